@@ -42,3 +42,5 @@ wchar_t* tzutNewString(wchar_t const* text) {
 }
 
 void tzutDelString(wchar_t*& text) { delete[] std::exchange(text, nullptr); }
+
+void tzutDelBuffer(wchar_t*& text) { tzutDelString(text); }

@@ -61,5 +61,7 @@ TZ_API int tzutRelRb(resbuf* list);
 [[nodiscard]] TZ_API wchar_t* tzutNewString(wchar_t const* text);
 // Releases a string that the host gave and clears the pointer. Null is allowed.
 TZ_API void tzutDelString(wchar_t*& text);
+// The same for texts that a question of the host gave.
+TZ_API void tzutDelBuffer(wchar_t*& text);
 // Whether a record of that type holds a string.
 [[nodiscard]] TZ_API bool tzutHoldsString(int type);
