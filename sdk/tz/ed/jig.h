@@ -36,8 +36,9 @@ public:
         kNormal = 0,     // a point, or a sample that differs
         kKW1 = 1,        // the first keyword; the n-th gives n, up to 30
     };
-    // Bits of the controls. A drag accepts an empty answer whatever they say; only kAnyBlank...'s
-    // absence is looked at by nothing else here, the rest are kept for hosts with a screen.
+    // Bits of the controls. kGovernedByOrthoMode lets ortho mode hold the point; kAccept3dCoordinates
+    // keeps a third coordinate. A drag accepts an empty answer whatever they say, and the other bits
+    // are for hosts with a screen.
     enum UserInputControls : int {
         kGovernedByOrthoMode = 0x1,
         kNullResponseAccepted = 0x2,
