@@ -1,0 +1,1 @@
+// A library made of whole archives still needs one source of its own.

@@ -1,0 +1,40 @@
+# Which folder may include which: the one table of the dependency graph. CMake gives every target
+# only the include roots of its row, and the test `lint.layers` reads every #include against it.
+#
+#   tz_row(FOLDER [USES folders...] [LIBRARIES third-party libraries...])
+#
+# Rows stand bottom to top, so a folder may only use folders of rows above its own line here: no
+# cycles. Each row is one line, since the lint reads this file too. Folders with no LIBRARIES
+# column under sdk/, module/ and examples/ use the standard library alone.
+#
+# Names of libraries: json (nlohmann-json), ini (SimpleIni), fontconfig, pango (with GLib), cairo,
+# cli (CLI11), editline (libedit).
+
+tz_row(sdk)
+
+tz_row(module/access       USES sdk)
+tz_row(module/fonts        USES sdk module/access)
+tz_row(module/prompt       USES sdk module/access)
+tz_row(module/markup       USES sdk module/access module/fonts)
+tz_row(module/edit         USES sdk module/access module/fonts module/markup)
+tz_row(module/mtext        USES sdk module/access module/prompt module/edit)
+tz_row(module/commands     USES sdk module/access module/prompt module/edit module/mtext)
+tz_row(module/align        USES sdk module/access module/prompt)
+tz_row(module/shell        USES sdk module/access module/fonts module/prompt module/markup module/edit module/mtext module/commands module/align)
+
+tz_row(host/base           USES sdk LIBRARIES json ini fontconfig)
+tz_row(host/faults         USES sdk host/base)
+tz_row(host/runtime        USES sdk host/base host/faults LIBRARIES json)
+tz_row(host/fonts          USES sdk host/base host/faults host/runtime LIBRARIES fontconfig ini)
+tz_row(host/layout         USES sdk host/base host/faults host/runtime host/fonts LIBRARIES fontconfig pango cairo)
+tz_row(host/database       USES sdk host/base host/faults host/runtime host/fonts host/layout LIBRARIES json)
+tz_row(host/drawing_file   USES sdk host/base host/faults host/runtime host/database LIBRARIES json)
+tz_row(host/display        USES sdk host/base host/faults host/runtime host/fonts host/layout host/database LIBRARIES json pango cairo)
+tz_row(host/command_line   USES sdk host/base host/faults host/runtime host/database host/display LIBRARIES json editline)
+tz_row(host/selection      USES sdk host/base host/faults host/runtime host/database host/display host/command_line LIBRARIES json)
+tz_row(host/editors        USES sdk host/base host/faults host/runtime host/fonts host/database host/display host/command_line host/selection LIBRARIES json)
+
+tz_row(apps/tzdraft        USES sdk host/base host/faults host/runtime host/fonts host/layout host/database host/drawing_file host/display host/command_line host/selection host/editors LIBRARIES json cli editline)
+tz_row(apps/tzconvert      USES sdk host/base module/access module/fonts module/markup LIBRARIES json cli)
+
+tz_row(examples            USES sdk)

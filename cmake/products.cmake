@@ -1,0 +1,52 @@
+# The products, made of the layers that exist.
+
+# The embedded host: every host layer whole, so that what only the module calls is in it too.
+tz_layers_in("^host/" layers)
+if(layers)
+    add_library(tz SHARED ${CMAKE_CURRENT_LIST_DIR}/empty.cpp)
+    foreach(layer IN LISTS layers)
+        target_link_libraries(tz PRIVATE $<LINK_LIBRARY:WHOLE_ARCHIVE,${layer}>)
+    endforeach()
+    target_link_libraries(tz PRIVATE Threads::Threads ${CMAKE_DL_LIBS})
+    target_link_options(tz PRIVATE ${TZ_LINK_DEFS})
+    set_target_properties(tz PROPERTIES VERSION 1 SOVERSION 1)
+    add_dependencies(tz_products tz)
+endif()
+
+# The module: every module layer whole, hidden but for the names of its list.
+tz_layers_in("^module/" layers)
+if("module_shell" IN_LIST layers AND TARGET tz)
+    set(exports ${PROJECT_SOURCE_DIR}/module/shell/exports.txt)
+    set(version_script ${CMAKE_BINARY_DIR}/tzmted.version)
+    add_custom_command(OUTPUT ${version_script}
+        COMMAND Python3::Interpreter ${PROJECT_SOURCE_DIR}/scripts/lint/exports.py
+            --list ${exports} --version-script ${version_script}
+        DEPENDS ${exports} ${PROJECT_SOURCE_DIR}/scripts/lint/exports.py VERBATIM)
+    add_custom_target(tzmted_version_script DEPENDS ${version_script})
+    add_library(tzmted MODULE ${CMAKE_CURRENT_LIST_DIR}/empty.cpp)
+    foreach(layer IN LISTS layers)
+        target_link_libraries(tzmted PRIVATE $<LINK_LIBRARY:WHOLE_ARCHIVE,${layer}>)
+    endforeach()
+    target_link_libraries(tzmted PRIVATE tz)
+    tz_module_properties(tzmted tzmted)
+    target_link_options(tzmted PRIVATE -Wl,--version-script=${version_script})
+    set_target_properties(tzmted PROPERTIES LINK_DEPENDS ${version_script})
+    add_dependencies(tzmted tzmted_version_script)
+    add_dependencies(tz_products tzmted)
+endif()
+
+# The programs: each is its layer, which suites link too, and a main.cpp.
+function(tz_program name)
+    add_executable(${name} ${PROJECT_SOURCE_DIR}/apps/${name}/main.cpp)
+    tz_flags(${name})
+    target_link_libraries(${name} PRIVATE $<TARGET_NAME_IF_EXISTS:app_${name}> ${ARGN})
+    add_dependencies(tz_products ${name})
+endfunction()
+if(TARGET app_tzdraft AND TARGET tz AND EXISTS ${PROJECT_SOURCE_DIR}/apps/tzdraft/main.cpp)
+    tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
+endif()
+# Archives only, so that no drawing database and no display library comes along.
+if(TARGET app_tzconvert AND TARGET module_markup AND TARGET host_base
+        AND EXISTS ${PROJECT_SOURCE_DIR}/apps/tzconvert/main.cpp)
+    tz_program(tzconvert module_markup module_fonts module_access host_base)
+endif()

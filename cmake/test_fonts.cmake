@@ -1,0 +1,26 @@
+# Tests see these faces and no others, so that widths and charsets are the same on every machine:
+# - DejaVu: wide coverage (Latin, Greek, Cyrillic, Hebrew, Arabic), several weights and widths;
+# - Liberation: a second family of other widths with true bold and italic cuts, no Hebrew or Arabic in some;
+# - Droid Sans Fallback: one small file with the Chinese, Japanese and Korean characters.
+# The files are linked into a folder of the build tree, which a fontconfig file of its own names.
+set(TZ_TEST_FONTS
+    dejavu/DejaVuSans.ttf
+    dejavu/DejaVuSans-Bold.ttf
+    dejavu/DejaVuSansMono.ttf
+    dejavu/DejaVuSerif.ttf
+    liberation/LiberationSans-Regular.ttf
+    liberation/LiberationSans-Bold.ttf
+    liberation/LiberationSans-Italic.ttf
+    liberation/LiberationSans-BoldItalic.ttf
+    droid/DroidSansFallbackFull.ttf)
+set(TZ_TEST_FONTS_CONF ${CMAKE_BINARY_DIR}/tests/fonts/fonts.conf)
+file(MAKE_DIRECTORY ${CMAKE_BINARY_DIR}/tests/fonts/files)
+foreach(font IN LISTS TZ_TEST_FONTS)
+    if(NOT EXISTS /usr/share/fonts/truetype/${font})
+        message(WARNING "Test font ${font} is missing: scripts/setup.sh installs it")
+    endif()
+    get_filename_component(file ${font} NAME)
+    file(CREATE_LINK /usr/share/fonts/truetype/${font} ${CMAKE_BINARY_DIR}/tests/fonts/files/${file}
+        SYMBOLIC)
+endforeach()
+configure_file(${PROJECT_SOURCE_DIR}/tests/fonts/fonts.conf.in ${TZ_TEST_FONTS_CONF} @ONLY)

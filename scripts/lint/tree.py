@@ -1,0 +1,33 @@
+"""What the lints share: the files of the project and the layer table."""
+import os
+import re
+import subprocess
+
+ROOT = os.path.dirname(os.path.dirname(os.path.dirname(os.path.abspath(__file__))))
+
+
+def tracked(*suffixes):
+    """Tracked and newly added files, relative to the root, with one of the suffixes (all without)."""
+    command = ["git", "-C", ROOT, "ls-files", "-z", "--cached", "--others", "--exclude-standard"]
+    names = subprocess.run(command, check=True, capture_output=True, text=True).stdout.split("\0")
+    return sorted(name for name in set(names) if name and os.path.isfile(os.path.join(ROOT, name))
+                  and (not suffixes or name.endswith(suffixes)))
+
+
+def text_of(name):
+    """The lines of a text file; none of a binary one."""
+    with open(os.path.join(ROOT, name), "rb") as file:
+        data = file.read()
+    return [] if b"\0" in data else data.decode("utf-8", "replace").splitlines()
+
+
+def rows():
+    """The layer table: folder -> (folders that it may use, libraries that it may use)."""
+    table = {}
+    for line in text_of("cmake/layers.cmake"):
+        match = re.match(r"tz_row\(([\w/]+)\s*(.*)\)\s*$", line)
+        if match:
+            words = match.group(2).split()
+            at = words.index("LIBRARIES") if "LIBRARIES" in words else len(words)
+            table[match.group(1)] = (set(words[1:at]), set(words[at + 1:]))
+    return table
