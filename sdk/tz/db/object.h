@@ -73,7 +73,7 @@ private:
                                                           TzDb::OpenMode mode, bool erasedToo = false);
 
 // [any] The same for a given class: an object of another class is closed again and fails with
-// Tzad::eNotThatKindOfClass.
+// Tzad::eWrongObjectType.
 template <class T>
 [[nodiscard]] Tzad::ErrorStatus tzdbOpenObject(T*& object, TzDbObjectId id, TzDb::OpenMode mode,
                                                bool erasedToo = false) {
@@ -84,7 +84,7 @@ template <class T>
     object = tzrxCast<T>(static_cast<TzRxObject*>(opened));
     if (object) return Tzad::eOk;
     opened->close();
-    return Tzad::eNotThatKindOfClass;
+    return Tzad::eWrongObjectType;
 }
 
 // Opens the pointer's object for write in place of its opening for read, and gives that back at the end:
