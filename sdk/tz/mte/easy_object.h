@@ -1,0 +1,79 @@
+#pragma once
+
+class TzDbField;
+
+// Holders of open database objects: what a holder is told to give back, it gives back on every way out.
+//
+//   EasyObject<TzDbMText> text;                       // flags 1: close at the end
+//   if (tzdbOpenObject(text.object, id, TzDb::kForRead) != Tzad::eOk) return;
+//
+// The members are open to their users, who also take objects out by setting `object` to null. Not
+// copyable. Other host modules get such holders through the dialog parameters.
+namespace EasyFlags {
+inline constexpr unsigned int kNone = 0;
+inline constexpr unsigned int kClose = 1;   // close at the end
+inline constexpr unsigned int kDelete = 2;  // delete at the end, after closing
+}  // namespace EasyFlags
+
+template <class T>
+class EasyObject {
+public:
+    explicit EasyObject(T* held = nullptr, unsigned int duties = EasyFlags::kClose)
+        : object(held), flags(duties) {}
+    EasyObject(EasyObject const&) = delete;
+    EasyObject& operator=(EasyObject const&) = delete;
+    virtual ~EasyObject() {
+        if (!object) return;
+        if (flags & EasyFlags::kClose) object->close();
+        if (flags & EasyFlags::kDelete) delete object;
+        object = nullptr;
+    }
+
+    T* operator->() const { return object; }
+
+    T* object;
+    unsigned int flags;
+    // Filled by an editor session alone, for a text without a database; whoever ran the session
+    // attaches and closes it.
+    TzDbField* field = nullptr;
+};
+
+// The same for a table.
+template <class T>
+class EasyTable {
+public:
+    explicit EasyTable(T* held = nullptr, unsigned int duties = EasyFlags::kClose)
+        : object(held), flags(duties) {}
+    EasyTable(EasyTable const&) = delete;
+    EasyTable& operator=(EasyTable const&) = delete;
+    virtual ~EasyTable() {
+        if (!object) return;
+        if (flags & EasyFlags::kClose) object->close();
+        if (flags & EasyFlags::kDelete) delete object;
+        object = nullptr;
+    }
+
+    T* operator->() const { return object; }
+
+    T* object;
+    unsigned int flags;
+};
+
+// The iterator I of a table T; iterators are deleted and never closed.
+template <class T, class I>
+class EasyIterator {
+public:
+    explicit EasyIterator(I* held = nullptr, unsigned int duties = EasyFlags::kDelete)
+        : object(held), flags(duties) {}
+    EasyIterator(EasyIterator const&) = delete;
+    EasyIterator& operator=(EasyIterator const&) = delete;
+    ~EasyIterator() {
+        if (object && (flags & EasyFlags::kDelete)) delete object;
+        object = nullptr;
+    }
+
+    I* operator->() const { return object; }
+
+    I* object;
+    unsigned int flags;
+};
