@@ -3,8 +3,8 @@
 namespace tzhost {
 
 bool Audit::clean() const {
-    return openObjects == 0 && selectionSets == 0 && filters == 0 && gestureHandlers == 0 && highlighted == 0 &&
-           ucsStack == 0 && !keywordCallback;
+    return openObjects == 0 && selectionSets == 0 && filters == 0 && gestureHandlers == 0 &&
+           highlighted == 0 && ucsStack == 0 && !keywordCallback;
 }
 
 Audit& audit() {

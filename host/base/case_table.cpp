@@ -7,9 +7,9 @@ namespace tzhost {
 
 namespace {
 
-// One-to-one case pairs: first, last, step and what to add. A step of 2 takes every second character.
-// Sorted, without overlap. Unicode 14; characters whose other case is several characters, or
-// depends on what stands around them, keep their own.
+// One-to-one case pairs: first, last, step and what to add. A step of 2 takes every second
+// character. Sorted, without overlap. Unicode 14; characters whose other case is several
+// characters, or depends on what stands around them, keep their own.
 struct CaseRange {
     wchar_t first;
     wchar_t last;
@@ -162,15 +162,16 @@ static_assert(isSorted(kToLower) && isSorted(kToUpper));
 
 template <std::size_t Count>
 wchar_t mapCase(std::array<CaseRange, Count> const& table, wchar_t c) {
-    auto at = std::upper_bound(table.begin(), table.end(), c,
-                               [](wchar_t value, CaseRange const& row) { return value < row.first; });
+    auto at =
+        std::upper_bound(table.begin(), table.end(), c,
+                         [](wchar_t value, CaseRange const& row) { return value < row.first; });
     if (at == table.begin()) return c;
     --at;
     if (c > at->last || (c - at->first) % at->step != 0) return c;
     return c + at->delta;
 }
 
-} // namespace
+}  // namespace
 
 wchar_t lowerOf(wchar_t c) {
     if (c < 0x80) return c >= L'A' && c <= L'Z' ? c + (L'a' - L'A') : c;
@@ -182,4 +183,4 @@ wchar_t upperOf(wchar_t c) {
     return mapCase(kToUpper, c);
 }
 
-} // namespace tzhost
+}  // namespace tzhost

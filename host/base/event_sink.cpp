@@ -12,12 +12,16 @@ EventSink& sink() {
 
 }  // namespace
 
-bool eventsWanted() { return static_cast<bool>(sink()); }
+bool eventsWanted() {
+    return static_cast<bool>(sink());
+}
 
 void reportEvent(Event const& event) {
     if (sink()) sink()(event);
 }
 
-EventSink setEventSink(EventSink next) { return std::exchange(sink(), std::move(next)); }
+EventSink setEventSink(EventSink next) {
+    return std::exchange(sink(), std::move(next));
+}
 
 }  // namespace tzhost

@@ -22,6 +22,8 @@ void reportEvent(Event const& event);
 EventSink setEventSink(EventSink sink);
 
 // Text as events and drawing files hold it: UTF-8.
-[[nodiscard]] inline std::string utf8(TzString const& text) { return text.toUtf8(); }
+[[nodiscard]] inline std::string utf8(TzString const& text) {
+    return text.toUtf8();
+}
 
 }  // namespace tzhost

@@ -8,7 +8,9 @@ namespace {
 FaultHook installedHook = nullptr;
 }
 
-FaultHook setFaultHook(FaultHook hook) noexcept { return std::exchange(installedHook, hook); }
+FaultHook setFaultHook(FaultHook hook) noexcept {
+    return std::exchange(installedHook, hook);
+}
 
 std::optional<int> faultAt(std::string_view operation, int usual) {
     if (installedHook == nullptr) return std::nullopt;
@@ -17,4 +19,4 @@ std::optional<int> faultAt(std::string_view operation, int usual) {
     return status;
 }
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -13,18 +13,21 @@
 
 namespace tzhost {
 
-// The status with which an operation fails unless the plan names another: that of a refused question.
+// The status with which an operation fails unless the plan names another: that of a refused
+// question.
 constexpr int kUsualFailure = -5001;
 
-// Decides about one call of `operation`: true lets it fail with `status`, which holds the operation's
-// usual failure and may be replaced. Called for each asked operation, so it also counts the calls.
+// Decides about one call of `operation`: true lets it fail with `status`, which holds the
+// operation's usual failure and may be replaced. Called for each asked operation, so it also counts
+// the calls.
 using FaultHook = bool (*)(std::string_view operation, int& status);
 
 // Installs a hook (null removes it) and returns the one that was there.
 FaultHook setFaultHook(FaultHook hook) noexcept;
 
-// The status with which this call must fail, or nothing when it goes on. `usual` is the status of the
-// operation's common failure; an operation without a status ignores the number and gives its null.
+// The status with which this call must fail, or nothing when it goes on. `usual` is the status of
+// the operation's common failure; an operation without a status ignores the number and gives its
+// null.
 [[nodiscard]] std::optional<int> faultAt(std::string_view operation, int usual = kUsualFailure);
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -4,16 +4,19 @@ namespace tzhost {
 
 namespace {
 
-// Lives as long as the process; null, when the C library is out of memory, leaves the locale as it is.
+// Lives as long as the process; null, when the C library is out of memory, leaves the locale as it
+// is.
 locale_t plainLocale() noexcept {
     static locale_t const locale = newlocale(LC_ALL_MASK, "C", locale_t{});
     return locale;
 }
 
-} // namespace
+}  // namespace
 
 NumberLocale::NumberLocale() noexcept : before_(uselocale(plainLocale())) {}
 
-NumberLocale::~NumberLocale() { uselocale(before_); }
+NumberLocale::~NumberLocale() {
+    uselocale(before_);
+}
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -21,4 +21,4 @@ private:
     locale_t before_;
 };
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -14,11 +14,15 @@ namespace {
 PrintSink* printSink = nullptr;
 DebugSink* debugSink = nullptr;
 NotificationSink* notificationSink = nullptr;
-} // namespace
+}  // namespace
 
-PrintSink* setPrintSink(PrintSink* sink) noexcept { return std::exchange(printSink, sink); }
+PrintSink* setPrintSink(PrintSink* sink) noexcept {
+    return std::exchange(printSink, sink);
+}
 
-DebugSink* setDebugSink(DebugSink* sink) noexcept { return std::exchange(debugSink, sink); }
+DebugSink* setDebugSink(DebugSink* sink) noexcept {
+    return std::exchange(debugSink, sink);
+}
 
 NotificationSink* setNotificationSink(NotificationSink* sink) noexcept {
     return std::exchange(notificationSink, sink);
@@ -36,13 +40,15 @@ void notify(Notification const& notification) {
     if (notificationSink != nullptr) notificationSink->notify(notification);
 }
 
-} // namespace tzhost
+}  // namespace tzhost
 
 namespace {
 
-std::wstring orEmpty(wchar_t const* text) { return text ? text : L""; }
+std::wstring orEmpty(wchar_t const* text) {
+    return text ? text : L"";
+}
 
-} // namespace
+}  // namespace
 
 int tzutPrintf(wchar_t const* format, ...) {
     va_list arguments;
@@ -68,7 +74,9 @@ int TwHostMessageBox::simple(wchar_t const* text, unsigned style) {
     return MessageBox(nullptr, text, nullptr, style);
 }
 
-void OutputDebugString(wchar_t const* text) { tzhost::debug(orEmpty(text)); }
+void OutputDebugString(wchar_t const* text) {
+    tzhost::debug(orEmpty(text));
+}
 
 void Tzworks::Tzdraft::PAL::Diagnostics::outputDebugString(wchar_t const* text) {
     OutputDebugString(text);

@@ -1,8 +1,8 @@
 #pragma once
 
-// Where the texts of the host and its modules go. Each kind has one receiver, which whoever drives the
-// host installs; without one the texts are dropped. Receivers are not owned and are taken out, by
-// installing null, before they end.
+// Where the texts of the host and its modules go. Each kind has one receiver, which whoever drives
+// the host installs; without one the texts are dropped. Receivers are not owned and are taken out,
+// by installing null, before they end.
 //
 //   class Screen : public tzhost::PrintSink { void print(std::wstring_view text) override; ... };
 //   Screen screen;
@@ -39,7 +39,7 @@ struct Notification {
     std::wstring text;
     std::wstring caption;
     unsigned style = 0;
-    bool printed = false; // the text also goes to the command line
+    bool printed = false;  // the text also goes to the command line
 };
 
 class NotificationSink {
@@ -58,4 +58,4 @@ void print(std::wstring_view text);
 void debug(std::wstring_view text);
 void notify(Notification const& notification);
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -12,7 +12,7 @@ namespace {
 // Group codes below this one name texts of an entity: its kind, its name, its style and so on.
 constexpr int kFirstGroupCodeOfNumbers = 10;
 
-} // namespace
+}  // namespace
 
 bool tzutHoldsString(int type) {
     return type == Tzad::eResultString || type == Tzad::eResultEntityKind ||
@@ -41,6 +41,10 @@ wchar_t* tzutNewString(wchar_t const* text) {
     return copy.release();
 }
 
-void tzutDelString(wchar_t*& text) { delete[] std::exchange(text, nullptr); }
+void tzutDelString(wchar_t*& text) {
+    delete[] std::exchange(text, nullptr);
+}
 
-void tzutDelBuffer(wchar_t*& text) { tzutDelString(text); }
+void tzutDelBuffer(wchar_t*& text) {
+    tzutDelString(text);
+}

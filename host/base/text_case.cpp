@@ -1,9 +1,13 @@
 #include "host/base/case_table.h"
 #include "tz/text/string.h"
 
-wchar_t tzToLower(wchar_t c) { return tzhost::lowerOf(c); }
+wchar_t tzToLower(wchar_t c) {
+    return tzhost::lowerOf(c);
+}
 
-wchar_t tzToUpper(wchar_t c) { return tzhost::upperOf(c); }
+wchar_t tzToUpper(wchar_t c) {
+    return tzhost::upperOf(c);
+}
 
 int tzCompareNoCase(wchar_t const* a, wchar_t const* b) {
     wchar_t const* left = a ? a : L"";
@@ -16,14 +20,18 @@ int tzCompareNoCase(wchar_t const* a, wchar_t const* b) {
     }
 }
 
-int TzString::compareNoCase(wchar_t const* other) const { return tzCompareNoCase(kwszPtr(), other); }
+int TzString::compareNoCase(wchar_t const* other) const {
+    return tzCompareNoCase(kwszPtr(), other);
+}
 
 TzString& TzString::makeLower() {
-    for (wchar_t& c : text_) c = tzhost::lowerOf(c);
+    for (wchar_t& c : text_)
+        c = tzhost::lowerOf(c);
     return *this;
 }
 
 TzString& TzString::makeUpper() {
-    for (wchar_t& c : text_) c = tzhost::upperOf(c);
+    for (wchar_t& c : text_)
+        c = tzhost::upperOf(c);
     return *this;
 }

@@ -1,6 +1,6 @@
-// The host's formatted text: a printf of its own for wide formats. The C library's differs from what
-// the callers need in three ways: its "%s" takes narrow text in a wide format, its numbers follow the
-// locale, and it must be told the size of its result.
+// The host's formatted text: a printf of its own for wide formats. The C library's differs from
+// what the callers need in three ways: its "%s" takes narrow text in a wide format, its numbers
+// follow the locale, and it must be told the size of its result.
 
 #include <array>
 #include <cstddef>
@@ -22,7 +22,7 @@ enum class Length { normal, hh, h, l, ll, j, z, t, L };
 
 // One conversion of a format, from the percent sign to its letter.
 struct Directive {
-    std::string flags; // in the order as written
+    std::string flags;  // in the order as written
     int width = -1;
     int precision = -1;
     Length length = Length::normal;
@@ -37,17 +37,19 @@ struct LengthRow {
 };
 
 // The longer of two spellings stands first.
-constexpr std::array<LengthRow, 9> kLengths{{
-    {L"hh", Length::hh},
-    {L"h", Length::h},
-    {L"ll", Length::ll},
-    {L"l", Length::l},
-    {L"j", Length::j},
-    {L"z", Length::z},
-    {L"t", Length::t},
-    {L"L", Length::L},
-    {L"q", Length::ll},
-}};
+constexpr std::array<LengthRow, 9> kLengths{
+    {
+     {L"hh", Length::hh},
+     {L"h", Length::h},
+     {L"ll", Length::ll},
+     {L"l", Length::l},
+     {L"j", Length::j},
+     {L"z", Length::z},
+     {L"t", Length::t},
+     {L"L", Length::L},
+     {L"q", Length::ll},
+     }
+};
 
 // Runs a format over its arguments. `arguments_` is used up in the order of the conversions.
 class Formatter {
@@ -117,19 +119,13 @@ private:
     // False at a letter that is no conversion.
     bool write(Directive const& directive) {
         switch (directive.letter) {
-        case L'%':
-            text_ += L'%';
-            return true;
+        case L'%': text_ += L'%'; return true;
         case L'd':
-        case L'i':
-            number(directive, nextSigned(directive.length));
-            return true;
+        case L'i': number(directive, nextSigned(directive.length)); return true;
         case L'u':
         case L'o':
         case L'x':
-        case L'X':
-            number(directive, nextUnsigned(directive.length));
-            return true;
+        case L'X': number(directive, nextUnsigned(directive.length)); return true;
         case L'e':
         case L'E':
         case L'f':
@@ -137,33 +133,24 @@ private:
         case L'g':
         case L'G':
         case L'a':
-        case L'A':
-            real(directive);
-            return true;
+        case L'A': real(directive); return true;
         case L'c':
         case L'C':
-            field(directive, std::wstring(1, static_cast<wchar_t>(va_arg(arguments_, std::wint_t))));
+            field(directive,
+                  std::wstring(1, static_cast<wchar_t>(va_arg(arguments_, std::wint_t))));
             return true;
         case L's':
-        case L'S':
-            wideOrNarrowText(directive);
-            return true;
-        case L'p':
-            pointer(directive);
-            return true;
-        default:
-            return false;
+        case L'S': wideOrNarrowText(directive); return true;
+        case L'p': pointer(directive); return true;
+        default: return false;
         }
     }
 
     long long nextSigned(Length length) {
         switch (length) {
-        case Length::hh:
-            return static_cast<signed char>(va_arg(arguments_, int));
-        case Length::h:
-            return static_cast<short>(va_arg(arguments_, int));
-        case Length::normal:
-            return va_arg(arguments_, int);
+        case Length::hh: return static_cast<signed char>(va_arg(arguments_, int));
+        case Length::h: return static_cast<short>(va_arg(arguments_, int));
+        case Length::normal: return va_arg(arguments_, int);
         default:
             static_assert(sizeof(long) == sizeof(long long));
             return va_arg(arguments_, long long);
@@ -172,14 +159,10 @@ private:
 
     unsigned long long nextUnsigned(Length length) {
         switch (length) {
-        case Length::hh:
-            return static_cast<unsigned char>(va_arg(arguments_, unsigned));
-        case Length::h:
-            return static_cast<unsigned short>(va_arg(arguments_, unsigned));
-        case Length::normal:
-            return va_arg(arguments_, unsigned);
-        default:
-            return va_arg(arguments_, unsigned long long);
+        case Length::hh: return static_cast<unsigned char>(va_arg(arguments_, unsigned));
+        case Length::h: return static_cast<unsigned short>(va_arg(arguments_, unsigned));
+        case Length::normal: return va_arg(arguments_, unsigned);
+        default: return va_arg(arguments_, unsigned long long);
         }
     }
 
@@ -191,7 +174,8 @@ private:
         return format + length + static_cast<char>(directive.letter);
     }
 
-    template <class Value> void number(Directive const& directive, Value value) {
+    template <class Value>
+    void number(Directive const& directive, Value value) {
         appendNarrow(narrowFormat(directive, "ll"), value);
     }
 
@@ -209,7 +193,8 @@ private:
         appendNarrow(narrowFormat(plain, ""), va_arg(arguments_, void*));
     }
 
-    template <class Value> void appendNarrow(std::string const& format, Value value) {
+    template <class Value>
+    void appendNarrow(std::string const& format, Value value) {
         tzhost::NumberLocale const inC;
         std::array<char, 512> room;
         int const length = std::snprintf(room.data(), room.size(), format.c_str(), value);
@@ -224,8 +209,8 @@ private:
         text_.append(large.begin(), large.end() - 1);
     }
 
-    // Wide text, but narrow text (UTF-8) for "%hs". A precision cuts the text and bounds what is read
-    // of it.
+    // Wide text, but narrow text (UTF-8) for "%hs". A precision cuts the text and bounds what is
+    // read of it.
     void wideOrNarrowText(Directive const& directive) {
         bool const isBounded = directive.precision >= 0;
         auto const most = static_cast<std::size_t>(isBounded ? directive.precision : 0);
@@ -253,7 +238,7 @@ private:
     std::wstring text_;
 };
 
-} // namespace
+}  // namespace
 
 std::wstring tzFormatV(wchar_t const* format, va_list arguments) {
     return Formatter(format, arguments).run();

@@ -9,11 +9,13 @@ namespace {
 constexpr wchar_t kReplacement = 0xFFFD;
 constexpr wchar_t kLastScalar = 0x10FFFF;
 
-bool isSurrogate(wchar_t c) { return c >= 0xD800 && c <= 0xDFFF; }
+bool isSurrogate(wchar_t c) {
+    return c >= 0xD800 && c <= 0xDFFF;
+}
 
 struct Decoded {
     wchar_t c;
-    std::size_t size; // 0: no character stands here
+    std::size_t size;  // 0: no character stands here
 };
 
 // The character at the start of `bytes`, which is not empty.
@@ -52,7 +54,7 @@ void encode(wchar_t c, std::string& bytes) {
     }
 }
 
-} // namespace
+}  // namespace
 
 std::size_t firstBadByte(std::string_view bytes) {
     for (std::size_t at = 0; at < bytes.size();) {
@@ -83,8 +85,12 @@ std::string toUtf8(std::wstring_view text) {
     return bytes;
 }
 
-} // namespace tzhost
+}  // namespace tzhost
 
-TzString TzString::fromUtf8(std::string_view bytes) { return TzString(tzhost::fromUtf8(bytes)); }
+TzString TzString::fromUtf8(std::string_view bytes) {
+    return TzString(tzhost::fromUtf8(bytes));
+}
 
-std::string TzString::toUtf8() const { return tzhost::toUtf8(text_); }
+std::string TzString::toUtf8() const {
+    return tzhost::toUtf8(text_);
+}

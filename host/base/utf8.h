@@ -1,6 +1,7 @@
 #pragma once
 
-// UTF-8 and the host's wide text. Overlong forms, surrogates and values above U+10FFFF are no UTF-8.
+// UTF-8 and the host's wide text. Overlong forms, surrogates and values above U+10FFFF are no
+// UTF-8.
 
 #include <cstddef>
 #include <string>
@@ -19,4 +20,4 @@ constexpr std::size_t kAllUtf8 = static_cast<std::size_t>(-1);
 // A value that is no Unicode scalar is written as U+FFFD.
 [[nodiscard]] std::string toUtf8(std::wstring_view text);
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -12,7 +12,8 @@
 namespace {
 
 TEST(Format, TakesWideTextForEveryTextConversion) {
-    EXPECT_EQ(TzString::formatted(L"%s|%ls|%S", L"Größe", L"\x1F600", L"c").str(), L"Größe|\x1F600|c");
+    EXPECT_EQ(TzString::formatted(L"%s|%ls|%S", L"Größe", L"\x1F600", L"c").str(),
+              L"Größe|\x1F600|c");
     EXPECT_EQ(TzString::formatted(L"%hs", "narrow \xC3\xA9").str(), L"narrow é");
     EXPECT_EQ(TzString::formatted(L"[%5s][%-5s][%.2s]", L"ab", L"ab", L"abcd").str(),
               L"[   ab][ab   ][ab]");
@@ -27,20 +28,21 @@ struct NumberRow {
     wchar_t const* text;
 };
 constexpr NumberRow kNumbers[] = {
-    {"Short", L"%g", 0.2, L"0.2"},
-    {"FourDigits", L"\\H%0.4gx;", 1.23456, L"\\H1.235x;"},
-    {"Fixed", L"%8.3f|", -1.5, L"  -1.500|"},
-    {"LeftInWidth", L"%-8.1e|", 1.0, L"1.0e+00 |"},
-    {"Percent", L"%g%%", 50.0, L"50%"},
-    {"EndsInsideConversion", L"%g then %", 1.0, L"1 then "},
-    {"UnknownConversion", L"%g then %y more", 1.0, L"1 then "},
+    {"Short",                L"%g",              0.2,     L"0.2"       },
+    {"FourDigits",           L"\\H%0.4gx;",      1.23456, L"\\H1.235x;"},
+    {"Fixed",                L"%8.3f|",          -1.5,    L"  -1.500|" },
+    {"LeftInWidth",          L"%-8.1e|",         1.0,     L"1.0e+00 |" },
+    {"Percent",              L"%g%%",            50.0,    L"50%"       },
+    {"EndsInsideConversion", L"%g then %",       1.0,     L"1 then "   },
+    {"UnknownConversion",    L"%g then %y more", 1.0,     L"1 then "   },
 };
 class FormattedNumber : public testing::TestWithParam<NumberRow> {};
 TEST_P(FormattedNumber, ReadsAs) {
     EXPECT_EQ(TzString::formatted(GetParam().format, GetParam().value).str(), GetParam().text);
 }
-INSTANTIATE_TEST_SUITE_P(Forms, FormattedNumber, testing::ValuesIn(kNumbers),
-                         [](auto const& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Forms, FormattedNumber, testing::ValuesIn(kNumbers), [](auto const& row) {
+    return row.param.name;
+});
 
 TEST(Format, HoldsEveryWidthOfIntegers) {
     EXPECT_EQ(TzString::formatted(L"%d %lu %lld %04X %hhd %zu", -1, ~0UL, 1LL << 40, 0xABU, 300,
@@ -70,13 +72,13 @@ struct Utf8Row {
     std::size_t bad;
 };
 constexpr Utf8Row kUtf8[] = {
-    {"Plain", "abc", L"abc", tzhost::kAllUtf8},
-    {"EveryLength", "\xC3\xA9\xE6\xBC\xA2\xF0\x9F\x98\x80", L"é漢\x1F600", tzhost::kAllUtf8},
-    {"Overlong", "a\xC0\x80", L"a\xFFFD\xFFFD", 1},
-    {"Surrogate", "\xED\xA0\x80", L"\xFFFD\xFFFD\xFFFD", 0},
-    {"AboveTheLast", "\xF4\x90\x80\x80", L"\xFFFD\xFFFD\xFFFD\xFFFD", 0},
-    {"CutOff", "ab\xE6\xBC", L"ab\xFFFD\xFFFD", 2},
-    {"LoneTail", "\x80z", L"\xFFFDz", 0},
+    {"Plain",        "abc",                                  L"abc",                      tzhost::kAllUtf8},
+    {"EveryLength",  "\xC3\xA9\xE6\xBC\xA2\xF0\x9F\x98\x80", L"é漢\x1F600",             tzhost::kAllUtf8},
+    {"Overlong",     "a\xC0\x80",                            L"a\xFFFD\xFFFD",            1               },
+    {"Surrogate",    "\xED\xA0\x80",                         L"\xFFFD\xFFFD\xFFFD",       0               },
+    {"AboveTheLast", "\xF4\x90\x80\x80",                     L"\xFFFD\xFFFD\xFFFD\xFFFD", 0               },
+    {"CutOff",       "ab\xE6\xBC",                           L"ab\xFFFD\xFFFD",           2               },
+    {"LoneTail",     "\x80z",                                L"\xFFFDz",                  0               },
 };
 class Utf8 : public testing::TestWithParam<Utf8Row> {};
 TEST_P(Utf8, ReadsAs) {
@@ -86,11 +88,13 @@ TEST_P(Utf8, ReadsAs) {
         EXPECT_EQ(tzhost::toUtf8(GetParam().text), GetParam().bytes);
     }
 }
-INSTANTIATE_TEST_SUITE_P(Forms, Utf8, testing::ValuesIn(kUtf8),
-                         [](auto const& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Forms, Utf8, testing::ValuesIn(kUtf8), [](auto const& row) {
+    return row.param.name;
+});
 
 TEST(Utf8, WritesNoSurrogates) {
-    std::wstring const text = {L'a', static_cast<wchar_t>(0xD800), static_cast<wchar_t>(0x110000), -5};
+    std::wstring const text = {L'a', static_cast<wchar_t>(0xD800), static_cast<wchar_t>(0x110000),
+                               -5};
     EXPECT_EQ(tzhost::toUtf8(text), "a\xEF\xBF\xBD\xEF\xBF\xBD\xEF\xBF\xBD");
 }
 
@@ -99,8 +103,16 @@ struct CaseRow {
     wchar_t lower;
 };
 constexpr CaseRow kCases[] = {
-    {L'A', L'a'}, {L'Z', L'z'}, {0xC4, 0xE4},     {0x178, 0xFF},     {0x100, 0x101},
-    {L'Ω', L'ω'}, {L'Ж', L'ж'}, {0x531, 0x561},   {0x10400, 0x10428}, {0x1E00, 0x1E01},
+    {L'A',    L'a'   },
+    {L'Z',    L'z'   },
+    {0xC4,    0xE4   },
+    {0x178,   0xFF   },
+    {0x100,   0x101  },
+    {L'Ω',   L'ω'  },
+    {L'Ж',   L'ж'  },
+    {0x531,   0x561  },
+    {0x10400, 0x10428},
+    {0x1E00,  0x1E01 },
 };
 TEST(LetterCase, GoesBothWays) {
     for (CaseRow const& row : kCases) {
@@ -108,8 +120,8 @@ TEST(LetterCase, GoesBothWays) {
         EXPECT_EQ(tzToUpper(row.lower), row.upper);
         EXPECT_EQ(tzToLower(row.lower), row.lower);
     }
-    for (wchar_t const c : {L'[', L'`', L'@', L'ß', L'漢', static_cast<wchar_t>(0xD7), wchar_t{0x101},
-                            static_cast<wchar_t>(-1)}) {
+    for (wchar_t const c : {L'[', L'`', L'@', L'ß', L'漢', static_cast<wchar_t>(0xD7),
+                            wchar_t{0x101}, static_cast<wchar_t>(-1)}) {
         EXPECT_EQ(tzToLower(c), c);
     }
     EXPECT_EQ(tzToLower(0x130), L'i');
@@ -132,4 +144,4 @@ TEST(StdStr, ReplacesAndFormats) {
     EXPECT_EQ(text.Right(2), L"b1");
 }
 
-} // namespace
+}  // namespace

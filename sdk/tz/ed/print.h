@@ -1,7 +1,7 @@
 #pragma once
 
-// Text for the user's command line. What is printed starts on a new line when it begins with one, and
-// the caller writes its own line ends.
+// Text for the user's command line. What is printed starts on a new line when it begins with one,
+// and the caller writes its own line ends.
 //
 //   tzutPrintf(L"\n%d found.", count);
 

@@ -9,7 +9,7 @@ namespace Tzworks::Tzdraft::PAL::Diagnostics {
 // [any] Sends a text as it stands; the caller formats it and ends its lines.
 TZ_API void outputDebugString(wchar_t const* text);
 
-} // namespace Tzworks::Tzdraft::PAL::Diagnostics
+}  // namespace Tzworks::Tzdraft::PAL::Diagnostics
 
 // [any] The same.
 TZ_API void OutputDebugString(wchar_t const* text);

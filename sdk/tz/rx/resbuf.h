@@ -1,7 +1,8 @@
 #pragma once
 
 // The host's value record, and lists of them: values of system variables, arguments of interpreter
-// calls, selection filters. A record names its type and holds one value; a list is linked by `rbnext`.
+// calls, selection filters. A record names its type and holds one value; a list is linked by
+// `rbnext`.
 //
 //   resbuf* filter = tzutNewRb(0);
 //   filter->resval.rstring = tzutNewString(L"MTEXT");
@@ -15,8 +16,8 @@
 
 namespace Tzad {
 
-// Types of values; the low group codes of selection filters (0 for the kind of an entity) stand beside
-// them in the same member.
+// Types of values; the low group codes of selection filters (0 for the kind of an entity) stand
+// beside them in the same member.
 enum ResultType : short {
     eResultNone = 5000,
     eResultReal = 5001,
@@ -32,19 +33,19 @@ enum ResultType : short {
     eResultVoid = 5014,
     eResultListBegin = 5016,
     eResultListEnd = 5017,
-    eResultEntityKind = 5020, // in selection filters: the kind of an entity, as group code 0
+    eResultEntityKind = 5020,  // in selection filters: the kind of an entity, as group code 0
 };
 
-} // namespace Tzad
+}  // namespace Tzad
 
 // One value; which member is live follows from the record's type.
 union resval_u {
-    double rreal;        // reals, angles, orientations
-    double rpoint[3];    // points
-    short rint;          // shorts
-    wchar_t* rstring;    // strings and the kinds in filters
-    int rlong;           // longs, 32 bits
-    long long rlname[2]; // names of entities and selection sets
+    double rreal;         // reals, angles, orientations
+    double rpoint[3];     // points
+    short rint;           // shorts
+    wchar_t* rstring;     // strings and the kinds in filters
+    int rlong;            // longs, 32 bits
+    long long rlname[2];  // names of entities and selection sets
 };
 
 struct resbuf {

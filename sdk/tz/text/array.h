@@ -4,9 +4,9 @@
 #include <initializer_list>
 #include <vector>
 
-// The host's growable array. Elements are values; indices count from 0 and are not checked but where
-// an operation says so. `growLength` is how many elements room is made for when the array is full; it
-// shows only through `physicalLength`.
+// The host's growable array. Elements are values; indices count from 0 and are not checked but
+// where an operation says so. `growLength` is how many elements room is made for when the array is
+// full; it shows only through `physicalLength`.
 //
 //   TzArray<TzDbObjectId> ids;          // grows by 8
 //   ids.append(id);
@@ -28,10 +28,14 @@ public:
         if (length > 0) items_.reserve(static_cast<std::size_t>(length));
     }
     // Cuts the array or fills it up with default values.
-    void setLogicalLength(int length) { items_.resize(static_cast<std::size_t>(std::max(length, 0))); }
+    void setLogicalLength(int length) {
+        items_.resize(static_cast<std::size_t>(std::max(length, 0)));
+    }
 
     [[nodiscard]] T& operator[](int index) { return items_[static_cast<std::size_t>(index)]; }
-    [[nodiscard]] T const& operator[](int index) const { return items_[static_cast<std::size_t>(index)]; }
+    [[nodiscard]] T const& operator[](int index) const {
+        return items_[static_cast<std::size_t>(index)];
+    }
     [[nodiscard]] T& first() { return items_.front(); }
     [[nodiscard]] T const& first() const { return items_.front(); }
     [[nodiscard]] T& last() { return items_.back(); }
@@ -56,7 +60,8 @@ public:
     void removeAll() { items_.clear(); }
     // The first index of an equal element at or behind `start`, or -1.
     [[nodiscard]] int find(T const& item, int start = 0) const {
-        auto const at = std::find(items_.begin() + std::clamp(start, 0, length()), items_.end(), item);
+        auto const at =
+            std::find(items_.begin() + std::clamp(start, 0, length()), items_.end(), item);
         return at == items_.end() ? -1 : static_cast<int>(at - items_.begin());
     }
     [[nodiscard]] bool contains(T const& item) const { return find(item) >= 0; }

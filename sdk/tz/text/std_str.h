@@ -34,7 +34,9 @@ public:
 
     [[nodiscard]] int GetLength() const { return static_cast<int>(this->size()); }
     [[nodiscard]] bool IsEmpty() const { return this->empty(); }
-    [[nodiscard]] int Find(Char c, int start = 0) const { return static_cast<int>(this->find(c, clamp(start))); }
+    [[nodiscard]] int Find(Char c, int start = 0) const {
+        return static_cast<int>(this->find(c, clamp(start)));
+    }
     [[nodiscard]] int Find(Char const* text, int start = 0) const {
         return static_cast<int>(this->find(text ? text : &kEnd, clamp(start)));
     }
@@ -43,7 +45,9 @@ public:
         return static_cast<int>(this->find_first_of(set ? set : &kEnd));
     }
     [[nodiscard]] CStdStr Left(int count) const { return CStdStr(this->substr(0, clamp(count))); }
-    [[nodiscard]] CStdStr Right(int count) const { return CStdStr(this->substr(this->size() - clamp(count))); }
+    [[nodiscard]] CStdStr Right(int count) const {
+        return CStdStr(this->substr(this->size() - clamp(count)));
+    }
     [[nodiscard]] CStdStr Mid(int start) const { return CStdStr(this->substr(clamp(start))); }
     [[nodiscard]] CStdStr Mid(int start, int count) const {
         return CStdStr(this->substr(clamp(start), count < 0 ? 0 : static_cast<std::size_t>(count)));
@@ -66,16 +70,20 @@ public:
 
     // By the host's table of lower case.
     CStdStr& MakeLower() {
-        for (Char& c : *this) c = tzToLower(c);
+        for (Char& c : *this)
+            c = tzToLower(c);
         return *this;
     }
-    [[nodiscard]] int CompareNoCase(Char const* other) const { return tzCompareNoCase(this->c_str(), other); }
+    [[nodiscard]] int CompareNoCase(Char const* other) const {
+        return tzCompareNoCase(this->c_str(), other);
+    }
 
 private:
     static constexpr Char kEnd = 0;
     [[nodiscard]] std::size_t clamp(int index) const {
         if (index < 0) return 0;
-        return static_cast<std::size_t>(index) < this->size() ? static_cast<std::size_t>(index) : this->size();
+        return static_cast<std::size_t>(index) < this->size() ? static_cast<std::size_t>(index)
+                                                              : this->size();
     }
 };
 

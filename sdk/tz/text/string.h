@@ -13,8 +13,8 @@
 //   if (text.find(L'|') != -1) ...
 //
 // Indices and lengths count characters from 0; "not found" is -1. An index outside the text is
-// clamped to its ends, so no operation of this class fails but for memory. `format` and its kin take
-// wide text for both %s and %ls and follow no locale.
+// clamped to its ends, so no operation of this class fails but for memory. `format` and its kin
+// take wide text for both %s and %ls and follow no locale.
 class TzString {
 public:
     TzString() = default;
@@ -58,7 +58,8 @@ public:
     TzString& append(wchar_t c);
     TzString& insert(int index, wchar_t const* text);
     TzString& remove(int index, int count = 1);
-    // Replaces every occurrence, from the front, without looking at what it put in; returns how many.
+    // Replaces every occurrence, from the front, without looking at what it put in; returns how
+    // many.
     int replace(wchar_t const* what, wchar_t const* by);
     TzString& operator+=(TzString const& text) { return append(text.kwszPtr()); }
     TzString& operator+=(wchar_t const* text) { return append(text); }
@@ -72,8 +73,8 @@ public:
     TzString& trimLeft(wchar_t const* set = L" \t\r\n");
     TzString& trimRight(wchar_t const* set = L" \t\r\n");
 
-    // UTF-8 both ways. Bytes that are no UTF-8 read as U+FFFD each; values that are no Unicode scalar
-    // are written as U+FFFD.
+    // UTF-8 both ways. Bytes that are no UTF-8 read as U+FFFD each; values that are no Unicode
+    // scalar are written as U+FFFD.
     [[nodiscard]] static TZ_API TzString fromUtf8(std::string_view bytes);
     [[nodiscard]] TZ_API std::string toUtf8() const;
 
@@ -83,16 +84,30 @@ private:
     std::wstring text_;
 };
 
-[[nodiscard]] inline TzString operator+(TzString left, TzString const& right) { return left += right; }
-[[nodiscard]] inline TzString operator+(TzString left, wchar_t const* right) { return left += right; }
+[[nodiscard]] inline TzString operator+(TzString left, TzString const& right) {
+    return left += right;
+}
+[[nodiscard]] inline TzString operator+(TzString left, wchar_t const* right) {
+    return left += right;
+}
 [[nodiscard]] inline TzString operator+(wchar_t const* left, TzString const& right) {
     return TzString(left) += right;
 }
-[[nodiscard]] inline bool operator==(TzString const& a, TzString const& b) { return a.str() == b.str(); }
-[[nodiscard]] inline bool operator==(TzString const& a, wchar_t const* b) { return a.compare(b) == 0; }
-[[nodiscard]] inline bool operator!=(TzString const& a, TzString const& b) { return !(a == b); }
-[[nodiscard]] inline bool operator!=(TzString const& a, wchar_t const* b) { return !(a == b); }
-[[nodiscard]] inline bool operator<(TzString const& a, TzString const& b) { return a.str() < b.str(); }
+[[nodiscard]] inline bool operator==(TzString const& a, TzString const& b) {
+    return a.str() == b.str();
+}
+[[nodiscard]] inline bool operator==(TzString const& a, wchar_t const* b) {
+    return a.compare(b) == 0;
+}
+[[nodiscard]] inline bool operator!=(TzString const& a, TzString const& b) {
+    return !(a == b);
+}
+[[nodiscard]] inline bool operator!=(TzString const& a, wchar_t const* b) {
+    return !(a == b);
+}
+[[nodiscard]] inline bool operator<(TzString const& a, TzString const& b) {
+    return a.str() < b.str();
+}
 
 // The host's one table of lower case, the same on every machine and under every locale; characters
 // without a lower case come back as they are.
@@ -100,8 +115,8 @@ private:
 [[nodiscard]] TZ_API wchar_t tzToUpper(wchar_t c);
 // Compares by that table: below, equal to or above 0. Null reads as the empty text.
 [[nodiscard]] TZ_API int tzCompareNoCase(wchar_t const* a, wchar_t const* b);
-// The formatted text; %s and %ls take wide text. A format that cannot be read gives what was written
-// up to the fault.
+// The formatted text; %s and %ls take wide text. A format that cannot be read gives what was
+// written up to the fault.
 [[nodiscard]] TZ_API std::wstring tzFormatV(wchar_t const* format, va_list arguments);
 
 #include "tz/text/string_inline.h"

@@ -25,7 +25,9 @@ inline int TzString::find(wchar_t const* text, int start) const {
     return static_cast<int>(text_.find(text ? text : L"", clamp(start)));
 }
 
-inline int TzString::findLast(wchar_t c) const { return static_cast<int>(text_.rfind(c)); }
+inline int TzString::findLast(wchar_t c) const {
+    return static_cast<int>(text_.rfind(c));
+}
 
 inline int TzString::findOneOf(wchar_t const* set, int start) const {
     return static_cast<int>(text_.find_first_of(set ? set : L"", clamp(start)));
@@ -74,7 +76,9 @@ inline int TzString::replace(wchar_t const* what, wchar_t const* by) {
     return count;
 }
 
-inline int TzString::compare(wchar_t const* other) const { return text_.compare(other ? other : L""); }
+inline int TzString::compare(wchar_t const* other) const {
+    return text_.compare(other ? other : L"");
+}
 
 inline TzString& TzString::trimLeft(wchar_t const* set) {
     text_.erase(0, text_.find_first_not_of(set ? set : L""));
