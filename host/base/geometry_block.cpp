@@ -7,7 +7,9 @@ TzGeBoundBlock3d& TzGeBoundBlock3d::set(TzGePoint3d const& first, TzGePoint3d co
     return set(first, {diagonal.x, 0.0, 0.0}, {0.0, diagonal.y, 0.0}, {0.0, 0.0, diagonal.z});
 }
 
-TzGeBoundBlock3d& TzGeBoundBlock3d::set(TzGePoint3d const& base, TzGeVector3d const& side1, TzGeVector3d const& side2,
+TzGeBoundBlock3d& TzGeBoundBlock3d::set(TzGePoint3d const& base,
+                                        TzGeVector3d const& side1,
+                                        TzGeVector3d const& side2,
                                         TzGeVector3d const& side3) {
     base_ = base;
     sides_[0] = side1;
@@ -17,7 +19,10 @@ TzGeBoundBlock3d& TzGeBoundBlock3d::set(TzGePoint3d const& base, TzGeVector3d co
     return *this;
 }
 
-void TzGeBoundBlock3d::get(TzGePoint3d& base, TzGeVector3d& side1, TzGeVector3d& side2, TzGeVector3d& side3) const {
+void TzGeBoundBlock3d::get(TzGePoint3d& base,
+                           TzGeVector3d& side1,
+                           TzGeVector3d& side2,
+                           TzGeVector3d& side3) const {
     base = base_;
     side1 = sides_[0];
     side2 = sides_[1];
@@ -48,7 +53,8 @@ bool TzGeBoundBlock3d::contains(TzGePoint3d const& point, TzGeTol const& tol) co
     TzGePoint3d high;
     getMinMaxPoints(low, high);
     for (int i = 0; i < 3; ++i) {
-        if (point[i] < low[i] - tol.equalPoint() || point[i] > high[i] + tol.equalPoint()) return false;
+        if (point[i] < low[i] - tol.equalPoint() || point[i] > high[i] + tol.equalPoint())
+            return false;
     }
     return true;
 }
@@ -76,6 +82,7 @@ TzGeBoundBlock3d& TzGeBoundBlock3d::extend(TzGeBoundBlock3d const& other) {
 TzGeBoundBlock3d& TzGeBoundBlock3d::transformBy(TzGeMatrix3d const& matrix) {
     if (empty_) return *this;
     base_.transformBy(matrix);
-    for (TzGeVector3d& side : sides_) side.transformBy(matrix);
+    for (TzGeVector3d& side : sides_)
+        side.transformBy(matrix);
     return *this;
 }

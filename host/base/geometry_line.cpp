@@ -15,7 +15,8 @@ TzGeVector3d unitOrZero(TzGeVector3d const& v) {
 // coordinates are rounded.
 double roundingOf(TzGePoint3d const& a, TzGePoint3d const& b) {
     double largest = 0.0;
-    for (int i = 0; i < 3; ++i) largest = std::max({largest, std::fabs(a[i]), std::fabs(b[i])});
+    for (int i = 0; i < 3; ++i)
+        largest = std::max({largest, std::fabs(a[i]), std::fabs(b[i])});
     return 16.0 * std::numeric_limits<double>::epsilon() * largest;
 }
 
@@ -24,21 +25,25 @@ double roundingOf(TzGePoint3d const& a, TzGePoint3d const& b) {
 TzGeLine3d::TzGeLine3d(TzGePoint3d const& point, TzGeVector3d const& direction)
     : point_(point), direction_(unitOrZero(direction)) {}
 
-TzGeLine3d::TzGeLine3d(TzGePoint3d const& first, TzGePoint3d const& second) : TzGeLine3d(first, second - first) {}
+TzGeLine3d::TzGeLine3d(TzGePoint3d const& first, TzGePoint3d const& second)
+    : TzGeLine3d(first, second - first) {}
 
 TzGePoint3d TzGeLine3d::getClosestPointTo(TzGePoint3d const& point, TzGeTol const& tol) const {
     TzGePoint3d const foot = evalPoint(paramOf(point));
     return foot.isEqualTo(point, tol) ? point : foot;
 }
 
-bool TzGeLine3d::intersectWith(TzGeLine3d const& other, TzGePoint3d& out, TzGeTol const& tol) const {
+bool TzGeLine3d::intersectWith(TzGeLine3d const& other,
+                               TzGePoint3d& out,
+                               TzGeTol const& tol) const {
     if (direction_.isZeroLength(tol) || other.direction_.isZeroLength(tol)) return false;
     if (direction_.isParallelTo(other.direction_, tol)) return false;
     TzGeVector3d const across = direction_.crossProduct(other.direction_);
     TzGeVector3d const between = other.point_ - point_;
     double const gap = std::fabs(between.dotProduct(across)) / across.length();
     if (gap > tol.equalPoint() + roundingOf(point_, other.point_)) return false;
-    double const param = between.crossProduct(other.direction_).dotProduct(across) / across.dotProduct(across);
+    double const param =
+        between.crossProduct(other.direction_).dotProduct(across) / across.dotProduct(across);
     out = evalPoint(param);
     return true;
 }

@@ -6,8 +6,8 @@
 
 namespace {
 
-// The matrix whose axes are the images of the world's axes under `turn`, and which leaves `fixed` in
-// its place.
+// The matrix whose axes are the images of the world's axes under `turn`, and which leaves `fixed`
+// in its place.
 template <class Turn>
 TzGeMatrix3d matrixAbout(TzGePoint3d const& fixed, Turn turn) {
     TzGeVector3d const x = turn(TzGeVector3d::kXAxis);
@@ -19,11 +19,12 @@ TzGeMatrix3d matrixAbout(TzGePoint3d const& fixed, Turn turn) {
 }  // namespace
 
 TzGeMatrix3d TzGeMatrix3d::translation(TzGeVector3d const& offset) {
-    return TzGeMatrix3d().setCoordSystem(TzGePoint3d::kOrigin + offset, TzGeVector3d::kXAxis, TzGeVector3d::kYAxis,
-                                         TzGeVector3d::kZAxis);
+    return TzGeMatrix3d().setCoordSystem(TzGePoint3d::kOrigin + offset, TzGeVector3d::kXAxis,
+                                         TzGeVector3d::kYAxis, TzGeVector3d::kZAxis);
 }
 
-TzGeMatrix3d TzGeMatrix3d::rotation(double angle, TzGeVector3d const& axis, TzGePoint3d const& centre) {
+TzGeMatrix3d
+TzGeMatrix3d::rotation(double angle, TzGeVector3d const& axis, TzGePoint3d const& centre) {
     return matrixAbout(centre, [&](TzGeVector3d v) { return v.rotateBy(angle, axis); });
 }
 
@@ -32,11 +33,14 @@ TzGeMatrix3d TzGeMatrix3d::scaling(double factor, TzGePoint3d const& centre) {
 }
 
 TzGeMatrix3d TzGeMatrix3d::projection(TzGePlane const& plane, TzGeVector3d const& direction) {
-    return matrixAbout(plane.pointOnPlane(), [&](TzGeVector3d v) { return v.project(plane, direction); });
+    return matrixAbout(plane.pointOnPlane(),
+                       [&](TzGeVector3d v) { return v.project(plane, direction); });
 }
 
-TzGeMatrix3d& TzGeMatrix3d::setCoordSystem(TzGePoint3d const& origin, TzGeVector3d const& xAxis,
-                                           TzGeVector3d const& yAxis, TzGeVector3d const& zAxis) {
+TzGeMatrix3d& TzGeMatrix3d::setCoordSystem(TzGePoint3d const& origin,
+                                           TzGeVector3d const& xAxis,
+                                           TzGeVector3d const& yAxis,
+                                           TzGeVector3d const& zAxis) {
     for (int row = 0; row < 3; ++row) {
         entry[row][0] = xAxis[row];
         entry[row][1] = yAxis[row];
@@ -46,7 +50,9 @@ TzGeMatrix3d& TzGeMatrix3d::setCoordSystem(TzGePoint3d const& origin, TzGeVector
     return *this;
 }
 
-void TzGeMatrix3d::getCoordSystem(TzGePoint3d& origin, TzGeVector3d& xAxis, TzGeVector3d& yAxis,
+void TzGeMatrix3d::getCoordSystem(TzGePoint3d& origin,
+                                  TzGeVector3d& xAxis,
+                                  TzGeVector3d& yAxis,
                                   TzGeVector3d& zAxis) const {
     origin = this->origin();
     xAxis = axis(0);
@@ -55,19 +61,22 @@ void TzGeMatrix3d::getCoordSystem(TzGePoint3d& origin, TzGeVector3d& xAxis, TzGe
 }
 
 TzGeMatrix3d TzGeMatrix3d::operator*(TzGeMatrix3d const& right) const {
-    return TzGeMatrix3d().setCoordSystem(right.origin().transformBy(*this), right.axis(0).transformBy(*this),
-                                         right.axis(1).transformBy(*this), right.axis(2).transformBy(*this));
+    return TzGeMatrix3d().setCoordSystem(
+        right.origin().transformBy(*this), right.axis(0).transformBy(*this),
+        right.axis(1).transformBy(*this), right.axis(2).transformBy(*this));
 }
 
 TzGeMatrix3d TzGeMatrix3d::inverse() const {
     double const volume = det();
     if (volume == 0.0 || isSingular()) return TzGeMatrix3d();
     // The rows of the inverse are the cross products of the columns.
-    TzGeVector3d const rows[] = {axis(1).crossProduct(axis(2)) / volume, axis(2).crossProduct(axis(0)) / volume,
+    TzGeVector3d const rows[] = {axis(1).crossProduct(axis(2)) / volume,
+                                 axis(2).crossProduct(axis(0)) / volume,
                                  axis(0).crossProduct(axis(1)) / volume};
     TzGeMatrix3d back;
     for (int row = 0; row < 3; ++row) {
-        for (int column = 0; column < 3; ++column) back.entry[row][column] = rows[row][column];
+        for (int column = 0; column < 3; ++column)
+            back.entry[row][column] = rows[row][column];
         back.entry[row][3] = -rows[row].dotProduct(origin().asVector());
     }
     return back;

@@ -11,7 +11,9 @@ TzGePlane::TzGePlane(TzGePoint3d const& point, TzGeVector3d const& normal) : ori
     normal_ = axes.zAxis();
 }
 
-TzGePlane::TzGePlane(TzGePoint3d const& origin, TzGeVector3d const& xAxis, TzGeVector3d const& yAxis)
+TzGePlane::TzGePlane(TzGePoint3d const& origin,
+                     TzGeVector3d const& xAxis,
+                     TzGeVector3d const& yAxis)
     : origin_(origin) {
     if (xAxis.isZeroLength() || yAxis.isZeroLength() || xAxis.isParallelTo(yAxis)) return;
     xAxis_ = xAxis;
@@ -19,7 +21,9 @@ TzGePlane::TzGePlane(TzGePoint3d const& origin, TzGeVector3d const& xAxis, TzGeV
     normal_ = xAxis.normal().crossProduct(yAxis.normal()).normal();
 }
 
-void TzGePlane::getCoordSystem(TzGePoint3d& origin, TzGeVector3d& xAxis, TzGeVector3d& yAxis) const {
+void TzGePlane::getCoordSystem(TzGePoint3d& origin,
+                               TzGeVector3d& xAxis,
+                               TzGeVector3d& yAxis) const {
     origin = origin_;
     xAxis = xAxis_;
     yAxis = yAxis_;

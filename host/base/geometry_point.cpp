@@ -2,7 +2,8 @@
 #include "tz/ge/plane.h"
 #include "tz/ge/point3d.h"
 
-TzGePoint3d& TzGePoint3d::rotateBy(double angle, TzGeVector3d const& axis, TzGePoint3d const& centre) {
+TzGePoint3d&
+TzGePoint3d::rotateBy(double angle, TzGeVector3d const& axis, TzGePoint3d const& centre) {
     return *this = centre + (*this - centre).rotateBy(angle, axis);
 }
 

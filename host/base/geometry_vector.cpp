@@ -81,7 +81,8 @@ TzGeVector3d& TzGeVector3d::rotateBy(double angle, TzGeVector3d const& axis) {
 
 TzGeVector3d& TzGeVector3d::transformBy(TzGeMatrix3d const& matrix) {
     auto const& m = matrix.entry;
-    return *this = {m[0][0] * x + m[0][1] * y + m[0][2] * z, m[1][0] * x + m[1][1] * y + m[1][2] * z,
+    return *this = {m[0][0] * x + m[0][1] * y + m[0][2] * z,
+                    m[1][0] * x + m[1][1] * y + m[1][2] * z,
                     m[2][0] * x + m[2][1] * y + m[2][2] * z};
 }
 

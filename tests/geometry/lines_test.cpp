@@ -1,46 +1,59 @@
 #include <gtest/gtest.h>
 
-#include <cmath>
+#include <cstdio>
+#include <string>
 
 #include "tz/ge/line_seg3d.h"
 #include "tz/ge/plane.h"
 
 namespace {
 
+// The coordinates to four digits.
+std::string textOf(TzGePoint3d const& p) {
+    char text[64];
+    // Zero is added so that a negative one loses its sign.
+    std::snprintf(text, sizeof text, "%.4g %.4g %.4g", p.x + 0.0, p.y + 0.0, p.z + 0.0);
+    return text;
+}
+
 struct CrossingCase {
-    const char* name;
-    TzGeLine3d a;
-    TzGeLine3d b;
-    bool cross;
-    TzGePoint3d at;
+    char const* name;
+    TzGePoint3d p;
+    TzGeVector3d u;
+    TzGePoint3d q;
+    TzGeVector3d v;
+    char const* at;  // empty for lines that do not cross
 };
-const CrossingCase kCrossings[] = {
-    {"RightAngle", {{1, 2, 0}, TzGeVector3d(1, 0, 0)}, {{5, 7, 0}, TzGeVector3d(0, 1, 0)}, true, {5, 2, 0}},
-    {"LongDirections", {{1, 2, 0}, TzGeVector3d(1e8, 0, 0)}, {{5, 7, 0}, TzGeVector3d(0, -1e-8, 0)}, true, {5, 2, 0}},
-    {"Slanted", {{0, 0, 0}, TzGeVector3d(1, 1, 1)}, {{4, 0, 2}, TzGeVector3d(-1, 1, 0)}, true, {2, 2, 2}},
-    {"SamePoint", {{3, 3, 3}, TzGeVector3d(1, 0, 0)}, {{3, 3, 3}, TzGeVector3d(0, 0, 1)}, true, {3, 3, 3}},
-    {"OneDegreeApart", {{0, 0, 0}, TzGeVector3d(0, 1, 0)}, {{1, 0, 0}, TzGeVector3d(-0.017455064928217585, 1, 0)},
-     true, {0, 57.28996163075943, 0}},
-    {"Parallel", {{0, 0, 0}, TzGeVector3d(1, 0, 0)}, {{0, 1, 0}, TzGeVector3d(-2, 0, 0)}, false, {}},
-    {"Same", {{0, 0, 0}, TzGeVector3d(1, 0, 0)}, {{5, 0, 0}, TzGeVector3d(1, 0, 0)}, false, {}},
-    {"NoDirection", {{0, 0, 0}, TzGeVector3d(1, 0, 0)}, {{0, 0, 0}, TzGeVector3d(0, 1e-11, 0)}, false, {}},
-    {"PassWithin", {{0, 0, 0}, TzGeVector3d(1, 0, 0)}, {{2, 0, 0.9e-10}, TzGeVector3d(0, 1, 0)}, true, {2, 0, 0}},
-    {"PassBeyond", {{0, 0, 0}, TzGeVector3d(1, 0, 0)}, {{2, 0, 1.1e-10}, TzGeVector3d(0, 1, 0)}, false, {}},
+// name, first point and direction, second point and direction, crossing
+constexpr CrossingCase kCrossings[] = {
+    {"RightAngle",     {1, 2, 0}, {1, 0, 0},   {5, 7, 0},       {0, 1, 0},                "5 2 0"    },
+    {"LongDirections", {1, 2, 0}, {1e8, 0, 0}, {5, 7, 0},       {0, -1e-8, 0},            "5 2 0"    },
+    {"Slanted",        {0, 0, 0}, {1, 1, 1},   {4, 0, 2},       {-1, 1, 0},               "2 2 2"    },
+    {"SamePoint",      {3, 3, 3}, {1, 0, 0},   {3, 3, 3},       {0, 0, 1},                "3 3 3"    },
+    {"OneDegreeApart", {0, 0, 0}, {0, 1, 0},   {1, 0, 0},       {-0.0174550649282, 1, 0}, "0 57.29 0"},
+    {"Parallel",       {0, 0, 0}, {1, 0, 0},   {0, 1, 0},       {-2, 0, 0},               ""         },
+    {"Same",           {0, 0, 0}, {1, 0, 0},   {5, 0, 0},       {1, 0, 0},                ""         },
+    {"NoDirection",    {0, 0, 0}, {1, 0, 0},   {0, 0, 0},       {0, 1e-11, 0},            ""         },
+    {"PassWithin",     {0, 0, 0}, {1, 0, 0},   {2, 0, 0.9e-10}, {0, 1, 0},                "2 0 0"    },
+    {"PassBeyond",     {0, 0, 0}, {1, 0, 0},   {2, 0, 1.1e-10}, {0, 1, 0},                ""         },
 };
 class LineCrossings : public testing::TestWithParam<CrossingCase> {};
 TEST_P(LineCrossings, AreFoundOrLeftAlone) {
     auto const& row = GetParam();
-    TzGePoint3d const untouched(-1, -1, -1);
-    TzGePoint3d at = untouched;
-    EXPECT_EQ(row.a.intersectWith(row.b, at), row.cross);
-    EXPECT_TRUE(at.isEqualTo(row.cross ? row.at : untouched)) << at.x << ' ' << at.y << ' ' << at.z;
-    EXPECT_EQ(row.b.intersectWith(row.a, at), row.cross);
+    TzGeLine3d const a(row.p, row.u);
+    TzGeLine3d const b(row.q, row.v);
+    TzGePoint3d at(-1, -1, -1);
+    bool const cross = *row.at != 0;
+    EXPECT_EQ(a.intersectWith(b, at), cross);
+    EXPECT_EQ(textOf(at), cross ? row.at : "-1 -1 -1");
+    EXPECT_EQ(b.intersectWith(a, at), cross);
 }
-INSTANTIATE_TEST_SUITE_P(Rows, LineCrossings, testing::ValuesIn(kCrossings),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, LineCrossings, testing::ValuesIn(kCrossings), [](auto const& row) {
+    return row.param.name;
+});
 
-// Far out two lines of one tilted plane pass each other by some rounding of their coordinates, which
-// is more than the tolerance; they used not to cross.
+// Far out two lines of one tilted plane pass each other by some rounding of their coordinates,
+// which is more than the tolerance; by that alone they would not cross.
 TEST(Lines, CrossFarFromTheOrigin) {
     TzGeMatrix3d const tilt = TzGeMatrix3d::rotation(0.7, {1, 2, 3}, {4e8, -7e8, 1e8});
     TzGePoint3d const wanted = tilt * TzGePoint3d(9e8, 1e8, 0);
@@ -75,7 +88,8 @@ TEST(Lines, MoveWithTheirSystem) {
     EXPECT_NEAR(segment.line().paramOf(segment.endPoint()), 10.0, 1e-14);
     segment.transformBy(system.inverse());
     EXPECT_TRUE(segment.endPoint().isEqualTo({4, 4, 0}));
-    TzGeLine3d const moved = TzGeLine3d(TzGePoint3d(0, 0, 0), TzGeVector3d(3, 0, 0)).transformBy(system);
+    TzGeLine3d const moved =
+        TzGeLine3d(TzGePoint3d(0, 0, 0), TzGeVector3d(3, 0, 0)).transformBy(system);
     EXPECT_TRUE(moved.direction().isEqualTo({0, 1, 0}));
 }
 
@@ -87,7 +101,7 @@ TEST(Lines, OfNoLengthHaveNoDirection) {
 }
 
 struct PlaneCase {
-    const char* name;
+    char const* name;
     TzGePlane plane;
     TzGeVector3d normal;
     TzGePoint3d on;
@@ -95,11 +109,31 @@ struct PlaneCase {
     double distance;
 };
 const PlaneCase kPlanes[] = {
-    {"World", TzGePlane(), {0, 0, 1}, {5, -5, 0.9e-10}, {0, 0, -2}, -2},
-    {"PointAndNormal", TzGePlane({0, 0, 3}, TzGeVector3d(0, 0, -4)), {0, 0, -1}, {9, 9, 3}, {1, 1, 5}, -2},
-    {"OriginAndAxes", TzGePlane({1, 0, 0}, {0, 2, 0}, {0, 3, 5}), {1, 0, 0}, {1, 7, 8}, {4, 0, 0}, 3},
-    {"ZeroNormal", TzGePlane({0, 0, 1}, TzGeVector3d()), {0, 0, 1}, {3, 3, 1}, {0, 0, 1 + 1.1e-10}, 1.1e-10},
-    {"ParallelAxes", TzGePlane({0, 0, 1}, {1, 0, 0}, {-1, 0, 0}), {0, 0, 1}, {3, 3, 1}, {0, 0, 2}, 1},
+    {"World",             TzGePlane(),     {0, 0, 1},  {5, -5, 0.9e-10}, {0, 0, -2}, -2},
+    { "PointAndNormal",
+     TzGePlane({0, 0, 3},                   TzGeVector3d(0,       0,                                                         -4)),
+     {0, 0, -1},
+     {9, 9, 3},
+     {1, 1, 5},
+     -2},
+    {                                                                                   "OriginAndAxes",
+     TzGePlane({1, 0, 0},       {0, 2, 0}, {0, 3, 5}),
+     {1, 0, 0},
+     {1, 7, 8},
+     {4, 0, 0},
+     3},
+    {                                                                                    "ZeroNormal",
+     TzGePlane({0, 0, 1}, TzGeVector3d()),
+     {0, 0, 1},
+     {3, 3, 1},
+     {0, 0, 1 + 1.1e-10},
+     1.1e-10},
+    {                                                                            "ParallelAxes",
+     TzGePlane({0, 0, 1},              {1, 0, 0},                                        {-1, 0, 0}),
+     {0, 0, 1},
+     {3, 3, 1},
+     {0, 0, 2},
+     1},
 };
 class Planes : public testing::TestWithParam<PlaneCase> {};
 TEST_P(Planes, KnowTheirPoints) {
@@ -116,7 +150,9 @@ TEST_P(Planes, KnowTheirPoints) {
     row.plane.getCoordSystem(origin, x, y);
     EXPECT_TRUE(x.crossProduct(y).isCodirectionalTo(row.normal));
 }
-INSTANTIATE_TEST_SUITE_P(Rows, Planes, testing::ValuesIn(kPlanes), [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, Planes, testing::ValuesIn(kPlanes), [](auto const& row) {
+    return row.param.name;
+});
 
 TEST(PlaneUse, MeetsLinesThatReachIt) {
     TzGePlane const plane({0, 0, 2}, TzGeVector3d::kZAxis);

@@ -11,34 +11,47 @@ namespace {
 
 constexpr double kPi = std::numbers::pi;
 
-TzGeMatrix3d systemOf(TzGePoint3d const& origin, TzGeVector3d const& x, TzGeVector3d const& y, TzGeVector3d const& z) {
+TzGeMatrix3d systemOf(TzGePoint3d const& origin,
+                      TzGeVector3d const& x,
+                      TzGeVector3d const& y,
+                      TzGeVector3d const& z) {
     return TzGeMatrix3d().setCoordSystem(origin, x, y, z);
 }
 
 struct MatrixCase {
-    const char* name;
+    char const* name;
     TzGeMatrix3d matrix;
     TzGePoint3d from;
     TzGePoint3d to;
 };
 const MatrixCase kMatrices[] = {
-    {"Identity", TzGeMatrix3d(), {1, 2, 3}, {1, 2, 3}},
-    {"Translation", TzGeMatrix3d::translation({10, 20, 30}), {1, 2, 3}, {11, 22, 33}},
-    {"QuarterTurn", TzGeMatrix3d::rotation(kPi / 2, {0, 0, 2}, {10, 0, 0}), {11, 0, 5}, {10, 1, 5}},
-    {"Scaling", TzGeMatrix3d::scaling(3, {1, 1, 1}), {2, 1, 0}, {4, 1, -2}},
-    {"TinyScaling", TzGeMatrix3d::scaling(1e-7), {1, 2, 3}, {1e-7, 2e-7, 3e-7}},
-    {"System", systemOf({5, 6, 7}, {0, 1, 0}, {-1, 0, 0}, {0, 0, 1}), {1, 2, 3}, {3, 7, 10}},
-    {"Mirror", systemOf({0, 0, 0}, {-1, 0, 0}, {0, 1, 0}, {0, 0, 1}), {1, 2, 3}, {-1, 2, 3}},
-    {"Skew", systemOf({0, 0, 0}, {1, 0, 0}, {1, 1, 0}, {0, 2, 4}), {1, 1, 1}, {2, 3, 4}},
-    {"RightAppliesFirst", TzGeMatrix3d::translation({1, 0, 0}) * TzGeMatrix3d::scaling(2), {1, 1, 1}, {3, 2, 2}},
-    {"PostMult", TzGeMatrix3d::scaling(2).postMultBy(TzGeMatrix3d::translation({1, 0, 0})), {1, 1, 1}, {4, 2, 2}},
-    {"PreMult", TzGeMatrix3d::scaling(2).preMultBy(TzGeMatrix3d::translation({1, 0, 0})), {1, 1, 1}, {3, 2, 2}},
+    {"Identity",          TzGeMatrix3d(),                          {1, 2, 3},                                       {1, 2, 3}                                                                       },
+    {"Translation",       TzGeMatrix3d::translation({10, 20, 30}), {1, 2, 3},                                       {11, 22, 33}                                                                    },
+    {"QuarterTurn",       TzGeMatrix3d::rotation(kPi / 2,          {0, 0, 2},                                       {10, 0, 0}),                                                                      {11, 0, 5}, {10, 1, 5}},
+    {"Scaling",         TzGeMatrix3d::scaling(3,                                                {1, 1, 1}),                                                                                       {2, 1, 0},                                                                                                                                        {4, 1, -2}},
+    {"TinyScaling",          TzGeMatrix3d::scaling(1e-7),                                       {1, 2, 3},{1e-7, 2e-7, 3e-7}},
+    {"System",          systemOf({5, 6, 7},{0, 1, 0},                                         {-1, 0, 0},                                                                                                                                                                                      {0, 0, 1}), {1, 2, 3}, {3, 7, 10}},
+    {"Mirror",          systemOf({0, 0, 0},                                               {-1, 0, 0},                                            {0, 1, 0},{0, 0, 1}), {1, 2, 3}, {-1, 2, 3}},
+    {"Skew",                   systemOf({0, 0, 0},                                                   {1, 0, 0},                                                                       {1, 1, 0},                                                                                               {0, 2, 4}), {1, 1, 1}, {2, 3, 4}},
+    {"RightAppliesFirst",
+     TzGeMatrix3d::translation({1, 0, 0}) * TzGeMatrix3d::scaling(2),
+     {1, 1, 1},
+     {3, 2, 2}                                                                                                                                                                                                                              },
+    {"PostMult",
+     TzGeMatrix3d::scaling(2).postMultBy(TzGeMatrix3d::translation({1, 0, 0})),
+     {1, 1, 1},
+     {4, 2, 2}},
+    {"PreMult",
+     TzGeMatrix3d::scaling(2).preMultBy(TzGeMatrix3d::translation({1, 0, 0})),
+     {1, 1, 1},
+     {3, 2, 2}                                                                                                                                },
 };
 class Matrices : public testing::TestWithParam<MatrixCase> {};
 TEST_P(Matrices, GoThereAndBack) {
     auto const& row = GetParam();
     TzGePoint3d point = row.from;
-    EXPECT_TRUE(point.transformBy(row.matrix).isEqualTo(row.to)) << point.x << ' ' << point.y << ' ' << point.z;
+    EXPECT_TRUE(point.transformBy(row.matrix).isEqualTo(row.to))
+        << point.x << ' ' << point.y << ' ' << point.z;
     EXPECT_TRUE(point.transformBy(row.matrix.inverse()).isEqualTo(row.from));
     EXPECT_TRUE((row.matrix * row.matrix.inverse()).isEqualTo(TzGeMatrix3d::kIdentity));
     // Vectors follow the points that they lead between, so a translation does not move them.
@@ -47,8 +60,9 @@ TEST_P(Matrices, GoThereAndBack) {
     EXPECT_TRUE(vector.transformBy(row.matrix).isEqualTo(moved));
     EXPECT_FALSE(row.matrix.isSingular());
 }
-INSTANTIATE_TEST_SUITE_P(Rows, Matrices, testing::ValuesIn(kMatrices),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, Matrices, testing::ValuesIn(kMatrices), [](auto const& row) {
+    return row.param.name;
+});
 
 TEST(MatrixChecks, FlatOnesAreSingularAndHaveNoInverse) {
     TzGeMatrix3d const flat[] = {
@@ -74,19 +88,19 @@ TEST(MatrixChecks, ShapesAreKeptByTurnsMirrorsAndScales) {
 }
 
 struct ProjectionCase {
-    const char* name;
+    char const* name;
     TzGeVector3d direction;
     TzGePoint3d from;
     TzGePoint3d to;
 };
 // On the plane z = 2.
 constexpr ProjectionCase kProjections[] = {
-    {"Straight", {0, 0, 1}, {3, 4, 9}, {3, 4, 2}},
-    {"Against", {0, 0, -5}, {3, 4, 9}, {3, 4, 2}},
-    {"Slanted", {1, 0, 1}, {3, 4, 9}, {-4, 4, 2}},
-    {"OnThePlaneStays", {1, 2, 3}, {3, 4, 2}, {3, 4, 2}},
-    {"AlongThePlaneStays", {1, 2, 0}, {3, 4, 9}, {3, 4, 9}},
-    {"NoDirectionStays", {0, 0, 0}, {3, 4, 9}, {3, 4, 9}},
+    {"Straight",           {0, 0, 1},  {3, 4, 9}, {3, 4, 2} },
+    {"Against",            {0, 0, -5}, {3, 4, 9}, {3, 4, 2} },
+    {"Slanted",            {1, 0, 1},  {3, 4, 9}, {-4, 4, 2}},
+    {"OnThePlaneStays",    {1, 2, 3},  {3, 4, 2}, {3, 4, 2} },
+    {"AlongThePlaneStays", {1, 2, 0},  {3, 4, 9}, {3, 4, 9} },
+    {"NoDirectionStays",   {0, 0, 0},  {3, 4, 9}, {3, 4, 9} },
 };
 class Projections : public testing::TestWithParam<ProjectionCase> {};
 TEST_P(Projections, PointsAndMatricesAgree) {
@@ -97,8 +111,9 @@ TEST_P(Projections, PointsAndMatricesAgree) {
     TzGeVector3d const vector = row.from - TzGePoint3d(0, 0, 2);
     EXPECT_TRUE(vector.project(plane, row.direction).isEqualTo(row.to - TzGePoint3d(0, 0, 2)));
 }
-INSTANTIATE_TEST_SUITE_P(Rows, Projections, testing::ValuesIn(kProjections),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, Projections, testing::ValuesIn(kProjections), [](auto const& row) {
+    return row.param.name;
+});
 
 // The smallest and largest coordinates on one line.
 std::string extremesOf(TzGeBoundBlock3d const& block) {
@@ -107,7 +122,8 @@ std::string extremesOf(TzGeBoundBlock3d const& block) {
     block.getMinMaxPoints(low, high);
     std::string text;
     for (TzGePoint3d const& p : {low, high}) {
-        for (int i = 0; i < 3; ++i) text += std::to_string(std::lround(p[i] * 100)) + (i < 2 ? "," : " ");
+        for (int i = 0; i < 3; ++i)
+            text += std::to_string(std::lround(p[i] * 100)) + (i < 2 ? "," : " ");
     }
     return text;
 }

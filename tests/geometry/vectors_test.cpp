@@ -23,26 +23,26 @@ std::string relationOf(TzGeVector3d const& a, TzGeVector3d const& b) {
 }
 
 struct RelationCase {
-    const char* name;
+    char const* name;
     TzGeVector3d a;
     TzGeVector3d b;
-    const char* relation;
+    char const* relation;
 };
 constexpr RelationCase kRelations[] = {
-    {"Same", {1, 2, 3}, {1, 2, 3}, "pce"},
-    {"Longer", {1, 2, 3}, {1e9, 2e9, 3e9}, "pc"},
-    {"Opposite", {0, 5, 0}, {0, -1e-3, 0}, "p"},
-    {"RightAngle", {0, 5, 0}, {7, 0, 1e6}, "r"},
-    {"TiltWithin", {1, 0, 0}, {1e6, 0.9e-4, 0}, "pc"},
-    {"TiltBeyond", {1, 0, 0}, {1e6, 1.1e-4, 0}, ""},
-    {"LeanWithin", {1, 0, 0}, {0.9e-4, 1e6, 0}, "r"},
-    {"LeanBeyond", {1, 0, 0}, {1.1e-4, 1e6, 0}, ""},
-    {"ShortHasDirection", {1.1e-10, 0, 0}, {1, 0, 0}, "pc"},
-    {"TooShort", {1e-10, 0, 0}, {1, 0, 0}, ""},
-    {"TooShortAcross", {1, 0, 0}, {0, 1e-10, 0}, ""},
-    {"ZeroAndZero", {0, 0, 0}, {0, 0, 0}, "e"},
-    {"EqualWithin", {1, 1, 1}, {1, 1, 1 + 0.9e-10}, "pce"},
-    {"EqualBeyond", {1, 1, 1}, {1, 1 + 0.8e-10, 1 + 0.8e-10}, "pc"},
+    {"Same",              {1, 2, 3},       {1, 2, 3},                     "pce"},
+    {"Longer",            {1, 2, 3},       {1e9, 2e9, 3e9},               "pc" },
+    {"Opposite",          {0, 5, 0},       {0, -1e-3, 0},                 "p"  },
+    {"RightAngle",        {0, 5, 0},       {7, 0, 1e6},                   "r"  },
+    {"TiltWithin",        {1, 0, 0},       {1e6, 0.9e-4, 0},              "pc" },
+    {"TiltBeyond",        {1, 0, 0},       {1e6, 1.1e-4, 0},              ""   },
+    {"LeanWithin",        {1, 0, 0},       {0.9e-4, 1e6, 0},              "r"  },
+    {"LeanBeyond",        {1, 0, 0},       {1.1e-4, 1e6, 0},              ""   },
+    {"ShortHasDirection", {1.1e-10, 0, 0}, {1, 0, 0},                     "pc" },
+    {"TooShort",          {1e-10, 0, 0},   {1, 0, 0},                     ""   },
+    {"TooShortAcross",    {1, 0, 0},       {0, 1e-10, 0},                 ""   },
+    {"ZeroAndZero",       {0, 0, 0},       {0, 0, 0},                     "e"  },
+    {"EqualWithin",       {1, 1, 1},       {1, 1, 1 + 0.9e-10},           "pce"},
+    {"EqualBeyond",       {1, 1, 1},       {1, 1 + 0.8e-10, 1 + 0.8e-10}, "pc" },
 };
 class VectorRelations : public testing::TestWithParam<RelationCase> {};
 TEST_P(VectorRelations, HoldBothWays) {
@@ -50,21 +50,22 @@ TEST_P(VectorRelations, HoldBothWays) {
     EXPECT_EQ(relationOf(row.a, row.b), row.relation);
     EXPECT_EQ(relationOf(row.b, row.a), row.relation);
 }
-INSTANTIATE_TEST_SUITE_P(Rows, VectorRelations, testing::ValuesIn(kRelations),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, VectorRelations, testing::ValuesIn(kRelations), [](auto const& row) {
+    return row.param.name;
+});
 
 struct AngleCase {
-    const char* name;
+    char const* name;
     TzGeVector3d a;
     TzGeVector3d b;
     double angle;
 };
 const AngleCase kAngles[] = {
-    {"Quarter", {2, 0, 0}, {0, -3, 0}, kPi / 2},
-    {"Half", {1, 1, 0}, {-4, -4, 0}, kPi},
-    {"Zero", {0, 0, 0}, {1, 0, 0}, 0},
-    // Through the cosine this came out as 0.
-    {"Tiny", {1, 0, 0}, {1, 1e-9, 0}, 1e-9},
+    {"Quarter",   {2, 0, 0}, {0, -3, 0},                                    kPi / 2  },
+    {"Half",      {1, 1, 0}, {-4, -4, 0},                                   kPi      },
+    {"Zero",      {0, 0, 0}, {1, 0, 0},                                     0        },
+ // Through the cosine this came out as 0.
+    {"Tiny",      {1, 0, 0}, {1, 1e-9, 0},                                  1e-9     },
     {"OneDegree", {0, 1, 0}, {std::sin(kPi / 180), std::cos(kPi / 180), 0}, kPi / 180},
 };
 class VectorAngles : public testing::TestWithParam<AngleCase> {};
@@ -73,23 +74,24 @@ TEST_P(VectorAngles, AreUnsigned) {
     EXPECT_NEAR(row.a.angleTo(row.b), row.angle, 1e-15);
     EXPECT_NEAR(row.b.angleTo(row.a), row.angle, 1e-15);
 }
-INSTANTIATE_TEST_SUITE_P(Rows, VectorAngles, testing::ValuesIn(kAngles),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, VectorAngles, testing::ValuesIn(kAngles), [](auto const& row) {
+    return row.param.name;
+});
 
 struct TurnCase {
-    const char* name;
+    char const* name;
     TzGeVector3d vector;
     double angle;
     TzGeVector3d axis;
     TzGeVector3d result;
 };
 const TurnCase kTurns[] = {
-    {"AnticlockwiseAboutZ", {1, 0, 0}, kPi / 2, {0, 0, 9}, {0, 1, 0}},
-    {"ClockwiseAboutMinusZ", {1, 0, 0}, kPi / 2, {0, 0, -1}, {0, -1, 0}},
-    {"AboutX", {0, 1, 0}, kPi / 2, {1, 0, 0}, {0, 0, 1}},
-    {"AlongTheAxisStays", {2, 2, 2}, 1.0, {1, 1, 1}, {2, 2, 2}},
-    {"ThirdAboutDiagonal", {1, 0, 0}, 2 * kPi / 3, {1, 1, 1}, {0, 1, 0}},
-    {"ZeroAxisTurnsNothing", {1, 2, 3}, 1.0, {0, 0, 0}, {1, 2, 3}},
+    {"AnticlockwiseAboutZ",  {1, 0, 0}, kPi / 2,     {0, 0, 9},  {0, 1, 0} },
+    {"ClockwiseAboutMinusZ", {1, 0, 0}, kPi / 2,     {0, 0, -1}, {0, -1, 0}},
+    {"AboutX",               {0, 1, 0}, kPi / 2,     {1, 0, 0},  {0, 0, 1} },
+    {"AlongTheAxisStays",    {2, 2, 2}, 1.0,         {1, 1, 1},  {2, 2, 2} },
+    {"ThirdAboutDiagonal",   {1, 0, 0}, 2 * kPi / 3, {1, 1, 1},  {0, 1, 0} },
+    {"ZeroAxisTurnsNothing", {1, 2, 3}, 1.0,         {0, 0, 0},  {1, 2, 3} },
 };
 class VectorTurns : public testing::TestWithParam<TurnCase> {};
 TEST_P(VectorTurns, FollowTheRightHand) {
@@ -99,8 +101,9 @@ TEST_P(VectorTurns, FollowTheRightHand) {
     TzGePoint3d const turned = (centre + row.vector).rotateBy(row.angle, row.axis, centre);
     EXPECT_TRUE(turned.isEqualTo(centre + row.result));
 }
-INSTANTIATE_TEST_SUITE_P(Rows, VectorTurns, testing::ValuesIn(kTurns),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, VectorTurns, testing::ValuesIn(kTurns), [](auto const& row) {
+    return row.param.name;
+});
 
 TEST(Vectors, NoTurnIsExact) {
     TzGeVector3d v(0.1, 0.2, 0.3);
@@ -133,32 +136,36 @@ TEST(Points, AreEqualUpToTheLimit) {
 }
 
 struct AxisCase {
-    const char* name;
+    char const* name;
     TzGeVector3d normal;
     TzGeVector3d xAxis;
 };
-const double kLimit = 1.0 / 64.0;
+double const kLimit = 1.0 / 64.0;
 const AxisCase kAxes[] = {
-    {"World", {0, 0, 1}, {1, 0, 0}},
-    {"FromBelow", {0, 0, -1}, {-1, 0, 0}},
-    {"Front", {0, -1, 0}, {1, 0, 0}},
-    {"Side", {7, 0, 0}, {0, 1, 0}},
-    {"ZeroIsWorld", {0, 0, 0}, {1, 0, 0}},
-    // Just inside the cone about Z the Y axis rules, at its edge the Z axis does.
-    {"InsideTheCone", {kLimit - 1e-9, 0, std::sqrt(1 - kLimit * kLimit)}, {0.9998779222195, 0, -0.015625}},
-    {"AtItsEdge", {kLimit, 0, std::sqrt(1 - kLimit * kLimit)}, {0, 1, 0}},
+    {"World",         {0, 0, 1},                                          {1, 0, 0} },
+    {"FromBelow",     {0, 0, -1},                                         {-1, 0, 0}},
+    {"Front",         {0, -1, 0},                                         {1, 0, 0} },
+    {"Side",          {7, 0, 0},                                          {0, 1, 0} },
+    {"ZeroIsWorld",   {0, 0, 0},                                          {1, 0, 0} },
+ // Just inside the cone about Z the Y axis rules, at its edge the Z axis does.
+    {"InsideTheCone",
+     {kLimit - 1e-9, 0, std::sqrt(1 - kLimit * kLimit)},
+     {0.9998779222195, 0, -0.015625}                                                },
+    {"AtItsEdge",     {kLimit, 0, std::sqrt(1 - kLimit * kLimit)},        {0, 1, 0} },
     {"BeyondInYOnly", {0, kLimit + 1e-9, std::sqrt(1 - kLimit * kLimit)}, {-1, 0, 0}},
 };
 class ArbitraryAxes : public testing::TestWithParam<AxisCase> {};
 TEST_P(ArbitraryAxes, FollowTheRule) {
     auto const& row = GetParam();
     TzGeMatrix3d const axes = atwt(row.normal);
-    EXPECT_TRUE(axes.xAxis().isEqualTo(row.xAxis, TzGeTol(1e-8))) << axes.xAxis().x << ' ' << axes.xAxis().y;
+    EXPECT_TRUE(axes.xAxis().isEqualTo(row.xAxis, TzGeTol(1e-8)))
+        << axes.xAxis().x << ' ' << axes.xAxis().y;
     EXPECT_TRUE(axes.xAxis().crossProduct(axes.yAxis()).isEqualTo(axes.zAxis()));
     EXPECT_TRUE(axes.isUniScaledOrtho());
     EXPECT_NEAR(axes.det(), 1.0, 1e-14);
 }
-INSTANTIATE_TEST_SUITE_P(Rows, ArbitraryAxes, testing::ValuesIn(kAxes),
-                         [](const auto& row) { return row.param.name; });
+INSTANTIATE_TEST_SUITE_P(Rows, ArbitraryAxes, testing::ValuesIn(kAxes), [](auto const& row) {
+    return row.param.name;
+});
 
 }  // namespace

@@ -17,8 +17,12 @@ public:
     // From the first point towards the second.
     TZ_API TzGeLine3d(TzGePoint3d const& first, TzGePoint3d const& second);
 
-    TzGeLine3d& set(TzGePoint3d const& point, TzGeVector3d const& along) { return *this = TzGeLine3d(point, along); }
-    TzGeLine3d& set(TzGePoint3d const& first, TzGePoint3d const& second) { return *this = TzGeLine3d(first, second); }
+    TzGeLine3d& set(TzGePoint3d const& point, TzGeVector3d const& along) {
+        return *this = TzGeLine3d(point, along);
+    }
+    TzGeLine3d& set(TzGePoint3d const& first, TzGePoint3d const& second) {
+        return *this = TzGeLine3d(first, second);
+    }
 
     [[nodiscard]] TzGePoint3d pointOnLine() const { return point_; }
     // Of length 1, or exactly zero.
@@ -26,18 +30,25 @@ public:
 
     [[nodiscard]] TzGePoint3d evalPoint(double param) const { return point_ + direction_ * param; }
     // The parameter of the point's foot on the line.
-    [[nodiscard]] double paramOf(TzGePoint3d const& point) const { return direction_.dotProduct(point - point_); }
+    [[nodiscard]] double paramOf(TzGePoint3d const& point) const {
+        return direction_.dotProduct(point - point_);
+    }
     // The point's foot on the line; the point itself when it lies on the line within the tolerance.
-    [[nodiscard]] TZ_API TzGePoint3d getClosestPointTo(TzGePoint3d const& point,
-                                                       TzGeTol const& tol = TzGeContext::gTol) const;
-    [[nodiscard]] double distanceTo(TzGePoint3d const& point) const { return point.distanceTo(evalPoint(paramOf(point))); }
-    [[nodiscard]] bool isOn(TzGePoint3d const& point, TzGeTol const& tol = TzGeContext::gTol) const {
+    [[nodiscard]] TZ_API TzGePoint3d
+    getClosestPointTo(TzGePoint3d const& point, TzGeTol const& tol = TzGeContext::gTol) const;
+    [[nodiscard]] double distanceTo(TzGePoint3d const& point) const {
+        return point.distanceTo(evalPoint(paramOf(point)));
+    }
+    [[nodiscard]] bool isOn(TzGePoint3d const& point,
+                            TzGeTol const& tol = TzGeContext::gTol) const {
         return distanceTo(point) <= tol.equalPoint();
     }
     // Where two lines cross. False, and `out` unchanged, for parallel lines, zero ones, and lines
-    // that pass each other at more than the point tolerance (to which the rounding of coordinates as
-    // large as these is added).
-    TZ_API bool intersectWith(TzGeLine3d const& other, TzGePoint3d& out, TzGeTol const& tol = TzGeContext::gTol) const;
+    // that pass each other at more than the point tolerance (to which the rounding of coordinates
+    // as large as these is added).
+    TZ_API bool intersectWith(TzGeLine3d const& other,
+                              TzGePoint3d& out,
+                              TzGeTol const& tol = TzGeContext::gTol) const;
     TZ_API TzGeLine3d& transformBy(TzGeMatrix3d const& matrix);
 
 private:

@@ -11,9 +11,12 @@ public:
     // From the world's origin to 1,0,0.
     TzGeLineSeg3d() = default;
     TzGeLineSeg3d(TzGePoint3d const& start, TzGePoint3d const& end) : start_(start), end_(end) {}
-    TzGeLineSeg3d(TzGePoint3d const& start, TzGeVector3d const& along) : start_(start), end_(start + along) {}
+    TzGeLineSeg3d(TzGePoint3d const& start, TzGeVector3d const& along)
+        : start_(start), end_(start + along) {}
 
-    TzGeLineSeg3d& set(TzGePoint3d const& start, TzGePoint3d const& end) { return *this = TzGeLineSeg3d(start, end); }
+    TzGeLineSeg3d& set(TzGePoint3d const& start, TzGePoint3d const& end) {
+        return *this = TzGeLineSeg3d(start, end);
+    }
 
     [[nodiscard]] TzGePoint3d startPoint() const { return start_; }
     [[nodiscard]] TzGePoint3d endPoint() const { return end_; }

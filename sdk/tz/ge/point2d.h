@@ -22,7 +22,10 @@ public:
     [[nodiscard]] constexpr TzGeVector2d asVector() const { return {x, y}; }
     [[nodiscard]] double distanceTo(TzGePoint2d const& p) const { return (p - *this).length(); }
     // The points are no farther apart than the tolerance; `==` takes the global one.
-    [[nodiscard]] bool isEqualTo(TzGePoint2d const& p, TzGeTol const& tol = TzGeContext::gTol) const { return distanceTo(p) <= tol.equalPoint(); }
+    [[nodiscard]] bool isEqualTo(TzGePoint2d const& p,
+                                 TzGeTol const& tol = TzGeContext::gTol) const {
+        return distanceTo(p) <= tol.equalPoint();
+    }
     bool operator==(TzGePoint2d const& p) const { return isEqualTo(p); }
     bool operator!=(TzGePoint2d const& p) const { return !isEqualTo(p); }
 

@@ -26,11 +26,15 @@ public:
     TzGeVector2d& operator/=(double divisor) { return *this = *this / divisor; }
 
     [[nodiscard]] TZ_API double length() const;
-    [[nodiscard]] bool isZeroLength(TzGeTol const& tol = TzGeContext::gTol) const { return length() <= tol.equalVector(); }
+    [[nodiscard]] bool isZeroLength(TzGeTol const& tol = TzGeContext::gTol) const {
+        return length() <= tol.equalVector();
+    }
     // This direction at length 1; a zero vector comes back as it is.
     [[nodiscard]] TZ_API TzGeVector2d normal(TzGeTol const& tol = TzGeContext::gTol) const;
     TzGeVector2d& normalize(TzGeTol const& tol = TzGeContext::gTol) { return *this = normal(tol); }
-    [[nodiscard]] constexpr double dotProduct(TzGeVector2d const& v) const { return x * v.x + y * v.y; }
+    [[nodiscard]] constexpr double dotProduct(TzGeVector2d const& v) const {
+        return x * v.x + y * v.y;
+    }
     // This vector turned a quarter anticlockwise.
     [[nodiscard]] constexpr TzGeVector2d perpVector() const { return {-y, x}; }
     // The angle from the X axis, in radians, 0 up to but not including two pi; 0 for a zero vector.
@@ -38,7 +42,8 @@ public:
     // Turns this vector anticlockwise by an angle in radians.
     TZ_API TzGeVector2d& rotateBy(double angle);
     // The vectors' difference is no longer than the tolerance; `==` takes the global one.
-    [[nodiscard]] TZ_API bool isEqualTo(TzGeVector2d const& v, TzGeTol const& tol = TzGeContext::gTol) const;
+    [[nodiscard]] TZ_API bool isEqualTo(TzGeVector2d const& v,
+                                        TzGeTol const& tol = TzGeContext::gTol) const;
     bool operator==(TzGeVector2d const& v) const { return isEqualTo(v); }
     bool operator!=(TzGeVector2d const& v) const { return !isEqualTo(v); }
 
@@ -50,4 +55,6 @@ inline constexpr TzGeVector2d TzGeVector2d::kIdentity{};
 inline constexpr TzGeVector2d TzGeVector2d::kXAxis{1.0, 0.0};
 inline constexpr TzGeVector2d TzGeVector2d::kYAxis{0.0, 1.0};
 
-[[nodiscard]] constexpr TzGeVector2d operator*(double factor, TzGeVector2d const& v) { return v * factor; }
+[[nodiscard]] constexpr TzGeVector2d operator*(double factor, TzGeVector2d const& v) {
+    return v * factor;
+}
