@@ -160,7 +160,8 @@ function(tz_proof_target target)
     target_include_directories(${target} PRIVATE ${TZ_ALL_ROOTS})
     tz_link_closure(libs ${ARGN})
     target_link_libraries(${target} PUBLIC ${libs} $<TARGET_NAME_IF_EXISTS:tz>
-        tz_library_json tz_library_ini)
+        tz_library_json tz_library_ini tz_library_fontconfig tz_library_pango tz_library_cairo
+        tz_library_cli tz_library_editline)
     get_target_property(type ${target} TYPE)
     if(type STREQUAL "EXECUTABLE")
         set_target_properties(${target} PROPERTIES RUNTIME_OUTPUT_DIRECTORY
@@ -195,9 +196,22 @@ endfunction()
 function(tz_test_environment test name)
     set(scratch ${CMAKE_BINARY_DIR}/tests/scratch/${name})
     file(MAKE_DIRECTORY ${scratch}/config)
+    set(environment
+        LC_ALL=C.UTF-8
+        TZ=UTC
+        FONTCONFIG_FILE=${TZ_TEST_FONTS_CONF}
+        XDG_CONFIG_HOME=${scratch}/config
+        TZ_TEST_LIB=${CMAKE_BINARY_DIR}/lib
+        TZ_TEST_BIN=${CMAKE_BINARY_DIR}/bin
+        TZ_TEST_SOURCE=${PROJECT_SOURCE_DIR}
+        TZ_TEST_SCRATCH=${scratch})
+    if(TZ_SANITIZE)
+        list(APPEND environment
+            LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/leaks.supp:print_suppressions=0
+            UBSAN_OPTIONS=print_stacktrace=1)
+    endif()
     set_tests_properties(${test} PROPERTIES TIMEOUT 900 WORKING_DIRECTORY ${scratch}
-        ENVIRONMENT "LC_ALL=C.UTF-8;TZ=UTC;FONTCONFIG_FILE=${TZ_TEST_FONTS_CONF};XDG_CONFIG_HOME=${scratch}/config;TZ_TEST_LIB=${CMAKE_BINARY_DIR}/lib;TZ_TEST_BIN=${CMAKE_BINARY_DIR}/bin;TZ_TEST_SOURCE=${PROJECT_SOURCE_DIR};TZ_TEST_SCRATCH=${scratch}"
-        ENVIRONMENT_MODIFICATION "VISUAL=unset:;EDITOR=unset:")
+        ENVIRONMENT "${environment}" ENVIRONMENT_MODIFICATION "VISUAL=unset:;EDITOR=unset:")
 endfunction()
 
 function(add_fuzz name source)

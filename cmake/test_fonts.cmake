@@ -1,7 +1,8 @@
 # Tests see these faces and no others, so that widths and charsets are the same on every machine:
-# - DejaVu: wide coverage (Latin, Greek, Cyrillic, Hebrew, Arabic), several weights and widths;
-# - Liberation: a second family of other widths with true bold and italic cuts, no Hebrew or Arabic in some;
-# - Droid Sans Fallback: one small file with the Chinese, Japanese and Korean characters.
+# - DejaVu: wide coverage (Latin, Greek, Cyrillic and more), serif, mono and a bold;
+# - Liberation Sans: a second Latin family of other widths, with true bold and italic cuts;
+# - Droid Sans Fallback: one small file with the Chinese, Japanese and Korean characters;
+# - Noto Sans Hebrew, Arabic, Thai and Armenian: faces that hold one script and no Latin letters.
 # The files are linked into a folder of the build tree, which a fontconfig file of its own names.
 set(TZ_TEST_FONTS
     dejavu/DejaVuSans.ttf
@@ -12,7 +13,11 @@ set(TZ_TEST_FONTS
     liberation/LiberationSans-Bold.ttf
     liberation/LiberationSans-Italic.ttf
     liberation/LiberationSans-BoldItalic.ttf
-    droid/DroidSansFallbackFull.ttf)
+    droid/DroidSansFallbackFull.ttf
+    noto/NotoSansArabic-Regular.ttf
+    noto/NotoSansArmenian-Regular.ttf
+    noto/NotoSansHebrew-Regular.ttf
+    noto/NotoSansThai-Regular.ttf)
 set(TZ_TEST_FONTS_CONF ${CMAKE_BINARY_DIR}/tests/fonts/fonts.conf)
 file(MAKE_DIRECTORY ${CMAKE_BINARY_DIR}/tests/fonts/files)
 foreach(font IN LISTS TZ_TEST_FONTS)

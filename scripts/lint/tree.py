@@ -6,11 +6,22 @@ import subprocess
 ROOT = os.path.dirname(os.path.dirname(os.path.dirname(os.path.abspath(__file__))))
 
 
+def everything():
+    """Names of all files but build products; a tree without git (an archive) is walked."""
+    command = ["git", "-C", ROOT, "ls-files", "-z", "--cached", "--others", "--exclude-standard"]
+    if os.path.exists(os.path.join(ROOT, ".git")):
+        return subprocess.run(command, check=True, capture_output=True, text=True).stdout.split("\0")
+    names = []
+    for folder, folders, files in os.walk(ROOT):
+        folders[:] = [name for name in folders if os.path.join(folder, name) != ROOT + "/build"]
+        names += [os.path.relpath(os.path.join(folder, name), ROOT) for name in files]
+    return names
+
+
 def tracked(*suffixes):
     """Tracked and newly added files, relative to the root, with one of the suffixes (all without)."""
-    command = ["git", "-C", ROOT, "ls-files", "-z", "--cached", "--others", "--exclude-standard"]
-    names = subprocess.run(command, check=True, capture_output=True, text=True).stdout.split("\0")
-    return sorted(name for name in set(names) if name and os.path.isfile(os.path.join(ROOT, name))
+    return sorted(name for name in set(everything()) if name
+                  and os.path.isfile(os.path.join(ROOT, name))
                   and (not suffixes or name.endswith(suffixes)))
 
 
