@@ -20,12 +20,12 @@ public:
     [[nodiscard]] virtual bool isDerivedFrom(TzRxClass const* other) const = 0;
     // [any] A fresh object of the class, owned by the caller; null for a class without a creator.
     [[nodiscard]] virtual TzRxObject* create() const = 0;
-    // [any] Puts an extension object of the interface class `interface` on this class, or takes it
+    // [any] Puts an extension object of the interface class `face` on this class, or takes it
     // back. The registry does not own the extension. Returns the extension that stood there before.
-    virtual TzRxObject* addX(TzRxClass const* interface, TzRxObject* extension) = 0;
-    virtual TzRxObject* delX(TzRxClass const* interface) = 0;
+    virtual TzRxObject* addX(TzRxClass const* face, TzRxObject* extension) = 0;
+    virtual TzRxObject* delX(TzRxClass const* face) = 0;
     // [any] The extension on this very class, or null.
-    [[nodiscard]] virtual TzRxObject* getX(TzRxClass const* interface) const = 0;
+    [[nodiscard]] virtual TzRxObject* getX(TzRxClass const* face) const = 0;
 };
 
 using TzRxCreator = TzRxObject* (*)();

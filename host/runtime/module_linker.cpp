@@ -1,0 +1,135 @@
+#include "host/runtime/module_linker.h"
+
+#include <dlfcn.h>
+
+#include <algorithm>
+#include <utility>
+
+#include "host/base/fault_point.h"
+#include "host/runtime/class_registry.h"
+#include "host/runtime/documents.h"
+
+namespace tzhost {
+namespace {
+
+// Sets a value for the length of a block.
+template <class T>
+class Restoring {
+public:
+    Restoring(T& place, T value) : place_(place), before_(std::exchange(place, value)) {}
+    Restoring(Restoring const&) = delete;
+    Restoring& operator=(Restoring const&) = delete;
+    ~Restoring() { place_ = before_; }
+
+private:
+    T& place_;
+    T before_;
+};
+
+std::string loaderError() {
+    char const* const text = dlerror();
+    return text ? text : "the dynamic loader gives no reason";
+}
+
+}  // namespace
+
+LoadedModule* DynamicLinker::byHandle(void* handle) const {
+    auto const at = std::find_if(modules_.begin(), modules_.end(),
+                                 [&](auto const& module) { return module.get() == handle; });
+    return at == modules_.end() ? nullptr : at->get();
+}
+
+bool DynamicLinker::allowUnload(void* appHandle) {
+    LoadedModule* const module = byHandle(appHandle);
+    if (module) module->mayUnload = true;
+    return module != nullptr;
+}
+
+bool DynamicLinker::declareMultiDocument(void* appHandle) {
+    LoadedModule* const module = byHandle(appHandle);
+    if (module) module->servesDocuments = true;
+    return module != nullptr;
+}
+
+int DynamicLinker::deliver(LoadedModule const& module, TzRx::AppMsgCode message, void* argument) const {
+    Restoring<LoadedModule const*> const active(active_, &module);
+    return module.entry(message, argument);
+}
+
+int DynamicLinker::send(LoadedModule const& module, TzRx::AppMsgCode message) const {
+    return deliver(module, message, nullptr);
+}
+
+bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) {
+    auto const sameFile = [&](auto const& module) { return module->file.filename() == file.filename(); };
+    if (std::any_of(modules_.begin(), modules_.end(), sameFile)) {
+        error = file.string() + ": this module is loaded already";
+        return false;
+    }
+    auto module = std::make_unique<LoadedModule>();
+    module->file = file;
+    module->library = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
+    if (!module->library) {
+        error = file.string() + ": the module cannot be loaded: " + loaderError();
+        return false;
+    }
+    module->entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module->library, "tzrxEntryPoint"));
+    if (!module->entry) {
+        error = file.string() + ": this is no module of the host: it has no tzrxEntryPoint";
+        dlclose(module->library);
+        return false;
+    }
+    modules_.push_back(std::move(module));
+    LoadedModule& loaded = *modules_.back();
+    int const status = deliver(loaded, TzRx::kInitAppMsg, &loaded);
+    if (status != TzRx::kRetOK) {
+        error = file.string() + ": the module refused to start (status " + std::to_string(status) + ")";
+        (void)deliver(loaded, TzRx::kUnloadAppMsg, nullptr);  // safe whatever load reached
+        dlclose(loaded.library);
+        modules_.pop_back();
+        return false;
+    }
+    if (documents().curDocument()) (void)send(loaded, TzRx::kLoadDwgMsg);  // the module stays either way
+    return true;
+}
+
+bool DynamicLinker::unload(std::filesystem::path const& file, std::string& error) {
+    auto const at = std::find_if(modules_.begin(), modules_.end(), [&](auto const& module) {
+        return module->file.filename() == file.filename();
+    });
+    if (at == modules_.end()) {
+        error = file.string() + ": no module of that name is loaded";
+        return false;
+    }
+    LoadedModule const& module = **at;
+    if (!module.mayUnload) {
+        error = file.string() + ": this module does not allow to be unloaded";
+        return false;
+    }
+    if (documents().curDocument()) (void)send(module, TzRx::kUnloadDwgMsg);
+    (void)send(module, TzRx::kUnloadAppMsg);
+    documents().forgetModule(module);
+    dlclose(module.library);
+    modules_.erase(at);
+    return true;
+}
+
+void DynamicLinker::unloadAll() {
+    for (std::size_t left = modules_.size(); left > 0; --left) {
+        std::string ignored;
+        (void)unload(modules_[left - 1]->file, ignored);
+    }
+}
+
+void DynamicLinker::broadcast(TzRx::AppMsgCode message) {
+    for (auto const& module : modules_) (void)send(*module, message);
+}
+
+}  // namespace tzhost
+
+TzRxClass* TzRxDynamicLinker::desc() {
+    static TzRxClass* const descriptor =
+        tzhost::hostClass(L"TzRxDynamicLinker", TzRxObject::desc());
+    return descriptor;
+}
+TzRxClass* TzRxDynamicLinker::isA() const { return desc(); }

@@ -1,0 +1,56 @@
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "tz/rx/app.h"
+#include "tz/rx/registry.h"
+#include "tz/text/string.h"
+
+namespace tzhost {
+
+// A loaded module. Its address is the handle that the module gets with message 1.
+struct LoadedModule {
+    std::filesystem::path file;
+    void* library = nullptr;  // of the dynamic loader
+    TzRxEntryPoint entry = nullptr;
+    bool mayUnload = false;
+    bool servesDocuments = false;
+};
+
+// Loads modules, sends them their messages, and unloads them.
+class DynamicLinker : public TzRxDynamicLinker {
+public:
+    bool allowUnload(void* appHandle) override;
+    bool declareMultiDocument(void* appHandle) override;
+
+    // Loads a module: message 1, then message 3 for the drawing that is open. On failure nothing of it
+    // stays and `error` says in one line why.
+    bool load(std::filesystem::path const& file, std::string& error);
+    // Unloads a module by its file name: message 4 for the open drawing, message 2, and its file leaves
+    // the process. On failure `error` says why and the module stays.
+    bool unload(std::filesystem::path const& file, std::string& error);
+    // Unloads all, newest first; a module that may not be unloaded stays.
+    void unloadAll();
+    // Message 3 or 4 for every module, when a drawing comes or goes.
+    void broadcast(TzRx::AppMsgCode message);
+    // Sends one message to the module that defined a function.
+    [[nodiscard]] int send(LoadedModule const& module, TzRx::AppMsgCode message) const;
+
+    [[nodiscard]] std::vector<std::unique_ptr<LoadedModule>> const& modules() const { return modules_; }
+    // The module whose message is being handled; null outside messages.
+    [[nodiscard]] LoadedModule const* active() const { return active_; }
+
+private:
+    [[nodiscard]] LoadedModule* byHandle(void* handle) const;
+    int deliver(LoadedModule const& module, TzRx::AppMsgCode message, void* argument) const;
+
+    std::vector<std::unique_ptr<LoadedModule>> modules_;
+    mutable LoadedModule const* active_ = nullptr;
+};
+
+[[nodiscard]] DynamicLinker& dynamicLinker();
+
+}  // namespace tzhost
