@@ -78,7 +78,12 @@ ClassDescriptor* insertClass(wchar_t const* name, wchar_t const* parent, TzRxCre
 
 void reportClass(wchar_t const* name, bool on) {
     if (!eventsWanted()) return;
-    reportEvent({{"event", "register"}, {"what", "class"}, {"name", utf8(name)}, {"on", on}});
+    reportEvent({
+        {"event", "register"},
+        {"what",  "class"   },
+        {"name",  utf8(name)},
+        {"on",    on        }
+    });
 }
 
 }  // namespace
@@ -90,12 +95,18 @@ TzRxClass* hostClass(wchar_t const* name, TzRxClass* parent, TzRxCreator creator
     return made;
 }
 
-int classCount() { return static_cast<int>(classes().size()); }
+int classCount() {
+    return static_cast<int>(classes().size());
+}
 
 }  // namespace tzhost
 
-TzRxClass* newTzRxClass(wchar_t const* name, wchar_t const* parent, int /*proxyFlags*/, TzRxCreator creator,
-                        wchar_t const* /*dxfName*/, wchar_t const* /*appName*/) {
+TzRxClass* newTzRxClass(wchar_t const* name,
+                        wchar_t const* parent,
+                        int /*proxyFlags*/,
+                        TzRxCreator creator,
+                        wchar_t const* /*dxfName*/,
+                        wchar_t const* /*appName*/) {
     if (tzhost::faultAt("newTzRxClass")) return nullptr;
     TzRxClass* const made = tzhost::insertClass(name, parent, creator);
     if (made) tzhost::reportClass(made->name(), true);
@@ -131,9 +142,13 @@ TzRxClass* TzRxObject::desc() {
     return descriptor;
 }
 
-TzRxClass* TzRxObject::isA() const { return desc(); }
+TzRxClass* TzRxObject::isA() const {
+    return desc();
+}
 
-bool TzRxObject::isKindOf(TzRxClass const* other) const { return isA() && isA()->isDerivedFrom(other); }
+bool TzRxObject::isKindOf(TzRxClass const* other) const {
+    return isA() && isA()->isDerivedFrom(other);
+}
 
 TzRxObject* TzRxObject::queryX(TzRxClass const* other) const {
     for (TzRxClass const* each = isA(); each; each = each->myParent()) {

@@ -2,8 +2,8 @@
 
 #include "tz/rx/class.h"
 
-// The registry of runtime classes. Classes of the host are made on their first use and stay; the root
-// is there from the start.
+// The registry of runtime classes. Classes of the host are made on their first use and stay; the
+// root is there from the start.
 namespace tzhost {
 
 // The descriptor of a class of the host, made on the first call and connected with its parent.
@@ -12,7 +12,8 @@ namespace tzhost {
 //       static TzRxClass* const descriptor = tzhost::hostClass(L"TzDbLine", TzDbEntity::desc());
 //       return descriptor;
 //   }
-[[nodiscard]] TzRxClass* hostClass(wchar_t const* name, TzRxClass* parent, TzRxCreator creator = nullptr);
+[[nodiscard]] TzRxClass*
+hostClass(wchar_t const* name, TzRxClass* parent, TzRxCreator creator = nullptr);
 
 // How many classes are registered, the host's included.
 [[nodiscard]] int classCount();

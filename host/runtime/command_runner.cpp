@@ -23,24 +23,31 @@ Audit& worst() {
 
 void reportPhase(Command const& command, char const* phase) {
     if (!eventsWanted()) return;
-    reportEvent({{"event", "command"}, {"name", utf8(command.globalName)}, {"phase", phase}});
+    reportEvent({
+        {"event", "command"               },
+        {"name",  utf8(command.globalName)},
+        {"phase", phase                   }
+    });
 }
 
 void reportAudit(Audit const& left) {
     if (!eventsWanted()) return;
-    reportEvent({{"event", "audit"},
-                 {"openObjects", left.openObjects},
-                 {"selectionSets", left.selectionSets},
-                 {"filters", left.filters},
-                 {"gestureHandlers", left.gestureHandlers},
-                 {"highlighted", left.highlighted},
-                 {"ucsStack", left.ucsStack},
-                 {"keywordCallback", left.keywordCallback}});
+    reportEvent({
+        {"event",           "audit"             },
+        {"openObjects",     left.openObjects    },
+        {"selectionSets",   left.selectionSets  },
+        {"filters",         left.filters        },
+        {"gestureHandlers", left.gestureHandlers},
+        {"highlighted",     left.highlighted    },
+        {"ucsStack",        left.ucsStack       },
+        {"keywordCallback", left.keywordCallback}
+    });
 }
 
 void setActive(int bits) {
     // The host may write it and the value is within the limits, so there is nothing to answer for.
-    (void)Variables::instance().set(L"CMDACTIVE", VariableValue(static_cast<short>(bits)), Writer::host);
+    (void)Variables::instance().set(L"CMDACTIVE", VariableValue(static_cast<short>(bits)),
+                                    Writer::host);
 }
 
 // One run of a command, ended on every way out.
@@ -71,8 +78,12 @@ private:
 
 }  // namespace
 
-void addCommandHooks(CommandHooks added) { hooks().push_back(std::move(added)); }
-void clearCommandHooks() { hooks().clear(); }
+void addCommandHooks(CommandHooks added) {
+    hooks().push_back(std::move(added));
+}
+void clearCommandHooks() {
+    hooks().clear();
+}
 
 Audit runCommand(Command const& command, AnswersFrom answers) {
     {
@@ -82,7 +93,11 @@ Audit runCommand(Command const& command, AnswersFrom answers) {
     return audit();
 }
 
-Audit const& worstAudit() { return worst(); }
-void resetWorstAudit() { worst() = Audit(); }
+Audit const& worstAudit() {
+    return worst();
+}
+void resetWorstAudit() {
+    worst() = Audit();
+}
 
 }  // namespace tzhost

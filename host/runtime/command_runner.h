@@ -10,8 +10,8 @@ namespace tzhost {
 
 struct Command;
 
-// What other layers do around each command, such as marking the undo log. `begin` runs in the order of
-// registration, `end` the other way round, also when the command passes an exception.
+// What other layers do around each command, such as marking the undo log. `begin` runs in the order
+// of registration, `end` the other way round, also when the command passes an exception.
 struct CommandHooks {
     std::function<void(Command const&)> begin;
     std::function<void(Command const&)> end;
@@ -21,8 +21,8 @@ void clearCommandHooks();
 
 enum class AnswersFrom { user, script };
 
-// Runs a command: CMDACTIVE, the hooks, the events, and the audit behind it. Returns what the command
-// left over; an exception of the command passes on after all of that.
+// Runs a command: CMDACTIVE, the hooks, the events, and the audit behind it. Returns what the
+// command left over; an exception of the command passes on after all of that.
 Audit runCommand(Command const& command, AnswersFrom answers);
 
 // The audit after the last command that left something over; clean when none did.

@@ -21,21 +21,30 @@ std::map<TzString, HelpTopic, NoCaseLess>& helpTopics() {
 
 void reportCommand(Command const& command, bool on) {
     if (!eventsWanted()) return;
-    reportEvent({{"event", "register"},
-                 {"what", "command"},
-                 {"name", utf8(command.globalName)},
-                 {"on", on},
-                 {"local", utf8(command.localName)},
-                 {"group", utf8(command.group)},
-                 {"flags", command.flags}});
+    reportEvent({
+        {"event", "register"              },
+        {"what",  "command"               },
+        {"name",  utf8(command.globalName)},
+        {"on",    on                      },
+        {"local", utf8(command.localName) },
+        {"group", utf8(command.group)     },
+        {"flags", command.flags           }
+    });
 }
 
 }  // namespace
 
-int CommandStack::addCommand(wchar_t const* group, wchar_t const* globalName, wchar_t const* localName, int flags,
-                             Callback callback, TzRxObject* /*reactor*/, int /*sequence*/,
-                             TzRxResourceInstance const& /*resources*/, void* /*data*/) {
-    if (auto const fault = faultAt("TzEdCommandStack::addCommand", Tzad::eInvalidInput)) return *fault;
+int CommandStack::addCommand(wchar_t const* group,
+                             wchar_t const* globalName,
+                             wchar_t const* localName,
+                             int flags,
+                             Callback callback,
+                             TzRxObject* /*reactor*/,
+                             int /*sequence*/,
+                             TzRxResourceInstance const& /*resources*/,
+                             void* /*data*/) {
+    if (auto const fault = faultAt("TzEdCommandStack::addCommand", Tzad::eInvalidInput))
+        return *fault;
     Command const command{group, globalName, localName, flags, callback};
     if (command.globalName.isEmpty() || !callback) return Tzad::eInvalidInput;
     auto const sameName = [&](Command const& other) {
@@ -70,12 +79,14 @@ Command const* CommandStack::find(TzString const& typed) const {
     }
     TzString const name = typed.mid(start);
     auto const firstWith = [&](TzString Command::*which) -> Command const* {
-        auto const at = std::find_if(commands_.begin(), commands_.end(), [&](Command const& command) {
-            return !(command.*which).isEmpty() && (command.*which).compareNoCase(name) == 0;
-        });
+        auto const at =
+            std::find_if(commands_.begin(), commands_.end(), [&](Command const& command) {
+                return !(command.*which).isEmpty() && (command.*which).compareNoCase(name) == 0;
+            });
         return at == commands_.end() ? nullptr : &*at;
     };
-    if (Command const* const local = globalOnly ? nullptr : firstWith(&Command::localName)) return local;
+    if (Command const* const local = globalOnly ? nullptr : firstWith(&Command::localName))
+        return local;
     return firstWith(&Command::globalName);
 }
 
@@ -86,23 +97,29 @@ HelpTopic const* findHelp(TzString const& name) {
 
 }  // namespace tzhost
 
-int tzedSetFunHelp(wchar_t const* name, wchar_t const* file, wchar_t const* topic, int /*command*/) {
+int tzedSetFunHelp(wchar_t const* name,
+                   wchar_t const* file,
+                   wchar_t const* topic,
+                   int /*command*/) {
     if (auto const fault = tzhost::faultAt("tzedSetFunHelp")) return *fault;
     if (!name || !*name) return Tzad::ePromptError;
     tzhost::helpTopics()[name] = {file, topic};
     if (tzhost::eventsWanted()) {
-        tzhost::reportEvent({{"event", "register"},
-                             {"what", "help"},
-                             {"name", tzhost::utf8(name)},
-                             {"on", true},
-                             {"topic", tzhost::utf8(topic)}});
+        tzhost::reportEvent({
+            {"event", "register"         },
+            {"what",  "help"             },
+            {"name",  tzhost::utf8(name) },
+            {"on",    true               },
+            {"topic", tzhost::utf8(topic)}
+        });
     }
     return Tzad::ePromptNormal;
 }
 
 TzRxClass* TzEdCommandStack::desc() {
-    static TzRxClass* const descriptor =
-        tzhost::hostClass(L"TzEdCommandStack", TzRxObject::desc());
+    static TzRxClass* const descriptor = tzhost::hostClass(L"TzEdCommandStack", TzRxObject::desc());
     return descriptor;
 }
-TzRxClass* TzEdCommandStack::isA() const { return desc(); }
+TzRxClass* TzEdCommandStack::isA() const {
+    return desc();
+}

@@ -30,14 +30,20 @@ struct HelpTopic {
 // All commands, in the order in which they came.
 class CommandStack : public TzEdCommandStack {
 public:
-    int addCommand(wchar_t const* group, wchar_t const* globalName, wchar_t const* localName, int flags,
-                   Callback callback, TzRxObject* reactor, int sequence,
-                   TzRxResourceInstance const& resources, void* data) override;
+    int addCommand(wchar_t const* group,
+                   wchar_t const* globalName,
+                   wchar_t const* localName,
+                   int flags,
+                   Callback callback,
+                   TzRxObject* reactor,
+                   int sequence,
+                   TzRxResourceInstance const& resources,
+                   void* data) override;
     int removeGroup(wchar_t const* group) override;
 
     // The command that a typed name means: a local name first, then a global one, without regard to
-    // case; "." and "_" ahead of the name are skipped, and "_" admits the global name alone. Null when
-    // there is none.
+    // case; "." and "_" ahead of the name are skipped, and "_" admits the global name alone. Null
+    // when there is none.
     [[nodiscard]] Command const* find(TzString const& typed) const;
     [[nodiscard]] std::deque<Command> const& commands() const { return commands_; }
 

@@ -38,7 +38,12 @@ public:
     TzRxObject* remove(wchar_t const* name) override {
         TzRxObject* const removed = Dictionary::remove(name);
         if (removed && eventsWanted()) {
-            reportEvent({{"event", "register"}, {"what", "service"}, {"name", utf8(name)}, {"on", false}});
+            reportEvent({
+                {"event", "register"},
+                {"what",  "service" },
+                {"name",  utf8(name)},
+                {"on",    false     }
+            });
         }
         return removed;
     }
@@ -67,11 +72,15 @@ CommandStack& commandStack() {
     return static_cast<CommandStack&>(*systemRegistry().at(L"TZAD_REGISTERED_COMMANDS"));
 }
 
-DynamicLinker& dynamicLinker() { return static_cast<DynamicLinker&>(*systemRegistry().at(L"DynamicLinker")); }
+DynamicLinker& dynamicLinker() {
+    return static_cast<DynamicLinker&>(*systemRegistry().at(L"DynamicLinker"));
+}
 
 }  // namespace tzhost
 
-TzRxDictionary* tzrxSysRegistry() { return &tzhost::systemRegistry(); }
+TzRxDictionary* tzrxSysRegistry() {
+    return &tzhost::systemRegistry();
+}
 
 TzRxObject* tzrxRegisterService(wchar_t const* name) {
     tzhost::Dictionary& services = tzhost::serviceDictionary();
@@ -79,15 +88,20 @@ TzRxObject* tzrxRegisterService(wchar_t const* name) {
     TzRxObject* const service = new tzhost::Service;
     services.atPut(name, service);
     if (tzhost::eventsWanted()) {
-        tzhost::reportEvent(
-            {{"event", "register"}, {"what", "service"}, {"name", tzhost::utf8(name)}, {"on", true}});
+        tzhost::reportEvent({
+            {"event", "register"        },
+            {"what",  "service"         },
+            {"name",  tzhost::utf8(name)},
+            {"on",    true              }
+        });
     }
     return service;
 }
 
 TzRxClass* TzRxDictionary::desc() {
-    static TzRxClass* const descriptor =
-        tzhost::hostClass(L"TzRxDictionary", TzRxObject::desc());
+    static TzRxClass* const descriptor = tzhost::hostClass(L"TzRxDictionary", TzRxObject::desc());
     return descriptor;
 }
-TzRxClass* TzRxDictionary::isA() const { return desc(); }
+TzRxClass* TzRxDictionary::isA() const {
+    return desc();
+}

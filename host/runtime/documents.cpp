@@ -12,7 +12,8 @@ namespace tzhost {
 
 bool GestureProcessor::addOverruleHandler(Handler* handler) {
     if (faultAt("GestureProcessor::addOverruleHandler")) return false;
-    if (!handler || std::find(handlers_.begin(), handlers_.end(), handler) != handlers_.end()) return false;
+    if (!handler || std::find(handlers_.begin(), handlers_.end(), handler) != handlers_.end())
+        return false;
     handlers_.push_back(handler);
     ++audit().gestureHandlers;
     return true;
@@ -25,12 +26,20 @@ bool GestureProcessor::removeOverruleHandler(Handler* handler) {
 }
 
 void Documents::redraw() {
-    if (eventsWanted()) reportEvent({{"event", "notify"}, {"name", "redraw"}});
+    if (eventsWanted())
+        reportEvent({
+            {"event", "notify"},
+            {"name",  "redraw"}
+        });
 }
 
-int Documents::sendStringToExecute(TzApDocument* document, wchar_t const* text, bool /*activate*/,
-                                   bool /*wrapUp*/, bool /*echo*/) {
-    if (auto const fault = faultAt("TzApDocManager::sendStringToExecute", Tzad::eNoDocument)) return *fault;
+int Documents::sendStringToExecute(TzApDocument* document,
+                                   wchar_t const* text,
+                                   bool /*activate*/,
+                                   bool /*wrapUp*/,
+                                   bool /*echo*/) {
+    if (auto const fault = faultAt("TzApDocManager::sendStringToExecute", Tzad::eNoDocument))
+        return *fault;
     if (!document || document != current_.get()) return Tzad::eNoDocument;
     current_->typed.emplace_back(text);
     return Tzad::eOk;
@@ -59,7 +68,9 @@ Documents& documents() {
 
 }  // namespace tzhost
 
-TzApDocManager* tzDocManagerPtr() { return &tzhost::documents(); }
+TzApDocManager* tzDocManagerPtr() {
+    return &tzhost::documents();
+}
 
 namespace Tzworks::Tzdraft::TzApGesture {
 DragGestureOverruleHandler::DragGestureOverruleHandler(TzApView* view) : view_(view) {}

@@ -54,7 +54,10 @@ public:
     [[nodiscard]] Document* curDocument() const override { return current_.get(); }
     [[nodiscard]] Document* current() const { return current_.get(); }
     void redraw() override;
-    int sendStringToExecute(TzApDocument* document, wchar_t const* text, bool activate, bool wrapUp,
+    int sendStringToExecute(TzApDocument* document,
+                            wchar_t const* text,
+                            bool activate,
+                            bool wrapUp,
                             bool echo) override;
 
     // Opens a document on a database, closing the one before; modules hear of both.

@@ -21,7 +21,9 @@ Call* currentCall = nullptr;
 
 class CallScope {
 public:
-    CallScope(int code, resbuf* arguments) : call_{code, arguments, currentCall} { currentCall = &call_; }
+    CallScope(int code, resbuf* arguments) : call_{code, arguments, currentCall} {
+        currentCall = &call_;
+    }
     CallScope(CallScope const&) = delete;
     CallScope& operator=(CallScope const&) = delete;
     ~CallScope() { currentCall = call_.outer; }
@@ -32,8 +34,13 @@ private:
 
 void reportFunction(TzString const& name, int code, bool on) {
     if (!eventsWanted()) return;
-    reportEvent(
-        {{"event", "register"}, {"what", "function"}, {"name", utf8(name)}, {"on", on}, {"code", code}});
+    reportEvent({
+        {"event", "register"},
+        {"what",  "function"},
+        {"name",  utf8(name)},
+        {"on",    on        },
+        {"code",  code      }
+    });
 }
 
 }  // namespace
@@ -55,9 +62,10 @@ void FunctionTable::forgetModule(LoadedModule const& module) {
 }
 
 DefinedFunction const* FunctionTable::find(TzString const& name) const {
-    auto const at = std::find_if(functions_.begin(), functions_.end(), [&](DefinedFunction const& each) {
-        return each.name.compareNoCase(name) == 0;
-    });
+    auto const at =
+        std::find_if(functions_.begin(), functions_.end(), [&](DefinedFunction const& each) {
+            return each.name.compareNoCase(name) == 0;
+        });
     return at == functions_.end() ? nullptr : &*at;
 }
 

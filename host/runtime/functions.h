@@ -30,8 +30,8 @@ private:
     std::vector<DefinedFunction> functions_;
 };
 
-// Calls a function of the current drawing: message 5 to its module, with the arguments, which stay the
-// caller's. The module's answer, or -1 when there is no such function.
+// Calls a function of the current drawing: message 5 to its module, with the arguments, which stay
+// the caller's. The module's answer, or -1 when there is no such function.
 [[nodiscard]] int callFunction(TzString const& name, resbuf* arguments);
 
 }  // namespace tzhost

@@ -51,7 +51,9 @@ bool DynamicLinker::declareMultiDocument(void* appHandle) {
     return module != nullptr;
 }
 
-int DynamicLinker::deliver(LoadedModule const& module, TzRx::AppMsgCode message, void* argument) const {
+int DynamicLinker::deliver(LoadedModule const& module,
+                           TzRx::AppMsgCode message,
+                           void* argument) const {
     Restoring<LoadedModule const*> const active(active_, &module);
     return module.entry(message, argument);
 }
@@ -61,7 +63,9 @@ int DynamicLinker::send(LoadedModule const& module, TzRx::AppMsgCode message) co
 }
 
 bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) {
-    auto const sameFile = [&](auto const& module) { return module->file.filename() == file.filename(); };
+    auto const sameFile = [&](auto const& module) {
+        return module->file.filename() == file.filename();
+    };
     if (std::any_of(modules_.begin(), modules_.end(), sameFile)) {
         error = file.string() + ": this module is loaded already";
         return false;
@@ -83,13 +87,15 @@ bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) 
     LoadedModule& loaded = *modules_.back();
     int const status = deliver(loaded, TzRx::kInitAppMsg, &loaded);
     if (status != TzRx::kRetOK) {
-        error = file.string() + ": the module refused to start (status " + std::to_string(status) + ")";
+        error =
+            file.string() + ": the module refused to start (status " + std::to_string(status) + ")";
         (void)deliver(loaded, TzRx::kUnloadAppMsg, nullptr);  // safe whatever load reached
         dlclose(loaded.library);
         modules_.pop_back();
         return false;
     }
-    if (documents().curDocument()) (void)send(loaded, TzRx::kLoadDwgMsg);  // the module stays either way
+    if (documents().curDocument())
+        (void)send(loaded, TzRx::kLoadDwgMsg);  // the module stays either way
     return true;
 }
 
@@ -122,7 +128,8 @@ void DynamicLinker::unloadAll() {
 }
 
 void DynamicLinker::broadcast(TzRx::AppMsgCode message) {
-    for (auto const& module : modules_) (void)send(*module, message);
+    for (auto const& module : modules_)
+        (void)send(*module, message);
 }
 
 }  // namespace tzhost
@@ -132,4 +139,6 @@ TzRxClass* TzRxDynamicLinker::desc() {
         tzhost::hostClass(L"TzRxDynamicLinker", TzRxObject::desc());
     return descriptor;
 }
-TzRxClass* TzRxDynamicLinker::isA() const { return desc(); }
+TzRxClass* TzRxDynamicLinker::isA() const {
+    return desc();
+}

@@ -26,11 +26,11 @@ public:
     bool allowUnload(void* appHandle) override;
     bool declareMultiDocument(void* appHandle) override;
 
-    // Loads a module: message 1, then message 3 for the drawing that is open. On failure nothing of it
-    // stays and `error` says in one line why.
+    // Loads a module: message 1, then message 3 for the drawing that is open. On failure nothing of
+    // it stays and `error` says in one line why.
     bool load(std::filesystem::path const& file, std::string& error);
-    // Unloads a module by its file name: message 4 for the open drawing, message 2, and its file leaves
-    // the process. On failure `error` says why and the module stays.
+    // Unloads a module by its file name: message 4 for the open drawing, message 2, and its file
+    // leaves the process. On failure `error` says why and the module stays.
     bool unload(std::filesystem::path const& file, std::string& error);
     // Unloads all, newest first; a module that may not be unloaded stays.
     void unloadAll();
@@ -39,7 +39,9 @@ public:
     // Sends one message to the module that defined a function.
     [[nodiscard]] int send(LoadedModule const& module, TzRx::AppMsgCode message) const;
 
-    [[nodiscard]] std::vector<std::unique_ptr<LoadedModule>> const& modules() const { return modules_; }
+    [[nodiscard]] std::vector<std::unique_ptr<LoadedModule>> const& modules() const {
+        return modules_;
+    }
     // The module whose message is being handled; null outside messages.
     [[nodiscard]] LoadedModule const* active() const { return active_; }
 

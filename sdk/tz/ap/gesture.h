@@ -2,8 +2,8 @@
 
 #include "tz/export.h"
 
-// What gestures with the pointer do in a view. A command that drags installs a handler of its own for
-// the length of the prompt.
+// What gestures with the pointer do in a view. A command that drags installs a handler of its own
+// for the length of the prompt.
 namespace Tzworks::Tzdraft {
 
 class TzApView;
@@ -30,8 +30,8 @@ private:
 class TZ_API GestureProcessor {
 public:
     virtual ~GestureProcessor() = default;
-    // [command] Installs or removes a handler; the processor does not own it. False for a handler that
-    // is there already, or not.
+    // [command] Installs or removes a handler; the processor does not own it. False for a handler
+    // that is there already, or not.
     virtual bool addOverruleHandler(GestureOverruleHandler* handler) = 0;
     virtual bool removeOverruleHandler(GestureOverruleHandler* handler) = 0;
 };

@@ -31,8 +31,8 @@ class TZ_API TzApHostDialogImp {
 public:
     // The module that the dialog belongs to, by its file name.
     explicit TzApHostDialogImp(wchar_t const* module) : module_(module) {}
-    // [command] Runs the dialog for the parameters' class and stores the result in them; a class that
-    // no dialog serves gives 3.
+    // [command] Runs the dialog for the parameters' class and stores the result in them; a class
+    // that no dialog serves gives 3.
     void run(TzApHostDialogParams& params);
     [[nodiscard]] TzString const& module() const { return module_; }
 

@@ -12,8 +12,10 @@ public:
     virtual ~TzDbDatabase() = default;
 
     // [any] The tables, opened; on failure the pointer is null.
-    [[nodiscard]] virtual Tzad::ErrorStatus getBlockTable(TzDbBlockTable*& table, TzDb::OpenMode mode) = 0;
-    [[nodiscard]] virtual Tzad::ErrorStatus getLayerTable(TzDbLayerTable*& table, TzDb::OpenMode mode) = 0;
+    [[nodiscard]] virtual Tzad::ErrorStatus getBlockTable(TzDbBlockTable*& table,
+                                                          TzDb::OpenMode mode) = 0;
+    [[nodiscard]] virtual Tzad::ErrorStatus getLayerTable(TzDbLayerTable*& table,
+                                                          TzDb::OpenMode mode) = 0;
     [[nodiscard]] virtual Tzad::ErrorStatus getLinetypeTable(TzDbLinetypeTable*& table,
                                                              TzDb::OpenMode mode) = 0;
     [[nodiscard]] virtual Tzad::ErrorStatus getTextStyleTable(TzDbTextStyleTable*& table,

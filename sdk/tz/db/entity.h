@@ -15,15 +15,15 @@ enum Planarity : int { kNonPlanar = 0, kPlanar = 1, kLinear = 2 };
 struct TzDbFullSubentPath {};
 inline constexpr TzDbFullSubentPath kNullSubent{};
 
-// What can be drawn and stand in a space. Modules derive from it for previews: such an entity overrides
-// subWorldDraw, never enters a database, and counts as open for write. Coordinates are world
-// coordinates.
+// What can be drawn and stand in a space. Modules derive from it for previews: such an entity
+// overrides subWorldDraw, never enters a database, and counts as open for write. Coordinates are
+// world coordinates.
 class TZ_API TzDbEntity : public TzDbObject {
 public:
     ~TzDbEntity() override;
 
-    // [write-open] Layer, colour, line type and text style from the database's current ones; `database()`
-    // stays null. A null database means the working one.
+    // [write-open] Layer, colour, line type and text style from the database's current ones;
+    // `database()` stays null. A null database means the working one.
     void setDatabaseDefaults(TzDbDatabase* database = nullptr);
 
     // [any], setters [write-open]; a setter fails with a status for an id of another class.
@@ -38,14 +38,17 @@ public:
     Tzad::ErrorStatus setVisibility(TzDb::Visibility visibility, bool doSubents = true);
 
     // [read-open] Shows or stops showing the entity as selected.
-    Tzad::ErrorStatus highlight(TzDbFullSubentPath const& path = kNullSubent, bool all = false) const;
-    Tzad::ErrorStatus unhighlight(TzDbFullSubentPath const& path = kNullSubent, bool all = false) const;
+    Tzad::ErrorStatus highlight(TzDbFullSubentPath const& path = kNullSubent,
+                                bool all = false) const;
+    Tzad::ErrorStatus unhighlight(TzDbFullSubentPath const& path = kNullSubent,
+                                  bool all = false) const;
 
     // [any] Whether the entity lies in one plane, and in which.
     [[nodiscard]] virtual bool isPlanar() const;
-    [[nodiscard]] virtual Tzad::ErrorStatus getPlane(TzGePlane& plane, TzDb::Planarity& planarity) const;
-    // [write-open] Moves, turns or scales the entity; refused, with nothing changed, when a coordinate
-    // would not be finite or a direction would vanish.
+    [[nodiscard]] virtual Tzad::ErrorStatus getPlane(TzGePlane& plane,
+                                                     TzDb::Planarity& planarity) const;
+    // [write-open] Moves, turns or scales the entity; refused, with nothing changed, when a
+    // coordinate would not be finite or a direction would vanish.
     Tzad::ErrorStatus transformBy(TzGeMatrix3d const& matrix);
 
     static TzRxClass* desc();

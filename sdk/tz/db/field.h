@@ -4,8 +4,8 @@
 #include "tz/text/array.h"
 #include "tz/text/string.h"
 
-// A text that is computed: code forms %<\Var NAME>%, %<\Date>%, %<\File>%, %<\Object HANDLE property>%,
-// mixed with plain text. One that cannot be evaluated shows "####".
+// A text that is computed: code forms %<\Var NAME>%, %<\Date>%, %<\File>%, %<\Object HANDLE
+// property>%, mixed with plain text. One that cannot be evaluated shows "####".
 //
 //   TzDbField* field = new TzDbField;
 //   field->setFieldCode(L"Drawn %<\\Date>%", 0, nullptr);
@@ -17,11 +17,12 @@ public:
     ~TzDbField() override;
 
     // [write-open] The code; flags 0 and 0x100 are treated alike. `children` may be null.
-    Tzad::ErrorStatus setFieldCode(wchar_t const* code, int flags, TzArray<TzDbField*> const* children);
+    Tzad::ErrorStatus
+    setFieldCode(wchar_t const* code, int flags, TzArray<TzDbField*> const* children);
     // [any] Flag 2 gives the evaluated text, anything else the text with its codes.
     [[nodiscard]] TzString getFieldCode(int flags) const;
-    // [write-open] Computes the text; the context 0x20 evaluates every kind of code. A database of null
-    // means the working one.
+    // [write-open] Computes the text; the context 0x20 evaluates every kind of code. A database of
+    // null means the working one.
     [[nodiscard]] Tzad::ErrorStatus evaluate(int context, TzDbDatabase* database);
 
     static TzRxClass* desc();

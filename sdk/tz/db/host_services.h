@@ -38,7 +38,7 @@ public:
 // Puts new texts on the layer that the drafter keeps for them.
 class TZ_API TzTextSetLayer {
 public:
-    // [write-open] The layer that the variable TEXTLAYER names, the current layer when it is empty or
-    // names none.
+    // [write-open] The layer that the variable TEXTLAYER names, the current layer when it is empty
+    // or names none.
     static void setTextLayer(TzDbEntity* entity);
 };

@@ -10,18 +10,18 @@ namespace TzDb {
 enum LineSpacingStyle : int { kAtLeast = 1, kExactly = 2 };
 }
 
-// A multi-line text: contents in the host's markup, laid out in a box of a given width (0: no wrapping)
-// from a location to which one of nine points of the box is attached. The text height is the height of
-// capitals; the distance of baselines at factor 1 is 5/3 of it.
+// A multi-line text: contents in the host's markup, laid out in a box of a given width (0: no
+// wrapping) from a location to which one of nine points of the box is attached. The text height is
+// the height of capitals; the distance of baselines at factor 1 is 5/3 of it.
 //
 //   TzDbMText* text = new TzDbMText;
 //   text->setDatabaseDefaults();
 //   text->setContents(L"First\\PSecond");
 //   text->setWidth(10);
 //
-// Getters [any]; setters [write-open]. A setter refuses, with a status and nothing changed, a value that
-// is not finite, a zero normal or direction, and a direction parallel to the normal. Measuring an
-// entity that is in no database uses the style that its id names.
+// Getters [any]; setters [write-open]. A setter refuses, with a status and nothing changed, a value
+// that is not finite, a zero normal or direction, and a direction parallel to the normal. Measuring
+// an entity that is in no database uses the style that its id names.
 class TZ_API TzDbMText : public TzDbEntity {
 public:
     // 1 to 9, top left to bottom right, row by row.
@@ -62,7 +62,8 @@ public:
     [[nodiscard]] double height() const;
     Tzad::ErrorStatus setHeight(double height);
     [[nodiscard]] AttachmentPoint attachment() const;
-    // The text moves about its location; with ...MovingLocation the location moves and the text stays.
+    // The text moves about its location; with ...MovingLocation the location moves and the text
+    // stays.
     Tzad::ErrorStatus setAttachment(AttachmentPoint point);
     Tzad::ErrorStatus setAttachmentMovingLocation(AttachmentPoint point);
     [[nodiscard]] TzDbObjectId textStyle() const;
@@ -73,8 +74,8 @@ public:
     [[nodiscard]] double lineSpacingFactor() const;
     Tzad::ErrorStatus setLineSpacingFactor(double factor);
 
-    // Markup, with fields evaluated; setContents finds the fields in it, which come to life when the
-    // entity is added to a database.
+    // Markup, with fields evaluated; setContents finds the fields in it, which come to life when
+    // the entity is added to a database.
     [[nodiscard]] TzString contents() const;
     Tzad::ErrorStatus setContents(wchar_t const* contents);
     // The markup of a paragraph's end.
@@ -107,7 +108,8 @@ public:
     void getBoundingPoints(TzArray<TzGePoint3d>& points) const;
 
     [[nodiscard]] bool isPlanar() const override;
-    [[nodiscard]] Tzad::ErrorStatus getPlane(TzGePlane& plane, TzDb::Planarity& planarity) const override;
+    [[nodiscard]] Tzad::ErrorStatus getPlane(TzGePlane& plane,
+                                             TzDb::Planarity& planarity) const override;
 
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;
@@ -118,5 +120,8 @@ protected:
 };
 
 // [write-open] Sets the whole background of a text at once.
-TZ_API Tzad::ErrorStatus tzdbSetMTextBackground(TzDbMText* text, bool fill, TzCmColor const& color,
-                                                double scale, TzCmTransparency const& transparency);
+TZ_API Tzad::ErrorStatus tzdbSetMTextBackground(TzDbMText* text,
+                                                bool fill,
+                                                TzCmColor const& color,
+                                                double scale,
+                                                TzCmTransparency const& transparency);

@@ -17,12 +17,12 @@ enum OpenMode : int { kForRead = 0, kForWrite = 1, kForNotify = 2 };
 //   1. tzdbOpenObject
 //   2. its operations; those that change it need it open for write
 //   3. close
-// An object may be open for read many times at once, or for write once. An object that was never added
-// to a database counts as open for write and is deleted by its owner; `close` on it fails. The host
-// keeps the object between close and the next opening; its address is the host's business.
+// An object may be open for read many times at once, or for write once. An object that was never
+// added to a database counts as open for write and is deleted by its owner; `close` on it fails.
+// The host keeps the object between close and the next opening; its address is the host's business.
 //
-// Statuses: 0; 15 another holder has it open for read; 45 for write; 83 it is already open for write;
-// 87 its layer is locked (opening for write and upgrading; opening for read always works).
+// Statuses: 0; 15 another holder has it open for read; 45 for write; 83 it is already open for
+// write; 87 its layer is locked (opening for write and upgrading; opening for read always works).
 class TZ_API TzDbObject : public TzGiDrawable {
 public:
     ~TzDbObject() override;
@@ -49,12 +49,14 @@ public:
     // [read-open] A copy in no database, owned by the caller; null when it cannot be made.
     [[nodiscard]] virtual TzDbObject* clone() const;
 
-    // [write-open] Attaches a field under a key; `id` takes the field's id. The object's database owns
-    // the field, which stays open until its `close`. On an object without a database the call fails
-    // and the field stays the caller's.
-    [[nodiscard]] Tzad::ErrorStatus setField(wchar_t const* key, TzDbField* field, TzDbObjectId& id);
+    // [write-open] Attaches a field under a key; `id` takes the field's id. The object's database
+    // owns the field, which stays open until its `close`. On an object without a database the call
+    // fails and the field stays the caller's.
+    [[nodiscard]] Tzad::ErrorStatus
+    setField(wchar_t const* key, TzDbField* field, TzDbObjectId& id);
     // [read-open] The field under a key, opened; on failure `field` is null.
-    [[nodiscard]] Tzad::ErrorStatus getField(wchar_t const* key, TzDbField*& field, TzDb::OpenMode mode) const;
+    [[nodiscard]] Tzad::ErrorStatus
+    getField(wchar_t const* key, TzDbField*& field, TzDb::OpenMode mode) const;
 
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;
@@ -68,15 +70,18 @@ private:
     TzDbObjectImp* imp_;
 };
 
-// [any] Opens an object by its id; on failure `object` is null. The null id and erased objects fail.
-[[nodiscard]] TZ_API Tzad::ErrorStatus tzdbOpenTzDbObject(TzDbObject*& object, TzDbObjectId id,
-                                                          TzDb::OpenMode mode, bool erasedToo = false);
+// [any] Opens an object by its id; on failure `object` is null. The null id and erased objects
+// fail.
+[[nodiscard]] TZ_API Tzad::ErrorStatus tzdbOpenTzDbObject(TzDbObject*& object,
+                                                          TzDbObjectId id,
+                                                          TzDb::OpenMode mode,
+                                                          bool erasedToo = false);
 
 // [any] The same for a given class: an object of another class is closed again and fails with
 // Tzad::eWrongObjectType.
 template <class T>
-[[nodiscard]] Tzad::ErrorStatus tzdbOpenObject(T*& object, TzDbObjectId id, TzDb::OpenMode mode,
-                                               bool erasedToo = false) {
+[[nodiscard]] Tzad::ErrorStatus
+tzdbOpenObject(T*& object, TzDbObjectId id, TzDb::OpenMode mode, bool erasedToo = false) {
     object = nullptr;
     TzDbObject* opened = nullptr;
     Tzad::ErrorStatus const status = tzdbOpenTzDbObject(opened, id, mode, erasedToo);
@@ -87,8 +92,8 @@ template <class T>
     return Tzad::eWrongObjectType;
 }
 
-// Opens the pointer's object for write in place of its opening for read, and gives that back at the end:
-// first the write, then the read.
+// Opens the pointer's object for write in place of its opening for read, and gives that back at the
+// end: first the write, then the read.
 class TZ_API WritableTzDbObject {
 public:
     // [read-open] Makes `object` writable; false leaves the opening as it was.

@@ -11,8 +11,8 @@ class TzDbObject;
 // Names an object of a database for as long as the database lives, erased objects included. A plain
 // value: copying and comparing never touches the object. The null id names nothing.
 //
-// The host's older interface names objects by pairs of 64-bit integers; the two operations at the end
-// convert.
+// The host's older interface names objects by pairs of 64-bit integers; the two operations at the
+// end convert.
 class TZ_API TzDbObjectId {
 public:
     TzDbObjectId() = default;
@@ -44,8 +44,8 @@ private:
     TzDbObjectRecord* record_ = nullptr;
 };
 
-// [any] The id of the object that an older name means: 0, or a failing status with a null id when the
-// name is that of no object.
+// [any] The id of the object that an older name means: 0, or a failing status with a null id when
+// the name is that of no object.
 [[nodiscard]] TZ_API int tzdbGetObjectId(TzDbObjectId& id, long long const* name);
 // [any] The older name of an id: 0, or a failing status for the null id.
 [[nodiscard]] TZ_API int tzdbGetTzsName(long long* name, TzDbObjectId id);

@@ -5,7 +5,8 @@
 #include "tz/ge/vector3d.h"
 #include "tz/text/array.h"
 
-// The plain entities beside texts. Getters [any]; setters [write-open], refusing what is not finite.
+// The plain entities beside texts. Getters [any]; setters [write-open], refusing what is not
+// finite.
 class TZ_API TzDbLine : public TzDbEntity {
 public:
     TzDbLine();
@@ -62,7 +63,8 @@ public:
     // Block coordinates to world.
     [[nodiscard]] TzGeMatrix3d blockTransform() const;
     // [write-open] Takes an attribute over as appendTzDbEntity does.
-    [[nodiscard]] Tzad::ErrorStatus appendAttribute(TzDbObjectId& id, class TzDbAttribute* attribute);
+    [[nodiscard]] Tzad::ErrorStatus appendAttribute(TzDbObjectId& id,
+                                                    class TzDbAttribute* attribute);
     void attributes(TzArray<TzDbObjectId>& ids) const;
 
     static TzRxClass* desc();

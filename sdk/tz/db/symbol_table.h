@@ -7,15 +7,16 @@
 #include "tz/text/string.h"
 
 // The tables of a database: layers, line types, text styles, blocks. A table is opened, asked for a
-// record or walked by an iterator, and closed; records are opened by id. Names compare without case.
-// Tables are walked in file order, new records last.
+// record or walked by an iterator, and closed; records are opened by id. Names compare without
+// case. Tables are walked in file order, new records last.
 
-// Walks a table. Made by the table's newIterator and deleted by the caller, while the table is open.
+// Walks a table. Made by the table's newIterator and deleted by the caller, while the table is
+// open.
 class TZ_API TzDbSymbolTableIterator {
 public:
     virtual ~TzDbSymbolTableIterator() = default;
-    // To the first record, or with `atBeginning` false to the last; erased ones are passed over unless
-    // told not to.
+    // To the first record, or with `atBeginning` false to the last; erased ones are passed over
+    // unless told not to.
     virtual void start(bool atBeginning = true, bool skipErased = true) = 0;
     [[nodiscard]] virtual bool done() const = 0;
     virtual void step(bool forward = true, bool skipErased = true) = 0;
@@ -106,10 +107,10 @@ public:
     [[nodiscard]] TzString bigFontFileName() const;
     Tzad::ErrorStatus setBigFontFileName(wchar_t const* file);
     // The typeface with its description; an empty typeface for a style that names a font file.
-    [[nodiscard]] Tzad::ErrorStatus font(TzString& typeface, bool& bold, bool& italic, int& charset,
-                                         int& pitchAndFamily) const;
-    Tzad::ErrorStatus setFont(wchar_t const* typeface, bool bold, bool italic, int charset,
-                              int pitchAndFamily);
+    [[nodiscard]] Tzad::ErrorStatus
+    font(TzString& typeface, bool& bold, bool& italic, int& charset, int& pitchAndFamily) const;
+    Tzad::ErrorStatus
+    setFont(wchar_t const* typeface, bool bold, bool italic, int charset, int pitchAndFamily);
 
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;
@@ -118,7 +119,8 @@ public:
 class TZ_API TzDbLayerTable : public TzDbSymbolTable {
 public:
     explicit TzDbLayerTable(TzDbObjectImp* imp) : TzDbSymbolTable(imp) {}
-    [[nodiscard]] Tzad::ErrorStatus newIterator(TzDbSymbolTableIterator*& iterator, bool atBeginning = true,
+    [[nodiscard]] Tzad::ErrorStatus newIterator(TzDbSymbolTableIterator*& iterator,
+                                                bool atBeginning = true,
                                                 bool skipErased = true) const;
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;
@@ -130,11 +132,14 @@ public:
     ~TzDbLinetypeTableIterator() { delete walk_; }
     TzDbLinetypeTableIterator(TzDbLinetypeTableIterator const&) = delete;
     TzDbLinetypeTableIterator& operator=(TzDbLinetypeTableIterator const&) = delete;
-    void start(bool atBeginning = true, bool skipErased = true) { walk_->start(atBeginning, skipErased); }
+    void start(bool atBeginning = true, bool skipErased = true) {
+        walk_->start(atBeginning, skipErased);
+    }
     [[nodiscard]] bool done() const { return walk_->done(); }
     void step(bool forward = true, bool skipErased = true) { walk_->step(forward, skipErased); }
     // [read-open] Opens the record where the walk stands; the caller closes it.
-    [[nodiscard]] Tzad::ErrorStatus getRecord(TzDbLinetypeTableRecord*& record, TzDb::OpenMode mode) const {
+    [[nodiscard]] Tzad::ErrorStatus getRecord(TzDbLinetypeTableRecord*& record,
+                                              TzDb::OpenMode mode) const {
         return tzdbOpenObject(record, walk_->getRecordId(), mode);
     }
 
@@ -145,7 +150,8 @@ private:
 class TZ_API TzDbLinetypeTable : public TzDbSymbolTable {
 public:
     explicit TzDbLinetypeTable(TzDbObjectImp* imp) : TzDbSymbolTable(imp) {}
-    [[nodiscard]] Tzad::ErrorStatus newIterator(TzDbLinetypeTableIterator*& iterator, bool atBeginning = true,
+    [[nodiscard]] Tzad::ErrorStatus newIterator(TzDbLinetypeTableIterator*& iterator,
+                                                bool atBeginning = true,
                                                 bool skipErased = true) const;
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;
@@ -157,11 +163,14 @@ public:
     ~TzDbTextStyleTableIterator() { delete walk_; }
     TzDbTextStyleTableIterator(TzDbTextStyleTableIterator const&) = delete;
     TzDbTextStyleTableIterator& operator=(TzDbTextStyleTableIterator const&) = delete;
-    void start(bool atBeginning = true, bool skipErased = true) { walk_->start(atBeginning, skipErased); }
+    void start(bool atBeginning = true, bool skipErased = true) {
+        walk_->start(atBeginning, skipErased);
+    }
     [[nodiscard]] bool done() const { return walk_->done(); }
     void step(bool forward = true, bool skipErased = true) { walk_->step(forward, skipErased); }
     // [read-open] Opens the record where the walk stands; the caller closes it.
-    [[nodiscard]] Tzad::ErrorStatus getRecord(TzDbTextStyleTableRecord*& record, TzDb::OpenMode mode) const {
+    [[nodiscard]] Tzad::ErrorStatus getRecord(TzDbTextStyleTableRecord*& record,
+                                              TzDb::OpenMode mode) const {
         return tzdbOpenObject(record, walk_->getRecordId(), mode);
     }
 
@@ -172,7 +181,8 @@ private:
 class TZ_API TzDbTextStyleTable : public TzDbSymbolTable {
 public:
     explicit TzDbTextStyleTable(TzDbObjectImp* imp) : TzDbSymbolTable(imp) {}
-    [[nodiscard]] Tzad::ErrorStatus newIterator(TzDbTextStyleTableIterator*& iterator, bool atBeginning = true,
+    [[nodiscard]] Tzad::ErrorStatus newIterator(TzDbTextStyleTableIterator*& iterator,
+                                                bool atBeginning = true,
                                                 bool skipErased = true) const;
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;

@@ -7,8 +7,8 @@
 
 struct resbuf;
 
-// A single-line text, from its position along the X axis of its plane turned by the rotation. Getters
-// [any]; setters [write-open] with the refusals of TzDbMText.
+// A single-line text, from its position along the X axis of its plane turned by the rotation.
+// Getters [any]; setters [write-open] with the refusals of TzDbMText.
 class TZ_API TzDbText : public TzDbEntity {
 public:
     TzDbText();
@@ -33,7 +33,8 @@ public:
     Tzad::ErrorStatus setTextString(wchar_t const* text);
 
     [[nodiscard]] bool isPlanar() const override;
-    [[nodiscard]] Tzad::ErrorStatus getPlane(TzGePlane& plane, TzDb::Planarity& planarity) const override;
+    [[nodiscard]] Tzad::ErrorStatus getPlane(TzGePlane& plane,
+                                             TzDb::Planarity& planarity) const override;
 
     static TzRxClass* desc();
     [[nodiscard]] TzRxClass* isA() const override;
@@ -55,8 +56,8 @@ public:
     [[nodiscard]] TzString prompt() const;
     Tzad::ErrorStatus setPrompt(wchar_t const* prompt);
     [[nodiscard]] bool isMTextAttributeDefinition() const;
-    // [any] The text of a multi-line definition, null for a single-line one; owned by this. It is open
-    // as this object is.
+    // [any] The text of a multi-line definition, null for a single-line one; owned by this. It is
+    // open as this object is.
     [[nodiscard]] TzDbMText const* getMTextAttributeDefinitionConst() const;
     // [write-open] The same, to be changed.
     [[nodiscard]] TzDbMText* getMTextAttributeDefinition();
@@ -82,8 +83,8 @@ public:
     [[nodiscard]] TzRxClass* isA() const override;
 };
 
-// [any] The data of an entity as a list, type first, owned by the caller (tzutRelRb); null for a name
-// of no entity.
+// [any] The data of an entity as a list, type first, owned by the caller (tzutRelRb); null for a
+// name of no entity.
 [[nodiscard]] TZ_API resbuf* tzdbEntGet(long long const* name);
 // [any] Two corners of a text in its own frame, lower left and upper right, from the data that
 // tzdbEntGet gives: 5100, or -5001 for what is no text.

@@ -8,20 +8,26 @@ class TzRxResourceInstance;
 // Commands of the host and of its modules, in groups. Found in the system registry under
 // "TZAD_REGISTERED_COMMANDS".
 //
-// Bits of a command's flags: 0x2 the command sees the selection that was made before it began (without
-// it the host drops that selection first), 0x800000 the command takes its answers from scripts as a
-// dialog-free command does. Other bits change nothing here.
+// Bits of a command's flags: 0x2 the command sees the selection that was made before it began
+// (without it the host drops that selection first), 0x800000 the command takes its answers from
+// scripts as a dialog-free command does. Other bits change nothing here.
 class TZ_API TzEdCommandStack : public TzRxObject {
 public:
     using Callback = void (*)();
 
     // [any] Adds a command. The global name is the same in every language, the local name is the
     // translator's; either starts the command, without regard to case. `reactor` and `data` may be
-    // null; `sequence` -1 adds behind the group's commands. 0, or the failing status when the global
-    // name is empty or taken.
-    virtual int addCommand(wchar_t const* group, wchar_t const* globalName, wchar_t const* localName,
-                           int flags, Callback callback, TzRxObject* reactor, int sequence,
-                           TzRxResourceInstance const& resources, void* data) = 0;
+    // null; `sequence` -1 adds behind the group's commands. 0, or the failing status when the
+    // global name is empty or taken.
+    virtual int addCommand(wchar_t const* group,
+                           wchar_t const* globalName,
+                           wchar_t const* localName,
+                           int flags,
+                           Callback callback,
+                           TzRxObject* reactor,
+                           int sequence,
+                           TzRxResourceInstance const& resources,
+                           void* data) = 0;
     // [any] Removes a group with all its commands; 0, or the failing status for an unknown group.
     virtual int removeGroup(wchar_t const* group) = 0;
 
@@ -29,6 +35,7 @@ public:
     [[nodiscard]] TzRxClass* isA() const override;
 };
 
-// [any] Help of a command or function: `file` is the help file or null for the host's own, `topic` the
-// topic in it. HELP shows the topic. 5100, or -5001 for an empty name.
-TZ_API int tzedSetFunHelp(wchar_t const* name, wchar_t const* file, wchar_t const* topic, int command);
+// [any] Help of a command or function: `file` is the help file or null for the host's own, `topic`
+// the topic in it. HELP shows the topic. 5100, or -5001 for an empty name.
+TZ_API int
+tzedSetFunHelp(wchar_t const* name, wchar_t const* file, wchar_t const* topic, int command);

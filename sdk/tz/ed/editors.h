@@ -12,38 +12,40 @@ class TzDbMText;
 // changes the entity itself, and leaves it as it was when the user leaves without accepting. The
 // entity must be open for write, whether or not it has a database.
 
-// The record that the in-place editor receives. Its layout is part of the interface; what has no name
-// is zero.
+// The record that the in-place editor receives. Its layout is part of the interface; what has no
+// name is zero.
 struct IPESettings {
-    bool viewFlag = false;                // 0
-    std::uint8_t reserved1[3]{};          // 1
-    bool attribute = false;               // 4: the text belongs to an attribute
-    bool editable = false;                // 5
-    bool plainAttribute = false;          // 6: an attribute that is not edited in place
-    std::uint8_t reserved7[5]{};          // 7
-    std::uint32_t options = 0;            // 12: bits 13 and 14
-    double boxHeight = 0;                 // 16: drawing units
-    std::uint8_t reserved24[16]{};        // 24
-    double scale = 0;                     // 40
-    std::uint8_t reserved48[24]{};        // 48
-    TzString title;                       // 72
+    bool viewFlag = false;          // 0
+    std::uint8_t reserved1[3]{};    // 1
+    bool attribute = false;         // 4: the text belongs to an attribute
+    bool editable = false;          // 5
+    bool plainAttribute = false;    // 6: an attribute that is not edited in place
+    std::uint8_t reserved7[5]{};    // 7
+    std::uint32_t options = 0;      // 12: bits 13 and 14
+    double boxHeight = 0;           // 16: drawing units
+    std::uint8_t reserved24[16]{};  // 24
+    double scale = 0;               // 40
+    std::uint8_t reserved48[24]{};  // 48
+    TzString title;                 // 72
     std::uint8_t reservedBehindTitle[120 - sizeof(TzString)]{};
-    std::uint32_t colors[4]{};            // 192: 0x00BBGGRR
-    std::uint32_t fifthColor = 0;         // 208
-    std::uint16_t flags212 = 0;           // 212
-    std::uint16_t reserved214 = 0;        // 214
-    std::uint32_t minimumPixelSize = 0;   // 216
-    std::uint32_t fixedPixelSize = 0;     // 220
+    std::uint32_t colors[4]{};           // 192: 0x00BBGGRR
+    std::uint32_t fifthColor = 0;        // 208
+    std::uint16_t flags212 = 0;          // 212
+    std::uint16_t reserved214 = 0;       // 214
+    std::uint32_t minimumPixelSize = 0;  // 216
+    std::uint32_t fixedPixelSize = 0;    // 220
 };
 static_assert(offsetof(IPESettings, viewFlag) == 0 && offsetof(IPESettings, attribute) == 4);
 static_assert(offsetof(IPESettings, editable) == 5 && offsetof(IPESettings, plainAttribute) == 6);
 static_assert(offsetof(IPESettings, options) == 12 && offsetof(IPESettings, boxHeight) == 16);
 static_assert(offsetof(IPESettings, scale) == 40 && offsetof(IPESettings, title) == 72);
 static_assert(offsetof(IPESettings, colors) == 192 && offsetof(IPESettings, fifthColor) == 208);
-static_assert(offsetof(IPESettings, flags212) == 212 && offsetof(IPESettings, minimumPixelSize) == 216);
+static_assert(offsetof(IPESettings, flags212) == 212 &&
+              offsetof(IPESettings, minimumPixelSize) == 216);
 static_assert(offsetof(IPESettings, fixedPixelSize) == 220 && sizeof(IPESettings) == 224);
 
-// [command] The in-place editor; 0 when the user left without accepting. The settings are read only.
+// [command] The in-place editor; 0 when the user left without accepting. The settings are read
+// only.
 [[nodiscard]] TZ_API int IPEInvokeEditorOn(TzDbMText* text, IPESettings const* settings);
 // [any] Whether the editor that MTEXTED names is an in-place one; the argument asks for the name in
 // force.

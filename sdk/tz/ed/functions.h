@@ -16,7 +16,8 @@ struct resbuf;
 TZ_API int tzedUndef(wchar_t const* name, int code);
 // [message 5] The code of the function that is being called; -5001 outside a call.
 [[nodiscard]] TZ_API int tzedGetFunCode();
-// [message 5] The arguments of the call, null without any. Owned by the host, valid during the call.
+// [message 5] The arguments of the call, null without any. Owned by the host, valid during the
+// call.
 [[nodiscard]] TZ_API resbuf* tzedGetArgs();
 // [message 5] The call gives nothing back to the interpreter.
 TZ_API int tzedRetVoid();

@@ -13,9 +13,9 @@ struct TzEdJigInputData {
     TzGePoint3d point;
 };
 
-// A drag. The host calls `sampler` for each place of the cursor; when it says kNormal the host calls
-// `update` and draws `entity`. A drag begins with a sample where the cursor stands, drawn whatever its
-// status. One object may be dragged again and again.
+// A drag. The host calls `sampler` for each place of the cursor; when it says kNormal the host
+// calls `update` and draws `entity`. A drag begins with a sample where the cursor stands, drawn
+// whatever its status. One object may be dragged again and again.
 //
 //   struct Rubber : TzEdJig {
 //       DragStatus sampler() override { return acquirePoint(point_, base_); }
@@ -36,9 +36,9 @@ public:
         kNormal = 0,     // a point, or a sample that differs
         kKW1 = 1,        // the first keyword; the n-th gives n, up to 30
     };
-    // Bits of the controls. kGovernedByOrthoMode lets ortho mode hold the point; kAccept3dCoordinates
-    // keeps a third coordinate. A drag accepts an empty answer whatever they say, and the other bits
-    // are for hosts with a screen.
+    // Bits of the controls. kGovernedByOrthoMode lets ortho mode hold the point;
+    // kAccept3dCoordinates keeps a third coordinate. A drag accepts an empty answer whatever they
+    // say, and the other bits are for hosts with a screen.
     enum UserInputControls : int {
         kGovernedByOrthoMode = 0x1,
         kNullResponseAccepted = 0x2,
@@ -76,8 +76,8 @@ public:
     void setSpecialCursorType(int type);
 
     // [drag] Where the cursor stands; with a base point the host may draw a line from it and ortho
-    // mode, when the controls ask for it, holds the point on an axis through it. kNormal, or kNoChange
-    // when the place is that of the sample before.
+    // mode, when the controls ask for it, holds the point on an axis through it. kNormal, or
+    // kNoChange when the place is that of the sample before.
     DragStatus acquirePoint(TzGePoint3d& point);
     DragStatus acquirePoint(TzGePoint3d& point, TzGePoint3d const& base);
 

@@ -4,8 +4,8 @@
 #include "tz/ge/point3d.h"
 #include "tz/text/string.h"
 
-// Two questions as objects, for callers that ask the same thing again or read the answer later. They
-// keep to the same statuses, flags and keywords as tz/ed/prompts.h.
+// Two questions as objects, for callers that ask the same thing again or read the answer later.
+// They keep to the same statuses, flags and keywords as tz/ed/prompts.h.
 //
 //   TzEdPromptKeyword prompt;
 //   prompt.setMessageAndKeywords(L"Change [Style/Rotate]", L"Style Rotate");

@@ -4,22 +4,26 @@
 
 struct resbuf;
 
-// Selections and picks. A selection set and an entity are named by pairs of 64-bit integers; a set lives
-// from tzedSSGet to tzedSSFree, within the command. Statuses as in tz/ed/prompts.h.
+// Selections and picks. A selection set and an entity are named by pairs of 64-bit integers; a set
+// lives from tzedSSGet to tzedSSFree, within the command. Statuses as in tz/ed/prompts.h.
 //
-// Modes of tzedSSGet, in one text: "_" nothing further; "I" the implied set, without a question; "X" all
-// entities; ":$" the second argument is a pair of prompts (to add and to remove); ":K" the words armed
-// by tzedInitGet go to the keyword callback and the question goes on; ":L" and ":l" leave out entities on
-// locked layers; ":c" and ":p" change nothing. Null asks in the ordinary way.
+// Modes of tzedSSGet, in one text: "_" nothing further; "I" the implied set, without a question;
+// "X" all entities; ":$" the second argument is a pair of prompts (to add and to remove); ":K" the
+// words armed by tzedInitGet go to the keyword callback and the question goes on; ":L" and ":l"
+// leave out entities on locked layers; ":c" and ":p" change nothing. Null asks in the ordinary way.
 //
-// A filter is a list of conditions that an entity must meet all: codes 0 and 5020 the type's name, 8
-// the layer, 7 the text style; names may hold the wildcards of tzutWcMatchEx.
+// A filter is a list of conditions that an entity must meet all: codes 0 and 5020 the type's name,
+// 8 the layer, 7 the text style; names may hold the wildcards of tzutWcMatchEx.
 
-// [command] `first` and `second` are points (double[3]) or, with ":$", `first` is a wchar_t const*[2] of
-// prompts; they may be null. `filter` may be null. `set` takes the name of the new set, also when
-// nothing was selected: 5100 with at least one entity, -5001 with none, -5002 on cancel.
-[[nodiscard]] TZ_API int tzedSSGet(wchar_t const* mode, void const* first, void const* second,
-                                   resbuf const* filter, long long* set);
+// [command] `first` and `second` are points (double[3]) or, with ":$", `first` is a wchar_t
+// const*[2] of prompts; they may be null. `filter` may be null. `set` takes the name of the new
+// set, also when nothing was selected: 5100 with at least one entity, -5001 with none, -5002 on
+// cancel.
+[[nodiscard]] TZ_API int tzedSSGet(wchar_t const* mode,
+                                   void const* first,
+                                   void const* second,
+                                   resbuf const* filter,
+                                   long long* set);
 // [command] How many entities the set holds. -5001 for a set that is not there.
 [[nodiscard]] TZ_API int tzedSSLength(long long const* set, int* length);
 // [command] The name of the entity at `index`, from 0. -5001 outside the set.
@@ -33,18 +37,25 @@ TZ_API int tzedSSSetFirst(long long const* grips, long long const* selected);
 // [command] Picks one entity. `name` and `point` (user coordinates) are left alone but for 5100; a
 // pick at nothing gives -5001.
 [[nodiscard]] TZ_API int tzedEntSel(wchar_t const* prompt, long long* name, double* point);
-// [command] Picks one entity, also inside block references. `pickFlag` 0 asks, 1 takes `point` as the
-// pick. `matrix` (4 by 4, rows) maps the entity's coordinates to world; `references` takes a list of the
-// references around it, inmost first, null at top level, that the caller releases with tzutRelRb.
-[[nodiscard]] TZ_API int tzedNEntSelP(wchar_t const* prompt, long long* name, double* point,
-                                      int pickFlag, double (*matrix)[4], resbuf** references);
+// [command] Picks one entity, also inside block references. `pickFlag` 0 asks, 1 takes `point` as
+// the pick. `matrix` (4 by 4, rows) maps the entity's coordinates to world; `references` takes a
+// list of the references around it, inmost first, null at top level, that the caller releases with
+// tzutRelRb.
+[[nodiscard]] TZ_API int tzedNEntSelP(wchar_t const* prompt,
+                                      long long* name,
+                                      double* point,
+                                      int pickFlag,
+                                      double (*matrix)[4],
+                                      resbuf** references);
 
-// The process-wide callback that takes the keywords of a selection with ":K": it gets the global word
-// and may ask questions of its own; a list that it returns is ignored. The callback may be null.
+// The process-wide callback that takes the keywords of a selection with ":K": it gets the global
+// word and may ask questions of its own; a list that it returns is ignored. The callback may be
+// null.
 using TzedSSKeywordCallback = resbuf* (*)(wchar_t const* keyword);
 TZ_API int tzedSSGetKwordCallbackPtr(TzedSSKeywordCallback* callback);
 TZ_API int tzedSSSetKwordCallbackPtr(TzedSSKeywordCallback callback);
 
-// [any] Whether `text` matches a pattern of *, ?, [...], a leading ~ for "not", and lists with commas;
-// with `ignoreCase` case does not count.
-[[nodiscard]] TZ_API bool tzutWcMatchEx(wchar_t const* text, wchar_t const* pattern, bool ignoreCase);
+// [any] Whether `text` matches a pattern of *, ?, [...], a leading ~ for "not", and lists with
+// commas; with `ignoreCase` case does not count.
+[[nodiscard]] TZ_API bool
+tzutWcMatchEx(wchar_t const* text, wchar_t const* pattern, bool ignoreCase);

@@ -6,8 +6,8 @@
 
 class TzApDocument;
 
-// What a filter may do with the arrays that the host shows it. Indices are those of the array as it was
-// handed over and stay so until the callback ends, whatever was removed before.
+// What a filter may do with the arrays that the host shows it. Indices are those of the array as it
+// was handed over and stay so until the callback ends, whatever was removed before.
 class TZ_API TzEdSelectionSetService {
 public:
     virtual ~TzEdSelectionSetService() = default;
@@ -28,20 +28,26 @@ class TZ_API TzEdSSGetFilter : public TzEdInputContextReactor {
 public:
     // Entities are about to be added: the whole set so far, and the new ones, of which the service
     // removes by index. Runs for each addition, the implied selection included.
-    virtual void ssgetAddFilter(int flags, TzEdSelectionSetService& service,
+    virtual void ssgetAddFilter(int flags,
+                                TzEdSelectionSetService& service,
                                 TzArray<TzDbObjectId> const& selectionSet,
                                 TzArray<TzDbObjectId> const& subSelectionSet);
     // The same for entities that are about to be taken out of the set.
-    virtual void ssgetRemoveFilter(int flags, TzEdSelectionSetService& service,
+    virtual void ssgetRemoveFilter(int flags,
+                                   TzEdSelectionSetService& service,
                                    TzArray<TzDbObjectId> const& selectionSet,
                                    TzArray<TzDbObjectId> const& subSelectionSet);
-    // The selection is complete, with `status` as its result so far; the service removes from the set.
-    // Runs before tzedSSGet returns, for the implied selection too.
-    virtual void endSSGet(int status, int flags, TzEdSelectionSetService& service,
+    // The selection is complete, with `status` as its result so far; the service removes from the
+    // set. Runs before tzedSSGet returns, for the implied selection too.
+    virtual void endSSGet(int status,
+                          int flags,
+                          TzEdSelectionSetService& service,
                           TzArray<TzDbObjectId> const& selectionSet);
 };
 
-// [command] Installs a filter on a document's input, or takes it back; the host does not own it. 15 as
-// `flags` asks for every hook. False when the document is null, or the filter is there already or not.
-TZ_API bool addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter, int flags);
+// [command] Installs a filter on a document's input, or takes it back; the host does not own it. 15
+// as `flags` asks for every hook. False when the document is null, or the filter is there already
+// or not.
+TZ_API bool
+addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter, int flags);
 TZ_API bool removeSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter);

@@ -9,8 +9,8 @@
 #include "tz/gi/drawable.h"
 #include "tz/gi/text_style.h"
 
-// One drawing in progress. Everything is valid during the call that hands it over alone. Coordinates
-// are world coordinates, or those of the innermost pushed transform.
+// One drawing in progress. Everything is valid during the call that hands it over alone.
+// Coordinates are world coordinates, or those of the innermost pushed transform.
 
 // How what is drawn next looks.
 class TZ_API TzGiSubEntityTraits : public TzRxObject {
@@ -45,15 +45,21 @@ class TZ_API TzGiGeometry {
 public:
     virtual ~TzGiGeometry() = default;
     // Lines through `count` points. `normal` may be null; the marker -1 marks nothing.
-    virtual bool polyline(int count, TzGePoint3d const* points, TzGeVector3d const* normal = nullptr,
+    virtual bool polyline(int count,
+                          TzGePoint3d const* points,
+                          TzGeVector3d const* normal = nullptr,
                           long long marker = -1) = 0;
     // A closed outline, filled when the traits say so.
     virtual bool polygon(int count, TzGePoint3d const* points) = 0;
     virtual bool circle(TzGePoint3d const& center, double radius, TzGeVector3d const& normal) = 0;
-    // A line of text with its baseline from `position`; `length` -1 means up to the zero. With `raw`
-    // no code in the text is looked at.
-    virtual bool text(TzGePoint3d const& position, TzGeVector3d const& normal,
-                      TzGeVector3d const& direction, wchar_t const* text, int length, bool raw,
+    // A line of text with its baseline from `position`; `length` -1 means up to the zero. With
+    // `raw` no code in the text is looked at.
+    virtual bool text(TzGePoint3d const& position,
+                      TzGeVector3d const& normal,
+                      TzGeVector3d const& direction,
+                      wchar_t const* text,
+                      int length,
+                      bool raw,
                       TzGiTextStyle const& style) = 0;
     // Another drawable, with its own attributes.
     virtual bool draw(TzGiDrawable* drawable) = 0;
@@ -82,8 +88,8 @@ class TZ_API TzGiViewportDraw : public TzGiCommonDraw {};
 
 // Services that entities of several modules share when they draw.
 namespace ShareDB {
-// [draw] Lines drawn next keep clear of what the visual style does to edges: jitter, overhang, and so
-// on. The host's styles have none, so the traits stay as they are.
-TZ_API void disableVisualStyleEdgeModifiers(TzGiSubEntityTraits& traits, TzGiContext* context, bool jitter,
-                                            bool overhang, bool halo);
+// [draw] Lines drawn next keep clear of what the visual style does to edges: jitter, overhang, and
+// so on. The host's styles have none, so the traits stay as they are.
+TZ_API void disableVisualStyleEdgeModifiers(
+    TzGiSubEntityTraits& traits, TzGiContext* context, bool jitter, bool overhang, bool halo);
 }  // namespace ShareDB

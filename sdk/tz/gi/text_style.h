@@ -47,7 +47,10 @@ public:
 
     // [any] Width and height of a line of text in this style; `length` -1 means up to the zero.
     // `penUps` counts the advance behind the last character. `draw` may be null.
-    [[nodiscard]] TzGePoint2d extents(wchar_t const* text, bool penUps, int length, bool raw,
+    [[nodiscard]] TzGePoint2d extents(wchar_t const* text,
+                                      bool penUps,
+                                      int length,
+                                      bool raw,
                                       TzGiWorldDraw* draw = nullptr) const;
 
 private:

@@ -14,8 +14,8 @@ class TzDbMText;
 //   TzApHostDialogRawEditor::instance().doModal(params);
 //   int result = params.returnCode();
 //
-// Nothing here owns what it points to; the caller keeps it alive for the run. What the host calls on
-// the parameters is inline.
+// Nothing here owns what it points to; the caller keeps it alive for the run. What the host calls
+// on the parameters is inline.
 
 // The values behind both parameter classes.
 class TzApHostEditorParamsImp {

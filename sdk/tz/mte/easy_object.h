@@ -2,7 +2,8 @@
 
 class TzDbField;
 
-// Holders of open database objects: what a holder is told to give back, it gives back on every way out.
+// Holders of open database objects: what a holder is told to give back, it gives back on every way
+// out.
 //
 //   EasyObject<TzDbMText> text;                       // flags 1: close at the end
 //   if (tzdbOpenObject(text.object, id, TzDb::kForRead) != Tzad::eOk) return;

@@ -26,14 +26,26 @@ public:
     [[nodiscard]] TzRxClass* isA() const override;
 };
 
-// The gate: decides which editor runs on a text, and runs it. 1 accepted, 2 left without accepting, 3 no
-// editor ran (no text, locked, or not writable; one message said why). `flags` go to the dialog editor
-// alone; `interactive` to an external one; `attribute` for the text of an attribute; the last two are
-// options of the in-place editor. [command]
-TZ_API int InvokeEditorOn(EasyObject<TzDbMText>& text, MTETabType tab, unsigned int flags,
-                          bool interactive, bool view, bool attribute, bool option13, bool option14);
+// The gate: decides which editor runs on a text, and runs it. 1 accepted, 2 left without accepting,
+// 3 no editor ran (no text, locked, or not writable; one message said why). `flags` go to the
+// dialog editor alone; `interactive` to an external one; `attribute` for the text of an attribute;
+// the last two are options of the in-place editor. [command]
+TZ_API int InvokeEditorOn(EasyObject<TzDbMText>& text,
+                          MTETabType tab,
+                          unsigned int flags,
+                          bool interactive,
+                          bool view,
+                          bool attribute,
+                          bool option13,
+                          bool option14);
 // The same by id: opens for read, tests locks, closes.
-TZ_API int InvokeEditorOn(TzDbObjectId id, MTETabType tab, unsigned int flags, bool interactive, bool view);
+TZ_API int
+InvokeEditorOn(TzDbObjectId id, MTETabType tab, unsigned int flags, bool interactive, bool view);
 // The same for a text that the caller has open; it is closed when the call returns.
-TZ_API int InvokeEditorOn(TzDbMText* text, MTETabType tab, unsigned int flags, bool interactive, bool view,
-                          bool option13, bool option14);
+TZ_API int InvokeEditorOn(TzDbMText* text,
+                          MTETabType tab,
+                          unsigned int flags,
+                          bool interactive,
+                          bool view,
+                          bool option13,
+                          bool option14);

@@ -7,9 +7,9 @@
 #include "tz/mte/easy_object.h"
 #include "tz/text/string.h"
 
-// Variables that the module exports for other host modules to read. They are defined by the module and
-// live from its load to its unload; the module alone writes them, on the host's one thread. First values
-// stand behind each.
+// Variables that the module exports for other host modules to read. They are defined by the module
+// and live from its load to its unload; the module alone writes them, on the host's one thread.
+// First values stand behind each.
 
 // A point and a rectangle of the screen, in pixels.
 struct TzScreenPoint {
@@ -25,30 +25,30 @@ struct TzScreenRect {
 
 extern "C++" {
 // Editing.
-extern TZ_API double gdJigBoundBoxHeight;   // 0: height of the box dragged last, in drawing units
-extern TZ_API std::uint8_t gbUsedIPE;       // 0: whether the last editor run used the in-place editor
-extern TZ_API std::int32_t gMTextFixed;     // 0: MTEXTFIXED at the last editor run
+extern TZ_API double gdJigBoundBoxHeight;  // 0: height of the box dragged last, in drawing units
+extern TZ_API std::uint8_t gbUsedIPE;    // 0: whether the last editor run used the in-place editor
+extern TZ_API std::int32_t gMTextFixed;  // 0: MTEXTFIXED at the last editor run
 extern TZ_API double g_dMTextObjectHeight;  // 0: height of the edited text, for the editor's size
 extern TZ_API double g_dTextSize;           // 0: working text size of the dialog editor
-extern TZ_API std::int32_t gwysiwyg;        // 0: whether the dialog editor's place matches the drawing
-extern TZ_API TzScreenPoint gcPoint;        // zeros: the dialog editor's window
+extern TZ_API std::int32_t gwysiwyg;  // 0: whether the dialog editor's place matches the drawing
+extern TZ_API TzScreenPoint gcPoint;  // zeros: the dialog editor's window
 extern TZ_API TzScreenRect gcRect;
-extern TZ_API std::int32_t giPoints;        // 16: point size in the dialog editor
-extern TZ_API double gdx;                   // 0, 0: the edited text's first point
+extern TZ_API std::int32_t giPoints;  // 16: point size in the dialog editor
+extern TZ_API double gdx;             // 0, 0: the edited text's first point
 extern TZ_API double gdy;
 extern TZ_API EasyObject<TzDbMText>* gpText;  // null: the text being edited
-extern TZ_API void* gpFontList;             // null: font list of the dialog editor
+extern TZ_API void* gpFontList;               // null: font list of the dialog editor
 extern TZ_API std::uint8_t g_bEnableFieldUI;  // 1: whether fields may be typed as such; set at load
-extern TZ_API std::int32_t gPixelsPerInch;  // 0
+extern TZ_API std::int32_t gPixelsPerInch;    // 0
 
 // Conversion between markup and rich text.
 extern TZ_API std::int32_t g_nDefaultTabTwips;  // 0: default tab width, twips
-extern TZ_API double gdTweakFactor;         // 0.72: indents and tabs of the markup over twips
-extern TZ_API double g_dWidthFactor;        // 1: scaling of margins
+extern TZ_API double gdTweakFactor;             // 0.72: indents and tabs of the markup over twips
+extern TZ_API double g_dWidthFactor;            // 1: scaling of margins
 extern TZ_API std::int64_t TZDB_FIELDCODE_MODIFIED;  // 1
 extern TZ_API wchar_t const* gszStartOfStackToken;   // "\S"
 extern TZ_API wchar_t const* gszEndOfStackToken;     // "\s"
-extern TZ_API TzString g_sInitialFont;      // empty
+extern TZ_API TzString g_sInitialFont;               // empty
 
 // The font map file.
 extern TZ_API wchar_t const* gszIniSHXSectMapDatabase;         // "SHX Map"
@@ -57,8 +57,8 @@ extern TZ_API wchar_t const* gszIniMiscSectMapDatabase;        // "Misc Map"
 extern TZ_API wchar_t const* gszIniSectProxyFiles;             // "Proxy Fonts"
 extern TZ_API wchar_t const* gszIniKeyOneWaySubst;             // "OneWaySubstitution"
 extern TZ_API wchar_t const* gszIniKeyBigfontProxy;            // "Default Bigfont Proxy"
-extern TZ_API TzString gsExtensionSHX;      // ".shx"
-extern TZ_API TzString gsIniFileDatabase;   // empty: path of the font map file
+extern TZ_API TzString gsExtensionSHX;                         // ".shx"
+extern TZ_API TzString gsIniFileDatabase;                      // empty: path of the font map file
 
 // Names that the module registers; local names are empty until it is loaded.
 extern TZ_API TzString gsEditMtext_GlobalName, gsEditMtext_LocalName;
@@ -68,9 +68,9 @@ extern TZ_API TzString gsMtext_GlobalName, gsMtext_LocalName;
 extern TZ_API TzString gsCompatibleMtext_GlobalName, gsCompatibleMtext_LocalName;
 extern TZ_API TzString gsMtprop_GlobalName, gsMtprop_LocalName;
 extern TZ_API TzString gsMtextProperties_GlobalName, gsMtextProperties_LocalName;
-extern TZ_API TzString gsServiceName;       // "TzMTextService_TZC"
-extern TZ_API TzString gsCommandGroupName;  // "TZCORE_MTEXT"
-extern TZ_API TzString gsMtextRegistryKey;  // empty
+extern TZ_API TzString gsServiceName;            // "TzMTextService_TZC"
+extern TZ_API TzString gsCommandGroupName;       // "TZCORE_MTEXT"
+extern TZ_API TzString gsMtextRegistryKey;       // empty
 extern TZ_API TzString gsLocalizationSeparator;  // " _"
 }
 

@@ -8,16 +8,17 @@
 #include "tz/rx/object.h"
 #include "tz/text/string.h"
 
-// One run of MTEXT: the options that its questions change, the questions, and the making of the entity.
+// One run of MTEXT: the options that its questions change, the questions, and the making of the
+// entity.
 //
 //   TzxMtextCommand* command = newTzxMtextCommand();
 //   command->UseCommandLineEditor(true);
 //   if (command->DoMainPrompt(false, true)) command->CreateObject(nullptr, false);
 //   delete command;
 //
-// Lengths in drawing units, angles in radians; points in world coordinates but for firstCornerUcs. The
-// constructor reads the drawing's defaults, so a drawing must be open. A question that returns false was
-// cancelled and changed nothing.
+// Lengths in drawing units, angles in radians; points in world coordinates but for firstCornerUcs.
+// The constructor reads the drawing's defaults, so a drawing must be open. A question that returns
+// false was cancelled and changed nothing.
 
 // The options and the questions that commands share.
 class TZ_API TzxMtextCommandBase {
@@ -28,8 +29,8 @@ public:
     // Whether a text style of that name is in the drawing.
     [[nodiscard]] bool IsStyleNameOK(TzString const& name) const;
     // Reads the options from an entity, or writes them to one that is open for write. They are not
-    // exact inverses: reading adds the working globals' angle to the rotation, writing does not take
-    // it away.
+    // exact inverses: reading adds the working globals' angle to the rotation, writing does not
+    // take it away.
     void setMTextOptionsFrom(TzDbMText* entity);
     void setMTextOptionsTo(TzDbMText* entity) const;
     // The text height that the style in force gives.
@@ -56,15 +57,15 @@ public:
     unsigned int attachmentId = 1048;   // keyword 1048 to 1056, top left to bottom right
     unsigned int directionId = 1057;    // keyword of the flow direction; nothing changes it
     double boxWidth = 0;
-    double boxHeight = 0;               // of the box or of the columns
+    double boxHeight = 0;  // of the box or of the columns
     double textHeight = 0;
     double rotation = 0;
     double location[3] = {0, 0, 0};
     double firstCornerUcs[3] = {0, 0, 0};
     TzString styleName;
     TzString contents;
-    bool boxDragged = false;            // the second corner was picked in the drag
-    int lineSpacingStyle = 1;           // 1 at least, 2 exactly
+    bool boxDragged = false;   // the second corner was picked in the drag
+    int lineSpacingStyle = 1;  // 1 at least, 2 exactly
     double lineSpacingFactor = 1;
     TzTelemetryCmdHelper telemetry;
 };
@@ -85,12 +86,16 @@ public:
     bool DoColumnWidthPrompt();
     bool DoColumnGutterPrompt();
     bool DoColumnHeightPrompt();
-    // Makes the entity: a new one, posted to the drawing, with `existing` null; else fills the caller's,
-    // which is not posted. True when the text was accepted.
+    // Makes the entity: a new one, posted to the drawing, with `existing` null; else fills the
+    // caller's, which is not posted. True when the text was accepted.
     int CreateObject(TzDbMText* existing, bool forAttribute);
     // For outside callers, instead of the first questions.
-    void setInitialProperties(TzGePoint3d const& location, double width, double rotation, double height,
-                              unsigned int attachmentId, wchar_t const* styleName);
+    void setInitialProperties(TzGePoint3d const& location,
+                              double width,
+                              double rotation,
+                              double height,
+                              unsigned int attachmentId,
+                              wchar_t const* styleName);
 
     static TzRxClass* gpDesc;
     static TzRxClass* desc();

@@ -3,8 +3,8 @@
 #include "tz/export.h"
 #include "tz/rx/object.h"
 
-// Descriptors of runtime classes. A module registers its classes in this order and takes them back at
-// unload:
+// Descriptors of runtime classes. A module registers its classes in this order and takes them back
+// at unload:
 //   1. newTzRxClass for each class
 //   2. tzrxBuildClassHierarchy once
 //   3. deleteTzRxClass for each class
@@ -31,10 +31,13 @@ public:
 using TzRxCreator = TzRxObject* (*)();
 
 // [any] Registers a class and returns its descriptor; null when the name is taken. `parent` is the
-// parent's name, resolved by tzrxBuildClassHierarchy; `proxyFlags` is 0; `creator` may be null for an
-// abstract class; the names for drawing files and of the application may be null.
-[[nodiscard]] TZ_API TzRxClass* newTzRxClass(wchar_t const* name, wchar_t const* parent, int proxyFlags,
-                                             TzRxCreator creator, wchar_t const* dxfName,
+// parent's name, resolved by tzrxBuildClassHierarchy; `proxyFlags` is 0; `creator` may be null for
+// an abstract class; the names for drawing files and of the application may be null.
+[[nodiscard]] TZ_API TzRxClass* newTzRxClass(wchar_t const* name,
+                                             wchar_t const* parent,
+                                             int proxyFlags,
+                                             TzRxCreator creator,
+                                             wchar_t const* dxfName,
                                              wchar_t const* appName);
 // [any] Removes the class and frees its descriptor; null is ignored.
 TZ_API void deleteTzRxClass(TzRxClass* descriptor);

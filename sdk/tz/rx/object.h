@@ -9,7 +9,8 @@ class TzRxClass;
 //
 //   if (TzDbMText* text = tzrxCast<TzDbMText>(object)) ...
 //
-// Descriptors live from `newTzRxClass` to `deleteTzRxClass`; those of the host live with the process.
+// Descriptors live from `newTzRxClass` to `deleteTzRxClass`; those of the host live with the
+// process.
 class TZ_API TzRxObject {
 public:
     virtual ~TzRxObject() = default;
@@ -18,8 +19,9 @@ public:
     [[nodiscard]] virtual TzRxClass* isA() const;
     // [any] Whether the object's class is `other` or derives from it; null gives false.
     [[nodiscard]] bool isKindOf(TzRxClass const* other) const;
-    // [any] The extension object that `other`'s interface has on this object's class or on the nearest
-    // of its parents; null when there is none. Owned by the class, valid as long as it is registered.
+    // [any] The extension object that `other`'s interface has on this object's class or on the
+    // nearest of its parents; null when there is none. Owned by the class, valid as long as it is
+    // registered.
     [[nodiscard]] TzRxObject* queryX(TzRxClass const* other) const;
 
     [[nodiscard]] static TzRxClass* desc();
@@ -39,7 +41,8 @@ template <class T>
 [[nodiscard]] T const* tzrxCast(TzRxObject const* object) {
     return object && object->isKindOf(T::desc()) ? static_cast<T const*>(object) : nullptr;
 }
-// The extension of interface T that stands on the object's class; null without an object or extension.
+// The extension of interface T that stands on the object's class; null without an object or
+// extension.
 template <class T>
 [[nodiscard]] T* tzrxQuery(TzRxObject const* object) {
     return object ? static_cast<T*>(object->queryX(T::desc())) : nullptr;
