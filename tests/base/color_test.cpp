@@ -61,7 +61,7 @@ struct NearestRow {
 constexpr NearestRow kNearestRows[] = {
     {255, 0,   0,   1  }, // 10 is the same red
     {254, 1,   1,   1  },
-    {0,   0,   0,   18 }, // the darkest red is nearer than any grey
+    {0,   0,   0,   250}, // grey 40 is nearer than the darkest red
     {255, 255, 255, 7  },
     {128, 128, 128, 8  },
     {127, 127, 255, 171},

@@ -1,0 +1,60 @@
+#pragma once
+
+#include <cstdint>
+#include <functional>
+
+#include "tz/export.h"
+
+// What the user has set for the host's products, and what kind of process this is.
+//
+//   using namespace Tzworks::Tzdraft::PAL;
+//   Settings::read().getProductSettings(
+//       L"MTEXT.IPE",
+//       [&](Settings::Container const& values) {
+//           if (values.exists(L"MinPixelSize")) size = values.getUInt32(L"MinPixelSize");
+//           return true;
+//       },
+//       true);
+//
+// [any]
+namespace Tzworks::Tzdraft::PAL {
+
+namespace Settings {
+
+// The values under one name. Valid while the reader runs.
+class TZ_API Container {
+public:
+    virtual ~Container() = default;
+    [[nodiscard]] virtual bool exists(wchar_t const* key) const = 0;
+    // 0 for a key that does not exist.
+    [[nodiscard]] virtual std::uint32_t getUInt32(wchar_t const* key) const = 0;
+};
+
+// The settings as they were when they were read.
+class TZ_API Roots {
+public:
+    using Reader = std::function<bool(Container const& values)>;
+
+    // Calls `reader` once with the values under that name, none of which exist when the user has
+    // set none. With `userValues` false only the product's own values count, of which this host has
+    // none. Gives what the reader gave, or false when the settings could not be read.
+    bool getProductSettings(wchar_t const* name, Reader const& reader, bool userValues) const;
+};
+
+[[nodiscard]] TZ_API Roots read();
+
+}  // namespace Settings
+
+namespace Process {
+
+// Whether the host runs as a service without a window of its own, where only the in-place editor
+// may be used.
+[[nodiscard]] TZ_API bool isFabric();
+
+}  // namespace Process
+
+}  // namespace Tzworks::Tzdraft::PAL
+
+// Whether the product may offer a feature. `encodedName` is the feature's name with each character
+// code raised by one.
+[[nodiscard]] TZ_API bool IsCommandAllowed(wchar_t const* encodedName);
