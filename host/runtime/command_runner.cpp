@@ -2,6 +2,7 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/variables.h"
+#include "host/faults/memory.h"
 #include "host/runtime/command_stack.h"
 
 namespace tzhost {
@@ -88,6 +89,7 @@ void clearCommandHooks() {
 Audit runCommand(Command const& command, AnswersFrom answers) {
     {
         Run const run(command, answers);
+        MemoryFaultScope const memory;
         command.callback();
     }
     return audit();

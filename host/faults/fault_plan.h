@@ -1,0 +1,61 @@
+#pragma once
+
+#include <map>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+// Which calls of which host operations fail. A plan is made of rules in the form
+//
+//   NAME[:K][=STATUS]
+//
+// NAME is the operation as it is declared ("tzdbOpenObject", "TzEdJig::drag"), or "operator new"
+// for memory; its K-th call fails (1 when left out, "*" every one), with STATUS or with its usual
+// failure.
+//
+//   tzhost::FaultPlan plan;
+//   if (auto const problem = plan.add("tzedGetPoint:2=-5002")) say(*problem);
+//   plan.install();
+//
+// An installed plan also counts the calls, so that an empty one measures what a run calls. One plan
+// is installed at a time; it must outlive that. Not thread-safe.
+namespace tzhost {
+
+class FaultPlan {
+public:
+    FaultPlan() = default;
+    FaultPlan(FaultPlan const&) = delete;
+    FaultPlan& operator=(FaultPlan const&) = delete;
+    ~FaultPlan() { remove(); }
+
+    // Adds a rule; what is wrong with it, or nothing.
+    [[nodiscard]] std::optional<std::string> add(std::string_view rule);
+    // Puts this plan in force, in place of the one before.
+    void install();
+    // No plan is in force any more, if it was this one.
+    void remove();
+    // Forgets rules and counts.
+    void clear();
+
+    // Calls met since install or clear, by operation.
+    [[nodiscard]] std::map<std::string, long, std::less<>> const& calls() const { return calls_; }
+    // Whether a rule has struck since then.
+    [[nodiscard]] bool hasStruck() const { return struck_; }
+
+private:
+    struct Rule {
+        std::string name;
+        long call = 1;  // 0: every one
+        std::optional<int> status;
+    };
+
+    static bool decide(std::string_view operation, int& status);
+    bool strike(std::string_view operation, int& status);
+
+    std::vector<Rule> rules_;
+    std::map<std::string, long, std::less<>> calls_;
+    bool struck_ = false;
+};
+
+}  // namespace tzhost

@@ -1,0 +1,24 @@
+#pragma once
+
+// Memory as a host operation that can fail. The host's library replaces the global `operator new`;
+// it asks the fault plan under the name "operator new", but only within a MemoryFaultScope, which
+// the run of a command opens, and never within a pause. Otherwise it is malloc.
+namespace tzhost {
+
+class MemoryFaultScope {
+public:
+    MemoryFaultScope() noexcept;
+    MemoryFaultScope(MemoryFaultScope const&) = delete;
+    MemoryFaultScope& operator=(MemoryFaultScope const&) = delete;
+    ~MemoryFaultScope();
+};
+
+class MemoryFaultPause {
+public:
+    MemoryFaultPause() noexcept;
+    MemoryFaultPause(MemoryFaultPause const&) = delete;
+    MemoryFaultPause& operator=(MemoryFaultPause const&) = delete;
+    ~MemoryFaultPause();
+};
+
+}  // namespace tzhost
