@@ -76,6 +76,18 @@ void DrawPass::addLines(std::vector<TzGePoint3d> points, bool closed) {
     });
 }
 
+void DrawPass::place(DrawnText& text) const {
+    if (transforms_.empty()) return;
+    TzGeMatrix3d const& matrix = transforms_.back();
+    TzGeVector3d const along = matrix * text.direction.normal();
+    // The normal stays upright on the text's plane, which a skew turns otherwise than a vector.
+    TzGeVector3d const up = matrix * text.normal.crossProduct(text.direction);
+    text.position.transformBy(matrix);
+    text.direction = along.normal();
+    text.normal = along.crossProduct(up).normal();
+    text.style.setTextSize(text.style.textSize() * along.length());
+}
+
 TzGeMatrix3d const& DrawPass::transform() const {
     return transforms_.empty() ? TzGeMatrix3d::kIdentity : transforms_.back();
 }
@@ -115,18 +127,9 @@ bool DrawPass::Geometry::text(TzGePoint3d const& position,
                               bool raw,
                               TzGiTextStyle const& style) {
     TzString const whole(text);
-    TzGeMatrix3d const& matrix = pass_.transform();
-    DrawnText drawn;
-    drawn.text = length < 0 ? whole : whole.left(length);
-    drawn.position = matrix * position;
-    drawn.direction = (matrix * direction).normal();
-    // The normal goes with the plane of the text, which a mirror or a skew turns otherwise than it
-    // turns a vector.
-    TzGeVector3d const up = matrix * normal.crossProduct(direction);
-    drawn.normal = drawn.direction.crossProduct(up).normal();
-    drawn.style = style;
-    drawn.style.setTextSize(style.textSize() * (matrix * direction.normal()).length());
-    drawn.raw = raw;
+    DrawnText drawn{
+        length < 0 ? whole : whole.left(length), position, normal, direction, style, raw};
+    pass_.place(drawn);
     pass_.list_.push_back({pass_.traits_.pen(), std::move(drawn)});
     return true;
 }

@@ -92,6 +92,8 @@ private:
     void drawNested(TzGiDrawable& drawable);
     bool take(TzDbEntity const& entity, wchar_t const* type, TzGePoint3d const& position);
     void addLines(std::vector<TzGePoint3d> points, bool closed);
+    // Brings a text from the innermost transform's coordinates to those of the world.
+    void place(DrawnText& text) const;
     [[nodiscard]] TzGeMatrix3d const& transform() const;
 
     Entities entities_;

@@ -1,0 +1,40 @@
+#include "host/display/view.h"
+
+#include <variant>
+
+#include "host/base/variables.h"
+#include "tz/ed/ucs.h"
+#include "tz/ge/arbitrary_axis.h"
+
+namespace tzhost {
+
+Space activeSpace() {
+    Variables const& variables = Variables::instance();
+    bool const onPaper = variables.number(L"TILEMODE") == 0 && variables.number(L"CVPORT") == 1;
+    return onPaper ? Space::paper : Space::model;
+}
+
+ViewAxes::ViewAxes(TzGeVector3d const& towardsViewer) {
+    TzGeMatrix3d const axes = atwt(towardsViewer);
+    x_ = axes.xAxis();
+    y_ = axes.yAxis();
+}
+
+TzGePoint2d ViewAxes::project(TzGePoint3d const& world) const {
+    return TzGePoint2d() + project(world.asVector());
+}
+
+TzGeVector2d ViewAxes::project(TzGeVector3d const& world) const {
+    return {world.dotProduct(x_), world.dotProduct(y_)};
+}
+
+ViewAxes viewAxes(Space space) {
+    if (space == Space::paper) return ViewAxes();
+    VariableValue const* const value = Variables::instance().get(L"VIEWDIR");
+    auto const* const user = value ? std::get_if<VariablePoint>(value) : nullptr;
+    VariablePoint world{};
+    if (!user || !tzdbUcs2Wcs(user->data(), world.data(), true)) return ViewAxes();
+    return ViewAxes(TzGeVector3d(world[0], world[1], world[2]));
+}
+
+}  // namespace tzhost
