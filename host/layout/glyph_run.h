@@ -1,0 +1,20 @@
+#pragma once
+
+#include <string>
+
+#include "host/layout/text_line.h"
+
+// The step from a look to a run of letters.
+namespace tzhost {
+
+// From one letter of a vertical text to the next, in text heights.
+inline constexpr double kVerticalStep = 4.0 / 3.0;
+
+// What an advance in heights of capitals is multiplied by.
+[[nodiscard]] double advanceScale(LineFormat const& format, WholeText const& whole);
+
+// A run of `text` at the start of a baseline; its advance is left at 0.
+[[nodiscard]] GlyphRun
+makeGlyphRun(std::wstring const& text, LineFormat const& format, WholeText const& whole);
+
+}  // namespace tzhost

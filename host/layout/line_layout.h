@@ -1,0 +1,26 @@
+#pragma once
+
+#include <string>
+
+#include "host/layout/layout_types.h"
+
+// Lays out a single line: TEXT, attributes, and whatever is measured as a text of one style.
+//
+//   LineLayout const line = layOutLine({L"A-12", 0.2, style, {}});
+//   // line.box: from the insertion point to the end of the advance and the top of capitals
+//
+// A vertical style stacks upright letters downwards, centred under the insertion point, 4/3 of the
+// text height from one to the next; its box goes from the foot of the last letter to the insertion
+// point. Backward and upside-down styles turn text and box over about the insertion point.
+namespace tzhost {
+
+[[nodiscard]] LineLayout layOutLine(LineLayoutInput const& input);
+
+// A line's text with its character codes (backslash, U or M, "+" and digits) replaced by what they
+// stand for. Anything else stands as written: a single line knows no other markup.
+[[nodiscard]] std::wstring decodeLineText(std::wstring const& text);
+
+// Whether a style writes from top to bottom: by its flag, or by a typeface with a leading "@".
+[[nodiscard]] bool isVerticalStyle(LayoutStyle const& style);
+
+}  // namespace tzhost
