@@ -1,0 +1,75 @@
+#include "host/command_line/keyword_list.h"
+
+#include "tz/text/string.h"
+
+namespace tzhost {
+
+namespace {
+
+constexpr std::wstring_view kGlobalMark = L" _";
+
+std::vector<std::wstring> splitWords(std::wstring_view list) {
+    std::vector<std::wstring> words;
+    while (true) {
+        std::size_t const start = list.find_first_not_of(L' ');
+        if (start == std::wstring_view::npos) return words;
+        list.remove_prefix(start);
+        words.emplace_back(list.substr(0, list.find(L' ')));
+        list.remove_prefix(words.back().size());
+    }
+}
+
+bool isSame(std::wstring_view a, std::wstring_view b) {
+    if (a.size() != b.size()) return false;
+    for (std::size_t i = 0; i < a.size(); ++i) {
+        if (tzToLower(a[i]) != tzToLower(b[i])) return false;
+    }
+    return true;
+}
+
+bool isCapital(wchar_t c) {
+    return tzToLower(c) != c;
+}
+
+bool isMeant(std::wstring_view answer, std::wstring_view word) {
+    if (isSame(answer, word)) return true;
+    std::wstring capitals;
+    std::size_t holdsAll = 0;  // the length of the shortest leading part with every capital
+    for (std::size_t i = 0; i < word.size(); ++i) {
+        if (!isCapital(word[i])) continue;
+        capitals += word[i];
+        holdsAll = i + 1;
+    }
+    if (capitals.empty()) return false;
+    if (isSame(answer, capitals)) return true;
+    return answer.size() >= holdsAll && isSame(answer, word.substr(0, answer.size()));
+}
+
+std::optional<int> findMeant(std::wstring_view answer, std::vector<std::wstring> const& words) {
+    for (std::size_t i = 0; i < words.size(); ++i) {
+        if (isMeant(answer, words[i])) return static_cast<int>(i);
+    }
+    return std::nullopt;
+}
+
+}  // namespace
+
+std::optional<KeywordList> KeywordList::parse(std::wstring_view list) {
+    KeywordList result;
+    std::size_t const mark = list.find(kGlobalMark);
+    result.locals_ = splitWords(list.substr(0, mark));
+    result.globals_ = mark == std::wstring_view::npos
+                          ? result.locals_
+                          : splitWords(list.substr(mark + kGlobalMark.size()));
+    if (result.locals_.size() != result.globals_.size()) return std::nullopt;
+    return result;
+}
+
+std::optional<int> KeywordList::match(std::wstring_view answer) const {
+    if (answer.empty()) return std::nullopt;
+    if (answer.front() == L'_') return findMeant(answer.substr(1), globals_);
+    auto const local = findMeant(answer, locals_);
+    return local ? local : findMeant(answer, globals_);
+}
+
+}  // namespace tzhost
