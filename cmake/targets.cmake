@@ -1,4 +1,4 @@
-# The five words that every CMakeLists.txt below uses:
+# The words that every CMakeLists.txt below uses:
 #
 #   add_layer(NAME sources...)                        one folder of the layer table (headers are found)
 #   add_test_support(NAME sources... [LIBS layers...])  shared code of the suites
@@ -6,6 +6,7 @@
 #   add_fuzz(NAME source [LIBS layers...])            a fuzzer and the replay of its seeds, target fuzz_NAME
 #   add_bench(NAME sources... [LIBS layers...])       a benchmark (release only), target bench_NAME
 #   add_example_module(NAME sources...)               a further module lib/NAME.tzx, built from sdk/ alone
+#   add_lint(NAME command...)                         a check of the source tree, test lint.NAME
 #
 # LIBS names layers (module_markup, app_tzdraft), support libraries or third-party targets; a layer
 # brings the layers of its row along, and libtz is always there.
@@ -212,6 +213,12 @@ function(tz_test_environment test name)
     endif()
     set_tests_properties(${test} PROPERTIES TIMEOUT 900 WORKING_DIRECTORY ${scratch}
         ENVIRONMENT "${environment}" ENVIRONMENT_MODIFICATION "VISUAL=unset:;EDITOR=unset:")
+endfunction()
+
+# Runs in the root of the source tree; exit status 77 skips it.
+function(add_lint name)
+    add_test(NAME lint.${name} COMMAND ${ARGN} WORKING_DIRECTORY ${PROJECT_SOURCE_DIR})
+    set_tests_properties(lint.${name} PROPERTIES SKIP_RETURN_CODE 77 TIMEOUT 600)
 endfunction()
 
 function(add_fuzz name source)

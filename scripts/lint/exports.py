@@ -1,8 +1,9 @@
 #!/usr/bin/env python3
 """Turns the module's list of exported names into a linker version script, or compares it with the
-module. Exit status 77 when there is no module to compare with."""
+module and with the bodies that carry the export mark. Exit status 77 when there is no module."""
 import argparse
 import fnmatch
+import glob
 import os
 import re
 import subprocess
@@ -36,16 +37,31 @@ def version_script(names):
     return "\n".join(lines + ["local:", "    *;", "};", ""])
 
 
-def exported(module):
-    """Pairs of mangled and readable name."""
-    def nm(*options):
-        command = ["nm", "-D", "--defined-only", "--format=posix", *options, module]
-        return subprocess.run(command, check=True, capture_output=True, text=True).stdout.splitlines()
+def output_of(*command, **options):
+    return subprocess.run(command, check=True, capture_output=True, text=True, **options).stdout
 
-    mangled = [line.split(" ")[0] for line in nm()]
-    readable = subprocess.run(["c++filt"], input="\n".join(mangled), check=True,
-                              capture_output=True, text=True).stdout.splitlines()
-    return list(zip(mangled, readable))
+
+def readable(mangled):
+    """Pairs of mangled and readable name."""
+    return list(zip(mangled, output_of("c++filt", input="\n".join(mangled)).splitlines()))
+
+
+def exported(module):
+    lines = output_of("nm", "-D", "--defined-only", "--format=posix", module).splitlines()
+    return readable([line.split(" ")[0] for line in lines])
+
+
+def marked(folder):
+    """What the layers of the module define with the export mark. Weak names are inline functions of
+    the interface, which every user of it holds."""
+    names = set()
+    for archive in glob.glob(os.path.join(folder, "libmodule_*.a")):
+        for line in output_of("readelf", "-sW", archive).splitlines():
+            fields = line.split()
+            if len(fields) == 8 and fields[3] in ("FUNC", "OBJECT") and fields[6] != "UND" \
+                    and fields[4:6] == ["GLOBAL", "DEFAULT"]:
+                names.add(fields[7])
+    return readable(sorted(names))
 
 
 def fits(entry, mangled, readable):
@@ -54,10 +70,14 @@ def fits(entry, mangled, readable):
     return entry in (mangled, readable)
 
 
-def compare(names, module):
+def compare(names, module, archives):
+    def unlisted(symbols):
+        return [shown for mangled, shown in symbols
+                if not any(fits(entry, mangled, shown) for entry in names)]
+
     symbols = exported(module)
-    faults = [f"exported but not in the list: {readable}" for mangled, readable in symbols
-              if not any(fits(entry, mangled, readable) for entry in names)]
+    faults = [f"exported but not in the list: {name}" for name in unlisted(symbols)]
+    faults += [f"marked and defined but not in the list: {name}" for name in unlisted(marked(archives))]
     faults += [f"in the list but not exported: {entry}" for entry in names
                if not any(fits(entry, *symbol) for symbol in symbols)]
     faults += [f"twice in the list: {name}" for name in sorted(set(names)) if names.count(name) > 1]
@@ -68,7 +88,8 @@ def main():
     parser = argparse.ArgumentParser(description=__doc__)
     parser.add_argument("--list", required=True)
     parser.add_argument("--version-script")
-    parser.add_argument("--module")
+    parser.add_argument("--module", help="the built module, to compare with")
+    parser.add_argument("--archives", help="the folder of the layers that it was made of")
     options = parser.parse_args()
     names = read_list(options.list)
     if options.version_script:
@@ -78,7 +99,7 @@ def main():
         if not os.path.exists(options.module):
             print("no module was built")
             return 77
-        faults = compare(names, options.module)
+        faults = compare(names, options.module, options.archives)
         print("\n".join(faults) or f"{len(names)} names, all exported, nothing else")
         return 1 if faults else 0
     return 0
