@@ -59,7 +59,8 @@ def marked(folder):
         for line in output_of("readelf", "-sW", archive).splitlines():
             fields = line.split()
             if len(fields) == 8 and fields[3] in ("FUNC", "OBJECT") and fields[6] != "UND" \
-                    and fields[4:6] == ["GLOBAL", "DEFAULT"]:
+                    and fields[4:6] == ["GLOBAL", "DEFAULT"] \
+                    and not fields[7].startswith("__odr_asan."):
                 names.add(fields[7])
     return readable(sorted(names))
 
