@@ -26,7 +26,7 @@ public:
 
 class TZ_API TzDbSymbolTableRecord : public TzDbObject {
 public:
-    // [any] Valid while the record is open; null never.
+    // [any] Valid until the record is renamed or erased; null never.
     [[nodiscard]] wchar_t const* getName() const;
     // [write-open] Refuses an empty name, or one that the table has.
     Tzad::ErrorStatus setName(wchar_t const* name);

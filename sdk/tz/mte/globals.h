@@ -11,6 +11,14 @@
 // and live from its load to its unload; the module alone writes them, on the host's one thread.
 // First values stand behind each.
 
+// The module's texts by their ids, with variables expanded: "{NAME}" stands for a system variable's
+// value,
+// "{(}" and "{)}" for braces. An id without a text gives the empty text. [any]
+class TZ_API TzStringTable {
+public:
+    [[nodiscard]] TzString operator[](unsigned int id) const;
+};
+
 // A point and a rectangle of the screen, in pixels.
 struct TzScreenPoint {
     std::int32_t x = 0;
@@ -68,10 +76,11 @@ extern TZ_API TzString gsMtext_GlobalName, gsMtext_LocalName;
 extern TZ_API TzString gsCompatibleMtext_GlobalName, gsCompatibleMtext_LocalName;
 extern TZ_API TzString gsMtprop_GlobalName, gsMtprop_LocalName;
 extern TZ_API TzString gsMtextProperties_GlobalName, gsMtextProperties_LocalName;
-extern TZ_API TzString gsServiceName;            // "TzMTextService_TZC"
-extern TZ_API TzString gsCommandGroupName;       // "TZCORE_MTEXT"
+extern TZ_API TzString gsServiceName;            // empty; "TzMTextService_TZC" once loaded
+extern TZ_API TzString gsCommandGroupName;       // empty; "TZCORE_MTEXT" once loaded
 extern TZ_API TzString gsMtextRegistryKey;       // empty
 extern TZ_API TzString gsLocalizationSeparator;  // " _"
+extern TZ_API TzStringTable gStringTable;
 }
 
 // The stack characters, "/#^", without a terminator and directly ahead of the resource file's name:

@@ -1,0 +1,29 @@
+#include "module/access/mtext_versioner.h"
+
+#include "module/access/string_table.h"
+#include "tz/pal/message_box.h"
+
+namespace {
+
+constexpr int kFirstNewerFormat = 4;
+constexpr unsigned int kTooNewMessage = 229;
+
+}  // namespace
+
+MTextVersioner::MTextVersioner(TzDbMText* text)
+    : TextEditor(text, true, false, false, false, 0.0, 0.0, 0.0, false, false) {}
+
+MTextVersioner::~MTextVersioner() = default;
+
+bool MTextVersioner::isNewer(wchar_t const* contents) {
+    initialize(contents);
+    bool const newer = !unreadable_.IsEmpty() || from_mtext(contents) >= kFirstNewerFormat;
+    uninitialize();
+    return newer;
+}
+
+bool MTextVersioner::too_new(wchar_t const* contents) {
+    if (!isNewer(contents)) return false;
+    MessageBox(nullptr, gStringTable[kTooNewMessage], nullptr, kMessageBoxError);
+    return true;
+}

@@ -1,0 +1,67 @@
+#pragma once
+
+#include "module/prompt/keyword_table.h"
+#include "tz/text/string.h"
+
+// One question at the command line. An input is built on the stack, told its default, asked,
+// usually in a loop, and read:
+//
+//   CKeywordTable none;
+//   CTzsRealInput input(6, none, gStringTable[1111]);
+//   input.SetDefault(6.0);
+//   int const status = input.Prompt();      // "Prompt text [Keywords] <Default>: "
+//   if (status == statusNone || status == statusNormal) use(input.GetReal());
+//
+// An input prints no error and never repeats by itself; it gives the host's status.
+
+enum PromptStatus : int {
+    statusNormal = 5100,   // a value was given
+    statusNone = 5000,     // an empty answer
+    statusError = -5001,   // a failure or a refused answer
+    statusCancel = -5002,  // the user cancelled
+    statusKeyword = -5005  // a keyword or free text was given
+};
+
+class CTzsInput {
+public:
+    // `flags` go to tzedInitGet with each asking. The table is copied, its ids stay borrowed.
+    CTzsInput(unsigned int theFlags, CKeywordTable& table, TzString const& prompt);
+    CTzsInput(CTzsInput const&) = delete;
+    CTzsInput& operator=(CTzsInput const&) = delete;
+
+    // Asks once and ends the line; the status.
+    virtual int Prompt();
+    // The text of the last answer: the global word of a keyword, or free text.
+    virtual TzString GetInput();
+    // The id of the keyword that was answered; 0 when the answer is none.
+    virtual unsigned int GetKeyword();
+    virtual ~CTzsInput();
+    // The keywords as tzedInitGet takes them: local words, a separator, global words.
+    [[nodiscard]] virtual TzString KeywordList() const;
+    // One part of a keyword's text; empty for an id that is not in the table.
+    [[nodiscard]] virtual TzString GetKeywordString(unsigned int id, bool local) const;
+    // The prompt with brackets and default, without the colon. The body gives what stands in the
+    // brackets.
+    [[nodiscard]] virtual TzString PromptString() const = 0;
+    // The two steps of Prompt: arms the host for the next question; asks the host for the status.
+    virtual void Init();
+    virtual int OnPrompt(TzString const& prompt) = 0;
+    virtual void SetFlags(unsigned int newFlags);
+    [[nodiscard]] virtual unsigned int GetFlags() const;
+
+    [[nodiscard]] int GetKeywordCount() const { return keywords.GetCount(); }
+
+protected:
+    // `text` with the keywords behind it in brackets; the keywords alone when it is empty.
+    [[nodiscard]] TzString DefaultPrompt(TzString const& text) const;
+    [[nodiscard]] TzString DefaultPrompt() const { return DefaultPrompt(promptText); }
+    // The same with a default, in angle brackets, ahead of the keywords.
+    [[nodiscard]] TzString PromptWithDefault(TzString const& shownDefault) const;
+
+    TzString promptText;  // without default, keywords and colon
+    TzString inputText;   // the last text answer
+    CKeywordTable keywords;
+    unsigned int flags;
+    TzString keywordList;
+    TzString reserved;  // stays empty
+};

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "module/prompt/input.h"
+
+// Asks for a whole number from 2 to 100, as column counts need; the host refuses any other and asks
+// again. An empty answer gives statusNone, and the result is then the default.
+//
+//   CTzsIntegerInput input(0x138F, none, gStringTable[1109]);
+//   input.SetDefault(2);
+//   if (input.Prompt() != statusCancel) use(input.GetInteger());
+class CTzsIntegerInput : public CTzsInput {
+public:
+    using CTzsInput::CTzsInput;
+
+    // Also lets an empty answer through (bit 0 of the flags) that the flags refused.
+    virtual void SetDefault(int value);
+    [[nodiscard]] virtual int GetInteger() const;
+    // The default as the prompt shows it.
+    [[nodiscard]] virtual TzString FormattedInteger() const;
+    [[nodiscard]] virtual int GetDefault() const;
+    [[nodiscard]] virtual bool HasDefault() const;
+
+    [[nodiscard]] TzString PromptString() const override;
+    int OnPrompt(TzString const& prompt) override;
+
+private:
+    int result_ = 0;
+    int default_ = 0;
+    bool hasDefault_ = false;
+};
