@@ -1,0 +1,99 @@
+#include "apps/tzdraft/commands/ask.h"
+
+#include "tz/ed/prompts.h"
+#include "tz/ed/units.h"
+#include "tz/rx/status.h"
+
+namespace tzdraft {
+namespace {
+
+constexpr int kDecimal = 2;
+constexpr int kShownDecimals = 4;
+
+TzString withDefault(wchar_t const* question, TzString const& shown) {
+    return TzString::formatted(L"\n%ls <%ls>: ", question, shown.kwszPtr());
+}
+
+// Asks until the host gives a value, an empty answer or a cancel.
+template <class Ask>
+Asked askUntilDecided(wchar_t const* keywords, Ask ask) {
+    for (;;) {
+        (void)tzedInitGet(0, keywords);  // the lists of this program are well-formed
+        switch (ask()) {
+        case Tzad::ePromptNormal:
+        case Tzad::ePromptKeyword: return Asked::given;
+        case Tzad::ePromptNone: return Asked::empty;
+        case Tzad::ePromptCancel: return Asked::cancelled;
+        default: break;
+        }
+    }
+}
+
+}  // namespace
+
+Answer<TzString> askText(wchar_t const* question, TzString const& defaultText) {
+    TzString const prompt = defaultText.isEmpty() ? TzString::formatted(L"\n%ls: ", question)
+                                                  : withDefault(question, defaultText);
+    Answer<TzString> answer;
+    answer.asked = askUntilDecided(nullptr, [&] { return tzedGetString(1, prompt, answer.value); });
+    if (answer.asked == Asked::given && answer.value.isEmpty()) {
+        answer.value = defaultText;
+        if (defaultText.isEmpty()) answer.asked = Asked::empty;
+    }
+    return answer;
+}
+
+Answer<TzString>
+askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defaultWord) {
+    TzString const prompt = defaultWord ? withDefault(question, defaultWord)
+                                        : TzString::formatted(L"\n%ls: ", question);
+    Answer<TzString> answer;
+    answer.asked = askUntilDecided(keywords, [&] { return tzedGetKword(prompt, answer.value); });
+    if (answer.asked == Asked::empty && defaultWord) answer = {Asked::given, defaultWord};
+    return answer;
+}
+
+Answer<double> askReal(wchar_t const* question, double defaultValue) {
+    TzString shown;
+    (void)tzdbRToS(defaultValue, kDecimal, kShownDecimals, shown);
+    TzString const prompt = withDefault(question, shown);
+    Answer<double> answer;
+    answer.asked = askUntilDecided(nullptr, [&] { return tzedGetReal(prompt, &answer.value); });
+    if (answer.asked == Asked::empty) answer = {Asked::given, defaultValue};
+    return answer;
+}
+
+Answer<double> askAngle(wchar_t const* question, double defaultRadians) {
+    TzString shown;
+    (void)tzdbAngToS(defaultRadians, 0, kShownDecimals, shown);
+    TzString const prompt = withDefault(question, shown);
+    Answer<double> answer;
+    answer.asked =
+        askUntilDecided(nullptr, [&] { return tzedGetAngle(nullptr, prompt, &answer.value); });
+    if (answer.asked == Asked::empty) answer = {Asked::given, defaultRadians};
+    return answer;
+}
+
+Answer<bool> askYesNo(wchar_t const* question, bool defaultYes) {
+    Answer<TzString> const word = askKeyword(TzString::formatted(L"%ls [Yes/No]", question),
+                                             L"Yes No", defaultYes ? L"Yes" : L"No");
+    return {word.asked, word.value == L"Yes"};
+}
+
+PointAnswer askPoint(wchar_t const* question, TzGePoint3d const* base, wchar_t const* keywords) {
+    TzString const prompt = TzString::formatted(L"\n%ls: ", question);
+    double const from[3] = {base ? base->x : 0, base ? base->y : 0, base ? base->z : 0};
+    double point[3] = {0, 0, 0};
+    PointAnswer answer;
+    bool isWord = false;
+    answer.asked = askUntilDecided(keywords, [&] {
+        int const status = tzedGetPoint(base ? from : nullptr, prompt, point);
+        isWord = status == Tzad::ePromptKeyword;
+        return status;
+    });
+    if (isWord) (void)tzedGetInput(answer.word);  // an empty word matches none of the caller's
+    answer.point = TzGePoint3d(point[0], point[1], point[2]);
+    return answer;
+}
+
+}  // namespace tzdraft

@@ -1,0 +1,39 @@
+#pragma once
+
+#include "tz/ge/point3d.h"
+#include "tz/text/string.h"
+
+// The questions of the program's own commands, with their defaults shown as "<...>".
+namespace tzdraft {
+
+enum class Asked { given, empty, cancelled };
+
+template <class Value>
+struct Answer {
+    Asked asked = Asked::cancelled;
+    Value value{};
+
+    [[nodiscard]] bool isCancelled() const { return asked == Asked::cancelled; }
+};
+
+// Without a default an empty answer is `empty`; with one it gives the default.
+[[nodiscard]] Answer<TzString> askText(wchar_t const* question,
+                                       TzString const& defaultText = TzString());
+// The global word of the keyword; the default is one of the words.
+[[nodiscard]] Answer<TzString>
+askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defaultWord = nullptr);
+[[nodiscard]] Answer<double> askReal(wchar_t const* question, double defaultValue);
+// Radians.
+[[nodiscard]] Answer<double> askAngle(wchar_t const* question, double defaultRadians);
+[[nodiscard]] Answer<bool> askYesNo(wchar_t const* question, bool defaultYes);
+
+// A point in user coordinates or, with `keywords` not null, a keyword in `word`.
+struct PointAnswer {
+    Asked asked = Asked::cancelled;
+    TzGePoint3d point;
+    TzString word;
+};
+[[nodiscard]] PointAnswer
+askPoint(wchar_t const* question, TzGePoint3d const* base, wchar_t const* keywords = nullptr);
+
+}  // namespace tzdraft

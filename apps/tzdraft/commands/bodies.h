@@ -1,0 +1,19 @@
+#pragma once
+
+// Bodies of the program's own commands. Each asks its questions, does its work and prints what went
+// wrong; a cancelled question ends it with nothing changed by the question.
+namespace tzdraft {
+
+void newCommand();
+void openCommand();
+void saveCommand();
+void plotCommand();
+void quitCommand();
+void listCommand();
+void setvarCommand();
+void styleCommand();
+void layerCommand();
+void ucsCommand();
+void lineCommand();
+
+}  // namespace tzdraft

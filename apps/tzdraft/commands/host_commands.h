@@ -1,0 +1,20 @@
+#pragma once
+
+#include <span>
+
+namespace tzdraft {
+
+// A command of the program itself, beside those of modules.
+struct HostCommand {
+    wchar_t const* name;
+    void (*body)();
+    wchar_t const* help;  // one sentence, or several apart by line feeds
+};
+
+// All of them, by name.
+[[nodiscard]] std::span<HostCommand const> hostCommands();
+
+// Puts them on the host's command stack, with their help.
+void registerHostCommands();
+
+}  // namespace tzdraft

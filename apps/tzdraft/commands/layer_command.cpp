@@ -1,0 +1,134 @@
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/color_text.h"
+#include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/session.h"
+#include "tz/ed/print.h"
+
+namespace tzdraft {
+namespace {
+
+TzDbObjectId layerNamed(TzString const& name) {
+    TzDbLayerTable* table = nullptr;
+    TzDbObjectId id;
+    if (Session::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk) return id;
+    Opened<TzDbLayerTable> const opened(table);
+    if (table->getIdAt(name, id) != Tzad::eOk) {
+        tzutPrintf(L"\nThere is no layer \"%ls\".\n", name.kwszPtr());
+    }
+    return id;
+}
+
+TzString currentLayerName() {
+    Opened<TzDbLayerTableRecord> const layer(Session::current().drawing().clayer(), TzDb::kForRead);
+    return layer ? TzString(layer->getName()) : TzString();
+}
+
+void makeCurrent(TzDbObjectId layer) {
+    if (!layer.isNull())
+        (void)Session::current().drawing().setClayer(layer);  // a layer's id is taken
+}
+
+bool make() {
+    Answer<TzString> const name = askText(L"Name of the new layer, which becomes current");
+    if (name.asked != Asked::given) return !name.isCancelled();
+    TzDbLayerTable* table = nullptr;
+    if (Session::current().drawing().getLayerTable(table, TzDb::kForWrite) != Tzad::eOk)
+        return true;
+    Opened<TzDbLayerTable> const opened(table);
+    TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name.value);
+    if (id.isNull())
+        tzutPrintf(L"\n\"%ls\" cannot be the name of a layer.\n", name.value.kwszPtr());
+    makeCurrent(id);
+    return true;
+}
+
+bool set() {
+    Answer<TzString> const name = askText(L"Layer to make current", currentLayerName());
+    if (name.asked == Asked::given) makeCurrent(layerNamed(name.value));
+    return !name.isCancelled();
+}
+
+// Changes the layer that the user names.
+template <class Change>
+bool changeNamed(wchar_t const* question, Change change) {
+    Answer<TzString> const name = askText(question, currentLayerName());
+    if (name.asked != Asked::given) return !name.isCancelled();
+    TzDbObjectId const id = layerNamed(name.value);
+    Opened<TzDbLayerTableRecord> const layer(id, TzDb::kForWrite);
+    if (layer) change(*layer.get());
+    return true;
+}
+
+bool color() {
+    Answer<TzString> const text = askText(L"Colour, 1 to 255 or #RRGGBB", L"7");
+    if (text.asked != Asked::given) return !text.isCancelled();
+    std::optional<TzCmColor> const chosen = readColor(text.value.str());
+    if (!chosen) {
+        tzutPrintf(L"\n\"%ls\" is no colour.\n", text.value.kwszPtr());
+        return true;
+    }
+    return changeNamed(L"Layer to colour",
+                       [&](TzDbLayerTableRecord& layer) { (void)layer.setColor(*chosen); });
+}
+
+bool lock() {
+    return changeNamed(L"Layer to lock",
+                       [](TzDbLayerTableRecord& layer) { (void)layer.setIsLocked(true); });
+}
+
+bool unlock() {
+    return changeNamed(L"Layer to unlock",
+                       [](TzDbLayerTableRecord& layer) { (void)layer.setIsLocked(false); });
+}
+
+bool list() {
+    TzDbLayerTable* table = nullptr;
+    TzDbSymbolTableIterator* found = nullptr;
+    if (Session::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk) return true;
+    Opened<TzDbLayerTable> const opened(table);
+    if (table->newIterator(found) != Tzad::eOk) return true;
+    std::unique_ptr<TzDbSymbolTableIterator> const walk(found);
+    for (walk->start(); !walk->done(); walk->step()) {
+        Opened<TzDbLayerTableRecord> const layer(walk->getRecordId(), TzDb::kForRead);
+        if (!layer) continue;
+        tzutPrintf(L"\n\"%ls\", colour %ls%ls", layer->getName(),
+                   writeColor(layer->color()).c_str(), layer->isLocked() ? L", locked" : L"");
+    }
+    tzutPrintf(L"\nCurrent layer: \"%ls\".\n", currentLayerName().kwszPtr());
+    return true;
+}
+
+// One choice of the command; its action returns false when it was cancelled.
+struct Choice {
+    wchar_t const* word;
+    bool (*action)();
+};
+
+constexpr wchar_t kWords[] = L"Make Set Color LOck Unlock ?";
+constexpr Choice kChoices[] = {
+    {L"Make",   make  },
+    {L"Set",    set   },
+    {L"Color",  color },
+    {L"LOck",   lock  },
+    {L"Unlock", unlock},
+    {L"?",      list  },
+};
+
+bool act(TzString const& word) {
+    for (Choice const& each : kChoices) {
+        if (word == each.word) return each.action();
+    }
+    return true;
+}
+
+}  // namespace
+
+void layerCommand() {
+    for (;;) {
+        Answer<TzString> const word = askKeyword(L"[Make/Set/Color/LOck/Unlock/?]", kWords);
+        if (word.asked != Asked::given || !act(word.value)) return;
+    }
+}
+
+}  // namespace tzdraft

@@ -1,0 +1,45 @@
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/commands/bodies.h"
+#include "host/base/variable_table.h"
+#include "host/base/variables.h"
+#include "tz/ed/print.h"
+
+namespace tzdraft {
+namespace {
+
+void listVariables() {
+    tzhost::Variables& variables = tzhost::Variables::instance();
+    for (tzhost::VariableDefinition const& each : tzhost::variableTable()) {
+        tzhost::VariableValue const* const value = variables.get(each.name);
+        if (!value) continue;
+        tzutPrintf(L"\n%-22ls %ls%ls", std::wstring(each.name).c_str(),
+                   tzhost::writeValue(*value).c_str(),
+                   each.access == tzhost::Access::readOnly ? L" (read only)" : L"");
+    }
+    tzutPrintf(L"\n");
+}
+
+}  // namespace
+
+void setvarCommand() {
+    Answer<TzString> const name = askText(L"Variable name or [?]");
+    if (name.asked != Asked::given) return;
+    if (name.value == L"?") return listVariables();
+    tzhost::Variables& variables = tzhost::Variables::instance();
+    tzhost::VariableValue const* const present = variables.get(name.value.str());
+    if (!present) {
+        tzutPrintf(L"\nThere is no system variable \"%ls\"; ? lists them.\n", name.value.kwszPtr());
+        return;
+    }
+    TzString const shown(tzhost::writeValue(*present));
+    Answer<TzString> const value = askText(
+        TzString::formatted(L"New value for %ls <%ls>", name.value.kwszPtr(), shown.kwszPtr()));
+    if (value.asked != Asked::given) return;
+    // "." stands for the empty text, which Enter cannot give.
+    std::wstring const text = value.value == L"." ? std::wstring() : value.value.str();
+    tzhost::WriteResult const written =
+        variables.setFromText(name.value.str(), text, tzhost::Writer::user);
+    if (!written.isDone()) tzutPrintf(L"\n%ls\n", written.reason.c_str());
+}
+
+}  // namespace tzdraft

@@ -1,0 +1,156 @@
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/session.h"
+#include "tz/db/extensions.h"
+#include "tz/ed/print.h"
+
+namespace tzdraft {
+namespace {
+
+// Everything that STYLE asks, so that a cancel leaves the style alone.
+struct StyleAnswers {
+    TzString font;
+    TzString bigFont;
+    bool bold = false;
+    bool italic = false;
+    int charset = 0;
+    int pitchAndFamily = 0;
+    double height = 0;
+    double widthFactor = 1;
+    double oblique = 0;
+    bool backward = false;
+    bool upsideDown = false;
+    bool vertical = false;
+    bool annotative = false;
+};
+
+constexpr int kBackward = 2;
+constexpr int kUpsideDown = 4;
+
+bool isFontFile(TzString const& font) {
+    return font.length() >= 4 && font.right(4).compareNoCase(L".shx") == 0;
+}
+
+StyleAnswers presentValues(TzDbTextStyleTableRecord const& style) {
+    StyleAnswers values;
+    TzString typeface;
+    if (style.font(typeface, values.bold, values.italic, values.charset, values.pitchAndFamily) ==
+        Tzad::eOk) {
+        values.font = typeface;
+    }
+    if (values.font.isEmpty()) values.font = style.fileName();
+    values.bigFont = style.bigFontFileName();
+    values.height = style.textSize();
+    values.widthFactor = style.xScale();
+    values.oblique = style.obliquingAngle();
+    values.backward = (style.flagBits() & kBackward) != 0;
+    values.upsideDown = (style.flagBits() & kUpsideDown) != 0;
+    values.vertical = style.isVertical();
+    if (auto* const extension = tzrxQuery<TzDbAnnotativeObjectPE>(&style)) {
+        values.annotative = extension->annotative(&style);
+    }
+    return values;
+}
+
+template <class Value>
+bool take(Answer<Value> const& answer, Value& place) {
+    if (answer.asked == Asked::given) place = answer.value;
+    return !answer.isCancelled();
+}
+
+// "a.shx,b.shx" names a font file with its big font.
+bool askFont(StyleAnswers& values) {
+    TzString shown = values.font;
+    if (isFontFile(shown) && !values.bigFont.isEmpty()) shown += L"," + values.bigFont;
+    TzString answer;
+    if (!take(askText(L"Font file or typeface", shown), answer)) return false;
+    int const comma = answer.find(L',');
+    bool const isPair = comma >= 0 && isFontFile(answer.left(comma));
+    values.font = isPair ? answer.left(comma) : answer;
+    values.bigFont = isPair ? answer.mid(comma + 1) : TzString();
+    if (isFontFile(values.font)) return true;
+    return take(askYesNo(L"Bold?", values.bold), values.bold) &&
+           take(askYesNo(L"Italic?", values.italic), values.italic);
+}
+
+bool askAll(StyleAnswers& values) {
+    return askFont(values) &&
+           take(askReal(L"Text height, 0 for any", values.height), values.height) &&
+           take(askReal(L"Width factor", values.widthFactor), values.widthFactor) &&
+           take(askAngle(L"Obliquing angle", values.oblique), values.oblique) &&
+           take(askYesNo(L"Backward?", values.backward), values.backward) &&
+           take(askYesNo(L"Upside-down?", values.upsideDown), values.upsideDown) &&
+           take(askYesNo(L"Vertical?", values.vertical), values.vertical) &&
+           take(askYesNo(L"Annotative?", values.annotative), values.annotative);
+}
+
+// The first refusal, or eOk.
+Tzad::ErrorStatus write(TzDbTextStyleTableRecord& style, StyleAnswers const& values) {
+    bool const isFile = isFontFile(values.font);
+    int const bits = (values.backward ? kBackward : 0) | (values.upsideDown ? kUpsideDown : 0);
+    Tzad::ErrorStatus const statuses[] = {
+        style.setFont(isFile ? L"" : values.font.kwszPtr(), values.bold, values.italic,
+                      values.charset, values.pitchAndFamily),
+        style.setFileName(isFile ? values.font.kwszPtr() : L""),
+        style.setBigFontFileName(values.bigFont),
+        style.setTextSize(values.height),
+        style.setXScale(values.widthFactor),
+        style.setObliquingAngle(values.oblique),
+        style.setFlagBits(bits),
+        style.setIsVertical(values.vertical),
+    };
+    for (Tzad::ErrorStatus const status : statuses) {
+        if (status != Tzad::eOk) return status;
+    }
+    auto* const extension = tzrxQuery<TzDbAnnotativeObjectPE>(&style);
+    return extension ? extension->setAnnotative(&style, values.annotative) : Tzad::eOk;
+}
+
+TzDbObjectId styleNamed(TzString const& name) {
+    TzDbTextStyleTable* table = nullptr;
+    if (Session::current().drawing().getTextStyleTable(table, TzDb::kForWrite) != Tzad::eOk)
+        return {};
+    Opened<TzDbTextStyleTable> const opened(table);
+    return findOrAdd<TzDbTextStyleTableRecord>(table, name);
+}
+
+// The values to begin with: those of the style of that name, if there is one.
+StyleAnswers startingValues(TzString const& name) {
+    TzDbTextStyleTable* table = nullptr;
+    TzDbObjectId id;
+    if (Session::current().drawing().getTextStyleTable(table, TzDb::kForRead) != Tzad::eOk)
+        return {};
+    Opened<TzDbTextStyleTable> const opened(table);
+    if (table->getIdAt(name, id) != Tzad::eOk) return {.font = L"txt.shx"};
+    Opened<TzDbTextStyleTableRecord> const style(id, TzDb::kForRead);
+    return style ? presentValues(*style.get()) : StyleAnswers();
+}
+
+}  // namespace
+
+void styleCommand() {
+    TzString name;
+    {
+        Opened<TzDbTextStyleTableRecord> const present(Session::current().drawing().textstyle(),
+                                                       TzDb::kForRead);
+        if (present) name = present->getName();
+    }
+    if (!take(askText(L"Text style name", name), name)) return;
+    StyleAnswers values = startingValues(name);
+    if (!askAll(values)) return;
+    TzDbObjectId const id = styleNamed(name);
+    Opened<TzDbTextStyleTableRecord> const style(id, TzDb::kForWrite);
+    if (!style) {
+        tzutPrintf(L"\n\"%ls\" cannot be the name of a text style.\n", name.kwszPtr());
+        return;
+    }
+    if (write(*style.get(), values) != Tzad::eOk) {
+        tzutPrintf(L"\nOne of these values cannot be kept; the others are.\n");
+    }
+    if (Session::current().drawing().setTextstyle(id) == Tzad::eOk) {
+        tzutPrintf(L"\n\"%ls\" is now the current text style.\n", name.kwszPtr());
+    }
+}
+
+}  // namespace tzdraft

@@ -1,0 +1,93 @@
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/session.h"
+#include "host/database/user_system.h"
+#include "tz/ed/print.h"
+#include "tz/ed/ucs.h"
+#include "tz/ge/matrix3d.h"
+
+namespace tzdraft {
+namespace {
+
+TzGeMatrix3d present() {
+    TzGeMatrix3d system;
+    (void)tzedGetCurrentUCS(system);  // the identity without a drawing
+    return system;
+}
+
+// Makes a system that lies in the present one current, for good.
+void use(TzGeMatrix3d const& inPresent) {
+    if (tzhost::setUserSystem(present() * inPresent) != Tzad::eOk) {
+        tzutPrintf(L"\nThat is no coordinate system.\n");
+    }
+}
+
+void turn(TzGeVector3d const& axis) {
+    Answer<double> const angle = askAngle(L"Rotation angle", 0);
+    if (angle.asked == Asked::given)
+        use(TzGeMatrix3d::rotation(angle.value, axis, TzGePoint3d::kOrigin));
+}
+
+void turnX() {
+    turn(TzGeVector3d::kXAxis);
+}
+void turnY() {
+    turn(TzGeVector3d::kYAxis);
+}
+void turnZ() {
+    turn(TzGeVector3d::kZAxis);
+}
+
+void world() {
+    (void)tzhost::setUserSystem(TzGeMatrix3d());
+}
+
+void threePoints() {
+    PointAnswer const origin = askPoint(L"New origin", nullptr);
+    if (origin.asked != Asked::given) return;
+    PointAnswer const onX = askPoint(L"Point on the positive X axis", &origin.point);
+    if (onX.asked != Asked::given) return;
+    PointAnswer const towardsY =
+        askPoint(L"Point on the side of the positive Y axis", &origin.point);
+    if (towardsY.asked != Asked::given) return;
+    TzGeVector3d x = onX.point - origin.point;
+    TzGeVector3d z = x.crossProduct(towardsY.point - origin.point);
+    if (x.isZeroLength() || z.isZeroLength()) {
+        tzutPrintf(L"\nThe three points lie on one line.\n");
+        return;
+    }
+    x.normalize();
+    z.normalize();
+    TzGeMatrix3d system;
+    system.setCoordSystem(origin.point, x, z.crossProduct(x), z);
+    use(system);
+}
+
+struct Choice {
+    wchar_t const* word;
+    void (*action)();
+};
+
+constexpr wchar_t kWords[] = L"World X Y Z 3point";
+constexpr Choice kChoices[] = {
+    {L"World",  world      },
+    {L"X",      turnX      },
+    {L"Y",      turnY      },
+    {L"Z",      turnZ      },
+    {L"3point", threePoints},
+};
+
+}  // namespace
+
+void ucsCommand() {
+    PointAnswer const answer =
+        askPoint(L"Origin of the user system or [World/X/Y/Z/3point] <World>", nullptr, kWords);
+    if (answer.asked == Asked::cancelled) return;
+    if (answer.asked == Asked::empty) return world();
+    if (answer.word.isEmpty()) return use(TzGeMatrix3d::translation(answer.point.asVector()));
+    for (Choice const& each : kChoices) {
+        if (answer.word == each.word) return each.action();
+    }
+}
+
+}  // namespace tzdraft

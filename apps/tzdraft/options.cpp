@@ -1,0 +1,77 @@
+#include "apps/tzdraft/options.h"
+
+#include <CLI/CLI.hpp>
+#include <cstdio>
+
+namespace tzdraft {
+namespace {
+
+constexpr char kPurpose[] =
+    "A drafting host with a command line: opens a drawing, runs commands, saves and plots it.";
+constexpr char kScripts[] =
+    "A script is UTF-8 text with one answer a line: an empty line is Enter, ^C cancels, ;; begins a\n"
+    "comment, ~x,y moves the cursor in a drag, <<< and >>> enclose what an editor leaves.\n"
+    "Exit status: 0 done; 1 input ended inside a command; 2 wrong usage or an unusable file; 3 a command\n"
+    "left something open.";
+
+void declareText(CLI::App& app, char const* name, std::string& value, char const* help) {
+    app.add_option(name, value, help)->type_name("");
+}
+
+void declareFile(CLI::App& app, char const* name, std::filesystem::path& file, char const* help) {
+    app.add_option(name, file, help)->type_name("FILE");
+}
+
+void declare(CLI::App& app, Options& options) {
+    app.add_option("DRAWING", options.drawing, "the drawing to open; a new one when left out")
+        ->type_name("");
+    app.add_option("--script", options.script,
+                   "answers from FILE ('-' is standard input); without it, an interactive session")
+        ->type_name("FILE");
+    declareFile(app, "--save", options.save, "write the drawing at the end");
+    declareFile(app, "--svg", options.svg,
+                "plot the active space at the end, fitted to its extents");
+    declareFile(app, "--png", options.png, "the same as a PNG picture");
+    declareFile(app, "--pdf", options.pdf, "the same as a PDF page");
+    app.add_option("--var", options.variables,
+                   "set a system variable for this run (repeatable; points as x,y,z)")
+        ->type_name("NAME=VALUE")
+        ->expected(1);
+    declareFile(app, "--font-map", options.fontMap, "the font map file");
+    declareText(app, "--locale", options.locale, "LL  the language of prompts and messages");
+    declareFile(app, "--settings", options.settings, "the settings file");
+    declareFile(app, "--module", options.module,
+                "the module to load; beside the program when left out");
+    declareFile(app, "--resources", options.resources, "the resource library of the module");
+    declareText(app, "--rtf-editor", options.richTextEditor, "CMD  program for the dialog editor");
+    declareText(app, "--text-editor", options.textEditor,
+                "CMD  program for the in-place and raw editors");
+    declareFile(app, "--events", options.events,
+                "write what passes between module and host as JSON lines");
+    app.add_option("--fail", options.faults,
+                   "let the K-th call of a host operation fail (repeatable)")
+        ->type_name("NAME[:K][=STATUS]")
+        ->expected(1);
+}
+
+}  // namespace
+
+ParsedOptions parseOptions(int count, char const* const* arguments) {
+    CLI::App app(kPurpose, "tzdraft");
+    app.footer(kScripts);
+    app.set_version_flag("--version", "tzdraft 1.0");
+    ParsedOptions parsed;
+    declare(app, parsed.options);
+    try {
+        app.parse(count, arguments);
+    } catch (CLI::Success const& asked) {  // --help, --version
+        app.exit(asked);
+        parsed.exit = kDone;
+    } catch (CLI::ParseError const& wrong) {
+        std::fprintf(stderr, "tzdraft: %s; try --help\n", wrong.what());
+        parsed.exit = kUnusable;
+    }
+    return parsed;
+}
+
+}  // namespace tzdraft

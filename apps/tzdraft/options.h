@@ -1,0 +1,45 @@
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+// What the program was told on its command line.
+namespace tzdraft {
+
+// Exit statuses.
+inline constexpr int kDone = 0;
+inline constexpr int kInputEnded = 1;  // within a command, or an editor block that nobody took
+inline constexpr int kUnusable = 2;    // wrong usage, an unusable file, or no module
+inline constexpr int kLeftOver = 3;    // a command left something open
+
+struct Options {
+    std::filesystem::path drawing;  // empty: a new one
+    std::string script;             // "-" is standard input, empty an interactive session
+    std::filesystem::path save;
+    std::filesystem::path svg;
+    std::filesystem::path png;
+    std::filesystem::path pdf;
+    std::vector<std::string> variables;  // NAME=VALUE
+    std::filesystem::path fontMap;
+    std::string locale;
+    std::filesystem::path settings;
+    std::filesystem::path module;
+    std::filesystem::path resources;
+    std::string richTextEditor;
+    std::string textEditor;
+    std::filesystem::path events;
+    std::vector<std::string> faults;  // NAME[:K][=STATUS]
+};
+
+struct ParsedOptions {
+    Options options;
+    std::optional<int> exit;  // the program ends at once with this status
+};
+
+// Reads the arguments. --help and --version print to standard output and end with 0; a wrong
+// argument is one line on standard error and ends with 2.
+[[nodiscard]] ParsedOptions parseOptions(int count, char const* const* arguments);
+
+}  // namespace tzdraft

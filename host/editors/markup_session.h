@@ -1,0 +1,36 @@
+#pragma once
+
+#include <functional>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "tz/text/string.h"
+
+// One session of an editor that holds markup: the in-place, the raw and the external one.
+namespace tzhost {
+
+// What a script says that the user leaves in the next editor.
+struct EditorBlock {
+    std::wstring text;  // its lines, apart by line feeds
+    bool accepted = true;
+};
+
+// Where editors get their answers from: the block that comes next in a script, if one does, and the
+// program that serves for the in-place and raw editors or for the dialog, empty for none.
+struct EditorConfiguration {
+    std::function<std::optional<EditorBlock>()> nextBlock;
+    std::string textEditor;
+    std::string richTextEditor;
+    std::vector<std::string> inPlaceEditors;  // values of MTEXTED that name an in-place editor
+};
+[[nodiscard]] EditorConfiguration& editorConfiguration();
+
+// Edits a text: with the next block of the script, else with the program, else not at all. The new
+// contents, or nothing when the user left without accepting or the program failed; then one message
+// has said why, and what was edited lies in a file whose name was printed. A text left unchanged
+// comes back byte for byte.
+[[nodiscard]] std::optional<TzString> editMarkup(TzString const& contents,
+                                                 std::string const& program);
+
+}  // namespace tzhost

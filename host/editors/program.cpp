@@ -1,0 +1,119 @@
+#include "host/editors/program.h"
+
+#include <cerrno>
+#include <csignal>
+#include <cstring>
+#include <fcntl.h>
+#include <sys/wait.h>
+#include <termios.h>
+#include <unistd.h>
+
+namespace tzhost {
+namespace {
+
+// The terminal of standard input, given to a program and taken back.
+class Terminal {
+public:
+    Terminal() : isTerminal_(isatty(STDIN_FILENO) == 1) {
+        if (!isTerminal_) return;
+        tcgetattr(STDIN_FILENO, &settings_);
+        // The host is in the background while the program runs and must not be stopped for that.
+        struct sigaction ignore {};
+        ignore.sa_handler = SIG_IGN;
+        sigaction(SIGTTOU, &ignore, &before_);
+    }
+    Terminal(Terminal const&) = delete;
+    Terminal& operator=(Terminal const&) = delete;
+    ~Terminal() {
+        if (!isTerminal_) return;
+        tcsetpgrp(STDIN_FILENO, getpgrp());
+        tcsetattr(STDIN_FILENO, TCSADRAIN, &settings_);
+        sigaction(SIGTTOU, &before_, nullptr);
+    }
+    [[nodiscard]] bool isTerminal() const { return isTerminal_; }
+    void giveTo(pid_t program) const {
+        if (isTerminal_) tcsetpgrp(STDIN_FILENO, program);
+    }
+
+private:
+    bool isTerminal_;
+    termios settings_{};
+    struct sigaction before_ {};
+};
+
+// In the child: becomes the program, or tells through the pipe why it cannot.
+[[noreturn]] void become(std::vector<std::string>& words, Terminal const& terminal, int report) {
+    setpgid(0, 0);
+    terminal.giveTo(getpid());
+    for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE})
+        std::signal(each, SIG_DFL);
+    std::vector<char*> arguments;
+    for (std::string& word : words)
+        arguments.push_back(word.data());
+    arguments.push_back(nullptr);
+    execvp(arguments[0], arguments.data());
+    int const reason = errno;
+    (void)!write(report, &reason, sizeof reason);
+    _exit(127);
+}
+
+int waitFor(pid_t child) {
+    int status = 0;
+    while (waitpid(child, &status, 0) < 0 && errno == EINTR) {
+    }
+    return status;
+}
+
+std::string problemOf(int status) {
+    if (WIFSIGNALED(status)) return "was killed by signal " + std::to_string(WTERMSIG(status));
+    return "ended with exit status " + std::to_string(WEXITSTATUS(status));
+}
+
+}  // namespace
+
+std::vector<std::string> splitCommand(std::string_view command) {
+    std::vector<std::string> words;
+    bool open = false;  // a word has begun
+    char quote = 0;
+    for (char const c : command) {
+        if (quote ? c == quote : c == '"' || c == '\'') {
+            quote = quote ? '\0' : c;
+            if (!open) words.emplace_back();
+            open = true;
+        } else if (!quote && (c == ' ' || c == '\t')) {
+            open = false;
+        } else {
+            if (!open) words.emplace_back();
+            open = true;
+            words.back() += c;
+        }
+    }
+    return words;
+}
+
+ProgramResult runProgram(std::string_view command, std::filesystem::path const& file) {
+    std::vector<std::string> words = splitCommand(command);
+    if (words.empty()) return {false, "is no command"};
+    words.push_back(file.string());
+    int report[2];
+    if (pipe2(report, O_CLOEXEC) != 0) return {false, std::strerror(errno)};
+    Terminal const terminal;
+    pid_t const child = fork();
+    if (child == 0) become(words, terminal, report[1]);
+    close(report[1]);
+    if (child < 0) {
+        close(report[0]);
+        return {false, std::strerror(errno)};
+    }
+    setpgid(child, child);
+    terminal.giveTo(child);
+    int reason = 0;
+    bool const missing = read(report[0], &reason, sizeof reason) == sizeof reason;
+    close(report[0]);
+    int const status = waitFor(child);
+    if (missing) return {false, std::string("cannot be run: ") + std::strerror(reason)};
+    if (WIFEXITED(status) && WEXITSTATUS(status) == 0) return {true, ""};
+    return {false, problemOf(status)};
+}
+
+}  // namespace tzhost
