@@ -1,0 +1,41 @@
+#pragma once
+
+// INI files as the host keeps them in memory; tz/pal/ini_file.h says how they are read.
+
+#include <map>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace tzhost {
+
+class IniData {
+public:
+    // A section's keys and values as written, in the order of the file.
+    using Rows = std::vector<std::pair<std::wstring, std::wstring>>;
+
+    struct Section {
+        Rows rows;
+        std::map<std::wstring, std::wstring> values; // by key in lower case, the last of each
+    };
+
+    // Of a file's bytes.
+    [[nodiscard]] static IniData fromBytes(std::string_view bytes);
+
+    // Null when there is no such section. Valid as long as this object.
+    [[nodiscard]] Section const* section(std::wstring_view name) const;
+
+private:
+    std::map<std::wstring, Section> sections_; // by name in lower case
+};
+
+// The file's data, read anew when the file has changed since; empty for one that cannot be read. Never
+// null.
+[[nodiscard]] std::shared_ptr<IniData const> openIni(std::string const& path);
+
+// Text in lower case, by the host's table.
+[[nodiscard]] std::wstring lowered(std::wstring_view text);
+
+} // namespace tzhost
