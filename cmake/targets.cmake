@@ -208,7 +208,7 @@ function(tz_test_environment test name)
         TZ_TEST_SCRATCH=${scratch})
     if(TZ_SANITIZE)
         list(APPEND environment
-            LSAN_OPTIONS=suppressions=${PROJECT_SOURCE_DIR}/tests/leaks.supp:print_suppressions=0
+            "LSAN_OPTIONS=suppressions='${PROJECT_SOURCE_DIR}/tests/leaks.supp':print_suppressions=0"
             UBSAN_OPTIONS=print_stacktrace=1)
     endif()
     set_tests_properties(${test} PROPERTIES TIMEOUT 900 WORKING_DIRECTORY ${scratch}
