@@ -1,0 +1,27 @@
+#include "module/edit/editor_choice.h"
+
+#include "module/access/resources.h"
+#include "module/access/sys_var.h"
+#include "tz/ed/editors.h"
+#include "tz/pal/settings.h"
+
+namespace {
+
+constexpr int kBuiltInEditorId = 0x8009;
+
+TzString const& builtInEditor() {
+    static TzString const name = loadResourceString(kBuiltInEditorId);
+    return name;
+}
+
+}  // namespace
+
+TextEditorKind chooseTextEditor() {
+    if (Tzworks::Tzdraft::PAL::Process::isFabric()) return TextEditorKind::inPlace;
+    TzString const chosen = CTzadSysVar::GetString(L"MTEXTED");
+    if (chosen.isEmpty() || chosen.compareNoCase(builtInEditor()) == 0)
+        return TextEditorKind::inPlace;
+    if (chosen.compareNoCase(L"OLDEDITOR") == 0) return TextEditorKind::dialog;
+    if (chosen.compareNoCase(builtInEditor() + L"-") == 0) return TextEditorKind::raw;
+    return IPEIsEditor(true) ? TextEditorKind::inPlace : TextEditorKind::external;
+}

@@ -1,0 +1,111 @@
+// The questions for the columns of a new text. Their defaults follow the text height, so that
+// defaults alone make a layout of the text's own scale.
+
+#include <iterator>
+
+#include "module/access/string_table.h"
+#include "module/mtext/question.h"
+#include "module/prompt/integer_input.h"
+#include "module/prompt/keyword_input.h"
+#include "module/prompt/real_input.h"
+#include "tz/db/mtext.h"
+#include "tz/mte/mtext_command.h"
+
+namespace {
+
+// Keywords and prompts.
+constexpr unsigned kTypePrompt = 1105;
+constexpr unsigned kStatic = 1106;
+constexpr unsigned kDynamic = 1107;
+constexpr unsigned kNoColumns = 1108;
+constexpr unsigned kCountPrompt = 1109;
+
+// Only the bits for empty, zero and negative answers and for free text mean something; the rest of
+// this word has always been handed over.
+constexpr unsigned kCountFlags = 0x138F;
+constexpr int kDefaultCount = 2;
+
+// A question for a size: its prompt, its flags, and its default in text heights.
+struct SizeQuestion {
+    unsigned prompt;
+    unsigned flags;
+    double heights;
+};
+constexpr SizeQuestion kTotalWidth{1110, 6, 80.0};
+constexpr SizeQuestion kColumnWidth{1111, 6, 30.0};
+constexpr SizeQuestion kColumnGutter{1112, 4, 5.0};
+constexpr SizeQuestion kColumnHeight{1113, 6, 10.0};
+
+bool askSize(SizeQuestion const& question, double textHeight, double& size) {
+    CKeywordTable none;
+    CTzsRealInput input(question.flags, none, gStringTable[question.prompt]);
+    input.SetDefault(textHeight * question.heights);
+    return askOnce(input, [&] { size = input.GetReal(); });
+}
+
+// The outcomes of DoColumnPrompt.
+constexpr int kCancelled = -1;
+constexpr int kNone = 0;
+constexpr int kSetUp = 1;
+
+// The present type stays when the question failed.
+void chooseType(int status, CTzsKeywordInput& input, TextEditorColumns& columns) {
+    unsigned chosen = 0;
+    switch (status) {
+    case statusNone: chosen = input.GetDefault(); break;
+    case statusNormal:
+    case statusKeyword: chosen = input.GetKeyword(); break;
+    default: return;
+    }
+    switch (chosen) {
+    case kDynamic:
+        columns.columnType = TzDbMText::kDynamicColumns;
+        columns.autoHeight = true;
+        break;
+    case kStatic: columns.columnType = TzDbMText::kStaticColumns; break;
+    default: columns.columnType = TzDbMText::kNoColumns; break;
+    }
+}
+
+}  // namespace
+
+bool TzxMtextCommand::DoTotalWidthPrompt() {
+    return askSize(kTotalWidth, textHeight, boxWidth);
+}
+
+bool TzxMtextCommand::DoColumnWidthPrompt() {
+    return askSize(kColumnWidth, textHeight, columns.columnWidth);
+}
+
+bool TzxMtextCommand::DoColumnGutterPrompt() {
+    return askSize(kColumnGutter, textHeight, columns.columnGutter);
+}
+
+bool TzxMtextCommand::DoColumnHeightPrompt() {
+    return askSize(kColumnHeight, textHeight, boxHeight);
+}
+
+bool TzxMtextCommand::DoColumnCountPrompt() {
+    CKeywordTable none;
+    CTzsIntegerInput input(kCountFlags, none, gStringTable[kCountPrompt]);
+    input.SetDefault(kDefaultCount);
+    return askUntilAnswered(input, [&] { columns.columnCount = input.GetInteger(); });
+}
+
+int TzxMtextCommand::DoColumnPrompt() {
+    unsigned int ids[] = {kDynamic, kStatic, kNoColumns};
+    CKeywordTable keywords(ids, static_cast<int>(std::size(ids)));
+    CTzsKeywordInput input(0, keywords, gStringTable[kTypePrompt]);
+    input.SetDefault(kDynamic);
+    int const status = input.Prompt();
+    if (status == statusCancel) return kCancelled;
+    chooseType(status, input, columns);
+
+    if (columns.columnType == TzDbMText::kNoColumns) return kNone;
+    bool const answered = columns.columnType == TzDbMText::kStaticColumns
+                              ? DoTotalWidthPrompt() && DoColumnCountPrompt()
+                              : DoColumnWidthPrompt();
+    if (!answered || !DoColumnGutterPrompt() || !DoColumnHeightPrompt()) return kCancelled;
+    columnsConfirmed = true;
+    return kSetUp;
+}

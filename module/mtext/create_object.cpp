@@ -1,0 +1,162 @@
+// The making of the entity from the options.
+
+#include <memory>
+#include <new>
+#include <utility>
+
+#include "module/access/attachment_ids.h"
+#include "module/access/line_spacing.h"
+#include "module/access/space_posting.h"
+#include "module/access/style_rules.h"
+#include "module/access/sys_var.h"
+#include "module/edit/attachment.h"
+#include "module/edit/editor_result.h"
+#include "module/mtext/entity_fields.h"
+#include "module/mtext/points.h"
+#include "module/mtext/user_axes.h"
+#include "tz/db/database.h"
+#include "tz/db/extensions.h"
+#include "tz/db/field.h"
+#include "tz/db/host_services.h"
+#include "tz/mte/edit_mtext.h"
+#include "tz/mte/globals.h"
+#include "tz/mte/mtext_command.h"
+
+namespace {
+
+// Columns that come from MTEXTCOLUMN alone get a gutter of this many text heights.
+constexpr double kGutterHeights = 5.0;
+// The telemetry of a text that was made.
+constexpr int kSuccessPhase = 1;
+constexpr int kMadeText = 0x98;
+
+void fillEntity(TzxMtextCommand const& command,
+                TzDbMText& text,
+                TzDbObjectId style,
+                bool forAttribute) {
+    UserAxes const axes = activeUserAxes();
+    text.setDatabaseDefaults(tzdbHostApplicationServices()->workingDatabase());
+    text.setNormal(axes.normal);
+    text.setLocation(pointOf(command.location));
+    text.setTextStyle(style);
+    text.setLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
+    text.setLineSpacingFactor(command.lineSpacingFactor);
+    if (!forAttribute) TzTextSetLayer::setTextLayer(&text);
+    text.setDirection(axes.turned(command.rotation).x.normalize());
+    text.setTextHeight(command.textHeight);
+    text.setAttachment(MapAttachment(command.attachmentId));
+    text.setWidth(command.boxWidth);
+}
+
+// The columns share the box's width; gutters that would eat all of it are dropped.
+void setStaticColumns(TzxMtextCommand& command, TzDbMText& text) {
+    TextEditorColumns& columns = command.columns;
+    int const gutters = columns.columnCount - 1;
+    if (gutters * columns.columnGutter > command.boxWidth) columns.columnGutter = 0;
+    columns.columnWidth = (command.boxWidth - gutters * columns.columnGutter) / columns.columnCount;
+    text.setHeight(command.boxHeight);
+    text.setStaticColumns(columns.columnWidth, columns.columnGutter, columns.columnCount);
+}
+
+// Columns that were not asked for are as wide as the box.
+void setDynamicColumns(TzxMtextCommand& command, TzDbMText& text) {
+    TextEditorColumns& columns = command.columns;
+    if (command.columnsConfirmed)
+        text.setWidth(columns.columnWidth);
+    else
+        columns.columnWidth = command.boxWidth;
+    if (columns.autoHeight) text.setHeight(command.boxHeight);
+    text.setDynamicColumns(columns.columnWidth, columns.columnGutter, columns.autoHeight);
+    if (!command.columnsConfirmed) text.setColumnGutterWidth(command.textHeight * kGutterHeights);
+}
+
+void setColumns(TzxMtextCommand& command, TzDbMText& text) {
+    switch (command.columns.columnType) {
+    case TzDbMText::kStaticColumns: setStaticColumns(command, text); break;
+    case TzDbMText::kDynamicColumns: setDynamicColumns(command, text); break;
+    default: break;
+    }
+}
+
+// Makes the text annotative as its style is. Gives the text's extension, null without one or when
+// the style cannot be opened.
+TzDbAnnotativeObjectPE* followStyle(TzDbMText& text, TzDbObjectId styleId) {
+    EasyObject<TzDbTextStyleTableRecord> style;
+    if (tzdbOpenObject(style.object, styleId, TzDb::kForRead) != Tzad::eOk) return nullptr;
+    auto* const ofStyle = tzrxQuery<TzDbAnnotativeObjectPE>(style.object);
+    auto* const ofText = tzrxQuery<TzDbAnnotativeObjectPE>(&text);
+    bool const annotative = ofStyle && ofStyle->annotative(style.object);
+    if (!annotative || !ofText) return ofText;
+    ofText->setAnnotative(&text, true);
+    auto* const orientation = tzrxQuery<TzDbPaperOrientationPE>(style.object);
+    if (orientation && orientation->paperOrientation(style.object))
+        orientation->setPaperOrientation(&text, true);
+    return ofText;
+}
+
+bool typeText(TzxMtextCommand& command, TzDbMText& text) {
+    if (!command.DoTextString()) return false;
+    if (!g_bEnableFieldUI) command.contents = withFieldsEvaluated(command.contents);
+    text.setContents(command.contents);
+    return true;
+}
+
+// A box that was dragged stays where it is although the editor may have changed the attachment.
+bool editText(TzxMtextCommand const& command, EasyObject<TzDbMText>& text, bool forAttribute) {
+    int const result = InvokeEditorOn(text, kMTETabText, 0, true, true, forAttribute, false, false);
+    if (result != kEditorAccepted) return false;
+    TzDbMText::AttachmentPoint const attachment = text->attachment();
+    text->setLocation(pointOf(command.location));
+    if (!command.boxDragged) return true;
+    text->setAttachment(MapAttachment(command.attachmentId));
+    UpdateAttachPoint(text, attachment, command.boxHeight);
+    text->setAttachment(attachment);
+    return true;
+}
+
+// The options become what the drawing's next text begins with.
+void storeDefaults(TzxMtextCommand& command, TzDbObjectId style) {
+    TzDbDatabase* const database = tzdbHostApplicationServices()->workingDatabase();
+    if (StyleIsAnnotative(database->textstyle()))
+        command.textHeight *= CTzadSysVar::GetDouble(L"CANNOSCALEVALUE");
+    CTzadSysVar::SetDouble(L"TEXTSIZE", command.textHeight);
+    (void)database->setTextstyle(style);  // a drawing that refuses keeps the style that it has
+    SetLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
+    SetLineSpacingFactor(command.lineSpacingFactor);
+}
+
+}  // namespace
+
+int TzxMtextCommand::CreateObject(TzDbMText* existing, bool forAttribute) {
+    std::unique_ptr<TzDbMText> created(existing ? nullptr : new (std::nothrow) TzDbMText);
+    EasyObject<TzDbMText> text(existing ? existing : created.get(), EasyFlags::kNone);
+    if (!text.object) return false;
+
+    TzDbObjectId const style = GetTextStyleID(styleName);
+    fillEntity(*this, *text.object, style, forAttribute);
+    setColumns(*this, *text.object);
+    TzDbAnnotativeObjectPE* const annotation = followStyle(*text.object, style);
+    gbUsedIPE = 0;
+    bool const accepted =
+        useCommandLineEditor ? typeText(*this, *text.object) : editText(*this, text, forAttribute);
+    std::unique_ptr<TzDbField> field(std::exchange(text.field, nullptr));
+    if (!accepted) return false;
+    if (!gbUsedIPE && annotation) {
+        bool changed = false;
+        (void)annotation->updateScale(text.object, changed);
+    }
+
+    TzDbObjectId id;
+    if (created) {
+        text.object = nullptr;
+        // A text that cannot be posted is gone; the options still become the defaults.
+        (void)postToDb(created.release(), id, worksOnPaper());
+    }
+    if (field)
+        attachField(id, std::move(field));
+    else if (useCommandLineEditor)
+        evaluateField(id);
+    storeDefaults(*this, style);
+    telemetry.SendEvent(kSuccessPhase, kMadeText);
+    return true;
+}

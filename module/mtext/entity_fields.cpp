@@ -1,0 +1,46 @@
+#include "module/mtext/entity_fields.h"
+
+#include "tz/db/host_services.h"
+#include "tz/db/mtext.h"
+#include "tz/mte/easy_object.h"
+
+namespace {
+
+constexpr wchar_t const* kFieldKey = L"TEXT";
+constexpr int kEveryKind = 0x20;
+constexpr int kEvaluatedText = 2;
+
+Tzad::ErrorStatus evaluate(TzDbField& field) {
+    return field.evaluate(kEveryKind, tzdbHostApplicationServices()->workingDatabase());
+}
+
+}  // namespace
+
+TzString withFieldsEvaluated(TzString const& text) {
+    if (!tzdbHasFields(text, 1)) return text;
+    auto const field = std::make_unique<TzDbField>();
+    field->setFieldCode(text, 0, nullptr);
+    TzString const result =
+        evaluate(*field) == Tzad::eOk ? field->getFieldCode(kEvaluatedText) : text;
+    field->close();
+    return result;
+}
+
+void attachField(TzDbObjectId text, std::unique_ptr<TzDbField> field) {
+    EasyObject<TzDbMText> opened;
+    bool attached = false;
+    if (tzdbOpenObject(opened.object, text, TzDb::kForWrite) == Tzad::eOk) {
+        TzDbObjectId id;
+        attached = opened->setField(kFieldKey, field.get(), id) == Tzad::eOk;
+    }
+    field->close();
+    if (attached) (void)field.release();  // the drawing's now
+}
+
+void evaluateField(TzDbObjectId text) {
+    EasyObject<TzDbMText> opened;
+    if (tzdbOpenObject(opened.object, text, TzDb::kForRead) != Tzad::eOk) return;
+    EasyObject<TzDbField> field;
+    if (opened->getField(kFieldKey, field.object, TzDb::kForWrite) != Tzad::eOk) return;
+    (void)evaluate(*field.object);  // without a value the field shows that it has none
+}

@@ -1,0 +1,81 @@
+// The first half of the dialogue of MTEXT: the first corner.
+
+#include "module/access/scope_guard.h"
+#include "module/access/string_table.h"
+#include "module/access/style_rules.h"
+#include "module/access/sys_var.h"
+#include "module/access/unit_converter.h"
+#include "module/mtext/first_point_jig.h"
+#include "module/mtext/points.h"
+#include "module/mtext/question.h"
+#include "module/prompt/jig_input.h"
+#include "tz/ap/document.h"
+#include "tz/ap/gesture.h"
+#include "tz/ed/editors.h"
+#include "tz/ed/print.h"
+#include "tz/ed/ucs.h"
+#include "tz/mte/mtext_command.h"
+
+namespace {
+
+namespace Gesture = Tzworks::Tzdraft::TzApGesture;
+
+// Prompts and texts.
+constexpr unsigned kStatusLine = 1064;
+constexpr unsigned kFirstCorner = 1065;
+constexpr unsigned kAnnotative = 1101;
+constexpr unsigned kNotAnnotative = 1102;
+constexpr unsigned kAttributePoint = 3010;
+
+constexpr auto kControls = static_cast<TzEdJig::UserInputControls>(TzEdJig::kGovernedByUCSDetect |
+                                                                   TzEdJig::kAccept3dCoordinates);
+
+Tzworks::Tzdraft::TzApView* currentView() {
+    return tzDocManagerPtr()->curDocument()->view();
+}
+
+// Asks for the point while a press and drag of the pointer may give both corners of the box.
+int promptWithGesture(CTzsJigInput& input) {
+    Gesture::DragGestureOverruleHandler handler(currentView());
+    TzScopeGuard const registered(
+        [&handler] { currentView()->gestureProcessor()->addOverruleHandler(&handler); },
+        [&handler] { currentView()->gestureProcessor()->removeOverruleHandler(&handler); });
+    return input.Prompt();
+}
+
+void printStatusLine(TzxMtextCommand const& command) {
+    bool const annotative = StyleIsAnnotative(GetTextStyleID(command.styleName));
+    TzString const style = TzString::formatted(L"\"%ls\"", command.styleName.kwszPtr());
+    TzString const height = CLinearUnitConverter(kLinearUnitsOfDrawing, kPrecisionOfDrawing)
+                                .MapDoubleToUnit(command.textHeight);
+    tzutPrintf(gStringTable[kStatusLine], style.kwszPtr(), height.kwszPtr(),
+               gStringTable[annotative ? kAnnotative : kNotAnnotative].kwszPtr());
+}
+
+}  // namespace
+
+bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
+    if (StyleIsAnnotative(GetTextStyleID(styleName))) tzedInvokeAnnoSelectScaleDlg();
+    if (!forAttribute) printStatusLine(*this);
+
+    CTzsMtextFirstPointJig jig(TzGePoint3d::kOrigin);
+    CKeywordTable none;
+    CTzsJigInput input(kControls, none, &jig,
+                       gStringTable[forAttribute ? kAttributePoint : kFirstCorner]);
+    // An empty answer takes the point where the preview stands.
+    for (int status = 0; !isAnswered(status);) {
+        status = promptWithGesture(input);
+        if (status == statusCancel) return false;
+    }
+
+    TzGePoint3d const corner = jig.cursor();
+    setCoordinates(firstCornerUcs, corner);
+    tzdbWcs2Ucs(firstCornerUcs, firstCornerUcs, false);
+    setCoordinates(location, corner);
+    CTzadSysVar::SetPoint(L"LASTPOINT", corner);
+    telemetry.set_start_point(input.getInputData());
+    telemetry.SendEvent(0, 4);
+    if (wantSecondPoint) return DoSecondPointPrompt(forAttribute);
+    telemetry.set_end_point(input.getInputData());
+    return true;
+}

@@ -1,0 +1,113 @@
+// The list of the drawing's text styles.
+
+#include "module/access/string_table.h"
+#include "module/access/style_rules.h"
+#include "module/access/unit_converter.h"
+#include "module/prompt/string_input.h"
+#include "tz/db/database.h"
+#include "tz/db/host_services.h"
+#include "tz/ed/print.h"
+#include "tz/ed/selection.h"
+#include "tz/mte/mtext_command.h"
+
+namespace {
+
+// Texts of the list.
+constexpr unsigned kPatternPrompt = 1075;
+constexpr unsigned kHeading = 1076;
+constexpr unsigned kNameAndFont = 1077;
+constexpr unsigned kSizes = 1078;
+constexpr unsigned kModes = 1079;
+constexpr unsigned kNoneFound = 1080;
+constexpr unsigned kCurrentStyle = 1081;
+constexpr unsigned kExternalStyles = 1094;
+constexpr unsigned kBackward = 2068;
+constexpr unsigned kUpsideDown = 2069;
+constexpr unsigned kVertical = 2070;
+constexpr unsigned kNormal = 2071;
+
+// Bits of a style's flags.
+constexpr int kBackwardBit = 2;
+constexpr int kUpsideDownBit = 4;
+
+TzString quoted(wchar_t const* name) {
+    return TzString::formatted(L"\"%ls\"", name ? name : L"");
+}
+
+TzString modesOf(TzDbTextStyleTableRecord const& style) {
+    TzString modes;
+    if (style.flagBits() & kBackwardBit) modes += gStringTable[kBackward] + L" ";
+    if (style.flagBits() & kUpsideDownBit) modes += gStringTable[kUpsideDown] + L" ";
+    if (style.isVertical()) modes += gStringTable[kVertical] + L" ";
+    return modes.isEmpty() ? gStringTable[kNormal] : modes;
+}
+
+void printStyle(TzDbTextStyleTableRecord const& style) {
+    tzutPrintf(gStringTable[kNameAndFont], quoted(style.getName()).kwszPtr(),
+               style.fileName().kwszPtr());
+    TzString const bigFont = style.bigFontFileName();
+    if (!bigFont.isEmpty()) tzutPrintf(L", %ls", bigFont.kwszPtr());
+    tzutPrintf(L"\n");
+    CLinearUnitConverter const lengths(kLinearUnitsOfDrawing, kPrecisionOfDrawing);
+    CLinearUnitConverter const factors(kDecimal, kPrecisionOfDrawing);
+    CRadialUnitConverter const angles(kRadialUnitsOfDrawing, kPrecisionOfDrawing);
+    tzutPrintf(gStringTable[kSizes], lengths.MapDoubleToUnit(style.textSize()).kwszPtr(),
+               factors.MapDoubleToUnit(style.xScale()).kwszPtr(),
+               angles.MapDoubleToUnit(style.obliquingAngle()).kwszPtr());
+    tzutPrintf(gStringTable[kModes], modesOf(style).kwszPtr());
+}
+
+// How many styles a list showed, and how many it left out as another drawing's.
+struct ListCounts {
+    int shown = 0;
+    int external = 0;
+};
+
+ListCounts printStyles(TzDbTextStyleTableIterator& walk, TzString const& pattern) {
+    ListCounts counts;
+    for (; !walk.done(); walk.step(true, true)) {
+        EasyObject<TzDbTextStyleTableRecord> style;
+        if (walk.getRecord(style.object, TzDb::kForRead) != Tzad::eOk) continue;
+        TzString const name = style->getName();
+        if (name.find(L'|') != -1) {
+            ++counts.external;
+        } else if (tzutWcMatchEx(name, pattern, true)) {
+            printStyle(*style.object);
+            ++counts.shown;
+        }
+    }
+    return counts;
+}
+
+// Asks which styles to list; false when there is no answer.
+bool askPattern(TzString& pattern) {
+    CKeywordTable none;
+    CTzsSymbolStringInput input(0, none, gStringTable[kPatternPrompt]);
+    input.SetDefault(L"*");
+    int const status = input.Prompt();
+    if (status == statusNone) {
+        pattern = input.GetDefault();
+        return true;
+    }
+    pattern = input.GetInput();
+    return status == statusNormal;
+}
+
+}  // namespace
+
+void TzxMtextCommandBase::EnumerateStyles() {
+    TzString pattern;
+    if (!askPattern(pattern)) return;
+    EasyTable<TzDbTextStyleTable> table;
+    TzDbDatabase* database = tzdbHostApplicationServices()->workingDatabase();
+    if (database->getTextStyleTable(table.object, TzDb::kForRead) != Tzad::eOk) return;
+    EasyIterator<TzDbTextStyleTable, TzDbTextStyleTableIterator> walk;
+    if (table->newIterator(walk.object, true, true) != Tzad::eOk) return;
+    tzedTextScr();
+    tzutPrintf(gStringTable[kHeading]);
+    walk->start(true, true);
+    ListCounts const counts = printStyles(*walk.object, pattern);
+    if (counts.shown == 0) tzutPrintf(gStringTable[kNoneFound]);
+    if (counts.external > 0) tzutPrintf(gStringTable[kExternalStyles], counts.external);
+    tzutPrintf(gStringTable[kCurrentStyle], quoted(GetCurrentTextStyleName()).kwszPtr());
+}
