@@ -3,29 +3,15 @@
 #include <cmath>
 #include <variant>
 
+#include "host/base/fault_point.h"
+#include "host/base/screen.h"
 #include "host/base/variables.h"
 #include "tz/ed/view.h"
-
-// Windows are told apart by their addresses.
-struct TzWindow {
-    POINT corner;
-    tzhost::PixelSize size;
-};
 
 namespace tzhost {
 namespace {
 
-constexpr TzWindow kDesktopWindow{
-    {0, 0},
-    kDesktop
-};
-constexpr TzWindow kApplicationWindow{
-    {0, 0},
-    kDesktop
-};
-constexpr TzWindow kDrawingAreaWindow{kDrawingAreaCorner, kDrawingArea};
-
-// Half of what a pixel's coordinate can hold, so that the area's corner can be added.
+// Half of what a pixel's coordinate can hold, so that the drawing area's corner can be added.
 constexpr double kFarthestPixel = 1073741824.0;
 
 TzGePoint3d viewCentre(Space space) {
@@ -43,50 +29,27 @@ Space spaceOf(int viewport) {
 
 }  // namespace
 
-ScreenMapping::ScreenMapping(Space space)
-    : axes_(viewAxes(space)), centre_(viewCentre(space)),
-      pixelsPerUnit_(kDrawingArea.height / Variables::instance().number(L"VIEWSIZE")) {}
+ScreenMapping::ScreenMapping(Space space) : axes_(viewAxes(space)), centre_(viewCentre(space)) {
+    RECT const& area = screen().drawingArea;
+    double const height = area.bottom - area.top;
+    middle_ = {(area.right - area.left) / 2.0, height / 2.0};
+    pixelsPerUnit_ = height / Variables::instance().number(L"VIEWSIZE");
+}
 
 TzGePoint2d ScreenMapping::pixelOf(TzGePoint3d const& world) const {
     TzGeVector2d const off = axes_.project(world - centre_) * pixelsPerUnit_;
-    return {kDrawingArea.width / 2.0 + off.x, kDrawingArea.height / 2.0 - off.y};
+    return {middle_.x + off.x, middle_.y - off.y};
 }
 
 TzGePoint3d ScreenMapping::worldOf(TzGePoint2d const& pixel) const {
-    TzGeVector2d const off(pixel.x - kDrawingArea.width / 2.0, kDrawingArea.height / 2.0 - pixel.y);
+    TzGeVector2d const off(pixel.x - middle_.x, middle_.y - pixel.y);
     return centre_ + axes_.unproject(off / pixelsPerUnit_);
 }
 
 }  // namespace tzhost
 
-HWND GetDesktopWindow() {
-    return &tzhost::kDesktopWindow;
-}
-
-HWND GetApplicationWindow() {
-    return &tzhost::kApplicationWindow;
-}
-
-HWND GetDrawingAreaWindow() {
-    return &tzhost::kDrawingAreaWindow;
-}
-
-int GetWindowRect(HWND window, RECT* rect) {
-    if (!window || !rect) return 0;
-    POINT const corner = window->corner;
-    *rect = {corner.x, corner.y, corner.x + window->size.width, corner.y + window->size.height};
-    return 1;
-}
-
-int ClientToScreen(HWND window, POINT* point) {
-    if (!window || !point) return 0;
-    point->x += window->corner.x;
-    point->y += window->corner.y;
-    return 1;
-}
-
 bool tzedCoordFromWorldToPixel(int viewport, TzGePoint3d const& world, POINT& pixel) {
-    if (viewport < 1) return false;
+    if (tzhost::faultAt("tzedCoordFromWorldToPixel") || viewport < 1) return false;
     tzhost::ScreenMapping const mapping(tzhost::spaceOf(viewport));
     TzGePoint2d const exact = mapping.pixelOf(world);
     // Written so that what is not a number fails as well.
@@ -99,7 +62,7 @@ bool tzedCoordFromWorldToPixel(int viewport, TzGePoint3d const& world, POINT& pi
 }
 
 bool tzedCoordFromPixelToWorld(int viewport, POINT const& pixel, TzGePoint3d& world) {
-    if (viewport < 1) return false;
+    if (tzhost::faultAt("tzedCoordFromPixelToWorld") || viewport < 1) return false;
     tzhost::ScreenMapping const mapping(tzhost::spaceOf(viewport));
     world = mapping.worldOf({static_cast<double>(pixel.x), static_cast<double>(pixel.y)});
     return true;

@@ -1,20 +1,9 @@
 #pragma once
 
 #include "host/display/view.h"
-#include "tz/pal/windows_calls.h"
 
-// The screen, which exists in numbers only, and how the drawing lies on it.
+// How the drawing lies on the screen, which exists in numbers only.
 namespace tzhost {
-
-struct PixelSize {
-    int width;
-    int height;
-};
-
-// The application's window fills the desktop; the drawing area stands inside it.
-inline constexpr PixelSize kDesktop{1920, 1080};
-inline constexpr PixelSize kDrawingArea{1600, 900};
-inline constexpr POINT kDrawingAreaCorner{160, 90};
 
 // The mapping that the view in force gives, taken once. Pixels count from the drawing area's top
 // left corner, downwards, and are not rounded.
@@ -30,6 +19,7 @@ public:
 private:
     ViewAxes axes_;
     TzGePoint3d centre_;
+    TzGePoint2d middle_;  // the pixel that shows the centre
     double pixelsPerUnit_;
 };
 

@@ -31,9 +31,11 @@ TzGeVector2d ViewAxes::project(TzGeVector3d const& world) const {
 ViewAxes viewAxes(Space space) {
     if (space == Space::paper) return ViewAxes();
     VariableValue const* const value = Variables::instance().get(L"VIEWDIR");
-    auto const* const user = value ? std::get_if<VariablePoint>(value) : nullptr;
-    VariablePoint world{};
-    if (!user || !tzdbUcs2Wcs(user->data(), world.data(), true)) return ViewAxes();
+    auto const* const direction = value ? std::get_if<VariablePoint>(value) : nullptr;
+    if (!direction) return ViewAxes();
+    // Without a drawing there is no user system, and the numbers are those of the world.
+    VariablePoint world = *direction;
+    (void)tzdbUcs2Wcs(direction->data(), world.data(), true);
     return ViewAxes(TzGeVector3d(world[0], world[1], world[2]));
 }
 

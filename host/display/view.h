@@ -34,7 +34,7 @@ private:
     TzGeVector3d y_ = TzGeVector3d::kYAxis;
 };
 
-// The axes that VIEWDIR and the user system in force give, or those of the paper.
+// The axes that VIEWDIR gives, read in the user system in force, or those of the paper.
 [[nodiscard]] ViewAxes viewAxes(Space space);
 
 }  // namespace tzhost

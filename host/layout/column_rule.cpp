@@ -2,15 +2,12 @@
 
 #include <algorithm>
 
-#include "host/layout/glyph_run.h"
-
 namespace tzhost {
 namespace {
 
 constexpr double kLineDistance = 5.0 / 3.0;
 constexpr double kSlack = 1e-9;
 
-constexpr int kExactly = 2;
 constexpr int kStaticColumns = 1;
 constexpr int kDynamicColumns = 2;
 
@@ -46,11 +43,6 @@ double SpacingRule::distance(LineMetrics const& above, LineMetrics const& line) 
         return kLineDistance * factor * textHeight;
     }
     return kLineDistance * factor * line.height + (line.ascent - line.height) + above.depth;
-}
-
-SpacingRule spacingRuleOf(MTextLayoutInput const& input) {
-    return {input.lineSpacingStyle == kExactly, usableFactor(input.lineSpacingFactor),
-            input.textHeight};
 }
 
 PlacedLines placeLines(std::vector<LineMetrics> const& lines,

@@ -1,0 +1,34 @@
+#include "host/display/plot.h"
+
+#include "host/base/fault_point.h"
+#include "host/base/file_bytes.h"
+#include "host/database/drawing.h"
+#include "host/display/draw_pass.h"
+#include "host/display/record_access.h"
+
+namespace tzhost {
+namespace {
+
+DrawList strokesOfActiveSpace(TzDbDatabase& database) {
+    DrawPass pass(&database, DrawPass::Entities::strokes);
+    auto const* const space = objectOf<TzDbBlockTableRecord>(drawingOf(&database)->activeSpace());
+    TzArray<TzDbObjectId> ids;
+    if (space) space->entities(ids);
+    for (TzDbObjectId const& id : ids)
+        pass.draw(objectOf<TzDbEntity>(id));
+    return pass.list();
+}
+
+}  // namespace
+
+std::optional<std::string>
+plotDrawing(TzDbDatabase& database, PlotFormat format, std::string const& file) {
+    if (faultAt("plotDrawing")) return file + ": cannot be plotted";
+    PlotScene const scene = makeScene(strokesOfActiveSpace(database), viewAxes(activeSpace()));
+    std::string const bytes = paintPlot(scene, format);
+    if (bytes.empty()) return file + ": the picture could not be made";
+    if (!writeFileSafely(file, bytes)) return file + ": cannot be written: " + systemReason();
+    return std::nullopt;
+}
+
+}  // namespace tzhost

@@ -1,0 +1,181 @@
+#include "host/display/plot_paint.h"
+
+#include <cairo-pdf.h>
+#include <cairo-svg.h>
+#include <cairo.h>
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <memory>
+#include <numeric>
+
+namespace tzhost {
+namespace {
+
+struct SurfaceFree {
+    void operator()(cairo_surface_t* surface) const { cairo_surface_destroy(surface); }
+};
+using Surface = std::unique_ptr<cairo_surface_t, SurfaceFree>;
+struct CairoFree {
+    void operator()(cairo_t* cairo) const { cairo_destroy(cairo); }
+};
+using Cairo = std::unique_ptr<cairo_t, CairoFree>;
+
+struct Page {
+    double width;
+    double height;
+    double perMillimetre;  // page units
+    double thinnestLine;   // page units
+};
+// In the order of PlotFormat: pixels of 1/96 inch, and points of 1/72 inch.
+constexpr Page kPages[] = {
+    {1600.0, 900.0,  96.0 / 25.4, 1.0},
+    {1600.0, 900.0,  96.0 / 25.4, 1.0},
+    {841.89, 595.28, 72.0 / 25.4, 0.5},
+};
+constexpr double kMargin = 0.05;  // of the page's smaller side
+
+cairo_status_t takeBytes(void* closure, unsigned char const* data, unsigned int length) {
+    static_cast<std::string*>(closure)->append(reinterpret_cast<char const*>(data), length);
+    return CAIRO_STATUS_SUCCESS;
+}
+
+Surface makeSurface(PlotFormat format, Page const& page, std::string& bytes) {
+    switch (format) {
+    case PlotFormat::svg: {
+        Surface surface(
+            cairo_svg_surface_create_for_stream(takeBytes, &bytes, page.width, page.height));
+        cairo_svg_surface_set_document_unit(surface.get(), CAIRO_SVG_UNIT_PX);
+        return surface;
+    }
+    case PlotFormat::pdf:
+        return Surface(
+            cairo_pdf_surface_create_for_stream(takeBytes, &bytes, page.width, page.height));
+    case PlotFormat::png: break;
+    }
+    return Surface(cairo_image_surface_create(CAIRO_FORMAT_RGB24, static_cast<int>(page.width),
+                                              static_cast<int>(page.height)));
+}
+
+// From the view to the page, whose y runs downwards.
+class PageMapping {
+public:
+    PageMapping(Page const& page, LayoutBox const& extents);
+
+    [[nodiscard]] LayoutPoint place(LayoutPoint const& point) const {
+        return {pageMiddle_.x + (point.x - middle_.x) * scale_,
+                pageMiddle_.y - (point.y - middle_.y) * scale_};
+    }
+    [[nodiscard]] double scale() const { return scale_; }
+
+private:
+    LayoutPoint middle_;
+    LayoutPoint pageMiddle_;
+    double scale_ = 1.0;
+};
+
+PageMapping::PageMapping(Page const& page, LayoutBox const& extents)
+    : middle_{(extents.left + extents.right) / 2.0, (extents.bottom + extents.top) / 2.0},
+      pageMiddle_{page.width / 2.0, page.height / 2.0} {
+    double const margin = 2.0 * kMargin * std::min(page.width, page.height);
+    double const across = (page.width - margin) / extents.width();
+    double const upwards = (page.height - margin) / extents.height();
+    double const fitting = std::min(across, upwards);
+    // A scene that is a single point has no size to fit.
+    if (std::isfinite(fitting)) scale_ = fitting;
+}
+
+class Painter {
+public:
+    Painter(cairo_t* cairo, Page const& page, PageMapping const& mapping)
+        : cairo_(cairo), page_(page), mapping_(mapping) {}
+
+    void paint(PlotShape const& shape);
+
+private:
+    [[nodiscard]] bool addPath(std::vector<OutlineStep> const& path);
+    void addStep(OutlineKind kind, std::array<LayoutPoint, 3> const& at);
+    void setStroke(PlotShape const& shape);
+
+    cairo_t* cairo_;
+    Page const& page_;
+    PageMapping const& mapping_;
+};
+
+void Painter::addStep(OutlineKind kind, std::array<LayoutPoint, 3> const& at) {
+    switch (kind) {
+    case OutlineKind::move: cairo_move_to(cairo_, at[0].x, at[0].y); break;
+    case OutlineKind::line: cairo_line_to(cairo_, at[0].x, at[0].y); break;
+    case OutlineKind::curve:
+        cairo_curve_to(cairo_, at[0].x, at[0].y, at[1].x, at[1].y, at[2].x, at[2].y);
+        break;
+    case OutlineKind::close: cairo_close_path(cairo_); break;
+    }
+}
+
+bool Painter::addPath(std::vector<OutlineStep> const& path) {
+    cairo_new_path(cairo_);
+    for (OutlineStep const& step : path) {
+        std::array<LayoutPoint, 3> at;
+        std::transform(step.points.begin(), step.points.end(), at.begin(),
+                       [&](auto const& each) { return mapping_.place(each); });
+        bool const isFinite = std::all_of(at.begin(), at.end(), [](LayoutPoint const& each) {
+            return std::isfinite(each.x) && std::isfinite(each.y);
+        });
+        if (!isFinite) return false;
+        addStep(step.kind, at);
+    }
+    return true;
+}
+
+void Painter::setStroke(PlotShape const& shape) {
+    double const width = shape.lineWeight * page_.perMillimetre;
+    cairo_set_line_width(cairo_, std::max(width, page_.thinnestLine));
+    cairo_set_line_cap(cairo_, CAIRO_LINE_CAP_ROUND);
+    cairo_set_line_join(cairo_, CAIRO_LINE_JOIN_ROUND);
+    std::vector<double> dashes = shape.dashes;
+    for (double& each : dashes)
+        each *= mapping_.scale();
+    double const period = std::accumulate(dashes.begin(), dashes.end(), 0.0);
+    // Dashes that run into each other, or longer than anything, show as a solid line.
+    bool const isVisible = period > 2.0 * page_.thinnestLine && std::isfinite(period);
+    cairo_set_dash(cairo_, dashes.data(), isVisible ? static_cast<int>(dashes.size()) : 0, 0.0);
+}
+
+void Painter::paint(PlotShape const& shape) {
+    if (!addPath(shape.path)) return;
+    PlotColor const& color = shape.color;
+    cairo_set_source_rgba(cairo_, color.red, color.green, color.blue, color.alpha);
+    if (shape.kind == PlotKind::fill) {
+        cairo_fill(cairo_);
+        return;
+    }
+    setStroke(shape);
+    cairo_stroke(cairo_);
+}
+
+}  // namespace
+
+std::string paintPlot(PlotScene const& scene, PlotFormat format) {
+    Page const& page = kPages[static_cast<std::size_t>(format)];
+    std::string bytes;
+    Surface const surface = makeSurface(format, page, bytes);
+    Cairo cairo(cairo_create(surface.get()));
+    cairo_set_source_rgb(cairo.get(), 1.0, 1.0, 1.0);
+    cairo_paint(cairo.get());
+    PageMapping const mapping(page, scene.extents().value_or(LayoutBox{}));
+    Painter painter(cairo.get(), page, mapping);
+    for (PlotShape const& shape : scene.shapes)
+        painter.paint(shape);
+    bool good = cairo_status(cairo.get()) == CAIRO_STATUS_SUCCESS;
+    cairo.reset();
+    if (format == PlotFormat::png) {
+        cairo_surface_write_to_png_stream(surface.get(), takeBytes, &bytes);
+    }
+    cairo_surface_finish(surface.get());
+    good = good && cairo_surface_status(surface.get()) == CAIRO_STATUS_SUCCESS;
+    return good ? bytes : std::string();
+}
+
+}  // namespace tzhost
