@@ -2,12 +2,15 @@
 
 #include <algorithm>
 
+#include "host/layout/glyph_run.h"
+
 namespace tzhost {
 namespace {
 
 constexpr double kLineDistance = 5.0 / 3.0;
 constexpr double kSlack = 1e-9;
 
+constexpr int kExactly = 2;
 constexpr int kStaticColumns = 1;
 constexpr int kDynamicColumns = 2;
 
@@ -43,6 +46,11 @@ double SpacingRule::distance(LineMetrics const& above, LineMetrics const& line) 
         return kLineDistance * factor * textHeight;
     }
     return kLineDistance * factor * line.height + (line.ascent - line.height) + above.depth;
+}
+
+SpacingRule spacingRuleOf(MTextLayoutInput const& input) {
+    return {input.lineSpacingStyle == kExactly, usableFactor(input.lineSpacingFactor),
+            input.textHeight};
 }
 
 PlacedLines placeLines(std::vector<LineMetrics> const& lines,

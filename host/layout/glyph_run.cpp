@@ -1,9 +1,24 @@
 #include "host/layout/glyph_run.h"
 
+#include <cmath>
+
 namespace tzhost {
 
+double usableFactor(double factor) {
+    return factor > 0.0 && std::isfinite(factor) ? factor : 1.0;
+}
+
+namespace {
+
+// Down the page tracking parts the letters and widens nothing.
+double trackingOf(WholeText const& whole) {
+    return whole.flow == TextFlow::along ? whole.tracking : 1.0;
+}
+
+}  // namespace
+
 double advanceScale(LineFormat const& format, WholeText const& whole) {
-    return format.height * whole.widthFactor * whole.tracking;
+    return format.height * whole.widthFactor * trackingOf(whole);
 }
 
 GlyphRun makeGlyphRun(std::wstring const& text, LineFormat const& format, WholeText const& whole) {
@@ -11,7 +26,7 @@ GlyphRun makeGlyphRun(std::wstring const& text, LineFormat const& format, WholeT
     run.text = text;
     run.height = format.height;
     run.widthFactor = whole.widthFactor;
-    run.tracking = whole.tracking;
+    run.tracking = trackingOf(whole);
     run.oblique = whole.oblique;
     run.face = format.face;
     run.color = format.color;

@@ -10,6 +10,9 @@ namespace tzhost {
 // From one letter of a vertical text to the next, in text heights.
 inline constexpr double kVerticalStep = 4.0 / 3.0;
 
+// A factor that letters can be drawn with: the given one, or 1 when it is not above 0 and finite.
+[[nodiscard]] double usableFactor(double factor);
+
 // What an advance in heights of capitals is multiplied by.
 [[nodiscard]] double advanceScale(LineFormat const& format, WholeText const& whole);
 

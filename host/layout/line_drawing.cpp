@@ -43,7 +43,6 @@ public:
 
 private:
     void drawText(LineFragment const& fragment, LineFormat const& format);
-    void drawStack(LaidStack const& stack, double x);
     void decorate(DecorationRow const& row,
                   OpenRule& rule,
                   LineFragment const& fragment,
@@ -66,7 +65,8 @@ void LineDrawer::draw(SegmentLine const& line) {
             decorate(kDecorations[i], rules[i], fragment, format);
         }
         if (cell.stack != 0) {
-            drawStack(segment_.stacks[cell.stack - 1], origin_.x + fragment.x);
+            drawStack(segment_.stacks[cell.stack - 1], {origin_.x + fragment.x, origin_.y},
+                      layout_);
         } else if (segment_.text[fragment.start] != L'\t') {
             drawText(fragment, format);
         }
@@ -84,21 +84,6 @@ void LineDrawer::drawText(LineFragment const& fragment, LineFormat const& format
     run.y = origin_.y;
     run.advance = fragment.advance;
     layout_.runs.push_back(std::move(run));
-}
-
-void LineDrawer::drawStack(LaidStack const& stack, double x) {
-    for (GlyphRun run : stack.runs) {
-        run.x += x;
-        run.y += origin_.y;
-        layout_.runs.push_back(std::move(run));
-    }
-    for (TextRule rule : stack.rules) {
-        for (LayoutPoint* const point : {&rule.from, &rule.to}) {
-            point->x += x;
-            point->y += origin_.y;
-        }
-        layout_.rules.push_back(rule);
-    }
 }
 
 void LineDrawer::decorate(DecorationRow const& row,
@@ -133,6 +118,21 @@ void LineDrawer::close(DecorationRow const& row, OpenRule& rule) {
 }
 
 }  // namespace
+
+void drawStack(LaidStack const& stack, LayoutPoint origin, MTextLayout& layout) {
+    for (GlyphRun run : stack.runs) {
+        run.x += origin.x;
+        run.y += origin.y;
+        layout.runs.push_back(std::move(run));
+    }
+    for (TextRule rule : stack.rules) {
+        for (LayoutPoint* const point : {&rule.from, &rule.to}) {
+            point->x += origin.x;
+            point->y += origin.y;
+        }
+        layout.rules.push_back(rule);
+    }
+}
 
 void drawLine(Segment const& segment,
               SegmentLine const& line,

@@ -14,4 +14,7 @@ void drawLine(Segment const& segment,
               LayoutPoint origin,
               MTextLayout& layout);
 
+// Adds a stack, its start on the baseline at `origin`.
+void drawStack(LaidStack const& stack, LayoutPoint origin, MTextLayout& layout);
+
 }  // namespace tzhost

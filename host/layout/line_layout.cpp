@@ -1,7 +1,6 @@
 #include "host/layout/line_layout.h"
 
 #include <algorithm>
-#include <cmath>
 #include <utility>
 
 #include "host/layout/face_table.h"
@@ -14,10 +13,10 @@ namespace {
 
 WholeText wholeTextOf(LineLayoutInput const& input) {
     WholeText whole;
-    double const factor = input.style.widthFactor;
-    whole.widthFactor = factor > 0.0 && std::isfinite(factor) ? factor : 1.0;
-    whole.tracking = input.tracking > 0.0 && std::isfinite(input.tracking) ? input.tracking : 1.0;
+    whole.widthFactor = usableFactor(input.style.widthFactor);
+    whole.tracking = usableFactor(input.tracking);
     whole.oblique = input.style.oblique;
+    whole.flow = isVerticalStyle(input.style) ? TextFlow::down : TextFlow::along;
     return whole;
 }
 
@@ -38,8 +37,7 @@ LineLayout layDown(LineLayoutInput const& input, LineFormat const& format, Whole
     double y = -format.height;
     for (std::wstring const& letter : splitLetters(input.text, format.face)) {
         GlyphRun run = makeGlyphRun(letter, format, whole);
-        run.tracking = 1.0;
-        run.advance = shapedAdvance(letter, format.face) * format.height * whole.widthFactor;
+        run.advance = shapedAdvance(letter, format.face) * advanceScale(format, whole);
         run.x = -run.advance / 2.0;
         run.y = y;
         y -= step;
@@ -71,7 +69,7 @@ void mirror(LineLayout& line, LayoutStyle const& style) {
 LineLayout layOutLine(LineLayoutInput const& input) {
     LineFormat const format{faceOfStyle(input.style), input.textHeight, input.color, false, false};
     WholeText const whole = wholeTextOf(input);
-    LineLayout line = isVerticalStyle(input.style) ? layDown(input, format, whole)
+    LineLayout line = whole.flow == TextFlow::down ? layDown(input, format, whole)
                                                    : layAlong(input, format, whole);
     mirror(line, input.style);
     return line;

@@ -28,13 +28,13 @@ void skipSemicolon(wchar_t const*& cursor);
 // nothing.
 [[nodiscard]] std::wstring scanEscapedText(wchar_t const*& cursor);
 
-// The character of "+XXXX" (four hex digits), or 0 when something else stands there. Five
-// characters are taken either way, as far as the text goes.
+// With the cursor behind "\U": the character of "+XXXX" (four hex digits), or 0 when something else
+// stands there. Five characters are taken either way, as far as the text goes.
 [[nodiscard]] wchar_t scanUnicode(wchar_t const*& cursor);
 
-// The character of "+nXXXX", n from 1 to 5 choosing one of the double-byte code pages 932, 936,
-// 949, 950 and 1361. False, and the cursor stays, when something else stands there. Bytes that are
-// no character of the page read as U+FFFD.
+// With the cursor behind "\M": the character of "+nXXXX", n from 1 to 5 choosing one of the
+// double-byte code pages 932, 936, 949, 950 and 1361. False, and the cursor stays, when something
+// else stands there. Bytes that are no character of the page read as U+FFFD.
 [[nodiscard]] bool scanMultibyte(wchar_t const*& cursor, wchar_t& character);
 
 }  // namespace tzhost::markup

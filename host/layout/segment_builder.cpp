@@ -33,6 +33,7 @@ private:
     void addCell(wchar_t c, std::size_t format, std::size_t stack);
     void endSegment(MarkupPiece const& piece);
     void shape();
+    void measure(SegmentCell& cell, ShapedCharacter const& character) const;
 
     MarkupText const& markup_;
     std::vector<LineFormat> const& formats_;
@@ -104,17 +105,27 @@ void Builder::shape() {
     }
     ShapedText const shaped = shapeText(segment_.text, spans);
     for (std::size_t i = 0; i < cells.size(); ++i) {
-        SegmentCell& cell = cells[i];
-        ShapedCharacter const& character = shaped.characters[i];
-        cell.mayBreakBefore = character.mayBreakBefore;
-        cell.isBlank = character.isBlank;
-        cell.advance = cell.stack != 0
-                           ? segment_.stacks[cell.stack - 1].advance
-                           : character.advance * advanceScale(formats_[cell.format], whole_);
+        measure(cells[i], shaped.characters[i]);
     }
     for (ShapedItem const& item : shaped.items) {
         segment_.itemEnds.push_back(item.end);
         segment_.itemLevels.push_back(item.level);
+    }
+}
+
+void Builder::measure(SegmentCell& cell, ShapedCharacter const& character) const {
+    LineFormat const& format = formats_[cell.format];
+    cell.mayBreakBefore = character.mayBreakBefore;
+    cell.isBlank = character.isBlank;
+    cell.opensLetter = character.opensLetter;
+    LaidStack const* const stack = cell.stack != 0 ? &segment_.stacks[cell.stack - 1] : nullptr;
+    cell.width =
+        stack != nullptr ? stack->advance : character.advance * advanceScale(format, whole_);
+    cell.advance = cell.width;
+    if (whole_.flow == TextFlow::down) {
+        double const beyond = stack != nullptr ? stack->top - stack->bottom - format.height : 0.0;
+        double const step = kVerticalStep * format.height * whole_.tracking + beyond;
+        cell.advance = cell.opensLetter ? step : 0.0;
     }
 }
 

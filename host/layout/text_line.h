@@ -13,6 +13,9 @@
 // its baseline.
 namespace tzhost {
 
+// Whether lines run along the text's direction, or down from the top, later lines to the left.
+enum class TextFlow { along, down };
+
 // What holds for the whole text: factors on advances, the oblique angle in radians, the percentage
 // of stacked parts, the distance of tab stops where a paragraph sets none.
 struct WholeText {
@@ -21,6 +24,7 @@ struct WholeText {
     double oblique = 0.0;
     double stackScale = 1.0;
     double tabDistance = 0.0;
+    TextFlow flow = TextFlow::along;
 };
 
 // A look ready to draw with.
@@ -41,13 +45,16 @@ struct LaidStack {
     std::vector<TextRule> rules;
 };
 
-// One character of a segment; a stack takes the place of one.
+// One character of a segment; a stack takes the place of one. `advance` is counted in the direction
+// of the flow, `width` always across the page; the one of a letter stands at its first character.
 struct SegmentCell {
     double advance = 0.0;
+    double width = 0.0;
     std::size_t format = 0;
     std::size_t stack = 0;  // counts from 1, 0 is none
     bool mayBreakBefore = false;
     bool isBlank = false;
+    bool opensLetter = true;
 };
 
 // A stretch between two line ends, shaped. `endFormat` is the look in force at its end, which gives
@@ -87,6 +94,26 @@ struct LineMetrics {
     double height = 0.0;
     double ascent = 0.0;
     double depth = 0.0;
+};
+
+// A line and the segment it was cut from.
+struct LaidLine {
+    std::size_t segment = 0;
+    SegmentLine line;
+};
+
+// A text that was broken into lines and is still to be placed. A wrap width of 0 or below has left
+// paragraphs unbroken.
+struct BrokenText {
+    WholeText whole;
+    double wrapWidth = 0.0;
+    std::vector<LineFormat> formats;
+    std::vector<Segment> segments;
+    std::vector<LaidLine> lines;
+
+    [[nodiscard]] Segment const& segmentOf(LaidLine const& line) const {
+        return segments[line.segment];
+    }
 };
 
 }  // namespace tzhost

@@ -29,6 +29,13 @@ Cairo makeCanvas() {
     return canvas;
 }
 
+// Whether a move opens no outline: one that the canvas left at the start or the end of a letter.
+bool leadsNowhere(cairo_path_t const& path, int index) {
+    int const next = index + path.data[index].header.length;
+    return path.data[index].header.type == CAIRO_PATH_MOVE_TO &&
+           (next >= path.num_data || path.data[next].header.type == CAIRO_PATH_MOVE_TO);
+}
+
 class Outliner {
 public:
     explicit Outliner(GlyphRun const& run)
@@ -97,6 +104,9 @@ void Outliner::addGlyph(PangoFont* font, PangoGlyphInfo const& glyph) {
 void Outliner::addPath(cairo_path_t const& path) {
     for (int i = 0; i < path.num_data; i += path.data[i].header.length) {
         cairo_path_data_t const* const data = path.data + i;
+        if (leadsNowhere(path, i)) {
+            continue;
+        }
         switch (data->header.type) {
         case CAIRO_PATH_MOVE_TO: steps_.push_back({OutlineKind::move, {place(data[1])}}); break;
         case CAIRO_PATH_LINE_TO: steps_.push_back({OutlineKind::line, {place(data[1])}}); break;
