@@ -7,8 +7,13 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <cstdlib>
+#include <ctime>
 #include <memory>
 #include <numeric>
+#include <string_view>
+
+#include "host/base/result_time.h"
 
 namespace tzhost {
 namespace {
@@ -41,6 +46,24 @@ cairo_status_t takeBytes(void* closure, unsigned char const* data, unsigned int 
     return CAIRO_STATUS_SUCCESS;
 }
 
+std::string dateText() {
+    std::time_t const seconds = resultTime();
+    std::tm parts{};
+    char text[64] = "";
+    if (gmtime_r(&seconds, &parts)) std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%SZ", &parts);
+    return text;
+}
+
+// Cairo numbers the surfaces of the process and names a picture by its number. The same drawing
+// must give the same file, so the number goes.
+void unnumber(std::string& svg) {
+    constexpr std::string_view kName = "id=\"surface";
+    std::size_t const at = svg.find(kName);
+    if (at == std::string::npos) return;
+    std::size_t const digits = at + kName.size();
+    svg.erase(digits, svg.find('"', digits) - digits);
+}
+
 Surface makeSurface(PlotFormat format, Page const& page, std::string& bytes) {
     switch (format) {
     case PlotFormat::svg: {
@@ -49,9 +72,16 @@ Surface makeSurface(PlotFormat format, Page const& page, std::string& bytes) {
         cairo_svg_surface_set_document_unit(surface.get(), CAIRO_SVG_UNIT_PX);
         return surface;
     }
-    case PlotFormat::pdf:
-        return Surface(
+    case PlotFormat::pdf: {
+        Surface surface(
             cairo_pdf_surface_create_for_stream(takeBytes, &bytes, page.width, page.height));
+        // Left alone, Cairo takes the clock and writes it with its zone.
+        if (std::getenv("SOURCE_DATE_EPOCH")) {
+            cairo_pdf_surface_set_metadata(surface.get(), CAIRO_PDF_METADATA_CREATE_DATE,
+                                           dateText().c_str());
+        }
+        return surface;
+    }
     case PlotFormat::png: break;
     }
     return Surface(cairo_image_surface_create(CAIRO_FORMAT_RGB24, static_cast<int>(page.width),
@@ -175,6 +205,7 @@ std::string paintPlot(PlotScene const& scene, PlotFormat format) {
     }
     cairo_surface_finish(surface.get());
     good = good && cairo_surface_status(surface.get()) == CAIRO_STATUS_SUCCESS;
+    if (format == PlotFormat::svg) unnumber(bytes);
     return good ? bytes : std::string();
 }
 

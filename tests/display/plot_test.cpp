@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdlib>
 #include <cstring>
 #include <limits>
 #include <string>
@@ -265,6 +266,17 @@ TEST(Plots, NeedNoFontsOfTheViewer) {
     std::string const pdf = paintPlot(scene, PlotFormat::pdf);
     EXPECT_EQ(pdf.substr(0, 5), "%PDF-");
     EXPECT_EQ(pdf.find("/FontFile"), std::string::npos);
+}
+
+// The names and dates that would differ between two runs are left out or told from outside.
+TEST(Plots, OfOneSceneAreTheSameFile) {
+    PlotScene const scene = makeScene({text(L"Plan", 1)}, ViewAxes());
+    ASSERT_EQ(setenv("SOURCE_DATE_EPOCH", "86400", 1), 0);
+    for (PlotFormat const format : {PlotFormat::svg, PlotFormat::png, PlotFormat::pdf}) {
+        EXPECT_EQ(paintPlot(scene, format), paintPlot(scene, format));
+    }
+    EXPECT_NE(paintPlot(scene, PlotFormat::pdf).find("(19700102000000Z)"), std::string::npos);
+    unsetenv("SOURCE_DATE_EPOCH");
 }
 
 }  // namespace
