@@ -7,6 +7,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/command_line/unit_reader.h"
+#include "host/command_line/unit_text.h"
 #include "host/command_line/unit_writer.h"
 #include "tz/ed/units.h"
 #include "tz/rx/status.h"
@@ -206,7 +207,10 @@ bool readSigned(UnitReader& reader, double bare, double& radians) {
     return true;
 }
 
-bool readAngle(std::wstring_view text, double bare, double& radians) {
+}  // namespace
+
+bool readAngle(std::wstring_view text, int unit, double& radians) {
+    double const bare = kUnits[isUnit(unit) ? static_cast<std::size_t>(unit) : 0].radians;
     UnitReader reader(text);
     double read = 0;
     char const first = reader.peek();
@@ -223,8 +227,6 @@ bool readAngle(std::wstring_view text, double bare, double& radians) {
     radians = read;
     return true;
 }
-
-}  // namespace
 
 }  // namespace tzhost
 
@@ -243,6 +245,5 @@ int tzdbAngToS(double radians, int unit, int precision, TzString& text) {
 int tzdbAngToF(wchar_t const* text, int unit, double* radians) {
     if (auto const fault = tzhost::faultAt("tzdbAngToF")) return *fault;
     if (text == nullptr || radians == nullptr || !tzhost::isUnit(unit)) return Tzad::ePromptError;
-    double const bare = tzhost::kUnits[static_cast<std::size_t>(unit)].radians;
-    return tzhost::readAngle(text, bare, *radians) ? Tzad::ePromptNormal : Tzad::ePromptError;
+    return tzhost::readAngle(text, unit, *radians) ? Tzad::ePromptNormal : Tzad::ePromptError;
 }

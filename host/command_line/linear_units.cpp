@@ -5,6 +5,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/command_line/unit_reader.h"
+#include "host/command_line/unit_text.h"
 #include "host/command_line/unit_writer.h"
 #include "tz/ed/units.h"
 #include "tz/rx/status.h"
@@ -71,6 +72,8 @@ bool isZero(std::string_view text) {
     return text.substr(0, text.find('E')).find_first_of("123456789") == std::string_view::npos;
 }
 
+}  // namespace
+
 bool readLength(std::wstring_view text, double& value) {
     UnitReader reader(text);
     double const sign = reader.readSign();
@@ -93,8 +96,6 @@ bool readLength(std::wstring_view text, double& value) {
     value = sign * total;
     return true;
 }
-
-}  // namespace
 
 }  // namespace tzhost
 

@@ -1,0 +1,140 @@
+#include "host/command_line/command_line.h"
+
+#include <utility>
+
+#include "host/base/event_sink.h"
+#include "host/base/utf8.h"
+#include "host/runtime/documents.h"
+#include "tz/rx/status.h"
+
+namespace tzhost {
+
+namespace {
+
+constexpr int kMostFailures = 100;
+constexpr std::wstring_view kIdlePrompt = L"Command: ";
+constexpr std::wstring_view kCancelEcho = L"^C";
+
+}  // namespace
+
+CommandLine& commandLine() {
+    static CommandLine theLine;
+    return theLine;
+}
+
+CommandLine::~CommandLine() {
+    if (isAttached_) setPrintSink(nullptr);
+}
+
+void CommandLine::attach() {
+    setPrintSink(this);
+    isAttached_ = true;
+}
+
+AnswerSource* CommandLine::setSource(AnswerSource* source) {
+    return std::exchange(source_, source);
+}
+
+void CommandLine::reset() {
+    source_ = nullptr;
+    transcript_ = {};
+    errors_ = {};
+    sent_.clear();
+    armed_ = {};
+    input_.reset();
+    voice_ = Voice::module;
+    failures_ = 0;
+    hasFailed_ = false;
+}
+
+void CommandLine::print(std::wstring_view text) {
+    if (text.empty()) return;
+    if (voice_ == Voice::module && eventsWanted()) {
+        reportEvent({
+            {"event", "print"     },
+            {"text",  toUtf8(text)}
+        });
+    }
+    transcript_.message(text);
+}
+
+void CommandLine::complain(std::wstring const& text) {
+    hasFailed_ = true;
+    if (errors_) errors_(text + L"\n");
+}
+
+Answer CommandLine::readFromSource(AnswerRequest const& request) {
+    while (source_ != nullptr) {
+        Answer answer = source_->next(request);
+        if (answer.kind != Answer::Kind::fault) return answer;
+        complain(answer.text);
+    }
+    return {};
+}
+
+Answer CommandLine::ask(AnswerRequest const& request) {
+    bool const isSent = !sent_.isEmpty();
+    bool const isOnTerminal = !isSent && !isScripted();
+    if (isOnTerminal) {
+        transcript_.freshLine();
+    } else {
+        transcript_.prompt(request.prompt);
+    }
+    Answer answer = isSent ? sent_.next() : readFromSource(request);
+    if (answer.kind != Answer::Kind::end) failures_ = 0;
+    if (isOnTerminal) {
+        transcript_.answeredOnTerminal();
+    } else if (answer.kind == Answer::Kind::line || answer.kind == Answer::Kind::cancel) {
+        transcript_.answer(answer.kind == Answer::Kind::line ? answer.text : kCancelEcho);
+    }
+    if (answer.kind == Answer::Kind::end && request.kind != QuestionKind::command)
+        hasFailed_ = true;
+    return answer;
+}
+
+std::optional<std::wstring> CommandLine::readCommand(std::vector<std::wstring> words) {
+    if (Document* const document = documents().current()) {
+        for (TzString const& text : document->typed)
+            sent_.push(text.str());
+        document->typed.clear();
+    }
+    AnswerRequest const request{QuestionKind::command, kIdlePrompt, std::move(words)};
+    while (true) {
+        Answer answer = ask(request);
+        if (answer.kind == Answer::Kind::line) return std::move(answer.text);
+        if (answer.kind == Answer::Kind::end) return std::nullopt;
+        if (answer.kind == Answer::Kind::tooLong) say(L"That line is too long.");
+    }
+}
+
+std::optional<EditorBlock> CommandLine::takeEditorBlock() {
+    return source_ == nullptr ? std::nullopt : source_->takeBlock();
+}
+
+Armed CommandLine::takeArmed() {
+    input_.reset();
+    return std::exchange(armed_, {});
+}
+
+std::optional<std::wstring> CommandLine::takeInput() {
+    return std::exchange(input_, std::nullopt);
+}
+
+int CommandLine::failed(int status) {
+    if (++failures_ < kMostFailures) return status;
+    failures_ = 0;
+    return Tzad::ePromptCancel;
+}
+
+int CommandLine::answered(std::wstring_view line, int status) const {
+    if (eventsWanted()) {
+        reportEvent({
+            {"event",  "answer"    },
+            {"line",   toUtf8(line)},
+            {"status", status      }
+        });
+    }
+    return status;
+}
+
+}  // namespace tzhost

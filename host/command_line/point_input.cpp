@@ -1,0 +1,81 @@
+#include "host/command_line/point_input.h"
+
+#include <array>
+#include <cmath>
+
+#include "host/base/variables.h"
+#include "host/command_line/unit_text.h"
+
+namespace tzhost {
+
+namespace {
+
+constexpr std::wstring_view kLastPoint = L"LASTPOINT";
+
+// A part of a unit vector; one that should be zero is.
+double exact(double part) {
+    constexpr double kNoise = 1e-15;
+    return std::fabs(part) < kNoise ? 0 : part;
+}
+
+std::optional<TzGeVector3d> readPolar(std::wstring_view text, std::size_t mark) {
+    auto const distance = readDistance(text.substr(0, mark));
+    auto const angle = readAngle(text.substr(mark + 1));
+    if (!distance || !angle) return std::nullopt;
+    return TzGeVector3d(exact(std::cos(*angle)), exact(std::sin(*angle)), 0) * *distance;
+}
+
+std::optional<TzGeVector3d> readCoordinates(std::wstring_view text) {
+    std::array<double, 3> values{};
+    std::size_t count = 0;
+    for (bool isMore = true; isMore; ++count) {
+        if (count == values.size()) return std::nullopt;
+        std::size_t const comma = text.find(L',');
+        auto const value = readDistance(text.substr(0, comma));
+        if (!value) return std::nullopt;
+        values[count] = *value;
+        isMore = comma != std::wstring_view::npos;
+        if (isMore) text.remove_prefix(comma + 1);
+    }
+    if (count < 2) return std::nullopt;
+    return TzGeVector3d(values[0], values[1], values[2]);
+}
+
+}  // namespace
+
+std::optional<double> readDistance(std::wstring_view text) {
+    double value = 0;
+    return readLength(text, value) ? std::optional(value) : std::nullopt;
+}
+
+std::optional<double> readAngle(std::wstring_view text) {
+    double radians = 0;
+    int const unit = static_cast<int>(Variables::instance().number(L"AUNITS"));
+    return readAngle(text, unit, radians) ? std::optional(radians) : std::nullopt;
+}
+
+std::optional<TzGePoint3d> readPoint(std::wstring_view text, TzGePoint3d const& last) {
+    bool const isRelative = text.starts_with(L'@');
+    if (isRelative) text.remove_prefix(1);
+    if (isRelative && text.empty()) return last;
+    std::size_t const polar = text.find(L'<');
+    auto const offset =
+        polar == std::wstring_view::npos ? readCoordinates(text) : readPolar(text, polar);
+    if (!offset) return std::nullopt;
+    TzGePoint3d const point = (isRelative ? last : TzGePoint3d::kOrigin) + *offset;
+    bool const isFinite =
+        std::isfinite(point.x) && std::isfinite(point.y) && std::isfinite(point.z);
+    return isFinite ? std::optional(point) : std::nullopt;
+}
+
+TzGePoint3d lastPoint() {
+    VariableValue const* const value = Variables::instance().get(kLastPoint);
+    auto const* const point = value ? std::get_if<VariablePoint>(value) : nullptr;
+    return point ? TzGePoint3d((*point)[0], (*point)[1], (*point)[2]) : TzGePoint3d::kOrigin;
+}
+
+void setLastPoint(TzGePoint3d const& user) {
+    Variables::instance().set(kLastPoint, VariablePoint{user.x, user.y, user.z}, Writer::host);
+}
+
+}  // namespace tzhost

@@ -1,0 +1,105 @@
+#include "host/command_line/question.h"
+
+#include <utility>
+
+#include "host/base/event_sink.h"
+#include "host/base/fault_point.h"
+#include "host/base/utf8.h"
+
+namespace tzhost {
+
+namespace {
+
+std::wstring_view withoutBlanksAround(std::wstring_view text) {
+    std::size_t const first = text.find_first_not_of(L" \t");
+    text.remove_prefix(first == std::wstring_view::npos ? text.size() : first);
+    return text.substr(0, text.find_last_not_of(L" \t") + 1);
+}
+
+AnswerRequest requestFor(QuestionKind kind, std::wstring_view prompt, KeywordList const& words) {
+    AnswerRequest request{kind, prompt, {}};
+    for (int i = 0; i < words.count(); ++i)
+        request.words.push_back(words.local(i));
+    return request;
+}
+
+}  // namespace
+
+std::optional<int> failsAt(std::string_view operation) {
+    auto const fault = faultAt(operation);
+    if (!fault) return std::nullopt;
+    (void)commandLine().takeArmed();  // the flags were for this question alone
+    return commandLine().failed(*fault);
+}
+
+Question::Question(QuestionKind kind, wchar_t const* prompt)
+    : Question(kind, prompt, commandLine().takeArmed()) {}
+
+Question::Question(QuestionKind kind, wchar_t const* prompt, Armed armed)
+    : line_(commandLine()), kind_(kind), prompt_(prompt ? prompt : L""), armed_(std::move(armed)) {
+    if (!eventsWanted()) return;
+    reportEvent({
+        {"event",    "prompt"           },
+        {"kind",     nameOf(kind_)      },
+        {"text",     toUtf8(prompt_)    },
+        {"keywords", toUtf8(armed_.list)},
+        {"flags",    armed_.flags       }
+    });
+}
+
+void Question::setEndings(int empty, int cancel) {
+    emptyStatus_ = empty;
+    cancelStatus_ = cancel;
+}
+
+int Question::ask(Reader const& read) {
+    while (true) {
+        Answer const answer = line_.ask(requestFor(kind_, prompt_, armed_.words));
+        switch (answer.kind) {
+        case Answer::Kind::line:
+            if (auto const status = take(answer.text, read)) return *status;
+            break;
+        case Answer::Kind::tooLong: line_.say(L"That line is too long."); break;
+        case Answer::Kind::cancel: return line_.answered(L"^C", cancelStatus_);
+        default: return line_.answered(L"", cancelStatus_);
+        }
+    }
+}
+
+std::optional<int> Question::take(std::wstring const& line, Reader const& read) {
+    Reply const reply =
+        replyTo(kind_ == QuestionKind::string ? line : withoutBlanksAround(line), read);
+    line_.answered(line, reply.status);
+    if (reply.kind == Reply::Kind::done) return reply.status;
+    if (reply.kind == Reply::Kind::refused) line_.say(reply.complaint);
+    return std::nullopt;
+}
+
+Reply Question::replyTo(std::wstring_view answer, Reader const& read) {
+    if (answer.empty()) {
+        if (armed_.has(Armed::kNoEmptyAnswer)) return Reply::refused(L"An answer is needed.");
+        return Reply::done(emptyStatus_);
+    }
+    if (auto const index = armed_.words.match(answer)) {
+        if (wordReader_) return wordReader_(*index);
+        line_.leaveInput(armed_.words.global(*index));
+        return Reply::done(Tzad::ePromptKeyword);
+    }
+    Reply reply = read(answer);
+    if (reply.kind != Reply::Kind::unreadable) return reply;
+    if (!armed_.has(Armed::kFreeText)) return Reply::refused(std::move(reply.complaint));
+    line_.leaveInput(std::wstring(answer));
+    return Reply::done(Tzad::ePromptKeyword);
+}
+
+std::optional<Reply> refusalOf(double value, Armed const& armed) {
+    if (value == 0 && armed.has(Armed::kNoZero)) {
+        return Reply::refused(L"The value must not be zero.");
+    }
+    if (value < 0 && armed.has(Armed::kNoNegative)) {
+        return Reply::refused(L"The value must not be negative.");
+    }
+    return std::nullopt;
+}
+
+}  // namespace tzhost

@@ -1,0 +1,169 @@
+#include "host/command_line/script_source.h"
+
+#include <algorithm>
+#include <fstream>
+#include <iostream>
+#include <sstream>
+#include <utility>
+
+#include "host/base/utf8.h"
+
+namespace tzhost {
+
+namespace {
+
+constexpr std::wstring_view kCancel = L"^C";
+constexpr std::wstring_view kComment = L";;";
+constexpr std::wstring_view kBlockStart = L"<<<";
+constexpr std::wstring_view kBlockEnd = L">>>";
+constexpr std::wstring_view kBlockCancel = L">>>cancel";
+constexpr std::wstring_view kBlockEscape = L">>>>";
+
+constexpr std::size_t kMostBytes = 4 * (kLongestAnswer + 1);
+constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
+constexpr wchar_t const* kNotUtf8 = L"this line is not UTF-8";
+
+using Traits = std::istream::traits_type;
+
+// Reads up to a line end and keeps at most `most` bytes. False at the end of the text.
+bool readBytes(std::streambuf& from, std::size_t most, std::string& bytes, bool& isCut) {
+    int c = from.sbumpc();
+    if (Traits::eq_int_type(c, Traits::eof())) return false;
+    for (; !Traits::eq_int_type(c, Traits::eof()) && c != '\n'; c = from.sbumpc()) {
+        if (bytes.size() < most) {
+            bytes += Traits::to_char_type(c);
+        } else {
+            isCut = true;
+        }
+    }
+    if (!isCut && bytes.ends_with('\r')) bytes.pop_back();
+    return true;
+}
+
+std::wstring_view withoutBlanksBehind(std::wstring_view text) {
+    return text.substr(0, text.find_last_not_of(L" \t") + 1);
+}
+
+}  // namespace
+
+ScriptSource::ScriptSource(std::string name, std::unique_ptr<std::istream> text)
+    : name_(std::move(name)), text_(std::move(text)) {}
+
+ScriptSource::ScriptSource(std::string_view text, std::string name)
+    : ScriptSource(std::move(name), std::make_unique<std::istringstream>(std::string(text))) {}
+
+std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::string& error) {
+    if (file == "-") {
+        return std::make_unique<ScriptSource>("standard input",
+                                              std::make_unique<std::istream>(std::cin.rdbuf()));
+    }
+    std::ifstream input(file, std::ios::binary);
+    std::ostringstream whole;
+    if (!input || (input.peek() != Traits::eof() && !(whole << input.rdbuf()))) {
+        error = file + ": the script cannot be read";
+        return nullptr;
+    }
+    std::string const text = whole.str();
+    std::size_t const bad = firstBadByte(text);
+    if (bad != kAllUtf8) {
+        auto const at = text.begin() + static_cast<std::ptrdiff_t>(bad);
+        error = file + ":" + std::to_string(1 + std::count(text.begin(), at, '\n')) + ": " +
+                toUtf8(kNotUtf8);
+        return nullptr;
+    }
+    return std::make_unique<ScriptSource>(text, file);
+}
+
+std::wstring ScriptSource::place(int line) const {
+    return fromUtf8(name_) + L":" + std::to_wstring(line) + L": ";
+}
+
+void ScriptSource::fail(int line, wchar_t const* what) {
+    fault_ = place(line) + what;
+    text_.reset();
+    peeked_.reset();
+}
+
+std::optional<ScriptSource::Line> ScriptSource::read(Length length) {
+    if (peeked_) return std::exchange(peeked_, std::nullopt);
+    if (!text_) return std::nullopt;
+    Line line;
+    std::string bytes;
+    std::size_t const most = length == Length::any ? std::string::npos : kMostBytes;
+    if (!readBytes(*text_->rdbuf(), most, bytes, line.isTooLong)) return std::nullopt;
+    line.number = ++lines_;
+    if (line.number == 1 && bytes.starts_with(kByteOrderMark))
+        bytes.erase(0, kByteOrderMark.size());
+    if (line.isTooLong) return line;
+    if (firstBadByte(bytes) != kAllUtf8) {
+        fail(line.number, kNotUtf8);
+        return std::nullopt;
+    }
+    line.text = fromUtf8(bytes);
+    line.isTooLong = length == Length::bounded && line.text.size() > kLongestAnswer;
+    return line;
+}
+
+ScriptSource::Line const* ScriptSource::peek() {
+    while (!peeked_) {
+        auto line = read(Length::bounded);
+        if (!line) return nullptr;
+        bool const isComment = !line->isTooLong && line->text.starts_with(kComment);
+        if (!isComment) peeked_ = std::move(line);
+    }
+    return &*peeked_;
+}
+
+// Stands at the line that opens the block.
+std::optional<EditorBlock> ScriptSource::readBlock() {
+    int const start = peeked_->number;
+    peeked_.reset();
+    EditorBlock block;
+    bool isFirst = true;
+    while (auto line = read(Length::any)) {
+        if (line->text == kBlockEnd) return block;
+        if (line->text == kBlockCancel) {
+            block.accepted = false;
+            return block;
+        }
+        if (!std::exchange(isFirst, false)) block.text += L'\n';
+        block.text += line->text == kBlockEscape ? kBlockEnd : std::wstring_view(line->text);
+    }
+    if (fault_.empty()) fail(start, L"this block has no end, a line >>> or >>>cancel");
+    return std::nullopt;
+}
+
+std::optional<EditorBlock> ScriptSource::takeBlock() {
+    Line const* const line = peek();
+    if (line == nullptr || withoutBlanksBehind(line->text) != kBlockStart) return std::nullopt;
+    return readBlock();
+}
+
+Answer ScriptSource::last() {
+    if (fault_.empty()) return {};
+    return {Answer::Kind::fault, std::exchange(fault_, {})};
+}
+
+Answer ScriptSource::next(AnswerRequest const& request) {
+    Line const* const line = peek();
+    if (line == nullptr) return last();
+    if (line->isTooLong) {
+        peeked_.reset();
+        return {Answer::Kind::tooLong, {}};
+    }
+    bool const isString = request.kind == QuestionKind::string;
+    std::wstring_view const word =
+        isString ? std::wstring_view(line->text) : withoutBlanksBehind(line->text);
+    if (!isString && word == kBlockStart) {
+        int const start = line->number;
+        if (!readBlock()) return last();
+        return {Answer::Kind::fault, place(start) + L"no editor takes this block"};
+    }
+    if (word == kCancel) {
+        peeked_.reset();
+        return {Answer::Kind::cancel, {}};
+    }
+    return {Answer::Kind::line, std::exchange(peeked_, std::nullopt)->text};
+}
+
+}  // namespace tzhost

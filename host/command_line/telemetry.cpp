@@ -1,0 +1,46 @@
+#include "tz/ed/telemetry.h"
+
+#include "host/base/event_sink.h"
+#include "tz/ed/jig.h"
+
+namespace {
+
+// A drag that learned no point has none to report.
+void reportPoint(int component,
+                 TzString const& name,
+                 char const* which,
+                 TzEdJigInputData const& data) {
+    if (!data.hasPoint || !tzhost::eventsWanted()) return;
+    TzGePoint3d const& point = data.point;
+    tzhost::reportEvent({
+        {"event",     "telemetryPoint"                                 },
+        {"component", component                                        },
+        {"name",      tzhost::utf8(name)                               },
+        {"which",     which                                            },
+        {"point",     tzhost::Event::array({point.x, point.y, point.z})}
+    });
+}
+
+}  // namespace
+
+TzTelemetryCmdHelper::TzTelemetryCmdHelper(int component, wchar_t const* name)
+    : component_(component), name_(name) {}
+
+void TzTelemetryCmdHelper::SendEvent(int phase, int value, wchar_t const* /*data*/) const {
+    if (!tzhost::eventsWanted()) return;
+    tzhost::reportEvent({
+        {"event",     "telemetry"        },
+        {"component", component_         },
+        {"name",      tzhost::utf8(name_)},
+        {"phase",     phase              },
+        {"value",     value              }
+    });
+}
+
+void TzTelemetryCmdHelper::set_start_point(TzEdJigInputData const& data) {
+    reportPoint(component_, name_, "start", data);
+}
+
+void TzTelemetryCmdHelper::set_end_point(TzEdJigInputData const& data) {
+    reportPoint(component_, name_, "end", data);
+}

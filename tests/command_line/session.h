@@ -1,0 +1,45 @@
+#pragma once
+
+// One session at the command line: a script, the transcript of what was asked and answered, the
+// events.
+
+#include <string>
+#include <string_view>
+
+#include "host/base/event_sink.h"
+#include "host/base/variables.h"
+#include "host/command_line/command_line.h"
+#include "host/command_line/script_source.h"
+
+namespace tzhost::test {
+
+class Session {
+public:
+    explicit Session(std::string_view script) : source_(script) {
+        Variables::instance().resetKept(KeptIn::drawing);
+        commandLine().reset();
+        commandLine().attach();
+        commandLine().setSource(&source_);
+        commandLine().setScreen([this](std::wstring_view text) { transcript_ += text; });
+        commandLine().setErrorScreen([this](std::wstring_view text) { errors_ += text; });
+        setEventSink([this](Event const& event) { events_ += event.dump() + "\n"; });
+    }
+    Session(Session const&) = delete;
+    Session& operator=(Session const&) = delete;
+    ~Session() {
+        setEventSink({});
+        commandLine().reset();
+    }
+
+    [[nodiscard]] std::wstring const& transcript() const { return transcript_; }
+    [[nodiscard]] std::wstring const& errors() const { return errors_; }
+    [[nodiscard]] std::string const& events() const { return events_; }
+
+private:
+    ScriptSource source_;
+    std::wstring transcript_;
+    std::wstring errors_;
+    std::string events_;
+};
+
+}  // namespace tzhost::test
