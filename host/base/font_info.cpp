@@ -1,6 +1,5 @@
 #include "tz/text/font_info.h"
 
-#include <array>
 #include <string_view>
 
 #include "host/base/fault_point.h"
@@ -20,17 +19,15 @@ struct FamilyWord {
 
 // Words in a face's name that tell its family, the first that is found counting. The catalogue
 // itself knows nothing of serifs.
-constexpr std::array<FamilyWord, 8> kFamilyWords{
-    {
-     {L"sans", FontFamily::kSwiss},
-     {L"serif", FontFamily::kRoman},
-     {L"roman", FontFamily::kRoman},
-     {L"times", FontFamily::kRoman},
-     {L"script", FontFamily::kScript},
-     {L"handwriting", FontFamily::kScript},
-     {L"symbol", FontFamily::kDecorative},
-     {L"dingbats", FontFamily::kDecorative},
-     }
+constexpr FamilyWord kFamilyWords[] = {
+    {L"sans",        FontFamily::kSwiss     },
+    {L"serif",       FontFamily::kRoman     },
+    {L"roman",       FontFamily::kRoman     },
+    {L"times",       FontFamily::kRoman     },
+    {L"script",      FontFamily::kScript    },
+    {L"handwriting", FontFamily::kScript    },
+    {L"symbol",      FontFamily::kDecorative},
+    {L"dingbats",    FontFamily::kDecorative},
 };
 
 FontPitch pitchOf(FontForm const& form) {
