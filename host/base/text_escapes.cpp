@@ -1,7 +1,7 @@
 #include "host/base/text_escapes.h"
 
 #include <algorithm>
-#include <iterator>
+#include <array>
 
 #include "tz/text/string.h"
 
@@ -15,12 +15,14 @@ struct Escape {
 };
 
 // The letter behind the backslash, the character that it stands for.
-constexpr Escape kEscapes[] = {
-    {L'n',  L'\n'},
-    {L'r',  L'\r'},
-    {L't',  L'\t'},
-    {L's',  L' ' },
-    {L'\\', L'\\'},
+constexpr std::array<Escape, 5> kEscapes{
+    {
+     {L'n', L'\n'},
+     {L'r', L'\r'},
+     {L't', L'\t'},
+     {L's', L' '},
+     {L'\\', L'\\'},
+     }
 };
 
 constexpr std::size_t kHexDigits = 4;
@@ -52,10 +54,10 @@ std::wstring escaped(std::wstring_view text) {
     std::wstring line;
     for (std::size_t i = 0; i < text.size(); ++i) {
         wchar_t const c = text[i];
-        auto const row = std::find_if(std::begin(kEscapes), std::end(kEscapes),
+        auto const row = std::find_if(kEscapes.begin(), kEscapes.end(),
                                       [c](Escape const& each) { return each.character == c; });
         bool const isInnerBlank = c == L' ' && i != 0 && i + 1 != text.size();
-        if (row != std::end(kEscapes) && !isInnerBlank) {
+        if (row != kEscapes.end() && !isInnerBlank) {
             line += {L'\\', row->letter};
         } else if (needsHex(c)) {
             line += TzString::formatted(L"\\u%04X", c).str();
@@ -76,9 +78,9 @@ std::optional<std::wstring> unescaped(std::wstring_view line) {
         if (++i == line.size()) return std::nullopt;
         wchar_t const letter = line[i];
         auto const row =
-            std::find_if(std::begin(kEscapes), std::end(kEscapes),
+            std::find_if(kEscapes.begin(), kEscapes.end(),
                          [letter](Escape const& each) { return each.letter == letter; });
-        if (row != std::end(kEscapes)) {
+        if (row != kEscapes.end()) {
             text += row->character;
             continue;
         }

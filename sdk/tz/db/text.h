@@ -69,6 +69,7 @@ public:
 
 protected:
     bool subWorldDraw(TzGiWorldDraw* draw) override;
+    [[nodiscard]] Tzad::ErrorStatus subTransformBy(TzGeMatrix3d const& matrix) override;
 };
 
 // An attribute of a block reference.

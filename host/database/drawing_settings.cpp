@@ -1,0 +1,75 @@
+#include "host/base/variables.h"
+#include "host/database/drawing.h"
+#include "host/database/symbol_imp.h"
+#include "tz/ge/matrix3d.h"
+
+// What a drawing holds beside its objects: current style and layer, user systems, the working set.
+namespace tzhost {
+namespace {
+
+bool isExactly(TzGePoint3d const& a, TzGePoint3d const& b) {
+    return a.x == b.x && a.y == b.y && a.z == b.z;
+}
+
+bool isExactly(TzGeVector3d const& a, TzGeVector3d const& b) {
+    return a.x == b.x && a.y == b.y && a.z == b.z;
+}
+
+// A record of that table which is not erased.
+bool isRecordOf(TzDbObjectId id, TzDbObjectId table) {
+    return !id.isNull() && !id.isErased() && id.record()->owner == table.record();
+}
+
+}  // namespace
+
+TzGeMatrix3d UserSystem::matrix() const {
+    TzGeMatrix3d result;
+    return result.setCoordSystem(origin, xAxis, yAxis, xAxis.crossProduct(yAxis));
+}
+
+bool UserSystem::isSameAs(UserSystem const& other) const {
+    return isExactly(origin, other.origin) && isExactly(xAxis, other.xAxis) &&
+           isExactly(yAxis, other.yAxis);
+}
+
+bool DrawingSettings::isSameAs(DrawingSettings const& other) const {
+    return textStyle == other.textStyle && layer == other.layer &&
+           modelSystem.isSameAs(other.modelSystem) && paperSystem.isSameAs(other.paperSystem) &&
+           workingSetExists == other.workingSetExists &&
+           workingSetActive == other.workingSetActive && workingAngle == other.workingAngle;
+}
+
+void Drawing::setSettings(DrawingSettings const& settings) {
+    settings_ = settings;
+    std::wstring const& name = valuesOf<SymbolImp>(*settings.textStyle.record()->object).name;
+    (void)Variables::instance().setKept(L"TEXTSTYLE", name);  // a text of any length is taken
+}
+
+Tzad::ErrorStatus Drawing::setTextstyle(TzDbObjectId style) {
+    if (auto const fault = faultStatus("TzDbDatabase::setTextstyle")) return fault;
+    if (!isRecordOf(style, textStyles_)) return Tzad::eWrongObjectType;
+    DrawingSettings next = settings_;
+    next.textStyle = style;
+    setSettings(next);
+    return Tzad::eOk;
+}
+
+Tzad::ErrorStatus Drawing::setClayer(TzDbObjectId layer) {
+    if (auto const fault = faultStatus("TzDbDatabase::setClayer")) return fault;
+    if (!isRecordOf(layer, layers_)) return Tzad::eWrongObjectType;
+    settings_.layer = layer;
+    return Tzad::eOk;
+}
+
+bool Drawing::orthomode() const {
+    return Variables::instance().number(L"ORTHOMODE") != 0;
+}
+
+Tzad::ErrorStatus Drawing::setOrthomode(bool on) {
+    if (auto const fault = faultStatus("TzDbDatabase::setOrthomode")) return fault;
+    VariableValue const value = static_cast<short>(on ? 1 : 0);
+    bool const done = Variables::instance().set(L"ORTHOMODE", value, Writer::host).isDone();
+    return done ? Tzad::eOk : Tzad::eInternal;
+}
+
+}  // namespace tzhost

@@ -1,0 +1,131 @@
+#include "host/database/field_codes.h"
+
+#include <charconv>
+#include <cstdlib>
+#include <ctime>
+#include <vector>
+
+#include "host/base/variables.h"
+#include "host/database/drawing.h"
+#include "host/database/field_properties.h"
+
+namespace tzhost {
+namespace {
+
+constexpr std::wstring_view kBegin = L"%<\\";
+constexpr std::wstring_view kEnd = L">%";
+constexpr std::wstring_view kFailed = L"####";
+
+using Value = std::optional<std::wstring>;
+using Words = std::vector<std::wstring_view>;
+
+Words splitWords(std::wstring_view text) {
+    Words words;
+    while (true) {
+        std::size_t const first = text.find_first_not_of(L' ');
+        if (first == text.npos) return words;
+        text.remove_prefix(first);
+        words.push_back(text.substr(0, text.find(L' ')));
+        text.remove_prefix(words.back().size());
+    }
+}
+
+Value variableValue(Words const& words, Drawing const* /*drawing*/) {
+    if (words.size() != 2) return std::nullopt;
+    VariableValue const* const value = Variables::instance().get(words[1]);
+    return value ? Value(writeValue(*value)) : std::nullopt;
+}
+
+// The time of a reproducible run when one is set, else now.
+std::time_t today() {
+    char const* const fixed = std::getenv("SOURCE_DATE_EPOCH");
+    if (!fixed) return std::time(nullptr);
+    std::string_view const text(fixed);
+    long long seconds = 0;
+    std::from_chars(text.data(), text.data() + text.size(), seconds);
+    return static_cast<std::time_t>(seconds);
+}
+
+Value dateValue(Words const& words, Drawing const* /*drawing*/) {
+    std::time_t const seconds = today();
+    std::tm date{};
+    bool const isFixed = std::getenv("SOURCE_DATE_EPOCH") != nullptr;
+    if (words.size() != 1 ||
+        !(isFixed ? gmtime_r(&seconds, &date) : localtime_r(&seconds, &date))) {
+        return std::nullopt;
+    }
+    return TzString::formatted(L"%04d-%02d-%02d", date.tm_year + 1900, date.tm_mon + 1,
+                               date.tm_mday)
+        .str();
+}
+
+Value fileValue(Words const& words, Drawing const* drawing) {
+    if (words.size() != 1 || !drawing || drawing->file().empty()) return std::nullopt;
+    return TzString::fromUtf8(drawing->file().filename().string()).str();
+}
+
+std::optional<std::uint64_t> readHandle(std::wstring_view text) {
+    constexpr std::size_t kMostDigits = 16;
+    if (text.empty() || text.size() > kMostDigits) return std::nullopt;
+    std::string const digits(text.begin(), text.end());
+    std::uint64_t handle = 0;
+    auto const [end, error] =
+        std::from_chars(digits.data(), digits.data() + digits.size(), handle, 16);
+    if (error != std::errc() || end != digits.data() + digits.size()) return std::nullopt;
+    return handle;
+}
+
+Value objectValue(Words const& words, Drawing const* drawing) {
+    auto const handle = words.size() == 3 ? readHandle(words[1]) : std::nullopt;
+    if (!handle || !drawing) return std::nullopt;
+    TzDbObjectId const id = drawing->objectAt(*handle);
+    if (id.isNull() || id.isErased()) return std::nullopt;
+    return propertyText(*id.record()->object, words[2]);
+}
+
+struct CodeRow {
+    std::wstring_view word;
+    Value (*value)(Words const& words, Drawing const* drawing);
+};
+
+// The first word of a code and what computes it.
+constexpr CodeRow kCodes[] = {
+    {L"\\Date",   dateValue    },
+    {L"\\File",   fileValue    },
+    {L"\\Object", objectValue  },
+    {L"\\Var",    variableValue},
+};
+
+Value valueOf(std::wstring_view code, Drawing const* drawing) {
+    Words const words = splitWords(code.substr(2, code.size() - 2 - kEnd.size()));
+    for (CodeRow const& row : kCodes) {
+        if (!words.empty() && words[0] == row.word) return row.value(words, drawing);
+    }
+    return std::nullopt;
+}
+
+}  // namespace
+
+std::optional<FieldSpan> findField(std::wstring_view text, std::size_t start) {
+    std::size_t const first = text.find(kBegin, start);
+    if (first == text.npos) return std::nullopt;
+    std::size_t const end = text.find(kEnd, first + kBegin.size());
+    if (end == text.npos) return std::nullopt;
+    return FieldSpan{first, end + kEnd.size()};
+}
+
+ExpandedText expandFields(std::wstring_view text, Drawing const* drawing) {
+    ExpandedText result;
+    std::size_t at = 0;
+    while (auto const code = findField(text, at)) {
+        result.text += text.substr(at, code->first - at);
+        Value const value = valueOf(text.substr(code->first, code->end - code->first), drawing);
+        result.text += value ? std::wstring_view(*value) : kFailed;
+        result.complete = result.complete && value.has_value();
+        at = code->end;
+    }
+    result.text += text.substr(at);
+    return result;
+}
+
+}  // namespace tzhost

@@ -1,0 +1,77 @@
+#include "host/database/mtext_imp.h"
+
+#include "host/database/style_look.h"
+#include "host/database/symbol_imp.h"
+#include "host/layout/mtext_layout.h"
+
+namespace tzhost {
+
+MTextImp::MTextImp(MTextImp const& other)
+    : TextStyledImp(other), contents(other.contents), location(other.location),
+      normal(other.normal), direction(other.direction), textHeight(other.textHeight),
+      width(other.width), height(other.height), lineSpacingFactor(other.lineSpacingFactor),
+      lineSpacingStyle(other.lineSpacingStyle), attachment(other.attachment),
+      columns(other.columns ? std::make_unique<TextEditorColumns>(*other.columns) : nullptr),
+      background(other.background ? std::make_unique<MTextBackground>(*other.background) : nullptr),
+      size_(other.size_), layout_(other.layout_), looks_(other.looks_) {}
+
+std::unique_ptr<TzDbObjectImp> MTextImp::copy() const {
+    return std::make_unique<MTextImp>(*this);
+}
+
+void MTextImp::forgetComputed() {
+    looks_ = 0;
+    layout_.reset();
+}
+
+bool MTextImp::showFieldText(std::wstring const& text) {
+    contents = text;
+    forgetComputed();
+    return true;
+}
+
+TextEditorColumns& MTextImp::columnsForChange() {
+    if (!columns) columns = std::make_unique<TextEditorColumns>();
+    return *columns;
+}
+
+MTextBackground& MTextImp::backgroundForChange() {
+    if (!background) background = std::make_unique<MTextBackground>();
+    return *background;
+}
+
+MTextLayoutInput MTextImp::input() const {
+    MTextLayoutInput input;
+    input.contents = contents;
+    input.width = width;
+    input.height = height;
+    input.textHeight = textHeight;
+    input.style = lookOfStyle(style);
+    input.lineSpacingStyle = lineSpacingStyle;
+    input.lineSpacingFactor = lineSpacingFactor;
+    input.attachment = attachment;
+    if (columns) {
+        input.columns = {
+            columns->columnType,   columns->autoHeight,
+            columns->columnCount,  columns->columnWidth,
+            columns->columnGutter, {columns->heights.begin(), columns->heights.end()}
+        };
+    }
+    return input;
+}
+
+std::shared_ptr<MTextLayout const> MTextImp::layout() const {
+    if (layout_ && looks_ == looksGeneration()) return layout_;
+    auto made = std::make_shared<MTextLayout const>(layOutMText(input()));
+    size_ = {made->width, made->height};
+    looks_ = looksGeneration();
+    layout_ = record || embedder ? nullptr : made;
+    return made;
+}
+
+LayoutPoint const& MTextImp::size() const {
+    if (looks_ != looksGeneration()) (void)layout();
+    return size_;
+}
+
+}  // namespace tzhost

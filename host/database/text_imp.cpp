@@ -1,0 +1,85 @@
+#include "host/database/text_imp.h"
+
+#include <algorithm>
+
+#include "host/database/geometry.h"
+#include "host/database/mtext_imp.h"
+#include "host/database/style_look.h"
+#include "host/database/symbol_imp.h"
+#include "host/layout/line_layout.h"
+
+namespace tzhost {
+
+std::unique_ptr<TzDbObjectImp> TextImp::copy() const {
+    return std::make_unique<TextImp>(*this);
+}
+
+bool TextImp::showFieldText(std::wstring const& shown) {
+    text = shown;
+    forgetComputed();
+    return true;
+}
+
+LineLayout TextImp::layout() const {
+    LineLayoutInput input;
+    input.text = shownText();
+    input.textHeight = height;
+    input.style = lookOfStyle(style);
+    input.style.widthFactor = widthFactor;
+    input.style.oblique = oblique;
+    return layOutLine(input);
+}
+
+LayoutBox TextImp::box() const {
+    if (looks_ != looksGeneration()) {
+        box_ = layout().box;
+        looks_ = looksGeneration();
+    }
+    return box_;
+}
+
+std::unique_ptr<TzDbObjectImp> AttributeImp::copy() const {
+    return std::make_unique<AttributeImp>(*this);
+}
+
+DefinitionImp::DefinitionImp(DefinitionImp const& other)
+    : TextImp(other), tag(other.tag), prompt(other.prompt) {
+    if (!other.lines) return;
+    lines = std::make_unique<TzDbMText>();
+    TzDbObjectAccess::exchange(*lines, TzDbObjectAccess::imp(*other.lines)->copy());
+}
+
+DefinitionImp::~DefinitionImp() = default;
+
+std::unique_ptr<TzDbObjectImp> DefinitionImp::copy() const {
+    return std::make_unique<DefinitionImp>(*this);
+}
+
+void DefinitionImp::settle(TzDbObject& object) {
+    if (lines) TzDbObjectAccess::imp(*lines)->embedder = &object;
+}
+
+bool DefinitionImp::refersTo(TzDbObjectRecord const* named) const {
+    return TextImp::refersTo(named) || (lines && TzDbObjectAccess::imp(*lines)->refersTo(named));
+}
+
+// Of a multi-line definition, the box around its lines.
+LayoutBox DefinitionImp::box() const {
+    if (!lines) return TextImp::box();
+    TzArray<TzGePoint3d> corners;
+    lines->getBoundingPoints(corners);
+    TzGeVector3d const along = directionAt(normal, rotation);
+    TzGeVector3d const up = normal.crossProduct(along);
+    LayoutBox box;
+    for (int i = 0; i < corners.length(); ++i) {
+        TzGeVector3d const offset = corners[i] - position;
+        double const x = offset.dotProduct(along);
+        double const y = offset.dotProduct(up);
+        if (i == 0) box = {x, y, x, y};
+        box = {std::min(box.left, x), std::min(box.bottom, y), std::max(box.right, x),
+               std::max(box.top, y)};
+    }
+    return box;
+}
+
+}  // namespace tzhost

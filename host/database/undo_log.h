@@ -1,0 +1,73 @@
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <vector>
+
+#include "host/base/variables.h"
+#include "host/database/object_imp.h"
+
+// What each command changed in a drawing, so that it can be taken back. An object costs something
+// only when a command changes it: its values are copied once per command, before the first change.
+//
+//   log.begin(drawing); ... a command ...; log.end();
+//   log.takeBack();      // the drawing is as it was before the command
+//
+// Outside begin and end nothing is noted.
+namespace tzhost {
+
+class Drawing;
+struct DrawingSettings;
+
+class UndoLog {
+public:
+    explicit UndoLog(Drawing& drawing);
+    ~UndoLog();
+
+    // Steps do not nest: inside a step, begin and end are counted and change nothing.
+    void begin();
+    // Keeps the step when it changed anything.
+    void end();
+    // Takes back the last finished step; false when there is none. Within a step the undoing itself
+    // is not noted.
+    bool takeBack();
+    [[nodiscard]] bool isEmpty() const { return steps_.empty(); }
+
+    // The object is about to change; it also covers erasing.
+    void noteChange(TzDbObjectRecord& record);
+    // Makes room for noteAppended, which then cannot fail.
+    void prepareAppend();
+    // The object has just been added to the drawing.
+    void noteAppended(TzDbObjectRecord& record) noexcept;
+
+private:
+    struct Entry {
+        TzDbObjectRecord* record;
+        std::unique_ptr<TzDbObjectImp> values;  // null for an object that the step added
+        bool erased;
+    };
+    struct VariableChange {
+        std::size_t slot;
+        Variables::Slot before;
+    };
+    struct Step {
+        std::vector<Entry> entries;
+        std::vector<VariableChange> variables;
+        std::unique_ptr<DrawingSettings> settings;  // null when they did not change
+    };
+
+    void rememberBase();
+    void collectVariables();
+    void restoreVariables(Step const& step);
+    void takeBack(Entry& entry);
+
+    Drawing& drawing_;
+    std::vector<Step> steps_;
+    Step open_;
+    int depth_ = 0;
+    std::uint32_t serial_ = 0;  // of the step that is open; records carry it
+    Variables::Snapshot baseVariables_;
+    std::unique_ptr<DrawingSettings> baseSettings_;
+};
+
+}  // namespace tzhost
