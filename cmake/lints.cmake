@@ -1,6 +1,7 @@
 # Lints are tests like any other; the scripts need nothing but Python's standard library.
 set(lint ${PROJECT_SOURCE_DIR}/scripts/lint)
 add_lint(layers Python3::Interpreter ${lint}/layers.py)
+add_lint(sources Python3::Interpreter ${lint}/sources.py)
 add_lint(words Python3::Interpreter ${lint}/words.py)
 add_lint(format Python3::Interpreter ${lint}/format.py)
 add_lint(exports Python3::Interpreter ${lint}/exports.py

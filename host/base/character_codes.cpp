@@ -24,7 +24,7 @@ int readDigits(wchar_t const* text) {
     return value;
 }
 
-} // namespace
+}  // namespace
 
 bool getCIF(wchar_t const* text, int& code) {
     code = 0;

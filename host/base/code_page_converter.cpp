@@ -32,7 +32,7 @@ public:
         std::string source(bytes);
         char* in = source.data();
         std::size_t inLeft = source.size();
-        char* out = reinterpret_cast<char*>(room.data()); // iconv writes wide characters as bytes
+        char* out = reinterpret_cast<char*>(room.data());  // iconv writes wide characters as bytes
         std::size_t outLeft = room.size() * sizeof(wchar_t);
         ::iconv(toText_, nullptr, nullptr, nullptr, nullptr);
         if (::iconv(toText_, &in, &inLeft, &out, &outLeft) == kFailed || inLeft != 0) return false;
@@ -44,7 +44,7 @@ public:
     // Appends the bytes of one character; false when the page lacks it.
     bool encode(wchar_t c, std::string& bytes) const {
         std::array<char, 16> room{};
-        char* in = reinterpret_cast<char*>(&c); // iconv reads wide characters as bytes
+        char* in = reinterpret_cast<char*>(&c);  // iconv reads wide characters as bytes
         std::size_t inLeft = sizeof c;
         char* out = room.data();
         std::size_t outLeft = room.size();
@@ -59,7 +59,7 @@ public:
 private:
     static constexpr auto kFailed = static_cast<std::size_t>(-1);
     static bool isOpen(iconv_t converter) {
-        return converter != reinterpret_cast<iconv_t>(-1); // as iconv_open fails
+        return converter != reinterpret_cast<iconv_t>(-1);  // as iconv_open fails
     }
 
     iconv_t toText_;
@@ -79,9 +79,11 @@ int usablePage(int number) {
     return isUsable(system) ? system : kDefaultCodePage;
 }
 
-bool isAscii(char byte) { return static_cast<unsigned char>(byte) < 0x80; }
+bool isAscii(char byte) {
+    return static_cast<unsigned char>(byte) < 0x80;
+}
 
-} // namespace
+}  // namespace
 
 std::optional<std::wstring> decode(int codePage, std::string_view bytes) {
     int const number = usablePage(codePage);
@@ -97,7 +99,8 @@ std::optional<std::wstring> decode(int codePage, std::string_view bytes) {
         if (isLeadByte(number, static_cast<unsigned char>(bytes[0])) && bytes.size() > 1) {
             count = 2;
         } else if (!hasLeadBytes(number)) {
-            while (count < bytes.size() && !isAscii(bytes[count])) ++count;
+            while (count < bytes.size() && !isAscii(bytes[count]))
+                ++count;
         }
         if (!page.decode(bytes.substr(0, count), text)) return std::nullopt;
         bytes.remove_prefix(count);
@@ -119,4 +122,4 @@ std::string encode(int codePage, std::wstring_view text) {
     return bytes;
 }
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -1,8 +1,8 @@
 #pragma once
 
-// Bytes of a code page to text and back, by the C library's iconv. A page that it does not know, and
-// UTF-8 (65001), which old texts never mean, are read as the system page. Bytes below 0x80 are ASCII in
-// every page.
+// Bytes of a code page to text and back, by the C library's iconv. A page that it does not know,
+// and UTF-8 (65001), which old texts never mean, are read as the system page. Bytes below 0x80 are
+// ASCII in every page.
 
 #include <optional>
 #include <string>
@@ -16,4 +16,4 @@ namespace tzhost {
 // A character that the page lacks becomes "?".
 [[nodiscard]] std::string encode(int codePage, std::wstring_view text);
 
-} // namespace tzhost
+}  // namespace tzhost

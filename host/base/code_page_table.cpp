@@ -1,7 +1,7 @@
 #include "host/base/code_page_table.h"
 
 #include <algorithm>
-#include <array>
+#include <iterator>
 
 #include "host/base/variables.h"
 #include "tz/text/string.h"
@@ -16,26 +16,26 @@ struct CharsetRow {
 };
 
 // Both ways; set 1, the system's, is not listed.
-constexpr std::array<CharsetRow, 18> kCharsets{{
-    {kAnsiCharset, 1252},
-    {kSymbolCharset, 42},
-    {kMacCharset, 10000},
-    {kShiftJisCharset, 932},
-    {kHangulCharset, 949},
-    {kJohabCharset, 1361},
-    {kGb2312Charset, 936},
-    {kChineseBig5Charset, 950},
-    {kGreekCharset, 1253},
-    {kTurkishCharset, 1254},
-    {kVietnameseCharset, 1258},
-    {kHebrewCharset, 1255},
-    {kArabicCharset, 1256},
-    {kBalticCharset, 1257},
-    {kRussianCharset, 1251},
-    {kThaiCharset, 874},
-    {kEastEuropeCharset, 1250},
-    {kOemCharset, 437},
-}};
+constexpr CharsetRow kCharsets[] = {
+    {kAnsiCharset,        1252 },
+    {kSymbolCharset,      42   },
+    {kMacCharset,         10000},
+    {kShiftJisCharset,    932  },
+    {kHangulCharset,      949  },
+    {kJohabCharset,       1361 },
+    {kGb2312Charset,      936  },
+    {kChineseBig5Charset, 950  },
+    {kGreekCharset,       1253 },
+    {kTurkishCharset,     1254 },
+    {kVietnameseCharset,  1258 },
+    {kHebrewCharset,      1255 },
+    {kArabicCharset,      1256 },
+    {kBalticCharset,      1257 },
+    {kRussianCharset,     1251 },
+    {kThaiCharset,        874  },
+    {kEastEuropeCharset,  1250 },
+    {kOemCharset,         437  },
+};
 
 struct LeadBytes {
     int codePage;
@@ -43,16 +43,16 @@ struct LeadBytes {
     unsigned char last;
 };
 
-constexpr std::array<LeadBytes, 8> kLeadBytes{{
-    {932, 0x81, 0x9F},
-    {932, 0xE0, 0xFC},
-    {936, 0x81, 0xFE},
-    {949, 0x81, 0xFE},
-    {950, 0x81, 0xFE},
+constexpr LeadBytes kLeadBytes[] = {
+    {932,  0x81, 0x9F},
+    {932,  0xE0, 0xFC},
+    {936,  0x81, 0xFE},
+    {949,  0x81, 0xFE},
+    {950,  0x81, 0xFE},
     {1361, 0x84, 0xD3},
     {1361, 0xD8, 0xDE},
     {1361, 0xE0, 0xF9},
-}};
+};
 
 struct NameRow {
     int codePage;
@@ -60,20 +60,20 @@ struct NameRow {
 };
 
 // Pages that iconv does not know as "CP" and their number.
-constexpr std::array<NameRow, 6> kNames{{
+constexpr NameRow kNames[] = {
     {10000, "MACINTOSH"},
-    {20127, "ASCII"},
-    {20866, "KOI8-R"},
-    {21866, "KOI8-U"},
-    {54936, "GB18030"},
-    {51932, "EUC-JP"},
-}};
+    {20127, "ASCII"    },
+    {20866, "KOI8-R"   },
+    {21866, "KOI8-U"   },
+    {54936, "GB18030"  },
+    {51932, "EUC-JP"   },
+};
 
 // Pages 28591 to 28606 are the parts 1 to 16 of ISO 8859.
 constexpr int kFirstIsoPage = 28591;
 constexpr int kLastIsoPage = 28606;
 
-} // namespace
+}  // namespace
 
 int systemCodePage() {
     std::wstring const name = Variables::instance().text(L"SYSCODEPAGE");
@@ -87,36 +87,37 @@ int systemCodePage() {
 }
 
 int codePageOf(Charset charset) {
-    auto const row = std::find_if(kCharsets.begin(), kCharsets.end(),
+    auto const row = std::find_if(std::begin(kCharsets), std::end(kCharsets),
                                   [=](CharsetRow const& each) { return each.charset == charset; });
-    return row == kCharsets.end() ? 0 : row->codePage;
+    return row == std::end(kCharsets) ? 0 : row->codePage;
 }
 
 Charset charsetOf(int codePage) {
-    auto const row = std::find_if(kCharsets.begin(), kCharsets.end(),
-                                  [=](CharsetRow const& each) { return each.codePage == codePage; });
-    return row == kCharsets.end() ? kAnsiCharset : row->charset;
+    auto const row =
+        std::find_if(std::begin(kCharsets), std::end(kCharsets),
+                     [=](CharsetRow const& each) { return each.codePage == codePage; });
+    return row == std::end(kCharsets) ? kAnsiCharset : row->charset;
 }
 
 bool isLeadByte(int codePage, unsigned char byte) {
-    return std::any_of(kLeadBytes.begin(), kLeadBytes.end(), [=](LeadBytes const& row) {
+    return std::any_of(std::begin(kLeadBytes), std::end(kLeadBytes), [=](LeadBytes const& row) {
         return row.codePage == codePage && byte >= row.first && byte <= row.last;
     });
 }
 
 bool hasLeadBytes(int codePage) {
-    return std::any_of(kLeadBytes.begin(), kLeadBytes.end(),
+    return std::any_of(std::begin(kLeadBytes), std::end(kLeadBytes),
                        [=](LeadBytes const& row) { return row.codePage == codePage; });
 }
 
 std::string iconvNameOf(int codePage) {
-    auto const row = std::find_if(kNames.begin(), kNames.end(),
+    auto const row = std::find_if(std::begin(kNames), std::end(kNames),
                                   [=](NameRow const& each) { return each.codePage == codePage; });
-    if (row != kNames.end()) return row->name;
+    if (row != std::end(kNames)) return row->name;
     if (codePage >= kFirstIsoPage && codePage <= kLastIsoPage) {
         return "ISO-8859-" + std::to_string(codePage - kFirstIsoPage + 1);
     }
     return "CP" + std::to_string(codePage);
 }
 
-} // namespace tzhost
+}  // namespace tzhost

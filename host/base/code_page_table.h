@@ -11,7 +11,8 @@ namespace tzhost {
 constexpr int kDefaultCodePage = 1252;
 constexpr int kUtf8CodePage = 65001;
 
-// The number at the end of the variable SYSCODEPAGE, such as 1252 of "ANSI_1252"; 1252 when it has none.
+// The number at the end of the variable SYSCODEPAGE, such as 1252 of "ANSI_1252"; 1252 when it has
+// none.
 [[nodiscard]] int systemCodePage();
 
 // The page of a set, 0 without one. The page 0 has no set; a page without a set of its own gives 0.
@@ -25,4 +26,4 @@ constexpr int kUtf8CodePage = 65001;
 // What iconv may call the page; it need not know it.
 [[nodiscard]] std::string iconvNameOf(int codePage);
 
-} // namespace tzhost
+}  // namespace tzhost

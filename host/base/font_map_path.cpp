@@ -11,11 +11,13 @@ namespace tzhost {
 namespace {
 constexpr char const* kShippedName = "TzmtedFonts.ini";
 std::string chosenFile;
-} // namespace
+}  // namespace
 
-std::string setFontMapFile(std::string path) { return std::exchange(chosenFile, std::move(path)); }
+std::string setFontMapFile(std::string path) {
+    return std::exchange(chosenFile, std::move(path));
+}
 
-} // namespace tzhost
+}  // namespace tzhost
 
 TzString GetMTextMapFilename() {
     namespace fs = std::filesystem;

@@ -9,4 +9,4 @@ namespace tzhost {
 // Replaces the shipped font map by another file, empty for the shipped one; returns the one before.
 std::string setFontMapFile(std::string path);
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -29,16 +29,17 @@ struct Kept {
     std::shared_ptr<IniData const> data;
 };
 
-} // namespace
+}  // namespace
 
 std::wstring lowered(std::wstring_view text) {
     std::wstring lower(text);
-    for (wchar_t& c : lower) c = lowerOf(c);
+    for (wchar_t& c : lower)
+        c = lowerOf(c);
     return lower;
 }
 
 IniData IniData::fromBytes(std::string_view bytes) {
-    CSimpleIniA reader(true, true, false); // UTF-8, keys more than once, values on one line
+    CSimpleIniA reader(true, true, false);  // UTF-8, keys more than once, values on one line
     reader.SetAllowKeyOnly(true);
     IniData data;
     if (reader.LoadData(bytes.data(), bytes.size()) < 0) return data;
@@ -77,4 +78,4 @@ std::shared_ptr<IniData const> openIni(std::string const& path) {
     return data;
 }
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -18,7 +18,7 @@ public:
 
     struct Section {
         Rows rows;
-        std::map<std::wstring, std::wstring> values; // by key in lower case, the last of each
+        std::map<std::wstring, std::wstring> values;  // by key in lower case, the last of each
     };
 
     // Of a file's bytes.
@@ -28,14 +28,14 @@ public:
     [[nodiscard]] Section const* section(std::wstring_view name) const;
 
 private:
-    std::map<std::wstring, Section> sections_; // by name in lower case
+    std::map<std::wstring, Section> sections_;  // by name in lower case
 };
 
-// The file's data, read anew when the file has changed since; empty for one that cannot be read. Never
-// null.
+// The file's data, read anew when the file has changed since; empty for one that cannot be read.
+// Never null.
 [[nodiscard]] std::shared_ptr<IniData const> openIni(std::string const& path);
 
 // Text in lower case, by the host's table.
 [[nodiscard]] std::wstring lowered(std::wstring_view text);
 
-} // namespace tzhost
+}  // namespace tzhost

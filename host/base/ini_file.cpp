@@ -3,8 +3,8 @@
 #include "host/base/ini_data.h"
 
 struct CIniFile::Section {
-    std::shared_ptr<tzhost::IniData const> data; // keeps `rows` alive
-    tzhost::IniData::Section const* rows;        // null: no such section
+    std::shared_ptr<tzhost::IniData const> data;  // keeps `rows` alive
+    tzhost::IniData::Section const* rows;         // null: no such section
 };
 
 CIniFile::CIniFile(TzString const& file, TzString const& section) {
@@ -32,7 +32,8 @@ int CIniFile::GetInt(wchar_t const* key, int otherwise) const {
 std::vector<TzString> CIniFile::keys() const {
     std::vector<TzString> names;
     if (section_->rows == nullptr) return names;
-    for (auto const& [key, value] : section_->rows->rows) names.emplace_back(key);
+    for (auto const& [key, value] : section_->rows->rows)
+        names.emplace_back(key);
     return names;
 }
 
@@ -45,7 +46,8 @@ bool CIniFileEnumerator::EnumerateSection() {
 
 int ms_wtoi(wchar_t const* text) {
     if (text == nullptr) return 0;
-    while (*text == L' ' || (*text >= L'\t' && *text <= L'\r')) ++text;
+    while (*text == L' ' || (*text >= L'\t' && *text <= L'\r'))
+        ++text;
     bool const isNegative = *text == L'-';
     if (isNegative || *text == L'+') ++text;
     unsigned int value = 0;

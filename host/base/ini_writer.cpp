@@ -7,14 +7,16 @@
 #include "host/base/utf8.h"
 #include "tz/pal/ini_file.h"
 
-bool WritePrivateProfileString(wchar_t const* section, wchar_t const* key, wchar_t const* value,
+bool WritePrivateProfileString(wchar_t const* section,
+                               wchar_t const* key,
+                               wchar_t const* value,
                                wchar_t const* file) {
     if (tzhost::faultAt("WritePrivateProfileString")) return false;
     if (section == nullptr || file == nullptr) return false;
     std::string const path = tzhost::toUtf8(file);
     std::string const name = tzhost::toUtf8(section);
     std::string const keyName = tzhost::toUtf8(key ? key : L"");
-    CSimpleIniA ini(true, true, false); // UTF-8, keys more than once, values on one line
+    CSimpleIniA ini(true, true, false);  // UTF-8, keys more than once, values on one line
     ini.SetAllowKeyOnly(true);
     ini.SetSpaces(false);
     std::string const old = tzhost::readFile(path).value_or("");

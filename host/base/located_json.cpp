@@ -86,8 +86,8 @@ private:
         return true;
     }
 
-    // A new value where the document has grown to. Values that are open are the last of their parents,
-    // so adding behind the innermost one moves none of them.
+    // A new value where the document has grown to. Values that are open are the last of their
+    // parents, so adding behind the innermost one moves none of them.
     LocatedJson* place(LocatedJson::Kind kind) {
         LocatedJson* here = &result_.root;
         if (!open_.empty() && open_.back()->kind_ == LocatedJson::Kind::object) {
@@ -139,4 +139,4 @@ std::string_view nameOf(LocatedJson::Kind kind) {
     return "an object";
 }
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -1,8 +1,8 @@
 #pragma once
 
 // A JSON document whose values know their line, for short files that people write by hand: whoever
-// finds fault with a value can say where it stands. Files of many entries are better read as a stream,
-// with LineCounter beneath it.
+// finds fault with a value can say where it stands. Files of many entries are better read as a
+// stream, with LineCounter beneath it.
 //
 //   LocatedJson::Result const read = LocatedJson::read(bytes);
 //   if (!read.error.empty()) complain(file, read.line, read.error);
@@ -17,8 +17,8 @@
 
 namespace tzhost {
 
-// Reads characters for a parser and knows the line of the last one that was more than a line end. The
-// copies of an iterator share their counter, which outlives them.
+// Reads characters for a parser and knows the line of the last one that was more than a line end.
+// The copies of an iterator share their counter, which outlives them.
 class LineCounter {
 public:
     explicit LineCounter(std::string_view bytes) : bytes_(bytes) {}
@@ -59,9 +59,9 @@ private:
     [[nodiscard]] char const& read(std::size_t at);
 
     std::string_view bytes_;
-    std::size_t counted_ = 0; // characters before this one are counted
+    std::size_t counted_ = 0;  // characters before this one are counted
     int line_ = 1;
-    int ends_ = 0; // line ends behind the last character
+    int ends_ = 0;  // line ends behind the last character
 };
 
 class LocatedJson {
@@ -77,7 +77,7 @@ public:
     [[nodiscard]] int line() const { return line_; }
     [[nodiscard]] bool boolean() const { return boolean_; }
     [[nodiscard]] double number() const { return number_; }
-    [[nodiscard]] std::string const& text() const { return text_; } // UTF-8
+    [[nodiscard]] std::string const& text() const { return text_; }  // UTF-8
     // Elements of an array.
     [[nodiscard]] std::vector<LocatedJson> const& items() const { return items_; }
     // Members of an object, as the file orders them.
@@ -100,11 +100,11 @@ private:
 
 struct LocatedJson::Result {
     LocatedJson root;
-    std::string error; // empty: the document was read
-    int line = 0;      // of the error
+    std::string error;  // empty: the document was read
+    int line = 0;       // of the error
 };
 
 // What a kind is called in a complaint: "a number".
 [[nodiscard]] std::string_view nameOf(LocatedJson::Kind kind);
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -26,13 +26,16 @@ private:
     Values values_;
 };
 
-} // namespace
+}  // namespace
 
 namespace Tzworks::Tzdraft::PAL {
 
-Settings::Roots Settings::read() { return {}; }
+Settings::Roots Settings::read() {
+    return {};
+}
 
-bool Settings::Roots::getProductSettings(wchar_t const* name, Reader const& reader,
+bool Settings::Roots::getProductSettings(wchar_t const* name,
+                                         Reader const& reader,
                                          bool userValues) const {
     if (tzhost::faultAt("Settings::Roots::getProductSettings") || name == nullptr) return false;
     auto const& products = tzhost::settings().product;
@@ -40,14 +43,17 @@ bool Settings::Roots::getProductSettings(wchar_t const* name, Reader const& read
     return reader(ProductValues(userValues && at != products.end() ? at->second : Values()));
 }
 
-bool Process::isFabric() { return tzhost::settings().fabric; }
+bool Process::isFabric() {
+    return tzhost::settings().fabric;
+}
 
-} // namespace Tzworks::Tzdraft::PAL
+}  // namespace Tzworks::Tzdraft::PAL
 
 bool IsCommandAllowed(wchar_t const* encodedName) {
     if (tzhost::faultAt("IsCommandAllowed") || encodedName == nullptr) return false;
     std::wstring name(encodedName);
-    for (wchar_t& c : name) --c;
+    for (wchar_t& c : name)
+        --c;
     auto const& denied = tzhost::settings().denied;
     return std::none_of(denied.begin(), denied.end(), [&name](std::wstring const& each) {
         return tzCompareNoCase(each.c_str(), name.c_str()) == 0;

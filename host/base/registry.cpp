@@ -46,7 +46,7 @@ std::uint32_t typeOfValue(tzhost::RegistryValue const& value) {
     return std::holds_alternative<std::wstring>(value) ? REG_SZ : REG_DWORD;
 }
 
-} // namespace
+}  // namespace
 
 bool CTwUiRegistryAccess::Open(HKEY root, wchar_t const* path) {
     Close();
@@ -54,7 +54,8 @@ bool CTwUiRegistryAccess::Open(HKEY root, wchar_t const* path) {
     std::wstring key = rootName(root);
     if (key.empty()) return false;
     if (path != nullptr && *path != 0) key += L'\\' + tzhost::lowered(path);
-    while (key.back() == L'\\') key.pop_back();
+    while (key.back() == L'\\')
+        key.pop_back();
     if (!isKey(key)) return false;
     key_ = TzString(std::move(key));
     isOpen_ = true;
@@ -72,7 +73,8 @@ TzString CTwUiRegistryAccess::GetString(wchar_t const* name) const {
     return text ? TzString(*text) : TzString();
 }
 
-bool CTwUiRegistryAccess::GetDword(wchar_t const* name, std::uint32_t& value,
+bool CTwUiRegistryAccess::GetDword(wchar_t const* name,
+                                   std::uint32_t& value,
                                    std::uint32_t& type) const {
     tzhost::RegistryValue const* const found = find(key_, name);
     if (found == nullptr) return false;

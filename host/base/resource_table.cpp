@@ -1,8 +1,8 @@
 #include "host/base/resource_table.h"
 
 #include <algorithm>
-#include <array>
 #include <charconv>
+#include <iterator>
 #include <optional>
 
 #include "host/base/text_escapes.h"
@@ -17,14 +17,12 @@ struct SectionRow {
     ResourceRules rules;
 };
 
-constexpr std::array<SectionRow, 5> kSections{
-    {
-     {"[texts]", ResourceRules::texts},
-     {"[keywords]", ResourceRules::keywords},
-     {"[fixed]", ResourceRules::fixed},
-     {"[warnings]", ResourceRules::warnings},
-     {"[warning formats]", ResourceRules::warningFormats},
-     }
+constexpr SectionRow kSections[] = {
+    {"[texts]",           ResourceRules::texts         },
+    {"[keywords]",        ResourceRules::keywords      },
+    {"[fixed]",           ResourceRules::fixed         },
+    {"[warnings]",        ResourceRules::warnings      },
+    {"[warning formats]", ResourceRules::warningFormats},
 };
 
 constexpr std::wstring_view kSeparator = L" _";
@@ -66,9 +64,9 @@ public:
 
 private:
     void readSection(std::string_view line) {
-        auto const row = std::find_if(kSections.begin(), kSections.end(),
+        auto const row = std::find_if(std::begin(kSections), std::end(kSections),
                                       [line](SectionRow const& each) { return each.name == line; });
-        if (row == kSections.end()) {
+        if (row == std::end(kSections)) {
             fault("no such section: " + std::string(line));
         } else {
             rules_ = row->rules;

@@ -15,4 +15,4 @@ struct Screen {
 // The rectangles in force; whoever has a real screen writes its own here.
 [[nodiscard]] Screen& screen();
 
-} // namespace tzhost
+}  // namespace tzhost

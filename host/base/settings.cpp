@@ -36,14 +36,13 @@ Json toJson(VariableValue const& value) {
 void putVariables(Json& document) {
     for (auto const& [name, value] : Variables::instance().kept(KeptIn::user)) {
         std::string const key = toUtf8(name);
-        bool const isThere =
-            document.contains("variables") && document["variables"].contains(key);
+        bool const isThere = document.contains("variables") && document["variables"].contains(key);
         bool const isDefault = value == findVariable(name)->defaultValue();
         if (isThere || !isDefault) document["variables"][key] = toJson(value);
     }
 }
 
-} // namespace
+}  // namespace
 
 Settings& settings() {
     static Settings inForce;
@@ -65,7 +64,8 @@ std::optional<std::string> loadSettings(std::string const& path, IfMissing ifMis
     if (!read.error.empty()) return path + ':' + read.error;
     settings() = std::move(read.settings);
     Variables& store = Variables::instance();
-    for (auto const& [name, value] : settings().variables) (void)store.setKept(name, value); // checked
+    for (auto const& [name, value] : settings().variables)
+        (void)store.setKept(name, value);  // checked
     return std::nullopt;
 }
 
@@ -88,4 +88,4 @@ std::optional<std::string> saveUserVariables(std::string const& path) {
     return path + ": " + systemReason();
 }
 
-} // namespace tzhost
+}  // namespace tzhost

@@ -8,8 +8,8 @@
 //    "productKey": "", "denied": ["FIELD"], "fabric": false, "inPlaceEditors": [],
 //    "rtfEditor": "", "textEditor": ""}
 //
-// Every member may be left out. Anything else is an error with its line and member, and then nothing of
-// the file counts.
+// Every member may be left out. Anything else is an error with its line and member, and then
+// nothing of the file counts.
 
 #include <cstdint>
 #include <map>
@@ -51,16 +51,16 @@ struct SettingsResult {
 
 enum class IfMissing { useDefaults, fail };
 
-// Loads the file into settings(), and its variables beneath their overrides into the store. The line
-// to show when it cannot be read or is wrong; then nothing has changed.
+// Loads the file into settings(), and its variables beneath their overrides into the store. The
+// line to show when it cannot be read or is wrong; then nothing has changed.
 [[nodiscard]] std::optional<std::string> loadSettings(std::string const& path, IfMissing ifMissing);
 
-// Writes the user's variables back into the file, with everything else in it as it was; one that has its
-// default and is not in the file stays out of it, and an unchanged file is not touched. The line to show
-// when it cannot be written.
+// Writes the user's variables back into the file, with everything else in it as it was; one that
+// has its default and is not in the file stays out of it, and an unchanged file is not touched. The
+// line to show when it cannot be written.
 [[nodiscard]] std::optional<std::string> saveUserVariables(std::string const& path);
 
 // The file that is used when none is named.
 [[nodiscard]] std::string defaultSettingsFile();
 
-} // namespace tzhost
+}  // namespace tzhost

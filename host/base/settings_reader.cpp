@@ -76,18 +76,16 @@ struct MemberRow {
     void (Reader::*read)(LocatedJson const& value, std::string const& path);
 };
 
-constexpr std::array<MemberRow, 9> kMembers{
-    {
-     {"variables", &Reader::variables},
-     {"product", &Reader::product},
-     {"registry", &Reader::registry},
-     {"productKey", &Reader::text<&Settings::productKey>},
-     {"denied", &Reader::texts<&Settings::denied>},
-     {"fabric", &Reader::fabric},
-     {"inPlaceEditors", &Reader::texts<&Settings::inPlaceEditors>},
-     {"rtfEditor", &Reader::text<&Settings::rtfEditor>},
-     {"textEditor", &Reader::text<&Settings::textEditor>},
-     }
+constexpr MemberRow kMembers[] = {
+    {"variables",      &Reader::variables                       },
+    {"product",        &Reader::product                         },
+    {"registry",       &Reader::registry                        },
+    {"productKey",     &Reader::text<&Settings::productKey>     },
+    {"denied",         &Reader::texts<&Settings::denied>        },
+    {"fabric",         &Reader::fabric                          },
+    {"inPlaceEditors", &Reader::texts<&Settings::inPlaceEditors>},
+    {"rtfEditor",      &Reader::text<&Settings::rtfEditor>      },
+    {"textEditor",     &Reader::text<&Settings::textEditor>     },
 };
 
 constexpr std::array<std::wstring_view, 2> kRoots{L"hkey_current_user", L"hkey_local_machine"};

@@ -28,7 +28,7 @@ FormatMark readMark(CStdStrW const& markup) {
     return mark;
 }
 
-} // namespace
+}  // namespace
 
 TextEditor::TextEditor(TzDbMText* text, bool, bool, bool, bool, double, double, double, bool, bool)
     : text_(text) {}
@@ -38,10 +38,13 @@ TextEditor::~TextEditor() = default;
 void TextEditor::initialize(wchar_t const* contents) {
     CStdStrW const markup(contents);
     FormatMark const mark = readMark(markup);
-    unreadable_ = mark.isThere && !mark.hasNumber ? markup.Left(static_cast<int>(mark.length)) : L"";
+    unreadable_ =
+        mark.isThere && !mark.hasNumber ? markup.Left(static_cast<int>(mark.length)) : L"";
 }
 
-void TextEditor::uninitialize() { unreadable_.clear(); }
+void TextEditor::uninitialize() {
+    unreadable_.clear();
+}
 
 int TextEditor::from_mtext(wchar_t const* contents) {
     FormatMark const mark = readMark(contents);

@@ -1,7 +1,7 @@
 #include "host/base/text_escapes.h"
 
 #include <algorithm>
-#include <array>
+#include <iterator>
 
 #include "tz/text/string.h"
 
@@ -15,14 +15,12 @@ struct Escape {
 };
 
 // The letter behind the backslash, the character that it stands for.
-constexpr std::array<Escape, 5> kEscapes{
-    {
-     {L'n', L'\n'},
-     {L'r', L'\r'},
-     {L't', L'\t'},
-     {L's', L' '},
-     {L'\\', L'\\'},
-     }
+constexpr Escape kEscapes[] = {
+    {L'n',  L'\n'},
+    {L'r',  L'\r'},
+    {L't',  L'\t'},
+    {L's',  L' ' },
+    {L'\\', L'\\'},
 };
 
 constexpr std::size_t kHexDigits = 4;
@@ -54,10 +52,10 @@ std::wstring escaped(std::wstring_view text) {
     std::wstring line;
     for (std::size_t i = 0; i < text.size(); ++i) {
         wchar_t const c = text[i];
-        auto const row = std::find_if(kEscapes.begin(), kEscapes.end(),
+        auto const row = std::find_if(std::begin(kEscapes), std::end(kEscapes),
                                       [c](Escape const& each) { return each.character == c; });
         bool const isInnerBlank = c == L' ' && i != 0 && i + 1 != text.size();
-        if (row != kEscapes.end() && !isInnerBlank) {
+        if (row != std::end(kEscapes) && !isInnerBlank) {
             line += {L'\\', row->letter};
         } else if (needsHex(c)) {
             line += TzString::formatted(L"\\u%04X", c).str();
@@ -78,9 +76,9 @@ std::optional<std::wstring> unescaped(std::wstring_view line) {
         if (++i == line.size()) return std::nullopt;
         wchar_t const letter = line[i];
         auto const row =
-            std::find_if(kEscapes.begin(), kEscapes.end(),
+            std::find_if(std::begin(kEscapes), std::end(kEscapes),
                          [letter](Escape const& each) { return each.letter == letter; });
-        if (row != kEscapes.end()) {
+        if (row != std::end(kEscapes)) {
             text += row->character;
             continue;
         }

@@ -11,7 +11,7 @@
 
 // A window is one of the screen's rectangles.
 struct TzWindow {
-    RECT tzhost::Screen::* rectangle;
+    RECT tzhost::Screen::*rectangle;
 };
 
 namespace {
@@ -24,18 +24,24 @@ constexpr TzWindow kDrawingArea{&tzhost::Screen::drawingArea};
 constexpr int kInvalidArgument = static_cast<int>(0x80070057U);
 constexpr int kOutOfMemory = static_cast<int>(0x8007000EU);
 
-} // namespace
+}  // namespace
 
 tzhost::Screen& tzhost::screen() {
     static Screen numbers;
     return numbers;
 }
 
-HWND GetDesktopWindow() { return &kDesktop; }
+HWND GetDesktopWindow() {
+    return &kDesktop;
+}
 
-HWND GetApplicationWindow() { return &kApplication; }
+HWND GetApplicationWindow() {
+    return &kApplication;
+}
 
-HWND GetDrawingAreaWindow() { return &kDrawingArea; }
+HWND GetDrawingAreaWindow() {
+    return &kDrawingArea;
+}
 
 int GetWindowRect(HWND window, RECT* rect) {
     if (tzhost::faultAt("GetWindowRect") || window == nullptr || rect == nullptr) return 0;
@@ -79,9 +85,9 @@ int StringFromCLSID(_GUID const& id, wchar_t** text) {
     *text = nullptr;
     if (auto const fault = tzhost::faultAt("StringFromCLSID", kOutOfMemory)) return *fault;
     std::uint8_t const* const d = id.Data4;
-    TzString const form = TzString::formatted(
-        L"{%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X}", id.Data1, id.Data2, id.Data3, d[0],
-        d[1], d[2], d[3], d[4], d[5], d[6], d[7]);
+    TzString const form =
+        TzString::formatted(L"{%08X-%04X-%04X-%02X%02X-%02X%02X%02X%02X%02X%02X}", id.Data1,
+                            id.Data2, id.Data3, d[0], d[1], d[2], d[3], d[4], d[5], d[6], d[7]);
     std::size_t const size = form.str().size() + 1;
     *text = static_cast<wchar_t*>(std::malloc(size * sizeof(wchar_t)));
     if (*text == nullptr) return kOutOfMemory;
@@ -89,4 +95,6 @@ int StringFromCLSID(_GUID const& id, wchar_t** text) {
     return 0;
 }
 
-void CoTaskMemFree(void* memory) { std::free(memory); }
+void CoTaskMemFree(void* memory) {
+    std::free(memory);
+}

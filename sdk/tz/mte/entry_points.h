@@ -41,3 +41,7 @@ TZ_API int TzadEditMTextEntity(void* ignored,
 TZ_API CMTextEditorInterface* new_CMTextEditorInterface();
 TZ_API void delete_CMTextEditorInterface(CMTextEditorInterface* state);
 }
+
+class TzString;
+// Does nothing; hosts that rename a command may still call it.
+TZ_API void UpdateCommandName(TzString& globalName, TzString& localName);

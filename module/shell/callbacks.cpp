@@ -1,0 +1,71 @@
+#include "module/shell/callbacks.h"
+
+#include <memory>
+
+#include "module/access/sys_var.h"
+#include "module/commands/placeholder.h"
+#include "tz/ed/prompts.h"
+#include "tz/mte/edit_mtext.h"
+#include "tz/mte/entry_points.h"
+#include "tz/mte/globals.h"
+#include "tz/mte/mtext_command.h"
+
+namespace {
+
+// Bits of CMDACTIVE: the answers come from a script or from a program.
+constexpr int kAnsweredWithoutUser = 4 | 32;
+
+bool takesTextFromCommandLine() {
+    if (tzedInitDialog(false)) return false;
+    return (CTzadSysVar::GetInt(L"CMDACTIVE") & kAnsweredWithoutUser) != 0 && !tzedMacroPlayback();
+}
+
+bool always() {
+    return true;
+}
+
+// MTEXTCOMMANDACTIVE stays 1 when an exception passes.
+void runMtext(bool (*commandLineEditor)()) {
+    gdJigBoundBoxHeight = 0;
+    std::unique_ptr<TzxMtextCommand> const command(newTzxMtextCommand());
+    CTzadSysVar::SetInt(L"MTEXTCOMMANDACTIVE", 1);
+    command->UseCommandLineEditor(commandLineEditor());
+    if (command->DoMainPrompt(false, true)) command->CreateObject(nullptr, false);
+    CTzadSysVar::SetInt(L"MTEXTCOMMANDACTIVE", 0);
+}
+
+void editOneMtext(MTETabType tab) {
+    std::unique_ptr<TzxEditMtext> const command(newTzxEditMtext());
+    command->EditMtext(tab, true, true);
+}
+
+}  // namespace
+
+void ImprovedMtextCallback() {
+    runMtext(takesTextFromCommandLine);
+}
+
+void CompatibleMtextCallback() {
+    runMtext(always);
+}
+
+void EditMtextCallback() {
+    gdJigBoundBoxHeight = 0;
+    editOneMtext(kMTETabText);
+}
+
+void MtpropCallback() {
+    editOneMtext(kMTETabProperties);
+}
+
+void CompatibleEditMtextCallback() {
+    printNotYetAvailable(gsCompatibleEditMtext_GlobalName);
+}
+
+void AlignTextCallback() {
+    printNotYetAvailable(gsAlignText_GlobalName);
+}
+
+void MtextPropertiesCallback() {
+    printNotYetAvailable(gsMtextProperties_GlobalName);
+}

@@ -1,0 +1,12 @@
+#pragma once
+
+// What the host calls when a command starts, one for each command. Each makes its command object,
+// runs it and lets it go; nothing survives but system variables and the exported globals.
+
+void ImprovedMtextCallback();        // MTEXT
+void CompatibleMtextCallback();      // -MTEXT
+void EditMtextCallback();            // MTEDIT
+void CompatibleEditMtextCallback();  // -MTEDIT
+void MtpropCallback();               // MTPROP
+void AlignTextCallback();            // TEXTALIGN
+void MtextPropertiesCallback();      // MTEXTPROPERTIES

@@ -1,0 +1,86 @@
+#include <array>
+
+#include "module/access/resources.h"
+#include "module/shell/callbacks.h"
+#include "module/shell/registration.h"
+#include "tz/ed/command_stack.h"
+#include "tz/mte/globals.h"
+#include "tz/pal/diagnostics.h"
+#include "tz/rx/registry.h"
+#include "tz/rx/resource.h"
+
+namespace {
+
+struct Command {
+    TzString* globalVariable;
+    TzString* localVariable;
+    wchar_t const* globalName;
+    int localNameId;
+    void (*callback)();
+};
+
+// Registered in this order. The last one is added on its own: with another flag, silently and
+// without help.
+constexpr std::array<Command, 7> kCommands{
+    {
+     {&gsEditMtext_GlobalName, &gsEditMtext_LocalName, L"MTEDIT", 143, EditMtextCallback},
+     {&gsCompatibleEditMtext_GlobalName, &gsCompatibleEditMtext_LocalName, L"-MTEDIT", 18372,
+         CompatibleEditMtextCallback},
+     {&gsAlignText_GlobalName, &gsAlignText_LocalName, L"TEXTALIGN", 127, AlignTextCallback},
+     {&gsMtext_GlobalName, &gsMtext_LocalName, L"MTEXT", 1062, ImprovedMtextCallback},
+     {&gsCompatibleMtext_GlobalName, &gsCompatibleMtext_LocalName, L"-MTEXT", 1063,
+         CompatibleMtextCallback},
+     {&gsMtprop_GlobalName, &gsMtprop_LocalName, L"MTPROP", 1082, MtpropCallback},
+     {&gsMtextProperties_GlobalName, &gsMtextProperties_LocalName, L"MTEXTPROPERTIES", 52328,
+         MtextPropertiesCallback},
+     }
+};
+
+constexpr int kSeesSelection = 0x2;
+constexpr int kSeesSelectionWithoutDialogs = 0x800002;
+
+TzEdCommandStack* commandStack() {
+    return tzrxCast<TzEdCommandStack>(tzrxSysRegistry()->at(L"TZAD_REGISTERED_COMMANDS"));
+}
+
+void addCommand(TzString const& globalName,
+                TzString const& localName,
+                int flags,
+                void (*callback)()) {
+    if (TzEdCommandStack* const commands = commandStack())
+        commands->addCommand(gsCommandGroupName, globalName, localName, flags, callback, nullptr,
+                             -1, TzRxResourceInstance::empty, nullptr);
+}
+
+}  // namespace
+
+void InitGlobalStrings() {
+    for (Command const& command : kCommands) {
+        *command.globalVariable = command.globalName;
+        *command.localVariable = loadResourceString(command.localNameId);
+    }
+}
+
+void RegisterCommand(TzString const& globalName, TzString const& localName, void (*callback)()) {
+    addCommand(globalName, localName, kSeesSelection, callback);
+    Tzworks::Tzdraft::PAL::Diagnostics::outputDebugString(TzString::formatted(
+        L"  Registered command under the global name '%ls' and local name '%ls'\r\n",
+        globalName.kwszPtr(), localName.kwszPtr()));
+    tzedSetFunHelp(globalName, nullptr, globalName, 0);
+    tzedSetFunHelp(localName, nullptr, globalName, 0);
+}
+
+void registerCommands() {
+    gsCommandGroupName = L"TZCORE_MTEXT";
+    for (std::size_t row = 0; row + 1 < kCommands.size(); ++row)
+        RegisterCommand(*kCommands[row].globalVariable, *kCommands[row].localVariable,
+                        kCommands[row].callback);
+    Command const& last = kCommands.back();
+    addCommand(*last.globalVariable, *last.localVariable, kSeesSelectionWithoutDialogs,
+               last.callback);
+}
+
+void unregisterCommands() {
+    if (TzEdCommandStack* const commands = commandStack())
+        commands->removeGroup(gsCommandGroupName);
+}

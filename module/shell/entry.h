@@ -1,0 +1,13 @@
+#pragma once
+
+#include "module/access/handle_object.h"
+#include "tz/rx/app.h"
+
+// The module's front door: the host sends every message through tzrxEntryPoint, which hands it on.
+
+// Loads, unloads, serves the functions of the interpreter; 0, or 3 for a failure. Any message that
+// is none of the five does nothing and gives 0. `appHandle` counts for loading alone.
+int tzrxEntryPoint_Mte(TzRx::AppMsgCode message, void* appHandle);
+
+// Never attached: the module has no thread but the host's.
+extern CHandleObject ghBackgroundThread;

@@ -1,0 +1,61 @@
+#include <array>
+
+#include "module/access/string_table.h"
+#include "module/commands/edit_mtext.h"
+#include "module/shell/registration.h"
+#include "tz/ed/command_stack.h"
+#include "tz/ed/functions.h"
+#include "tz/ed/print.h"
+#include "tz/rx/resbuf.h"
+#include "tz/rx/status.h"
+
+namespace {
+
+enum FunctionCode : int { kEdit = 0, kProperties = 1, kAlign = 4 };
+
+struct Function {
+    TzString* name;
+    FunctionCode code;
+};
+
+constexpr std::array<Function, 3> kFunctions{
+    {
+     {&gsEditMtext_GlobalName, kEdit},
+     {&gsAlignText_GlobalName, kAlign},
+     {&gsMtprop_GlobalName, kProperties},
+     }
+};
+
+constexpr unsigned int kNeedsEntityMessage = 163;
+
+}  // namespace
+
+bool defineFunctions() {
+    for (Function const& function : kFunctions)
+        if (tzedDefun(*function.name, function.code) != Tzad::ePromptNormal) return false;
+    tzedSetFunHelp(gsEditMtext_GlobalName, nullptr, gsEditMtext_GlobalName, 0);
+    tzedSetFunHelp(gsEditMtext_LocalName, nullptr, gsEditMtext_GlobalName, 0);
+    tzedSetFunHelp(gsAlignText_GlobalName, nullptr, gsAlignText_GlobalName, 0);
+    tzedSetFunHelp(gsAlignText_LocalName, nullptr, gsAlignText_GlobalName, 0);
+    return true;
+}
+
+void undefineFunctions() {
+    for (Function const& function : kFunctions)
+        tzedUndef(*function.name, function.code);
+}
+
+bool invokeFunction() {
+    tzedRetVoid();
+    int const code = tzedGetFunCode();
+    // The function for aligning is defined, but has no body.
+    if (code != kEdit && code != kProperties) return false;
+    resbuf const* const first = tzedGetArgs();
+    if (first && first->restype == Tzad::eResultEntityName) {
+        MTETabType const tab = code == kEdit ? kMTETabText : kMTETabProperties;
+        EditMtextByAdsName(first->resval.rlname, tab, true, true);
+    } else {
+        tzutPrintf(gStringTable[kNeedsEntityMessage]);
+    }
+    return true;
+}
