@@ -52,7 +52,7 @@ LayoutFace faceOfPattern(FcPattern* font) {
     int slant = FC_SLANT_ROMAN;
     (void)FcPatternGetInteger(font, FC_WEIGHT, 0, &weight);  // absent: the value set above
     (void)FcPatternGetInteger(font, FC_SLANT, 0, &slant);
-    return {textOf(font, FC_FAMILY), weight >= FC_WEIGHT_DEMIBOLD, slant != FC_SLANT_ROMAN, false};
+    return {textOf(font, FC_FAMILY), weight >= FC_WEIGHT_DEMIBOLD, slant != FC_SLANT_ROMAN};
 }
 
 // Every installed font file by its name in lower case, read once.
@@ -85,15 +85,16 @@ LayoutFace faceOfFile(std::wstring const& path) {
     }
     for (StrokeRow const& row : kStrokeFaces) {
         if (name.find(row.part) != std::wstring::npos) {
-            return {row.typeface, false, row.italic, false};
+            return {row.typeface, false, row.italic};
         }
     }
     return {};
 }
 
 LayoutFace faceOfName(std::wstring const& name, bool bold, bool italic) {
-    bool const sideways = !name.empty() && name.front() == L'@';
-    return {sideways ? name.substr(1) : name, bold, italic, sideways};
+    // The mark of a vertical face is no part of its name.
+    bool const marked = !name.empty() && name.front() == L'@';
+    return {marked ? name.substr(1) : name, bold, italic};
 }
 
 }  // namespace

@@ -95,7 +95,6 @@ struct LayoutFace {
     std::wstring typeface;
     bool bold = false;
     bool italic = false;
-    bool sideways = false;  // a face written with a leading "@": ideographs lie on their side
 
     friend bool operator==(LayoutFace const&, LayoutFace const&) = default;
 };

@@ -6,7 +6,9 @@ namespace tzhost {
 
 AttachmentShares attachmentShares(int attachment) {
     int const index = attachment >= 1 && attachment <= 9 ? attachment - 1 : 0;
-    return {(index % 3) / 2.0, (index / 3) / 2.0};
+    int const row = index / 3;
+    int const column = index % 3;
+    return {column / 2.0, row / 2.0};
 }
 
 LayoutBox boxAt(AttachmentShares const& shares, double width, double height) {

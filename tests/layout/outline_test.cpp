@@ -40,7 +40,7 @@ GlyphRun runOf(std::wstring const& text) {
     run.x = 100.0;
     run.y = 50.0;
     run.height = kCapital;
-    run.face = {L"DejaVu Sans Mono", false, false, false};
+    run.face = {L"DejaVu Sans Mono", false, false};
     return run;
 }
 
