@@ -23,7 +23,7 @@ WholeText wholeTextOf(MTextLayoutInput const& input, MarkupText const& markup) {
     whole.tracking = usableFactor(markup.tracking);
     double const most = kMostOblique * kDegree;
     whole.oblique = std::clamp(input.style.oblique + markup.oblique * kDegree, -most, most);
-    whole.stackScale = input.stackScalePercent / 100.0;
+    whole.stackScale = usableFactor(input.stackScalePercent / 100.0);
     whole.tabDistance = kTabHeights * input.textHeight;
     whole.flow = isVerticalStyle(input.style) ? TextFlow::down : TextFlow::along;
     return whole;

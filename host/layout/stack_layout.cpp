@@ -10,37 +10,25 @@
 namespace tzhost {
 namespace {
 
-// Proportions of a stack in heights of its parts: the baseline of the upper part above that of the
-// lower one, and how far the bar reaches over the parts at either end.
-struct StackProportions {
-    double rise;
-    double overhang;
-};
-
-// In the order of StackKind.
-constexpr std::array<StackProportions, 3> kProportions{
-    {
-     {1.6, 0.1},
-     {0.9, 0.1},
-     {1.4, 0.0},
-     }
-};
-
-// The bar of an over stack, and where a slash begins and ends, against the foot of the stack.
+// Proportions in heights of the parts: the room at either end of a stack, which an over bar fills,
+// the bar's place above the foot, and the slash, which each part reaches over by an overlap.
+constexpr double kMargin = 0.1;
 constexpr double kBarHeight = 1.3;
 constexpr double kSlashWidth = 0.6;
-constexpr double kSlashOverlap = 0.1;  // of each part over the slash
+constexpr double kSlashOverlap = 0.1;
 
 class StackMaker {
 public:
     StackMaker(StackText const& stack, LineFormat const& format, WholeText const& whole);
     LaidStack lay() &&;
 
-private:
-    GlyphRun part(std::wstring const& text);
+    // What each kind does with the parts within the margins.
     void layOver();
     void layFraction();
     void layTolerance();
+
+private:
+    GlyphRun part(std::wstring const& text);
     void addRule(RuleKind kind, LayoutPoint from, LayoutPoint to);
     void align();
 
@@ -48,16 +36,28 @@ private:
     LineFormat const& format_;
     WholeText const& whole_;
     double height_;  // of the parts
-    StackProportions proportions_;
+    double margin_;
     GlyphRun upper_;
     GlyphRun lower_;
     LaidStack laid_;
 };
 
+// How high the upper part's baseline lies above the lower one's, in heights of the parts.
+struct KindRow {
+    double rise;
+    void (StackMaker::*lay)();
+};
+
+// In the order of StackKind.
+constexpr std::array kKinds{
+    KindRow{1.6, &StackMaker::layOver     },
+    KindRow{0.9, &StackMaker::layFraction },
+    KindRow{1.4, &StackMaker::layTolerance},
+};
+
 StackMaker::StackMaker(StackText const& stack, LineFormat const& format, WholeText const& whole)
     : stack_(stack), format_(format), whole_(whole), height_(format.height * whole.stackScale),
-      proportions_(kProportions[static_cast<std::size_t>(stack.kind)]), upper_(part(stack.upper)),
-      lower_(part(stack.lower)) {}
+      margin_(kMargin * height_), upper_(part(stack.upper)), lower_(part(stack.lower)) {}
 
 GlyphRun StackMaker::part(std::wstring const& text) {
     LineFormat format = format_;
@@ -68,12 +68,9 @@ GlyphRun StackMaker::part(std::wstring const& text) {
 }
 
 LaidStack StackMaker::lay() && {
-    upper_.y = proportions_.rise * height_;
-    switch (stack_.kind) {
-    case StackKind::over: layOver(); break;
-    case StackKind::fraction: layFraction(); break;
-    case StackKind::tolerance: layTolerance(); break;
-    }
+    KindRow const& kind = kKinds[static_cast<std::size_t>(stack_.kind)];
+    upper_.y = kind.rise * height_;
+    (this->*kind.lay)();
     laid_.top = upper_.y + height_;
     for (GlyphRun* const run : {&upper_, &lower_}) {
         if (!run->text.empty()) {
@@ -85,8 +82,7 @@ LaidStack StackMaker::lay() && {
 }
 
 void StackMaker::layOver() {
-    double const overhang = proportions_.overhang * height_;
-    laid_.advance = std::max(upper_.advance, lower_.advance) + 2.0 * overhang;
+    laid_.advance = std::max(upper_.advance, lower_.advance) + 2.0 * margin_;
     upper_.x = (laid_.advance - upper_.advance) / 2.0;
     lower_.x = (laid_.advance - lower_.advance) / 2.0;
     double const bar = kBarHeight * height_;
@@ -95,15 +91,18 @@ void StackMaker::layOver() {
 
 void StackMaker::layFraction() {
     double const overlap = kSlashOverlap * height_;
-    double const foot = std::max(upper_.advance - overlap, 0.0);
+    upper_.x = margin_;
+    double const foot = margin_ + std::max(upper_.advance - overlap, 0.0);
     double const head = foot + kSlashWidth * height_;
     lower_.x = head - overlap;
-    laid_.advance = std::max(lower_.x + lower_.advance, head);
+    laid_.advance = std::max(lower_.x + lower_.advance, head) + margin_;
     addRule(RuleKind::stackSlash, {foot, 0.0}, {head, upper_.y + height_});
 }
 
 void StackMaker::layTolerance() {
-    laid_.advance = std::max(upper_.advance, lower_.advance);
+    upper_.x = margin_;
+    lower_.x = margin_;
+    laid_.advance = std::max(upper_.advance, lower_.advance) + 2.0 * margin_;
 }
 
 void StackMaker::addRule(RuleKind kind, LayoutPoint from, LayoutPoint to) {

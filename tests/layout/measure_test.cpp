@@ -85,6 +85,7 @@ constexpr StyleRow kStyles[] = {
     {"PlainStyle",                  L"abc",        1.0, 3.0},
     {"StyleFactor",                 L"abc",        0.5, 1.5},
     {"CodeFactorMultiplies",        L"\\W2;abc",   0.5, 3.0},
+    {"AccentsJoin",                 L"e\u0301x",   1.0, 2.0},
     {"Tracking",                    L"\\T1.5;abc", 1.0, 4.5},
     {"NegativeFactorIsNone",        L"\\W-2;abc",  1.0, 3.0},
     {"ZeroStyleFactorIsNone",       L"abc",        0.0, 3.0},

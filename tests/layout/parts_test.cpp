@@ -18,35 +18,38 @@ struct RunRow {
     char const* rules;  // kind and X,Y-X,Y
 };
 
-// A text height is 1493 / 1233 = 1.2109 letters. Of a stack the upper baseline lies 1.6 (over), 0.9
-// (fraction), 1.4 (tolerance) heights above the lower one, an over bar at 1.3 and 0.1 heights
-// longer than its parts at either end. The slash is 0.6 heights wide and shares 0.1 with each part.
+// A text height is 1493 / 1233 = 1.21087 letters. Of a stack the upper baseline lies 1.6 (over),
+// 0.9 (fraction), 1.4 (tolerance) heights above the lower one, and 0.1 are left free at either end
+// but for an over bar, which lies at 1.3. The slash is 0.6 heights wide and shares 0.1 with each
+// part.
 constexpr RunRow kRunRows[] = {
     {"Over",                   L"a\\S1/222;b",
-     "'a'@0,-2.6,1 '1'@2.12109,-1,1 '222'@1.12109,-2.6,3 'b'@4.24217,-2.6,1",                                                        "b1,-1.3-4.24217,-1.3"         },
-    {"Tolerance",              L"\\S+0.1^-0.25;b",                         "'+0.1'@0,-1,4 '-0.25'@0,-2.4,5 'b'@5,-2.4,1",            ""                             },
-    {"Fraction",               L"\\S1#2;b",                                "'1'@0,-1,1 '2'@1.48435,-1.9,1 'b'@2.48435,-1.9,1",
-     "s0.878913,-1.9-1.60543,0"                                                                                                                                     },
+     "'a'@0,-2.6,1 '1'@2.12109,-1,1 '222'@1.12109,-2.6,3 'b'@4.24217,-2.6,1",                                                         "b1,-1.3-4.24217,-1.3"         },
+    {"Tolerance",              L"\\S+0.1^-0.25;b",
+     "'+0.1'@0.121087,-1,4 '-0.25'@0.121087,-2.4,5 'b'@5.24217,-2.4,1",                                                               ""                             },
+    {"Fraction",               L"\\S1#2;b",                                "'1'@0.121087,-1,1 '2'@1.60543,-1.9,1 'b'@2.72652,-1.9,1",
+     "s1,-1.9-1.72652,0"                                                                                                                                             },
  // Around the middle at half a height a stack of 2.6 reaches 1.8 above the baseline and 0.8
   // below.
     {"Middle",                 L"\\A1;\\S1/2;\\Pb",                        "'1'@0.121087,-1,1 '2'@0.121087,-2.6,1 'b'@0,-4.26667,1",
-     "b0,-1.3-1.24217,-1.3"                                                                                                                                         },
-    {"Top",                    L"\\A2;\\S1/2;",                            "'1'@0.121087,-1,1 '2'@0.121087,-2.6,1",                  "b0,-1.3-1.24217,-1.3"         },
-    {"StackWithoutUpper",      L"\\S^2;b",                                 "'2'@0,-2.4,1 'b'@1,-2.4,1",                              ""                             },
-    {"SmallStack",             L"a{\\H0.5x;\\S1^2;}",                      "'a'@0,-1.2,1 '1'@1,-0.5,0.5*0.5 '2'@1,-1.2,0.5*0.5",     ""                             },
-    {"DefaultTabs",            L"a\tb\t\tc",                               "'a'@0,-1,1 'b'@4.84347,-1,1 'c'@14.5304,-1,1",           ""                             },
+     "b0,-1.3-1.24217,-1.3"                                                                                                                                          },
+    {"Top",                    L"\\A2;\\S1/2;",                            "'1'@0.121087,-1,1 '2'@0.121087,-2.6,1",                   "b0,-1.3-1.24217,-1.3"         },
+    {"StackWithoutUpper",      L"\\S^2;b",                                 "'2'@0.121087,-2.4,1 'b'@1.24217,-2.4,1",                  ""                             },
+    {"SmallStack",             L"a{\\H0.5x;\\S1^2;}",
+     "'a'@0,-1.2,1 '1'@1.06054,-0.5,0.5*0.5 '2'@1.06054,-1.2,0.5*0.5",                                                                ""                             },
+    {"DefaultTabs",            L"a\tb\t\tc",                               "'a'@0,-1,1 'b'@4.84347,-1,1 'c'@14.5304,-1,1",            ""                             },
     {"OwnTabs",                L"\\pt2466,6165;a\tb\tc\td",                "'a'@0,-1,1 'b'@2,-1,1 'c'@5,-1,1 'd'@9.68694,-1,1",
-     ""                                                                                                                                                             },
-    {"TabAtItsStop",           L"\\pt2466,6165;ab\tc",                     "'ab'@0,-1,2 'c'@5,-1,1",                                 ""                             },
-    {"TabToHangingIndent",     L"\\pi-3699,l3699;1.\ta",                   "'1.'@0,-1,2 'a'@3,-1,1",                                 ""                             },
-    {"Underline",              L"a\\Lbc\\ld",                              "'a'@0,-1,1 'bc'@1,-1,2 'd'@3,-1,1",                      "u1,-1.2-3,-1.2"               },
+     ""                                                                                                                                                              },
+    {"TabAtItsStop",           L"\\pt2466,6165;ab\tc",                     "'ab'@0,-1,2 'c'@5,-1,1",                                  ""                             },
+    {"TabToHangingIndent",     L"\\pi-3699,l3699;1.\ta",                   "'1.'@0,-1,2 'a'@3,-1,1",                                  ""                             },
+    {"Underline",              L"a\\Lbc\\ld",                              "'a'@0,-1,1 'bc'@1,-1,2 'd'@3,-1,1",                       "u1,-1.2-3,-1.2"               },
     {"UnderlineAcrossHeights", L"\\La{\\H2x;b}c",                          "'a'@0,-2,1 'b'@1,-2,2*2 'c'@3,-2,1",
-     "u0,-2.4-4,-2.4"                                                                                                                                               },
+     "u0,-2.4-4,-2.4"                                                                                                                                                },
     {"OverlineAcrossFonts",    L"\\Oa{\\fDejaVu Sans Mono|b0|i0|c0|p0;b}", "'a'@0,-1,1 'b'@1,-1,1",
-     "o0,0.2-2,0.2"                                                                                                                                                 },
-    {"UnderlineByColour",      L"\\La\\C1;b",                              "'a'@0,-1,1 'b'@1,-1,1",                                  "u0,-1.2-1,-1.2 u1,-1.2-2,-1.2"},
-    {"UnderlinedTab",          L"\\pt2466;\\La\tb",                        "'a'@0,-1,1 'b'@2,-1,1",                                  "u0,-1.2-3,-1.2"               },
-    {"ControlsAreDropped",     L"a\rb\x1F\x7F\x85",                        "'ab'@0,-1,2",                                            ""                             },
+     "o0,0.2-2,0.2"                                                                                                                                                  },
+    {"UnderlineByColour",      L"\\La\\C1;b",                              "'a'@0,-1,1 'b'@1,-1,1",                                   "u0,-1.2-1,-1.2 u1,-1.2-2,-1.2"},
+    {"UnderlinedTab",          L"\\pt2466;\\La\tb",                        "'a'@0,-1,1 'b'@2,-1,1",                                   "u0,-1.2-3,-1.2"               },
+    {"ControlsAreDropped",     L"a\rb\x1F\x7F\x85",                        "'ab'@0,-1,2",                                             ""                             },
 };
 
 TEST(Parts, StandWhereTheyAreCounted) {
@@ -74,7 +77,8 @@ TEST(Parts, StackPartsAreCentredUponEachOther) {
 TEST(Parts, StackScaleSizesTheParts) {
     MTextLayoutInput input = monospaced(L"\\S1^2;", 0);
     input.stackScalePercent = 50;
-    EXPECT_EQ(printGlyphRuns(layOutMText(input)), "'1'@0,-0.5,0.5*0.5 '2'@0,-1.2,0.5*0.5");
+    EXPECT_EQ(printGlyphRuns(layOutMText(input)),
+              "'1'@0.0605434,-0.5,0.5*0.5 '2'@0.0605434,-1.2,0.5*0.5");
 }
 
 // Hebrew (DejaVu Sans Mono has none, but its face decides no order) stands from right to left,
