@@ -47,8 +47,7 @@ private:
 
 TzGiTextStyle styleOf(GlyphRun const& run) {
     TzGiTextStyle style;
-    std::wstring const face = run.face.sideways ? L"@" + run.face.typeface : run.face.typeface;
-    style.setFont(face, run.face.bold, run.face.italic, 0, 0);
+    style.setFont(run.face.typeface, run.face.bold, run.face.italic, 0, 0);
     style.setTextSize(run.height);
     style.setXScale(run.widthFactor);
     style.setTrackingPercent(run.tracking);
