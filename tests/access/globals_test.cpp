@@ -61,7 +61,8 @@ TEST(Versioner, RefusesNewerFormatsWithOneMessage) {
              {L"\\?3;text",  false},
              {L"\\?4;text",  true },
              {L"\\?12;",     true },
-             {L"\\?x;text",  true },
+             {L"\\?;text",   true },
+             {L"\\?x;text",  false},
              {L"text \\?9;", false}
     }) {
         notes.boxes.clear();
