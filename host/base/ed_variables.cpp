@@ -1,9 +1,25 @@
 #include "tz/ed/variables.h"
 
+#include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
+#include "host/base/utf8.h"
+#include "host/base/variable_json.h"
 #include "host/base/variable_records.h"
 #include "host/base/variables.h"
 #include "tz/rx/status.h"
+
+namespace {
+
+void reportWrite(wchar_t const* name, tzhost::VariableValue const& value) {
+    std::wstring const capitals(tzhost::findVariable(name)->name);
+    tzhost::reportEvent({
+        {"event", "variable"              },
+        {"name",  tzhost::toUtf8(capitals)},
+        {"value", tzhost::toJson(value)   }
+    });
+}
+
+}  // namespace
 
 int tzedGetVar(wchar_t const* name, resbuf* result) {
     if (auto const fault = tzhost::faultAt("tzedGetVar")) return *fault;
@@ -19,5 +35,7 @@ int tzedSetVar(wchar_t const* name, resbuf const* value) {
     if (name == nullptr || value == nullptr) return Tzad::ePromptError;
     auto const held = tzhost::fromRecord(*value);
     if (!held) return Tzad::ePromptError;
-    return tzhost::Variables::instance().set(name, *held, tzhost::Writer::module).status;
+    auto const written = tzhost::Variables::instance().set(name, *held, tzhost::Writer::module);
+    if (written.isDone() && tzhost::eventsWanted()) reportWrite(name, *held);
+    return written.status;
 }

@@ -2,6 +2,8 @@
 
 #include <utility>
 
+#include "host/base/event_sink.h"
+#include "host/base/utf8.h"
 #include "tz/ed/print.h"
 #include "tz/pal/diagnostics.h"
 #include "tz/pal/message_box.h"
@@ -33,10 +35,24 @@ void print(std::wstring_view text) {
 }
 
 void debug(std::wstring_view text) {
+    if (eventsWanted())
+        reportEvent({
+            {"event", "debug"     },
+            {"text",  toUtf8(text)}
+        });
     if (debugSink != nullptr) debugSink->debug(text);
 }
 
 void notify(Notification const& notification) {
+    if (eventsWanted()) {
+        bool const isWarning = notification.kind == NotificationKind::warning;
+        reportEvent({
+            {"event", isWarning ? "warning" : "messageBox"},
+            {"id",    toUtf8(notification.id)             },
+            {"text",  toUtf8(notification.text)           },
+            {"style", notification.style                  }
+        });
+    }
     if (notificationSink != nullptr) notificationSink->notify(notification);
 }
 

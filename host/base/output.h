@@ -53,7 +53,8 @@ PrintSink* setPrintSink(PrintSink* sink) noexcept;
 DebugSink* setDebugSink(DebugSink* sink) noexcept;
 NotificationSink* setNotificationSink(NotificationSink* sink) noexcept;
 
-// Hands a text to the receiver of its kind.
+// Hands a text to the receiver of its kind. Texts for developers and messages are reported as
+// events too, whether or not there is a receiver.
 void print(std::wstring_view text);
 void debug(std::wstring_view text);
 void notify(Notification const& notification);

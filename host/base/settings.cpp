@@ -2,13 +2,13 @@
 
 #include <cerrno>
 #include <filesystem>
-#include <type_traits>
 
 #include <nlohmann/json.hpp>
 
 #include "host/base/file_bytes.h"
 #include "host/base/install_paths.h"
 #include "host/base/utf8.h"
+#include "host/base/variable_json.h"
 #include "host/base/variables.h"
 
 namespace tzhost {
@@ -19,18 +19,6 @@ namespace fs = std::filesystem;
 using Json = nlohmann::ordered_json;
 
 constexpr int kIndent = 2;
-
-Json toJson(VariableValue const& value) {
-    return std::visit(
-        [](auto const& held) -> Json {
-            if constexpr (std::is_same_v<std::decay_t<decltype(held)>, std::wstring>) {
-                return toUtf8(held);
-            } else {
-                return held;
-            }
-        },
-        value);
-}
 
 // The document with the user's variables in it.
 void putVariables(Json& document) {

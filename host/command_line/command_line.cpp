@@ -23,11 +23,14 @@ CommandLine& commandLine() {
 }
 
 CommandLine::~CommandLine() {
-    if (isAttached_) setPrintSink(nullptr);
+    if (!isAttached_) return;
+    setPrintSink(nullptr);
+    setNotificationSink(nullptr);
 }
 
 void CommandLine::attach() {
     setPrintSink(this);
+    setNotificationSink(this);
     isAttached_ = true;
 }
 

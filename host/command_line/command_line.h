@@ -39,7 +39,7 @@ struct Armed {
     [[nodiscard]] bool has(int bit) const { return (flags & bit) != 0; }
 };
 
-class CommandLine : public PrintSink {
+class CommandLine : public PrintSink, public NotificationSink {
 public:
     // Not owned; the source before. Null stands for a script at its end.
     AnswerSource* setSource(AnswerSource* source);
@@ -68,6 +68,8 @@ public:
     enum class Voice { module, host };
     void setVoice(Voice voice) { voice_ = voice; }
     void print(std::wstring_view text) override;
+    // A message that waits for the user is a line of the host's own, and nobody waits.
+    void notify(Notification const& notification) override { say(notification.text); }
     // Puts everything back as at the start, the source and the screens included.
     void reset();
 
