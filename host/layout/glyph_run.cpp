@@ -2,6 +2,8 @@
 
 #include <cmath>
 
+#include "host/layout/shaper.h"
+
 namespace tzhost {
 
 double usableFactor(double factor) {
@@ -30,6 +32,14 @@ GlyphRun makeGlyphRun(std::wstring const& text, LineFormat const& format, WholeT
     run.oblique = whole.oblique;
     run.face = format.face;
     run.color = format.color;
+    return run;
+}
+
+GlyphRun shapeGlyphRun(std::wstring const& text, LineFormat const& format, WholeText const& whole) {
+    GlyphRun run = makeGlyphRun(text, format, whole);
+    ShapedLine const line = shapeLine(text, format.face);
+    run.advance = line.advance * advanceScale(format, whole);
+    run.rightToLeft = line.rightToLeft;
     return run;
 }
 

@@ -20,4 +20,8 @@ inline constexpr double kVerticalStep = 4.0 / 3.0;
 [[nodiscard]] GlyphRun
 makeGlyphRun(std::wstring const& text, LineFormat const& format, WholeText const& whole);
 
+// The same for a text that stands alone, with its own advance and direction.
+[[nodiscard]] GlyphRun
+shapeGlyphRun(std::wstring const& text, LineFormat const& format, WholeText const& whole);
+
 }  // namespace tzhost

@@ -23,8 +23,7 @@ WholeText wholeTextOf(LineLayoutInput const& input) {
 LineLayout
 layAlong(LineLayoutInput const& input, LineFormat const& format, WholeText const& whole) {
     LineLayout line;
-    GlyphRun run = makeGlyphRun(input.text, format, whole);
-    run.advance = shapedAdvance(input.text, format.face) * advanceScale(format, whole);
+    GlyphRun run = shapeGlyphRun(input.text, format, whole);
     line.box = {0.0, 0.0, run.advance, format.height};
     line.runs.push_back(std::move(run));
     return line;
@@ -36,8 +35,7 @@ LineLayout layDown(LineLayoutInput const& input, LineFormat const& format, Whole
     double widest = 0.0;
     double y = -format.height;
     for (std::wstring const& letter : splitLetters(input.text, format.face)) {
-        GlyphRun run = makeGlyphRun(letter, format, whole);
-        run.advance = shapedAdvance(letter, format.face) * advanceScale(format, whole);
+        GlyphRun run = shapeGlyphRun(letter, format, whole);
         run.x = -run.advance / 2.0;
         run.y = y;
         y -= step;

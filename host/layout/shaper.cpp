@@ -107,16 +107,19 @@ ShapedText shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spa
     return result;
 }
 
-double shapedAdvance(std::wstring const& text, LayoutFace const& face) {
-    double advance = 0.0;
-    for (ShapedCharacter const& character : shapeText(text,
-                                                      {
-                                                          {text.size(), face}
-    })
-                                                .characters) {
-        advance += character.advance;
+ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face) {
+    ShapedText const shaped = shapeText(text, {
+                                                  {text.size(), face}
+    });
+    ShapedLine line;
+    for (ShapedCharacter const& character : shaped.characters) {
+        line.advance += character.advance;
     }
-    return advance;
+    // In a text that reads from the left something stands at level 0, and nothing in any other.
+    line.rightToLeft = !shaped.items.empty() &&
+                       std::none_of(shaped.items.begin(), shaped.items.end(),
+                                    [](ShapedItem const& item) { return item.level == 0; });
+    return line;
 }
 
 std::vector<std::wstring> splitLetters(std::wstring const& text, LayoutFace const& face) {

@@ -42,8 +42,13 @@ struct ShapedText {
 // Shapes a paragraph. Values in `text` that are no Unicode scalars show as U+FFFD.
 [[nodiscard]] ShapedText shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spans);
 
-// The advance of a text of one face, in heights of capitals.
-[[nodiscard]] double shapedAdvance(std::wstring const& text, LayoutFace const& face);
+// A text of one face that is never broken: its advance in heights of capitals, and which way it
+// reads as a whole, by its first strong letter.
+struct ShapedLine {
+    double advance = 0.0;
+    bool rightToLeft = false;
+};
+[[nodiscard]] ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face);
 
 // The letters of a text, each with the accents and joiners that belong to it.
 [[nodiscard]] std::vector<std::wstring> splitLetters(std::wstring const& text,

@@ -5,7 +5,6 @@
 #include <utility>
 
 #include "host/layout/glyph_run.h"
-#include "host/layout/shaper.h"
 
 namespace tzhost {
 namespace {
@@ -62,9 +61,7 @@ StackMaker::StackMaker(StackText const& stack, LineFormat const& format, WholeTe
 GlyphRun StackMaker::part(std::wstring const& text) {
     LineFormat format = format_;
     format.height = height_;
-    GlyphRun run = makeGlyphRun(text, format, whole_);
-    run.advance = shapedAdvance(text, format.face) * advanceScale(format, whole_);
-    return run;
+    return shapeGlyphRun(text, format, whole_);
 }
 
 LaidStack StackMaker::lay() && {

@@ -28,6 +28,11 @@ TEST(MarkupRuns, ZeroEndsTheText) {
     EXPECT_EQ(printRuns(readMarkup(text, kInitial), kInitial), "'A' P");
 }
 
+// Letters of no height cannot be shown, so this reader passes such heights over.
+TEST(MarkupRuns, HeightsAreAboveZero) {
+    EXPECT_EQ(printRuns(readMarkup(L"\\H-2;A\\H0;B\\Hx;C", kInitial), kInitial), "'ABC' P");
+}
+
 std::wstring repeated(std::wstring const& part, int count) {
     std::wstring text;
     for (int i = 0; i < count; ++i)

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cmath>
 
+#include "host/layout/line_layout.h"
 #include "host/layout/text_outline.h"
 #include "tests/layout/layout_printer.h"
 
@@ -80,6 +81,19 @@ TEST(Outline, LettersStandOnTheirRunsPlace) {
         EXPECT_NEAR(ink.bottom, row.ink.bottom, 0.01) << row.name;
         EXPECT_NEAR(ink.top, row.ink.top, 0.01) << row.name;
     }
+}
+
+// Drawn alone, a line that reads from the right has its last sign at its left end.
+TEST(Outline, DirectionPlacesNeutralSigns) {
+    LineLayoutInput input;
+    input.textHeight = kCapital;
+    input.style.typeface = L"DejaVu Sans Mono";
+    input.text = L"\u05D0   ";
+    GlyphRun const blanksBehind = layOutLine(input).runs.front();
+    EXPECT_TRUE(blanksBehind.rightToLeft);
+    EXPECT_GT(inkOf(blanksBehind).left, kLetter);
+    input.text = L"a\u05D0";
+    EXPECT_FALSE(layOutLine(input).runs.front().rightToLeft);
 }
 
 TEST(Outline, BlanksHaveNone) {
