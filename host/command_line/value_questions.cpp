@@ -4,6 +4,7 @@
 #include <cmath>
 #include <numbers>
 
+#include "host/base/utf8.h"
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
 #include "host/command_line/unit_reader.h"
@@ -35,7 +36,7 @@ std::optional<double> readPlainNumber(std::wstring_view text) {
 
 std::optional<int> readInteger(std::wstring_view text) {
     if (text.starts_with(L'+')) text.remove_prefix(1);
-    std::string const digits(text.begin(), text.end());
+    std::string const digits = tzhost::toUtf8(text);
     int value = 0;
     auto const read = std::from_chars(digits.data(), digits.data() + digits.size(), value);
     bool const isWhole = read.ec == std::errc() && read.ptr == digits.data() + digits.size();

@@ -32,6 +32,12 @@ private:
     GestureProcessor gestures_;
 };
 
+// A selection filter with the flags that it was installed with; not owned.
+struct InputFilter {
+    TzEdSSGetFilter* filter = nullptr;
+    int flags = 0;
+};
+
 // An open drawing. The database is made and owned by whoever opens the document.
 class Document : public TzApDocument {
 public:
@@ -40,8 +46,8 @@ public:
     [[nodiscard]] View* view() const override { return &view_; }
 
     FunctionTable functions;
-    std::vector<TzEdSSGetFilter*> filters;  // installed on its input, not owned
-    std::deque<TzString> typed;             // texts that were sent to its command line
+    std::vector<InputFilter> filters;  // installed on its input
+    std::deque<TzString> typed;        // texts that were sent to its command line
 
 private:
     TzDbDatabase* database_;

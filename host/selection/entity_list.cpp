@@ -1,0 +1,111 @@
+#include "host/selection/entity_list.h"
+
+#include <utility>
+
+#include "host/database/drawing.h"
+#include "host/database/object_list.h"
+#include "host/display/record_access.h"
+#include "tz/db/entity.h"
+#include "tz/db/symbol_table.h"
+
+namespace tzhost {
+
+namespace {
+
+KeptEntities& implied() {
+    static KeptEntities entities;
+    return entities;
+}
+
+KeptEntities& previous() {
+    static KeptEntities entities;
+    return entities;
+}
+
+void appendEntities(EntityIds& ids, TzDbObjectId space) {
+    ObjectList const* const list = listOf(*space.record());
+    if (list == nullptr) return;
+    for (TzDbObjectRecord* const record : list->items) {
+        if (!record->erased) ids.append(TzDbObjectId(record));
+    }
+}
+
+}  // namespace
+
+KeptEntities::KeptEntities(EntityIds ids) : ids_(std::move(ids)) {
+    Drawing const* const drawing = workingDrawing();
+    drawing_ = drawing != nullptr ? drawing->serial() : 0;
+}
+
+EntityIds KeptEntities::read() const {
+    EntityIds alive;
+    Drawing const* const drawing = workingDrawing();
+    if (drawing == nullptr || drawing->serial() != drawing_) return alive;
+    for (TzDbObjectId const id : ids_) {
+        if (!id.isErased()) alive.append(id);
+    }
+    return alive;
+}
+
+EntityIds entitiesOfActiveSpace() {
+    EntityIds ids;
+    if (Drawing const* const drawing = workingDrawing()) {
+        appendEntities(ids, drawing->activeSpace());
+    }
+    return ids;
+}
+
+EntityIds newestEntity() {
+    EntityIds const all = entitiesOfActiveSpace();
+    EntityIds newest;
+    if (!all.isEmpty()) newest.append(all.last());
+    return newest;
+}
+
+EntityIds entitiesOfAllSpaces() {
+    EntityIds ids;
+    if (Drawing const* const drawing = workingDrawing()) {
+        appendEntities(ids, drawing->modelSpace());
+        appendEntities(ids, drawing->paperSpace());
+    }
+    return ids;
+}
+
+bool isInActiveSpace(TzDbObjectId id) {
+    Drawing const* const drawing = workingDrawing();
+    return drawing != nullptr && entityOf(id) != nullptr &&
+           id.record()->owner == drawing->activeSpace().record();
+}
+
+TzDbEntity* entityOf(TzDbObjectId id) {
+    return objectOf<TzDbEntity>(id);
+}
+
+bool isOnLockedLayer(TzDbObjectId id) {
+    TzDbEntity const* const entity = entityOf(id);
+    auto const* const layer =
+        entity ? objectOf<TzDbLayerTableRecord>(entity->layerId()) : nullptr;
+    return layer != nullptr && layer->isLocked();
+}
+
+void setImpliedSelection(EntityIds ids) {
+    implied() = KeptEntities(std::move(ids));
+}
+
+void dropImpliedSelection() {
+    implied() = {};
+}
+
+EntityIds impliedSelection() {
+    return implied().read();
+}
+
+void setPreviousSelection(EntityIds ids) {
+    previous() = KeptEntities(std::move(ids));
+}
+
+EntityIds previousSelection() {
+    return previous().read();
+}
+
+}  // namespace tzhost

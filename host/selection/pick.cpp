@@ -1,0 +1,133 @@
+#include "host/selection/pick.h"
+
+#include <algorithm>
+#include <charconv>
+#include <cstdint>
+#include <string>
+
+#include "host/base/utf8.h"
+#include "host/database/drawing.h"
+#include "host/database/object_list.h"
+#include "host/database/user_system.h"
+#include "host/display/record_access.h"
+#include "host/selection/outline.h"
+#include "tz/db/shapes.h"
+
+namespace tzhost {
+
+namespace {
+
+constexpr wchar_t kHandleMark = L'#';
+constexpr wchar_t kInside = L'/';
+constexpr int kDeepest = 64;
+
+using Records = std::vector<TzDbObjectRecord*>;
+
+Records const* itemsOf(TzDbObjectId owner) {
+    ObjectList const* const list = owner.isNull() ? nullptr : listOf(*owner.record());
+    return list ? &list->items : nullptr;
+}
+
+// What stands inside a block reference: its attributes, which have the reference's own coordinates,
+// and the entities of its block.
+struct Inside {
+    Records const* items;
+    TzGeMatrix3d placed;
+};
+
+std::vector<Inside> insidesOf(Picked const& reference) {
+    auto const* const insert = objectOf<TzDbBlockReference>(reference.id);
+    if (insert == nullptr) return {};
+    return {
+        {itemsOf(reference.id),                reference.placed                           },
+        {itemsOf(insert->blockTableRecord()), reference.placed * insert->blockTransform()},
+    };
+}
+
+// The entity `record` inside a reference. An attribute is placed as its reference is, which so counts
+// as none around it.
+Picked stepInto(Picked const& outer, Inside const& inside, TzDbObjectRecord* record) {
+    Picked inner{TzDbObjectId(record), outer.references, inside.placed};
+    if (record->owner != outer.id.record()) inner.references.push_back(outer.id);
+    return inner;
+}
+
+bool boxHolds(TzDbObjectRecord* record, TzGeMatrix3d const& placed, TzGePoint3d const& user) {
+    TzDbEntity* const entity = entityOf(TzDbObjectId(record));
+    return entity != nullptr && Outline::of(*entity, placed).boxHolds(user.convert2d());
+}
+
+std::optional<Picked> pickInside(Picked const& outer, TzGePoint3d const& user, int depth) {
+    if (objectOf<TzDbBlockReference>(outer.id) == nullptr) return outer;
+    if (depth == kDeepest) return std::nullopt;
+    for (Inside const& inside : insidesOf(outer)) {
+        if (inside.items == nullptr) continue;
+        for (auto at = inside.items->rbegin(); at != inside.items->rend(); ++at) {
+            if (!boxHolds(*at, inside.placed, user)) continue;
+            auto const found = pickInside(stepInto(outer, inside, *at), user, depth + 1);
+            if (found) return found;
+        }
+    }
+    return std::nullopt;
+}
+
+std::optional<std::uint64_t> readHandle(std::wstring_view text) {
+    std::string const digits = toUtf8(text);
+    std::uint64_t handle = 0;
+    auto const read = std::from_chars(digits.data(), digits.data() + digits.size(), handle, 16);
+    bool const isWhole = read.ec == std::errc() && read.ptr == digits.data() + digits.size();
+    return isWhole && handle <= Drawing::kMaxEntityHandle ? std::optional(handle) : std::nullopt;
+}
+
+std::optional<Picked> findInside(Picked const& outer, std::uint64_t handle) {
+    for (Inside const& inside : insidesOf(outer)) {
+        if (inside.items == nullptr) continue;
+        auto const at = std::find_if(
+            inside.items->begin(), inside.items->end(),
+            [handle](auto const* record) { return record->handle == handle && !record->erased; });
+        if (at != inside.items->end()) return stepInto(outer, inside, *at);
+    }
+    return std::nullopt;
+}
+
+}  // namespace
+
+std::optional<Picked> pickAt(TzGePoint3d const& user, Depth depth) {
+    Drawing const* const drawing = workingDrawing();
+    Records const* const items = drawing ? itemsOf(drawing->activeSpace()) : nullptr;
+    if (items == nullptr) return std::nullopt;
+    for (auto at = items->rbegin(); at != items->rend(); ++at) {
+        if (!boxHolds(*at, TzGeMatrix3d::kIdentity, user)) continue;
+        Picked const top{TzDbObjectId(*at), {}, {}};
+        if (depth == Depth::top) return top;
+        if (auto const found = pickInside(top, user, 0)) return found;
+    }
+    return std::nullopt;
+}
+
+bool isHandles(std::wstring_view text) {
+    return text.starts_with(kHandleMark);
+}
+
+std::optional<Picked> pickByHandles(std::wstring_view text) {
+    Drawing const* const drawing = workingDrawing();
+    if (drawing == nullptr || !isHandles(text)) return std::nullopt;
+    text.remove_prefix(1);
+    std::optional<Picked> picked;
+    for (bool isMore = true; isMore;) {
+        std::size_t const end = text.find(kInside);
+        auto const handle = readHandle(text.substr(0, end));
+        if (!handle) return std::nullopt;
+        if (picked) {
+            picked = findInside(*picked, *handle);
+        } else if (TzDbObjectId const id = drawing->objectAt(*handle); isInActiveSpace(id)) {
+            picked = Picked{id, {}, {}};
+        }
+        if (!picked) return std::nullopt;
+        isMore = end != std::wstring_view::npos;
+        if (isMore) text.remove_prefix(end + 1);
+    }
+    return picked;
+}
+
+}  // namespace tzhost

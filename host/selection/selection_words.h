@@ -1,0 +1,33 @@
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+#include "host/selection/entity_list.h"
+#include "host/selection/outline.h"
+
+// What an answer at a selection prompt means.
+namespace tzhost {
+
+enum class Touch { within, crossing };
+
+// The entities of the active space in a window, or those that it touches.
+[[nodiscard]] EntityIds entitiesIn(FlatBox const& box, Touch touch);
+
+struct SelectionAnswer {
+    enum class Kind {
+        entities,  // these
+        add,       // what follows is added
+        remove,    // what follows is taken out
+    };
+    Kind kind = Kind::entities;
+    EntityIds ids;
+};
+
+// Handles, apart by blanks; "w" or "c" with two points; "all", "last", "previous", "add", "remove"; or
+// one point, which takes the newest entity whose box holds it. Words count without case, their first
+// letters and a leading "_" too. Points become the last point. Nothing for any other text, and for
+// handles of what is not in the active space.
+[[nodiscard]] std::optional<SelectionAnswer> readSelection(std::wstring_view text);
+
+}  // namespace tzhost
