@@ -52,8 +52,7 @@ bool goesOn(int status) {
 
 }  // namespace
 
-TzEdJigDriver::TzEdJigDriver(TzEdJig& jig)
-    : jig_(jig), outer_(std::exchange(jig.driver_, this)) {
+TzEdJigDriver::TzEdJigDriver(TzEdJig& jig) : jig_(jig), outer_(std::exchange(jig.driver_, this)) {
     jig_.data_ = {};
 }
 

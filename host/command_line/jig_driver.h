@@ -2,10 +2,10 @@
 
 // The host's side of one drag: where the cursor stands, what the jig is asked, and what is drawn.
 //
-// A drag begins with a sample where the cursor stands, which is drawn even when the jig saw no change.
-// A pick at a place where the cursor has not been is a sample there first. The cursor's place lives on
-// from drag to drag, in world coordinates; answers give it in user coordinates. A sample looks at
-// nothing of the drawing but its user system and ortho mode.
+// A drag begins with a sample where the cursor stands, which is drawn even when the jig saw no
+// change. A pick at a place where the cursor has not been is a sample there first. The cursor's
+// place lives on from drag to drag, in world coordinates; answers give it in user coordinates. A
+// sample looks at nothing of the drawing but its user system and ortho mode.
 
 #include <optional>
 #include <string_view>
@@ -37,5 +37,5 @@ private:
     TzEdJig& jig_;
     TzEdJigDriver* outer_;  // of the same jig, when a drag runs inside its own sampler
     std::optional<TzGePoint3d> lastSample_;  // what acquire gave last
-    bool isStale_ = false;  // the last sample changed the picture
+    bool isStale_ = false;                   // the last sample changed the picture
 };

@@ -83,8 +83,7 @@ TzDbEntity* entityOf(TzDbObjectId id) {
 
 bool isOnLockedLayer(TzDbObjectId id) {
     TzDbEntity const* const entity = entityOf(id);
-    auto const* const layer =
-        entity ? objectOf<TzDbLayerTableRecord>(entity->layerId()) : nullptr;
+    auto const* const layer = entity ? objectOf<TzDbLayerTableRecord>(entity->layerId()) : nullptr;
     return layer != nullptr && layer->isLocked();
 }
 

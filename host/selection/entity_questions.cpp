@@ -48,17 +48,20 @@ int askForEntity(wchar_t const* prompt, Depth depth, Taker const& take) {
 
 void putPoint(TzGePoint3d const& from, double* point) {
     if (point == nullptr) return;
-    for (int i = 0; i < 3; ++i) point[i] = from[i];
+    for (int i = 0; i < 3; ++i)
+        point[i] = from[i];
 }
 
 void putMatrix(TzGeMatrix3d const& from, double (*matrix)[4]) {
     if (matrix == nullptr) return;
     for (int row = 0; row < 4; ++row) {
-        for (int column = 0; column < 4; ++column) matrix[row][column] = from(row, column);
+        for (int column = 0; column < 4; ++column)
+            matrix[row][column] = from(row, column);
     }
 }
 
-// The references as a list, inmost first. False when a record cannot be made; then there is no list.
+// The references as a list, inmost first. False when a record cannot be made; then there is no
+// list.
 bool listReferences(std::vector<TzDbObjectId> const& references, resbuf*& list) {
     list = nullptr;
     for (TzDbObjectId const id : references) {
@@ -107,7 +110,7 @@ int tzedEntSel(wchar_t const* prompt, long long* name, double* point) {
         if (tzdbGetTzsName(picked, id) != Tzad::eOk) return Tzad::ePromptError;
         name[0] = picked[0];
         name[1] = picked[1];
-        putPoint(pick.point, point);
+        tzhost::putPoint(pick.point, point);
         return Tzad::ePromptNormal;
     });
 }
@@ -122,8 +125,9 @@ int tzedNEntSelP(wchar_t const* prompt,
     if (auto const failed = tzhost::failsAt("tzedNEntSelP")) return *failed;
     tzhost::NestedResult const result{name, point, matrix, references};
     if (pickFlag == 0) {
-        return tzhost::askForEntity(prompt, tzhost::Depth::nested,
-                            [&](tzhost::PickedAt const& pick) { return result.take(pick); });
+        return tzhost::askForEntity(
+            prompt, tzhost::Depth::nested,
+            [&](tzhost::PickedAt const& pick) { return result.take(pick); });
     }
     (void)tzhost::commandLine().takeArmed();  // nothing is asked
     TzGePoint3d const at(point[0], point[1], point[2]);

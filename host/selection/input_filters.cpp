@@ -68,8 +68,7 @@ void runFilters(int wanted, EntityIds& ids, Hook const& hook) {
     if (document == nullptr) return;
     Filters const installed = document->filters;  // hooks may change it
     for (InputFilter const& each : installed) {
-        bool const isThere =
-            findFilter(document->filters, each.filter) != document->filters.end();
+        bool const isThere = findFilter(document->filters, each.filter) != document->filters.end();
         if (!isThere || (each.flags & wanted) == 0) continue;
         Remover remover(ids.length());
         hook(each, remover);
@@ -124,10 +123,7 @@ void TzEdSSGetFilter::ssgetRemoveFilter(int,
                                         TzArray<TzDbObjectId> const&,
                                         TzArray<TzDbObjectId> const&) {}
 
-void TzEdSSGetFilter::endSSGet(int,
-                               int,
-                               TzEdSelectionSetService&,
-                               TzArray<TzDbObjectId> const&) {}
+void TzEdSSGetFilter::endSSGet(int, int, TzEdSelectionSetService&, TzArray<TzDbObjectId> const&) {}
 
 bool addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter, int flags) {
     if (tzhost::faultAt("addSSgetFilterInputContextReactor")) return false;

@@ -8,8 +8,8 @@
 
 struct resbuf;
 
-// The conditions of a filter list, all of which an entity must meet. Codes 0 and 5020 name the kind of
-// the entity, 8 its layer, 7 its text style; names may be patterns, without regard to case.
+// The conditions of a filter list, all of which an entity must meet. Codes 0 and 5020 name the kind
+// of the entity, 8 its layer, 7 its text style; names may be patterns, without regard to case.
 namespace tzhost {
 
 class ListFilter {

@@ -88,7 +88,8 @@ Outline Outline::of(TzDbEntity& entity, TzGeMatrix3d const& placed) {
     auto const add = [&](Corners const& corners, bool isArea) {
         Path path;
         path.isArea = isArea;
-        for (TzGePoint3d const& each : corners) path.points.push_back((toUser * each).convert2d());
+        for (TzGePoint3d const& each : corners)
+            path.points.push_back((toUser * each).convert2d());
         if (!path.points.empty()) outline.paths_.push_back(std::move(path));
     };
     if (auto const* const text = dynamic_cast<TzDbMText const*>(&entity)) {

@@ -8,8 +8,8 @@
 
 class TzDbEntity;
 
-// Where an entity lies in the user system, for picks, windows and crossings: its lines, and the boxes of
-// its texts as they are turned. Nothing is opened.
+// Where an entity lies in the user system, for picks, windows and crossings: its lines, and the
+// boxes of its texts as they are turned. Nothing is opened.
 //
 //   Outline const outline = Outline::of(*entity);
 //   if (outline.boxHolds(pick)) ...
@@ -26,7 +26,8 @@ struct FlatBox {
 
 class Outline {
 public:
-    // `placed` maps the entity's coordinates to world coordinates, for one inside a block reference.
+    // `placed` maps the entity's coordinates to world coordinates, for one inside a block
+    // reference.
     [[nodiscard]] static Outline of(TzDbEntity& entity,
                                     TzGeMatrix3d const& placed = TzGeMatrix3d::kIdentity);
 

@@ -39,13 +39,13 @@ std::vector<Inside> insidesOf(Picked const& reference) {
     auto const* const insert = objectOf<TzDbBlockReference>(reference.id);
     if (insert == nullptr) return {};
     return {
-        {itemsOf(reference.id),                reference.placed                           },
+        {itemsOf(reference.id),               reference.placed                           },
         {itemsOf(insert->blockTableRecord()), reference.placed * insert->blockTransform()},
     };
 }
 
-// The entity `record` inside a reference. An attribute is placed as its reference is, which so counts
-// as none around it.
+// The entity `record` inside a reference. An attribute is placed as its reference is, which so
+// counts as none around it.
 Picked stepInto(Picked const& outer, Inside const& inside, TzDbObjectRecord* record) {
     Picked inner{TzDbObjectId(record), outer.references, inside.placed};
     if (record->owner != outer.id.record()) inner.references.push_back(outer.id);
@@ -82,9 +82,10 @@ std::optional<std::uint64_t> readHandle(std::wstring_view text) {
 std::optional<Picked> findInside(Picked const& outer, std::uint64_t handle) {
     for (Inside const& inside : insidesOf(outer)) {
         if (inside.items == nullptr) continue;
-        auto const at = std::find_if(
-            inside.items->begin(), inside.items->end(),
-            [handle](auto const* record) { return record->handle == handle && !record->erased; });
+        auto const at =
+            std::find_if(inside.items->begin(), inside.items->end(), [handle](auto const* record) {
+                return record->handle == handle && !record->erased;
+            });
         if (at != inside.items->end()) return stepInto(outer, inside, *at);
     }
     return std::nullopt;

@@ -10,8 +10,8 @@
 // What a user picks: by a point in user coordinates, or by handles in a script.
 namespace tzhost {
 
-// A picked entity and the block references around it, outermost first; `placed` maps the coordinates
-// of the innermost one's block to world coordinates.
+// A picked entity and the block references around it, outermost first; `placed` maps the
+// coordinates of the innermost one's block to world coordinates.
 struct Picked {
     TzDbObjectId id;
     std::vector<TzDbObjectId> references;
@@ -24,8 +24,8 @@ enum class Depth { top, nested };
 // inside it when that is a block reference. Nothing where there is none.
 [[nodiscard]] std::optional<Picked> pickAt(TzGePoint3d const& user, Depth depth);
 
-// "#2A", or "#2A/2B" for an entity inside a block reference, as deep as it goes. Nothing when the text
-// has another form, or names what is not there.
+// "#2A", or "#2A/2B" for an entity inside a block reference, as deep as it goes. Nothing when the
+// text has another form, or names what is not there.
 [[nodiscard]] std::optional<Picked> pickByHandles(std::wstring_view text);
 
 // Whether the text begins as handles do.

@@ -31,7 +31,8 @@ std::wstring Selecting::add(EntityIds const& ids) {
         }
     }
     if (!fresh.isEmpty()) filterAdded(entities_, fresh);
-    for (TzDbObjectId const id : fresh) members_.insert(id);
+    for (TzDbObjectId const id : fresh)
+        members_.insert(id);
     int const leftOut = static_cast<int>(seen.size()) - locked - fresh.length();
     entities_.append(fresh);
     return std::to_wstring(fresh.length()) + L" found" + counted(locked, L" on a locked layer") +
@@ -45,7 +46,8 @@ std::wstring Selecting::remove(EntityIds const& ids) {
         if (members_.count(id) > 0 && seen.insert(id).second) going.append(id);
     }
     if (!going.isEmpty()) filterRemoved(entities_, going);
-    for (TzDbObjectId const id : going) members_.erase(id);
+    for (TzDbObjectId const id : going)
+        members_.erase(id);
     EntityIds staying;
     for (TzDbObjectId const id : entities_) {
         if (members_.count(id) > 0) staying.append(id);

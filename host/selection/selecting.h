@@ -22,8 +22,8 @@ public:
     // Adds what is new, or takes out what is there. What the user is told about it: "2 found".
     std::wstring add(EntityIds const& ids);
     std::wstring remove(EntityIds const& ids);
-    // Ends the selection: 5100 when something is selected, else -5001, or the status of a cancel or a
-    // keyword, which leaves nothing selected.
+    // Ends the selection: 5100 when something is selected, else -5001, or the status of a cancel or
+    // a keyword, which leaves nothing selected.
     [[nodiscard]] int finish(int status);
     [[nodiscard]] EntityIds const& entities() const { return entities_; }
 

@@ -2,7 +2,8 @@
 
 #include "host/selection/entity_list.h"
 
-// The selection sets that are lent out, by their names of two 64-bit integers. They count in the audit.
+// The selection sets that are lent out, by their names of two 64-bit integers. They count in the
+// audit.
 namespace tzhost {
 
 // Names a new set. The name is never given again.

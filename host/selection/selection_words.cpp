@@ -66,11 +66,11 @@ Answered readPrevious(Words const&) {
 }
 
 Answered readAdd(Words const&) {
-    return SelectionAnswer{SelectionAnswer::Kind::add, {}};
+    return SelectionAnswer{SelectionAnswer::Kind::add, EntityIds()};
 }
 
 Answered readRemove(Words const&) {
-    return SelectionAnswer{SelectionAnswer::Kind::remove, {}};
+    return SelectionAnswer{SelectionAnswer::Kind::remove, EntityIds()};
 }
 
 struct WordRow {

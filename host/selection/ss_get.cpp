@@ -97,7 +97,7 @@ TzGePoint2d asFlat(void const* point) {
 }
 
 EntityIds entitiesBetween(void const* first, void const* second, Touch touch) {
-    if (first == nullptr || second == nullptr) return {};
+    if (first == nullptr || second == nullptr) return EntityIds();
     return entitiesIn(FlatBox::between(asFlat(first), asFlat(second)), touch);
 }
 
@@ -138,7 +138,8 @@ int tzedSSGet(wchar_t const* mode,
     if (auto const failed = tzhost::failsAt("tzedSSGet")) return *failed;
     auto const how = tzhost::SelectionMode::parse(mode);
     auto const conditions = tzhost::ListFilter::read(filter);
-    if (!how || !conditions || set == nullptr) return tzhost::commandLine().failed(Tzad::ePromptError);
+    if (!how || !conditions || set == nullptr)
+        return tzhost::commandLine().failed(Tzad::ePromptError);
     tzhost::Selecting selecting(*how, *conditions);
     int const status = selecting.finish(tzhost::select(*how, first, second, selecting));
     if (status != Tzad::ePromptNormal) return status;

@@ -59,13 +59,13 @@ private:
         return letters_ == Case::ignored ? tzToLower(c) : c;
     }
 
-    // Whether the element of the pattern at `in` takes a character; `next` is the element behind it.
+    // Whether the element of the pattern at `in` takes a character; `next` is the element behind
+    // it.
     [[nodiscard]] bool matchesOne(wchar_t c, std::size_t in, std::size_t& next) const {
         if (in >= pattern_.size()) return false;
         next = in + 1;
         if (pattern_[in] == L'?') return true;
-        std::size_t const close =
-            pattern_[in] == L'[' ? endOfClass(pattern_, in) : pattern_.npos;
+        std::size_t const close = pattern_[in] == L'[' ? endOfClass(pattern_, in) : pattern_.npos;
         if (close == pattern_.npos) return fold(c) == fold(pattern_[in]);
         next = close + 1;
         return isInClass(c, pattern_.substr(in + 1, close - in - 1));
