@@ -5,16 +5,11 @@
 #include <string>
 #include <vector>
 
+#include "host/command_line/answer_source.h"
 #include "tz/text/string.h"
 
 // One session of an editor that holds markup: the in-place, the raw and the external one.
 namespace tzhost {
-
-// What a script says that the user leaves in the next editor.
-struct EditorBlock {
-    std::wstring text;  // its lines, apart by line feeds
-    bool accepted = true;
-};
 
 // Where editors get their answers from: the block that comes next in a script, if one does, and the
 // program that serves for the in-place and raw editors or for the dialog, empty for none.
