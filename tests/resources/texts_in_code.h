@@ -1,0 +1,16 @@
+#pragma once
+
+// Which texts the module's source asks for.
+
+#include <string>
+#include <vector>
+
+// One id, and the file that uses it.
+struct UsedText {
+    unsigned int id;
+    std::string file;
+};
+
+// The ids that are written into the module's source: those between the brackets of gStringTable and
+// loadResourceString, and those of keyword lists, as numbers or as constants of the same file.
+[[nodiscard]] std::vector<UsedText> textsInCode();
