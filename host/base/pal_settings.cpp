@@ -34,6 +34,10 @@ Settings::Roots Settings::read() {
     return {};
 }
 
+TzString Settings::productRegistryKey() {
+    return tzhost::settings().productKey;
+}
+
 bool Settings::Roots::getProductSettings(wchar_t const* name,
                                          Reader const& reader,
                                          bool userValues) const {

@@ -4,6 +4,7 @@
 #include <functional>
 
 #include "tz/export.h"
+#include "tz/text/string.h"
 
 // What the user has set for the host's products, and what kind of process this is.
 //
@@ -42,6 +43,9 @@ public:
 };
 
 [[nodiscard]] TZ_API Roots read();
+
+// The registry key of the product, which the settings give; may be empty.
+[[nodiscard]] TZ_API TzString productRegistryKey();
 
 }  // namespace Settings
 

@@ -1,0 +1,156 @@
+#include "tz/mte/font_map_database.h"
+
+#include <memory>
+
+#include "tz/mte/globals.h"
+#include "tz/pal/ini_file.h"
+#include "tz/text/font_info.h"
+
+namespace {
+
+// Only a backslash separates folders here.
+CStdStrW withoutFolder(CStdStrW file) {
+    if (std::size_t const slash = file.rfind(L'\\'); slash != CStdStrW::npos)
+        file.erase(0, slash + 1);
+    return file;
+}
+
+// The key of a file or a pair: each name without its folder, in lower case.
+CStdStrW normalised(CStdStrW file) {
+    std::size_t const comma = file.find(L',');
+    if (comma != CStdStrW::npos) {
+        CStdStrW const first = withoutFolder(CStdStrW(file.substr(0, comma)));
+        file = first + L"," + withoutFolder(CStdStrW(file.substr(comma + 1)));
+    } else {
+        file = withoutFolder(std::move(file));
+    }
+    file.MakeLower();
+    return file;
+}
+
+// Puts an entry in the place of what stands under the key.
+template <class Table, class Entry>
+void store(Table& table, CStdStrW const& key, std::unique_ptr<Entry> entry) {
+    auto& place = table[key];
+    delete place;
+    place = entry.release();
+}
+
+template <class Entry, class Table>
+void removeOfType(Table& table, CMTextFontMapDatabase::MapType type) {
+    for (auto at = table.begin(); at != table.end();) {
+        if (static_cast<Entry const*>(at->second)->m_eMapType != type) {
+            ++at;
+            continue;
+        }
+        delete at->second;
+        at = table.erase(at);
+    }
+}
+
+bool meansAll(CMTextFontMapDatabase::MapType type) {
+    return type == CMTextFontMapDatabase::MapTypeAll ||
+           type == CMTextFontMapDatabase::MapTypeSystem;
+}
+
+}  // namespace
+
+CMTextFontMapDatabase::CMTextFontMapDatabase(signed char flag) : CTzadFontMapDatabase(flag) {
+    gsIniFileDatabase = GetMTextMapFilename();
+    m_sBigfontProxy = CIniFile(gsIniFileDatabase, gszIniSectProxyFiles)
+                          .GetString(gszIniKeyBigfontProxy, L"System");
+    gsExtensionSHX.makeLower();
+}
+
+CMTextFontMapDatabase::~CMTextFontMapDatabase() {
+    RemoveFileToFontMapEntries(MapTypeProxy);
+    RemoveFontToFileMapEntries(MapTypeProxy);
+}
+
+bool CMTextFontMapDatabase::AddFontSubstitute(CStdStrW file,
+                                              CStdStrW face,
+                                              bool bold,
+                                              bool italic,
+                                              Charset charset,
+                                              int pitch,
+                                              MapType type,
+                                              signed char oneWay) {
+    auto toFont = std::make_unique<CMTextFileToFontMapEntry>();
+    toFont->m_bBold = bold;
+    toFont->m_bItalic = italic;
+    toFont->m_eCharset = charset;
+    toFont->m_nPitch = pitch;
+    toFont->m_sFaceName = face;
+    toFont->m_eMapType = type;
+    file = withoutFolder(std::move(file));
+    file.MakeLower();
+    store(m_mapFileToFont, file, std::move(toFont));
+    if (oneWay) return true;
+    auto toFile = std::make_unique<CMTextFontToFileMapEntry>();
+    toFile->m_sFileName = file;
+    toFile->m_eMapType = type;
+    store(m_mapFontToFile, BuildFontDescription(std::move(face), bold, italic, charset, pitch),
+          std::move(toFile));
+    return true;
+}
+
+CStdStrW CMTextFontMapDatabase::MapFileToFont(
+    MapType& type, CStdStrW file, bool& bold, bool& italic, Charset& charset, int& pitch) {
+    if (m_mapFileToFont.empty()) BuildDatabase();
+    file = normalised(std::move(file));
+    auto at = m_mapFileToFont.find(file);
+    if (at == m_mapFileToFont.end())
+        at = m_mapFileToFont.find(CStdStrW(file + gsExtensionSHX.str()));
+    if (at != m_mapFileToFont.end()) {
+        auto const& entry = static_cast<CMTextFileToFontMapEntry const&>(*at->second);
+        bold = entry.m_bBold;
+        italic = entry.m_bItalic;
+        charset = entry.m_eCharset;
+        pitch = entry.m_nPitch;
+        type = entry.m_eMapType;
+        return entry.m_sFaceName;
+    }
+    if (IsBigfontFilespec(file)) {
+        CStdStrW const face = AddBigfontProxy(file);
+        bold = italic = false;
+        GetOsFontInfo(face, charset, pitch);
+        type = MapTypeProxy;
+        return face;
+    }
+    CStdStrW face;
+    FontPitch fontPitch = FontPitch::kDefault;
+    FontFamily fontFamily = FontFamily::kDoNotCare;
+    tzFontInfo().FileToFontName(file, face, bold, italic, charset, fontPitch, fontFamily);
+    pitch = getPitchAndFamilyValueFromEnum(fontPitch, fontFamily);
+    type = face.empty() ? MapTypeProxy : MapTypeSystem;
+    return face.empty() ? AddProxy(file) : face;
+}
+
+CStdStrW CMTextFontMapDatabase::MapFontToFile(
+    MapType& type, CStdStrW face, bool bold, bool italic, Charset charset, int pitch) {
+    if (m_mapFontToFile.empty()) BuildDatabase();
+    auto const at = m_mapFontToFile.find(BuildFontDescription(face, bold, italic, charset, pitch));
+    if (at != m_mapFontToFile.end()) {
+        auto const& entry = static_cast<CMTextFontToFileMapEntry const&>(*at->second);
+        type = entry.m_eMapType;
+        return entry.m_sFileName;
+    }
+    type = MapTypeSystem;
+    CStdStrW file;
+    tzFontInfo().FontNameToFile(face, bold, italic, file);
+    return file;
+}
+
+void CMTextFontMapDatabase::RemoveFileToFontMapEntries(MapType type) {
+    if (meansAll(type)) return RemoveAllFileToFontMapEntries();
+    removeOfType<CMTextFileToFontMapEntry>(m_mapFileToFont, type);
+}
+
+void CMTextFontMapDatabase::RemoveFontToFileMapEntries(MapType type) {
+    if (meansAll(type)) return RemoveAllFontToFileMapEntries();
+    removeOfType<CMTextFontToFileMapEntry>(m_mapFontToFile, type);
+}
+
+bool CMTextFontMapDatabase::IsBigfontFilespec(CStdStrW const& spec) {
+    return spec.Find(L',') >= 0;
+}

@@ -1,0 +1,25 @@
+#pragma once
+
+#include "tz/mte/font_map_database.h"
+#include "tz/pal/ini_file.h"
+
+// One section of the font map file, read line by line into the tables.
+//
+//   file=face,bold,italic,charset,pitch[,charset...]
+//   OneWaySubstitution=1      no line of the section maps back
+class CEnumerateMappedFonts : public CIniFileEnumerator {
+public:
+    CEnumerateMappedFonts(CMTextFontMapDatabase* database,
+                          TzString const& file,
+                          TzString const& section,
+                          CMTextFontMapDatabase::MapType type);
+    bool EnumeratedKey(TzString const& key) override;
+
+private:
+    CMTextFontMapDatabase* m_pDatabase;
+    CMTextFontMapDatabase::MapType m_eType;
+    signed char m_bOneWay;  // the low eight bits of the key's number: 256 reads as 0
+};
+
+// Cuts the first field, up to a comma, off `rest`; without a comma all of it.
+[[nodiscard]] CStdStrW ParseField(CStdStrW& rest);
