@@ -10,7 +10,8 @@ void appendNumber(CStdStrW& text, std::wstring_view mark, int number) {
     char digits[16];
     char const* const end = std::to_chars(digits, digits + sizeof digits, number).ptr;
     text += mark;
-    for (char const* each = digits; each != end; ++each) text += static_cast<wchar_t>(*each);
+    for (char const* each = digits; each != end; ++each)
+        text += static_cast<wchar_t>(*each);
 }
 
 }  // namespace

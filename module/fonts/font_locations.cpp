@@ -1,7 +1,8 @@
 // Where a system with a registry lists its fonts, and the search in those lists.
 
+#include "module/fonts/font_locations.h"
+
 #include "tz/mte/font_catalogue.h"
-#include "tz/pal/registry.h"
 #include "tz/pal/settings.h"
 
 namespace {
@@ -10,7 +11,12 @@ constexpr wchar_t const* kFontList = L"SOFTWARE\\Microsoft\\Windows NT\\CurrentV
 constexpr wchar_t const* kShellFolders =
     L"SOFTWARE\\Microsoft\\Windows\\CurrentVersion\\Explorer\\Shell Folders";
 
-// The list of the system, and that of the product; built on first use.
+bool endsInFot(CStdStrW const& file) {
+    return file.GetLength() >= 5 && file.Right(4).CompareNoCase(L".fot") == 0;
+}
+
+}  // namespace
+
 CTwUiRegistryAccess& regLocation() {
     static CTwUiRegistryAccess reg;
     return reg;
@@ -21,8 +27,6 @@ CTwUiRegistryAccess& regLocationAlt() {
     return reg;
 }
 
-// The file of a face in a font collection: such a face stands under a name that lists several
-// faces, joined by " & ".
 CStdStrW SearchForTTCFile(CStdStrW name, CTwUiRegistryAccess& reg) {
     if (int const bracket = name.Find(L'('); bracket >= 0) {
         name.resize(static_cast<std::size_t>(bracket));
@@ -39,12 +43,6 @@ CStdStrW SearchForTTCFile(CStdStrW name, CTwUiRegistryAccess& reg) {
     }
     return {};
 }
-
-bool endsInFot(CStdStrW const& file) {
-    return file.GetLength() >= 5 && file.Right(4).CompareNoCase(L".fot") == 0;
-}
-
-}  // namespace
 
 void CTzadFontMapDatabase::InitSystemLocations() {
     if (!m_sRegistryLocation.isEmpty()) return;

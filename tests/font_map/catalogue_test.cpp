@@ -8,8 +8,8 @@
 #include <iterator>
 
 #include "host/base/settings.h"
+#include "module/fonts/font_locations.h"
 #include "tz/mte/font_catalogue.h"
-#include "tz/pal/registry.h"
 
 namespace {
 
@@ -90,18 +90,32 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
         {L"Alternate", L"alternate.ttf"}
     };
     tzhost::settings().productKey = L"SOFTWARE\\Product";
+    CTzadFontMapDatabase::PopulateDatabaseFromRegistry();
+    // The walk closes both lists again, so that nothing is found behind it.
+    EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(L"Plain Face"), L"");
+    ASSERT_TRUE(regLocation().Open(HKEY_LOCAL_MACHINE, CTzadFontMapDatabase::m_sRegistryLocation));
+    ASSERT_TRUE(regLocationAlt().Open(HKEY_LOCAL_MACHINE, L"SOFTWARE\\Product\\AltFontNames"));
     struct Row {
         wchar_t const* face;
         wchar_t const* file;
     };
-    // The walk opens both lists and closes them again, so that later questions find nothing.
-    CTzadFontMapDatabase::PopulateDatabaseFromRegistry();
     for (Row const& row : {
-             Row{L"Plain Face",             L""},
-             Row{L"Second Face (TrueType)", L""}
+             Row{L"Plain Face",        L"plain.ttf"    },
+             Row{L"@Plain Face",       L"plain.ttf"    },
+             Row{L"Alternate",         L"alternate.ttf"},
+             Row{L"First",             L"set.ttc"      },
+             Row{L"Second Face (Any)", L"set.ttc"      },
+             Row{L"Third",             L"set.ttc"      },
+             Row{L"Second",            L"set.ttc"      },
+             Row{L"Alone One",         L""             },
+             Row{L"Number",            L""             },
+             Row{L"Short",             L".fot"         },
+             Row{L"Missing",           L""             }
     }) {
-        EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(row.face), row.file);
+        EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(row.face), row.file) << row.face;
     }
+    regLocation().Close();
+    regLocationAlt().Close();
     EXPECT_EQ(CTzadFontMapDatabase::m_sRegistryLocation,
               L"SOFTWARE\\Microsoft\\Windows NT\\CurrentVersion\\Fonts");
     EXPECT_EQ(CTzadFontMapDatabase::GetFaceNameFromFontName(L"any", true, true), L"");

@@ -35,11 +35,10 @@ std::wstring byFile(Fonts& fonts, wchar_t const* file) {
 std::wstring
 byFace(Fonts& fonts, wchar_t const* face, int charset = 0, int pitch = 0, bool bold = false) {
     Fonts::MapType type = Fonts::MapTypeAll;
+    CStdStrW const file =
+        fonts.MapFontToFile(type, face, bold, false, static_cast<Charset>(charset), pitch);
     CStdStrW text;
-    text.Fmt(
-        L"%s|%d",
-        fonts.MapFontToFile(type, face, bold, false, static_cast<Charset>(charset), pitch).c_str(),
-        type);
+    text.Fmt(L"%s|%d", file.c_str(), type);
     return text;
 }
 
