@@ -1,6 +1,7 @@
 #include "module/shell/entry.h"
 
 #include "module/access/resources.h"
+#include "module/shell/font_database.h"
 #include "module/shell/registration.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/globals.h"
@@ -29,6 +30,7 @@ TzRx::AppRetCode load(void* appHandle) {
     registerService();
     InitGlobalStrings();
     registerCommands();
+    LoadFontDatabase();
     g_bEnableFieldUI = IsCommandAllowed(kFieldFeature) ? 1 : 0;
     return TzRx::kRetOK;
 }
@@ -37,6 +39,7 @@ TzRx::AppRetCode unload() {
     unregisterClasses();
     unregisterService();
     unregisterCommands();
+    UnloadFontDatabase();
     return TzRx::kRetOK;
 }
 
