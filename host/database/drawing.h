@@ -88,6 +88,8 @@ public:
     [[nodiscard]] DrawingSettings const& settings() const { return settings_; }
     // Puts settings in place unchecked and shows the style's name in TEXTSTYLE.
     void setSettings(DrawingSettings const& settings);
+    // The same for a drawing that is not worked on yet: no variable changes.
+    void restoreSettings(DrawingSettings const& settings) { settings_ = settings; }
     void setFile(std::filesystem::path file) { fileName_ = std::move(file); }
     [[nodiscard]] std::filesystem::path const& file() const { return fileName_; }
 
@@ -120,6 +122,9 @@ public:
 
     // The highest handle that an entity may have; those above are the host's own.
     static constexpr std::uint64_t kMaxEntityHandle = (std::uint64_t{1} << 62) - 1;
+
+    // Members of the drawing's file that this host does not know, by the path of their object.
+    UnknownMembers unknown;
 
     // All records, in the order of their making.
     [[nodiscard]] std::deque<TzDbObjectRecord> const& records() const { return records_; }

@@ -1,6 +1,7 @@
 #include "tz/db/host_services.h"
 
 #include "host/base/event_sink.h"
+#include "host/base/settings.h"
 #include "host/database/drawing.h"
 #include "host/database/user_system.h"
 
@@ -22,7 +23,9 @@ public:
     [[nodiscard]] TzDbDatabase* workingDatabase() const override { return theWorkingDrawing; }
     [[nodiscard]] TzDbWorkingGlobals* workingGlobals() const override { return theWorkingDrawing; }
     void textEditorStarting() override { notify("textEditorStarting"); }
-    [[nodiscard]] TzString getProductRegistryKey() const override { return {}; }
+    [[nodiscard]] TzString getProductRegistryKey() const override {
+        return settings().productKey;
+    }
 };
 
 class DefaultGlobals final : public TzDbWorkingGlobals {

@@ -1,0 +1,204 @@
+#include "host/drawing_file/member_reader.h"
+
+#include <charconv>
+#include <cmath>
+
+#include "host/base/utf8.h"
+#include "host/database/geometry.h"
+
+namespace tzhost::drawingfile {
+namespace {
+
+// A value as a message shows it.
+std::string shown(JsonValue const& value) {
+    if (value.kind == JsonKind::number) return value.text;
+    if (value.kind == JsonKind::flag) return value.flag ? "true" : "false";
+    return std::string(nameOf(value.kind));
+}
+
+std::string range(WholeRange numbers) {
+    return "a whole number from " + std::to_string(numbers.low) + " to " +
+           std::to_string(numbers.high);
+}
+
+bool isWholeIn(double number, WholeRange numbers) {
+    return number == std::floor(number) && number >= numbers.low && number <= numbers.high;
+}
+
+}  // namespace
+
+bool readTrueColor(std::string_view text, TzCmColor& color) {
+    constexpr std::size_t kLength = 7;
+    unsigned int rgb = 0;
+    if (text.size() != kLength || text[0] != '#') return false;
+    auto const [end, error] = std::from_chars(text.data() + 1, text.data() + kLength, rgb, 16);
+    if (error != std::errc() || end != text.data() + kLength) return false;
+    auto const part = [=](unsigned int shift) {
+        return static_cast<std::uint8_t>(rgb >> shift & 0xFFU);
+    };
+    color.setRGB(part(16), part(8), part(0));
+    return true;
+}
+
+MemberReader::MemberReader(ReadContext& context,
+                           JsonValue const& object,
+                           UnknownMembers& unknown,
+                           std::string path)
+    : context_(context), object_(object), unknown_(unknown), path_(std::move(path)),
+      known_(object.members.size()) {}
+
+std::string MemberReader::pathOf(std::string_view name) const {
+    return path_.empty() ? std::string(name) : path_ + '.' + std::string(name);
+}
+
+JsonValue const* MemberReader::take(char const* name) {
+    JsonValue const* const found = object_.find(name);
+    if (!found) return nullptr;
+    for (std::size_t i = 0; i < object_.members.size(); ++i) {
+        if (&object_.members[i].second == found) known_[i] = true;
+    }
+    return found;
+}
+
+JsonValue const* MemberReader::takeOf(char const* name, JsonKind kind) {
+    JsonValue const* const member = take(name);
+    if (!member || member->kind == kind) return member;
+    refuse(name, *member, nameOf(kind));
+    return nullptr;
+}
+
+void MemberReader::complain(char const* name, std::string what) const {
+    JsonValue const* const member = object_.find(name);
+    context_.complain(member ? member->line : object_.line, pathOf(name), std::move(what));
+}
+
+void MemberReader::refuse(char const* name,
+                          JsonValue const& member,
+                          std::string_view expected) const {
+    complain(name, "is " + shown(member) + ", expected " + std::string(expected));
+}
+
+void MemberReader::flag(char const* name, bool& value) {
+    if (JsonValue const* const member = takeOf(name, JsonKind::flag)) value = member->flag;
+}
+
+void MemberReader::number(char const* name, double& value, Range allowed) {
+    JsonValue const* const member = take(name);
+    if (!member) return;
+    if (member->kind != JsonKind::number || !std::isfinite(member->number) ||
+        !isIn(allowed, member->number)) {
+        return refuse(name, *member, nameOf(allowed));
+    }
+    value = member->number;
+}
+
+void MemberReader::wholeNumber(char const* name, int& value, WholeRange numbers) {
+    JsonValue const* const member = take(name);
+    if (!member) return;
+    if (member->kind != JsonKind::number || !isWholeIn(member->number, numbers)) {
+        return refuse(name, *member, range(numbers));
+    }
+    value = static_cast<int>(member->number);
+}
+
+void MemberReader::text(char const* name, std::wstring& value) {
+    JsonValue const* const member = takeOf(name, JsonKind::text);
+    if (!member) return;
+    if (member->text.find('\0') != std::string::npos) {
+        return complain(name, "holds a zero character, expected a text without one");
+    }
+    value = fromUtf8(member->text);
+}
+
+bool MemberReader::triple(char const* name, double (&values)[3]) {
+    JsonValue const* const member = take(name);
+    if (!member) return false;
+    constexpr char const* kExpected = "an array of three numbers";
+    if (member->kind != JsonKind::array || member->items.size() != 3) {
+        refuse(name, *member, kExpected);
+        return false;
+    }
+    for (std::size_t i = 0; i < 3; ++i) {
+        JsonValue const& item = member->items[i];
+        if (item.kind != JsonKind::number || !std::isfinite(item.number)) {
+            complain(name, "holds " + shown(item) + ", expected " + kExpected);
+            return false;
+        }
+        values[i] = item.number;
+    }
+    return true;
+}
+
+void MemberReader::point(char const* name, TzGePoint3d& value) {
+    double numbers[3];
+    if (triple(name, numbers)) value.set(numbers[0], numbers[1], numbers[2]);
+}
+
+void MemberReader::direction(char const* name, TzGeVector3d& value) {
+    double numbers[3];
+    if (!triple(name, numbers)) return;
+    TzGeVector3d const vector(numbers[0], numbers[1], numbers[2]);
+    if (!isDirection(vector)) return complain(name, "is zero, expected a direction");
+    value = unitVector(vector);
+}
+
+void MemberReader::color(char const* name, TzCmColor& value, WholeRange indices) {
+    JsonValue const* const member = take(name);
+    if (!member) return;
+    bool const isIndex = member->kind == JsonKind::number && isWholeIn(member->number, indices);
+    if (isIndex) {
+        value = TzCmEntityColor::fromIndex(static_cast<int>(member->number));
+    } else if (member->kind != JsonKind::text || !readTrueColor(member->text, value)) {
+        refuse(name, *member, range(indices) + " or a text \"#RRGGBB\"");
+    }
+}
+
+void MemberReader::record(char const* name,
+                          TzDbObjectId& value,
+                          TzDbObjectId table,
+                          char const* kind) {
+    std::wstring wanted;
+    JsonValue const* const member = object_.find(name);
+    text(name, wanted);
+    if (!member || member->kind != JsonKind::text) return;
+    TzDbObjectId const found = Drawing::find(table, wanted);
+    if (!found.isNull()) {
+        value = found;
+        return;
+    }
+    complain(name,
+             "names \"" + member->text + "\", expected the name of " + kind + " of this drawing");
+}
+
+void MemberReader::layer(char const* name, TzDbObjectId& value) {
+    record(name, value, context_.drawing.layerTableId(), "a layer");
+}
+
+void MemberReader::textStyle(char const* name, TzDbObjectId& value) {
+    record(name, value, context_.drawing.textStyleTableId(), "a text style");
+}
+
+void MemberReader::numbers(char const* name, std::vector<double>& values, Range allowed) {
+    JsonValue const* const member = takeOf(name, JsonKind::array);
+    if (!member) return;
+    values.clear();
+    for (JsonValue const& item : member->items) {
+        if (item.kind != JsonKind::number || !std::isfinite(item.number) ||
+            !isIn(allowed, item.number)) {
+            return complain(name, "holds " + shown(item) + ", expected " + nameOf(allowed));
+        }
+        values.push_back(item.number);
+    }
+}
+
+void MemberReader::keepRest() {
+    for (std::size_t i = 0; i < known_.size(); ++i) {
+        if (known_[i]) continue;
+        auto const& [name, value] = object_.members[i];
+        std::string json;
+        writeValue(json, value);
+        unknown_.push_back({path_, name, std::move(json)});
+    }
+}
+
+}  // namespace tzhost::drawingfile

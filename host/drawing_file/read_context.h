@@ -1,0 +1,27 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "host/database/drawing.h"
+#include "host/drawing_file/json_stream.h"
+
+namespace tzhost::drawingfile {
+
+// What the readers of a drawing's parts share: the drawing, and the first problem that was met. A
+// reader goes on with defaults behind a problem; whoever drives it looks at the end of each part.
+struct ReadContext {
+    Drawing& drawing;
+    bool failed = false;
+    Problem problem;  // when it failed
+    std::vector<std::string> warnings;  // "line: what"
+
+    void complain(int line, std::string member, std::string what) {
+        if (failed) return;
+        failed = true;
+        problem = {line, std::move(member), std::move(what)};
+    }
+};
+
+}  // namespace tzhost::drawingfile

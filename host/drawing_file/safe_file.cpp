@@ -1,0 +1,106 @@
+#include "host/drawing_file/safe_file.h"
+
+#include <cerrno>
+#include <csignal>
+#include <cstdlib>
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+#include <utility>
+
+#include "host/base/file_bytes.h"
+
+namespace tzhost::drawingfile {
+namespace {
+
+// A file size limit must give an error, not end the process.
+class NoSizeSignal {
+public:
+    NoSizeSignal() {
+        struct sigaction ignore {};
+        ignore.sa_handler = SIG_IGN;
+        (void)sigaction(SIGXFSZ, &ignore, &before_);  // cannot fail with these arguments
+    }
+    NoSizeSignal(NoSizeSignal const&) = delete;
+    NoSizeSignal& operator=(NoSizeSignal const&) = delete;
+    ~NoSizeSignal() { (void)sigaction(SIGXFSZ, &before_, nullptr); }
+
+private:
+    struct sigaction before_ {};
+};
+
+// The permissions of the old file, else those of a new one.
+mode_t permissionsFor(std::filesystem::path const& target) {
+    struct stat old {};
+    if (stat(target.c_str(), &old) == 0) return old.st_mode & 07777;
+    mode_t const mask = umask(0);
+    umask(mask);
+    return 0666 & ~mask;
+}
+
+// Makes the renaming last; folders that cannot be flushed are left to the system.
+void flushFolder(std::filesystem::path const& folder) {
+    int const handle = open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    if (handle < 0) return;
+    (void)fsync(handle);
+    (void)close(handle);
+}
+
+}  // namespace
+
+SafeFile::SafeFile(std::filesystem::path const& target) : target_(target) {
+    std::error_code error;
+    if (std::filesystem::is_symlink(target_, error)) {
+        auto const real = std::filesystem::canonical(target_, error);
+        if (!error) target_ = real;
+    }
+    if (std::filesystem::is_directory(target_, error)) {
+        errno = EISDIR;
+        (void)fail();
+        return;
+    }
+    temporary_ = (target_.parent_path() / ("." + target_.filename().string() + ".XXXXXX")).string();
+    file_ = mkostemp(temporary_.data(), O_CLOEXEC);
+    if (file_ < 0) {
+        temporary_.clear();
+        (void)fail();
+    } else if (fchmod(file_, permissionsFor(target_)) != 0) {
+        (void)fail();
+    }
+}
+
+SafeFile::~SafeFile() {
+    if (file_ >= 0) (void)close(file_);  // nothing is lost: the file goes away
+    if (!temporary_.empty()) (void)unlink(temporary_.c_str());
+}
+
+bool SafeFile::fail() {
+    if (reason_.empty()) reason_ = systemReason();
+    return false;
+}
+
+bool SafeFile::write(std::string_view bytes) {
+    NoSizeSignal const quiet;
+    while (reason_.empty() && !bytes.empty()) {
+        ssize_t const written = ::write(file_, bytes.data(), bytes.size());
+        if (written > 0) {
+            bytes.remove_prefix(static_cast<std::size_t>(written));
+        } else if (errno != EINTR) {
+            return fail();
+        }
+    }
+    return reason_.empty();
+}
+
+bool SafeFile::commit() {
+    if (!reason_.empty()) return false;
+    if (fsync(file_) != 0) return fail();
+    int const handle = std::exchange(file_, -1);
+    if (close(handle) != 0) return fail();
+    if (rename(temporary_.c_str(), target_.c_str()) != 0) return fail();
+    temporary_.clear();
+    flushFolder(target_.parent_path());
+    return true;
+}
+
+}  // namespace tzhost::drawingfile
