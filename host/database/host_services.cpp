@@ -23,9 +23,7 @@ public:
     [[nodiscard]] TzDbDatabase* workingDatabase() const override { return theWorkingDrawing; }
     [[nodiscard]] TzDbWorkingGlobals* workingGlobals() const override { return theWorkingDrawing; }
     void textEditorStarting() override { notify("textEditorStarting"); }
-    [[nodiscard]] TzString getProductRegistryKey() const override {
-        return settings().productKey;
-    }
+    [[nodiscard]] TzString getProductRegistryKey() const override { return settings().productKey; }
 };
 
 class DefaultGlobals final : public TzDbWorkingGlobals {

@@ -82,8 +82,7 @@ private:
         }
     }
     void wrongKind(char const* name, JsonValue const& value, char const* expected) {
-        context_.complain(value.line,
-                          name,
+        context_.complain(value.line, name,
                           "is " + std::string(nameOf(value.kind)) + ", expected " + expected);
     }
 
@@ -135,8 +134,7 @@ void DrawingReader::readVersion(JsonValue const& value) {
     hasVersion_ = true;
     if (value.kind == JsonKind::number && value.number == kVersion) return;
     isNewer_ = value.kind == JsonKind::number && value.number > kVersion;
-    context_.complain(value.line,
-                      "version",
+    context_.complain(value.line, "version",
                       isNewer_ ? "is " + value.text + " and newer than this program, expected 1"
                                : std::string("is no version, expected 1"));
 }
@@ -187,8 +185,7 @@ bool DrawingReader::beginBlock(int line) {
         block_ = blocks_[blockIndex_++];
         return true;
     }
-    block_ = &addTableRecord(context_.drawing,
-                             context_.drawing.blockTableId(),
+    block_ = &addTableRecord(context_.drawing, context_.drawing.blockTableId(),
                              std::make_unique<TzDbBlockTableRecord>());
     blocks_.push_back(block_);
     return true;
@@ -234,8 +231,7 @@ TzDbObjectId DrawingReader::currentRecord(char const* name,
     if (wanted.empty()) return fallback;
     TzDbObjectId const found = Drawing::find(table, fromUtf8(wanted));
     if (found.isNull()) {
-        context_.complain(name == std::string_view("currentLayer") ? layerLine_ : styleLine_,
-                          name,
+        context_.complain(name == std::string_view("currentLayer") ? layerLine_ : styleLine_, name,
                           "names \"" + wanted + "\", expected a name that the drawing has");
     }
     return found;
@@ -249,8 +245,8 @@ void DrawingReader::finish() {
     Drawing& drawing = context_.drawing;
     settings_.layer =
         currentRecord("currentLayer", layer_, drawing.layerTableId(), settings_.layer);
-    settings_.textStyle = currentRecord(
-        "currentTextStyle", style_, drawing.textStyleTableId(), settings_.textStyle);
+    settings_.textStyle =
+        currentRecord("currentTextStyle", style_, drawing.textStyleTableId(), settings_.textStyle);
     if (!context_.failed) drawing.restoreSettings(settings_);
 }
 
@@ -287,8 +283,8 @@ DrawingRead readDrawing(std::filesystem::path const& file) {
     std::error_code ignored;
     bool const isFolder = std::filesystem::is_directory(file, ignored);
     if (isFolder) errno = EISDIR;
-    std::unique_ptr<std::FILE, FileCloser> const stream(
-        isFolder ? nullptr : std::fopen(file.c_str(), "rb"));
+    std::unique_ptr<std::FILE, FileCloser> const stream(isFolder ? nullptr
+                                                                 : std::fopen(file.c_str(), "rb"));
     if (!stream) {
         result.error = file.string() + ": cannot be read: " + systemReason();
         return result;

@@ -54,19 +54,16 @@ std::uint64_t EntityReader::handleOf(JsonValue const& value) {
     constexpr int kHexadecimal = 16;
     std::uint64_t handle = 0;
     char const* const end = member->text.data() + member->text.size();
-    auto const [stop, error] =
-        std::from_chars(member->text.data(), end, handle, kHexadecimal);
+    auto const [stop, error] = std::from_chars(member->text.data(), end, handle, kHexadecimal);
     if (member->kind != JsonKind::text || error != std::errc() || stop != end || handle == 0 ||
         handle > Drawing::kMaxEntityHandle) {
-        context_.complain(member->line,
-                          "handle",
+        context_.complain(member->line, "handle",
                           "is no handle, expected a text of hexadecimal digits from \"1\" to "
                           "\"3FFFFFFFFFFFFFFF\"");
         return 0;
     }
     if (!context_.drawing.objectAt(handle).isNull()) {
-        context_.complain(member->line,
-                          "handle",
+        context_.complain(member->line, "handle",
                           "is \"" + member->text +
                               "\" as that of an earlier entity, expected each handle once");
         return 0;
@@ -79,8 +76,7 @@ TzDbObjectRecord& EntityReader::spaceOf(JsonValue const& value) {
     JsonValue const* const member = value.find("space");
     bool const onPaper = member && member->kind == JsonKind::text && member->text == "paper";
     if (member && !onPaper && (member->kind != JsonKind::text || member->text != "model")) {
-        context_.complain(
-            member->line, "space", "is no space, expected \"model\" or \"paper\"");
+        context_.complain(member->line, "space", "is no space, expected \"model\" or \"paper\"");
     }
     return *(onPaper ? drawing.paperSpace() : drawing.modelSpace()).record();
 }
@@ -149,8 +145,7 @@ void EntityReader::readAttributes(JsonValue const* list, TzDbObjectRecord& refer
 
 void EntityReader::read(JsonValue const& value, TzDbObjectRecord* owner) {
     if (value.kind != JsonKind::object) {
-        return context_.complain(value.line,
-                                 "entities",
+        return context_.complain(value.line, "entities",
                                  "holds " + std::string(nameOf(value.kind)) +
                                      ", expected an object");
     }
@@ -159,17 +154,16 @@ void EntityReader::read(JsonValue const& value, TzDbObjectRecord* owner) {
         void (EntityReader::*read)(JsonValue const& value, TzDbObjectRecord& owner);
     };
     static constexpr TypeRow kRows[] = {
-        {"MTEXT",  &EntityReader::readAs<TzDbMText, MTextImp>},
-        {"TEXT",   &EntityReader::readAs<TzDbText, TextImp>},
+        {"MTEXT",  &EntityReader::readAs<TzDbMText,               MTextImp>     },
+        {"TEXT",   &EntityReader::readAs<TzDbText,                TextImp>      },
         {"ATTDEF", &EntityReader::readAs<TzDbAttributeDefinition, DefinitionImp>},
-        {"LINE",   &EntityReader::readAs<TzDbLine, LineImp>},
-        {"CIRCLE", &EntityReader::readAs<TzDbCircle, CircleImp>},
-        {"INSERT", &EntityReader::readAs<TzDbBlockReference, InsertImp>},
+        {"LINE",   &EntityReader::readAs<TzDbLine,                LineImp>      },
+        {"CIRCLE", &EntityReader::readAs<TzDbCircle,              CircleImp>    },
+        {"INSERT", &EntityReader::readAs<TzDbBlockReference,      InsertImp>    },
     };
     JsonValue const* const type = value.find("type");
     if (!type) {
-        return context_.complain(
-            value.line, "type", std::string("is missing, expected ") + kTypes);
+        return context_.complain(value.line, "type", std::string("is missing, expected ") + kTypes);
     }
     for (TypeRow const& row : kRows) {
         if (type->kind != JsonKind::text || type->text != row.name) continue;
@@ -209,8 +203,7 @@ void EntityReader::refuseCycles() {
                 valuesOf<InsertImp>(*reference.reference->object).block.record();
             auto const mark = marks.find(target);
             if (mark != marks.end() && mark->second == Mark::open) {
-                return context_.complain(reference.line,
-                                         "block",
+                return context_.complain(reference.line, "block",
                                          "leads back to the block that holds it, expected another");
             }
             if (mark != marks.end()) continue;
@@ -222,11 +215,9 @@ void EntityReader::refuseCycles() {
 
 void EntityReader::finish() {
     for (OpenReference const& each : references_) {
-        TzDbObjectId const block =
-            Drawing::find(context_.drawing.blockTableId(), each.block);
+        TzDbObjectId const block = Drawing::find(context_.drawing.blockTableId(), each.block);
         if (block.isNull()) {
-            return context_.complain(each.line,
-                                     "block",
+            return context_.complain(each.line, "block",
                                      "names \"" + toUtf8(each.block) +
                                          "\", expected the name of a block of this drawing");
         }

@@ -21,8 +21,8 @@ public:
 
     // An entity of the block `owner`; null for one of the drawing, which names its space itself.
     void read(JsonValue const& value, TzDbObjectRecord* owner);
-    // When everything is read: looks up blocks, refuses blocks that hold themselves, and numbers the
-    // entities that had no handle.
+    // When everything is read: looks up blocks, refuses blocks that hold themselves, and numbers
+    // the entities that had no handle.
     void finish();
 
 private:

@@ -5,8 +5,8 @@
 #include <iterator>
 #include <string>
 
-// The bytes of a file one after the other for a JSON parser, in blocks of a fixed size, with the line
-// of the last one that was more than a line end: a parser reads one character past a number.
+// The bytes of a file one after the other for a JSON parser, in blocks of a fixed size, with the
+// line of the last one that was more than a line end: a parser reads one character past a number.
 namespace tzhost::drawingfile {
 
 class JsonSource {

@@ -28,10 +28,10 @@ JsonValue const* secondOfName(JsonValue const& object, std::string& name) {
     sorted.reserve(object.members.size());
     for (auto const& member : object.members)
         sorted.push_back(&member);
-    std::stable_sort(
-        sorted.begin(), sorted.end(), [](Member a, Member b) { return a->first < b->first; });
-    auto const at = std::adjacent_find(
-        sorted.begin(), sorted.end(), [](Member a, Member b) { return a->first == b->first; });
+    std::stable_sort(sorted.begin(), sorted.end(),
+                     [](Member a, Member b) { return a->first < b->first; });
+    auto const at = std::adjacent_find(sorted.begin(), sorted.end(),
+                                       [](Member a, Member b) { return a->first == b->first; });
     if (at == sorted.end()) return nullptr;
     name = (*at)->first;
     return &(*std::next(at))->second;
@@ -115,7 +115,8 @@ private:
     bool scalar(JsonValue value);
     bool open(JsonKind kind);
     bool close();
-    // Opens the drawing itself, its streamed arrays and its blocks; `handled` says whether it was one.
+    // Opens the drawing itself, its streamed arrays and its blocks; `handled` says whether it was
+    // one.
     bool openPlace(JsonKind kind, bool& handled);
     // Hands a finished value to the sink, or into the value around it.
     bool deliver(JsonValue value);
@@ -160,7 +161,8 @@ bool StreamParser::deliver(JsonValue value) {
     case Place::block: return hand(sink_.blockMember(key_, std::move(value)));
     case Place::entities:
     case Place::blockEntities: return hand(sink_.entity(std::move(value)));
-    case Place::blocks: return fail("holds " + std::string(nameOf(value.kind)) + ", expected an object");
+    case Place::blocks:
+        return fail("holds " + std::string(nameOf(value.kind)) + ", expected an object");
     case Place::start:
     case Place::end: break;
     }
@@ -169,9 +171,9 @@ bool StreamParser::deliver(JsonValue value) {
 
 bool StreamParser::scalar(JsonValue value) {
     value.line = source_.line();
-    bool const isStreamed = open_.empty() &&
-                            ((place_ == Place::drawing && (key_ == "entities" || key_ == "blocks")) ||
-                             (place_ == Place::block && key_ == "entities"));
+    bool const isStreamed =
+        open_.empty() && ((place_ == Place::drawing && (key_ == "entities" || key_ == "blocks")) ||
+                          (place_ == Place::block && key_ == "entities"));
     if (isStreamed) return fail("is " + std::string(nameOf(value.kind)) + ", expected an array");
     return deliver(std::move(value));
 }

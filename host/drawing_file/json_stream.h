@@ -5,8 +5,8 @@
 
 #include "host/drawing_file/json_value.h"
 
-// Reads the JSON of a drawing and hands over its parts as they come, so that no more than one entity
-// is held as JSON.
+// Reads the JSON of a drawing and hands over its parts as they come, so that no more than one
+// entity is held as JSON.
 namespace tzhost::drawingfile {
 
 // What is wrong with a file; `member` is empty where none is meant.
@@ -16,7 +16,8 @@ struct Problem {
     std::string what;
 };
 
-// Takes the parts of a drawing. False from an operation stops the reading; whoever gives it knows why.
+// Takes the parts of a drawing. False from an operation stops the reading; whoever gives it knows
+// why.
 class DrawingSink {
 public:
     virtual ~DrawingSink() = default;

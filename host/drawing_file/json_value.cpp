@@ -46,8 +46,8 @@ void writeCharacter(std::string& out, char c) {
 }  // namespace
 
 JsonValue const* JsonValue::find(std::string_view name) const {
-    auto const at = std::find_if(
-        members.begin(), members.end(), [=](auto const& each) { return each.first == name; });
+    auto const at = std::find_if(members.begin(), members.end(),
+                                 [=](auto const& each) { return each.first == name; });
     return at == members.end() ? nullptr : &at->second;
 }
 

@@ -5,8 +5,8 @@
 #include <utility>
 #include <vector>
 
-// A JSON value that knows its line, and the one form in which this host writes JSON: without blanks,
-// numbers in the shortest form that reads back the same, texts in UTF-8.
+// A JSON value that knows its line, and the one form in which this host writes JSON: without
+// blanks, numbers in the shortest form that reads back the same, texts in UTF-8.
 namespace tzhost::drawingfile {
 
 enum class JsonKind { null, flag, number, text, array, object };

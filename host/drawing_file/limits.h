@@ -5,8 +5,8 @@ namespace tzhost::drawingfile {
 // The numbers that a member takes. All are finite.
 enum class Range {
     any,
-    positive,     // above 0
-    size,         // 0 or more
+    positive,  // above 0
+    size,      // 0 or more
     nonZero,
     spacing,      // 0.25 to 4
     enlargement,  // 1 to 5

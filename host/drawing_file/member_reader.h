@@ -17,8 +17,8 @@ namespace tzhost::drawingfile {
 // value alone; a wrong one is complained about.
 class MemberReader {
 public:
-    // `path` names the object in messages and among unknown members: "" or "columns". What nobody asks
-    // for is added to `unknown` by `keepRest`.
+    // `path` names the object in messages and among unknown members: "" or "columns". What nobody
+    // asks for is added to `unknown` by `keepRest`.
     MemberReader(ReadContext& context,
                  JsonValue const& object,
                  UnknownMembers& unknown,

@@ -10,8 +10,8 @@
 #include "host/drawing_file/member_reader.h"
 #include "host/drawing_file/member_writer.h"
 
-// What a drawing file says of each class, once for reading and writing: `Members` is a MemberReader or
-// a MemberWriter. Members are written in the order in which they stand here.
+// What a drawing file says of each class, once for reading and writing: `Members` is a MemberReader
+// or a MemberWriter. Members are written in the order in which they stand here.
 namespace tzhost::drawingfile {
 
 inline constexpr WholeRange kEntityColors{0, 256};

@@ -14,7 +14,7 @@ namespace tzhost::drawingfile {
 struct ReadContext {
     Drawing& drawing;
     bool failed = false;
-    Problem problem;  // when it failed
+    Problem problem;                    // when it failed
     std::vector<std::string> warnings;  // "line: what"
 
     void complain(int line, std::string member, std::string what) {

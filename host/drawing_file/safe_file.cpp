@@ -40,7 +40,8 @@ mode_t permissionsFor(std::filesystem::path const& target) {
 
 // Makes the renaming last; folders that cannot be flushed are left to the system.
 void flushFolder(std::filesystem::path const& folder) {
-    int const handle = open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    int const handle =
+        open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
     if (handle < 0) return;
     (void)fsync(handle);
     (void)close(handle);

@@ -6,10 +6,10 @@
 
 namespace tzhost::drawingfile {
 
-// A file that is written piece by piece and takes the place of the old one only when it is whole: the
-// pieces go to a temporary file in the same folder, which `commit` flushes to the disk and renames. A
-// symbolic link is followed; an old file's permissions stay. Without `commit` the temporary file goes
-// away and the old one stays.
+// A file that is written piece by piece and takes the place of the old one only when it is whole:
+// the pieces go to a temporary file in the same folder, which `commit` flushes to the disk and
+// renames. A symbolic link is followed; an old file's permissions stay. Without `commit` the
+// temporary file goes away and the old one stays.
 class SafeFile {
 public:
     explicit SafeFile(std::filesystem::path const& target);

@@ -15,8 +15,8 @@ namespace {
 template <class Record, class Imp>
 void readTable(ReadContext& context, JsonValue const& list, char const* name, TzDbObjectId table) {
     if (list.kind != JsonKind::array) {
-        return context.complain(
-            list.line, name, "is " + std::string(nameOf(list.kind)) + ", expected an array");
+        return context.complain(list.line, name,
+                                "is " + std::string(nameOf(list.kind)) + ", expected an array");
     }
     std::set<TzDbObjectRecord const*> seen;
     for (JsonValue const& item : list.items) {
@@ -41,7 +41,8 @@ void readTable(ReadContext& context, JsonValue const& list, char const* name, Tz
             found.isNull() && !context.failed
                 ? addTableRecord(context.drawing, table, std::move(fresh))
                 : *(found.isNull() ? table.record() : found.record());
-        if (!seen.insert(&record).second) members.complain("name", "stands twice, expected each once");
+        if (!seen.insert(&record).second)
+            members.complain("name", "stands twice, expected each once");
         if (context.failed) return;
     }
 }
@@ -64,7 +65,8 @@ std::optional<VariableValue> valueFrom(JsonValue const& value, VariableType type
         if (!isNumber || value.number != std::floor(value.number)) return std::nullopt;
         if (value.number < -32768 || value.number > 32767) return std::nullopt;
         return static_cast<short>(value.number);
-    case VariableType::real: return isNumber ? std::optional<VariableValue>(value.number) : std::nullopt;
+    case VariableType::real:
+        return isNumber ? std::optional<VariableValue>(value.number) : std::nullopt;
     case VariableType::text:
         if (value.kind != JsonKind::text) return std::nullopt;
         return fromUtf8(value.text);
@@ -88,14 +90,13 @@ void readVariable(ReadContext& context,
     std::string const path = "variables." + name;
     auto const value = valueFrom(member, row.type);
     if (!value) {
-        return context.complain(member.line,
-                                path,
+        return context.complain(member.line, path,
                                 "is " + std::string(nameOf(member.kind)) + ", expected " +
                                     nameOfType(row.type));
     }
     if (row.complaintAbout(*value)) {
-        return context.complain(
-            member.line, path, "is outside its limits, expected " + toUtf8(row.takes()));
+        return context.complain(member.line, path,
+                                "is outside its limits, expected " + toUtf8(row.takes()));
     }
     values.emplace_back(row.name, *value);
 }
@@ -103,18 +104,18 @@ void readVariable(ReadContext& context,
 }  // namespace
 
 void readLayers(ReadContext& context, JsonValue const& list) {
-    readTable<TzDbLayerTableRecord, LayerImp>(
-        context, list, "layers", context.drawing.layerTableId());
+    readTable<TzDbLayerTableRecord, LayerImp>(context, list, "layers",
+                                              context.drawing.layerTableId());
 }
 
 void readLinetypes(ReadContext& context, JsonValue const& list) {
-    readTable<TzDbLinetypeTableRecord, LinetypeImp>(
-        context, list, "linetypes", context.drawing.linetypeTableId());
+    readTable<TzDbLinetypeTableRecord, LinetypeImp>(context, list, "linetypes",
+                                                    context.drawing.linetypeTableId());
 }
 
 void readTextStyles(ReadContext& context, JsonValue const& list) {
-    readTable<TzDbTextStyleTableRecord, TextStyleImp>(
-        context, list, "textStyles", context.drawing.textStyleTableId());
+    readTable<TzDbTextStyleTableRecord, TextStyleImp>(context, list, "textStyles",
+                                                      context.drawing.textStyleTableId());
 }
 
 void readVariables(ReadContext& context, JsonValue const& object, Variables::Values& values) {
@@ -125,8 +126,8 @@ void readVariables(ReadContext& context, JsonValue const& object, Variables::Val
             writeValue(json, member);
             context.drawing.unknown.push_back({"variables", name, std::move(json)});
         } else if (row->kept != KeptIn::drawing) {
-            context.warnings.push_back(std::to_string(member.line) + ": member \"variables." + name +
-                                       "\": a drawing does not decide it, left out");
+            context.warnings.push_back(std::to_string(member.line) + ": member \"variables." +
+                                       name + "\": a drawing does not decide it, left out");
         } else {
             readVariable(context, *row, name, member, values);
         }

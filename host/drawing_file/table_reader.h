@@ -14,8 +14,8 @@ void readLayers(ReadContext& context, JsonValue const& list);
 void readLinetypes(ReadContext& context, JsonValue const& list);
 void readTextStyles(ReadContext& context, JsonValue const& list);
 
-// "variables": values of variables that a drawing keeps are collected, those kept elsewhere are left
-// out with a warning, and names that no variable has are kept as unknown.
+// "variables": values of variables that a drawing keeps are collected, those kept elsewhere are
+// left out with a warning, and names that no variable has are kept as unknown.
 void readVariables(ReadContext& context, JsonValue const& object, Variables::Values& values);
 
 // "ucs" and "paperUcs": the axes are unit vectors at right angles.
@@ -29,7 +29,8 @@ void readWorkingSet(ReadContext& context, JsonValue const& object, DrawingSettin
 
 // Adds a record with that name to a table, the values being set; the table does not have the name.
 template <class Record>
-TzDbObjectRecord& addTableRecord(Drawing& drawing, TzDbObjectId table, std::unique_ptr<Record> made) {
+TzDbObjectRecord&
+addTableRecord(Drawing& drawing, TzDbObjectId table, std::unique_ptr<Record> made) {
     TzDbObjectRecord& added =
         drawing.addObject(made.get(), table.record(), Drawing::Numbered::service);
     (void)made.release();  // the drawing's now
