@@ -49,6 +49,11 @@ LineLayoutInput layoutInputOf(DrawnText const& text) {
     input.style.fontFile = style.fileName().str();
     input.style.bigFontFile = style.bigFontFileName().str();
     input.style.typeface = style.typeface().str();
+    // A leading "@" asks a whole text to run downwards, but what is drawn as horizontal has been
+    // placed already, letter by letter.
+    if (!style.isVertical() && input.style.typeface.starts_with(L'@')) {
+        input.style.typeface.erase(0, 1);
+    }
     input.style.bold = style.isBold();
     input.style.italic = style.isItalic();
     input.style.charset = style.charset();

@@ -1,17 +1,16 @@
 #include "host/display/plot_paint.h"
 
-#include <cairo.h>
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <cmath>
 #include <cstdlib>
-#include <cstring>
 #include <limits>
 #include <string>
 
 #include "host/base/entity_drawing.h"
 #include "host/display/plot_ink.h"
+#include "tests/display/picture.h"
 
 namespace {
 
@@ -48,50 +47,6 @@ DrawOp text(wchar_t const* string, double size) {
     op.what = drawn;
     return op;
 }
-
-// A picture read back, one colour as 0xRRGGBB a pixel.
-class Picture {
-public:
-    explicit Picture(std::string const& png) : bytes_(png) {
-        surface_ = cairo_image_surface_create_from_png_stream(read, this);
-        cairo_surface_flush(surface_);
-    }
-    ~Picture() { cairo_surface_destroy(surface_); }
-    Picture(Picture const&) = delete;
-    Picture& operator=(Picture const&) = delete;
-
-    [[nodiscard]] int width() const { return cairo_image_surface_get_width(surface_); }
-    [[nodiscard]] int height() const { return cairo_image_surface_get_height(surface_); }
-    [[nodiscard]] unsigned int at(int x, int y) const {
-        unsigned char const* const row =
-            cairo_image_surface_get_data(surface_) + y * cairo_image_surface_get_stride(surface_);
-        unsigned int pixel = 0;
-        std::memcpy(&pixel, row + 4 * x, sizeof pixel);
-        return pixel & 0xFFFFFF;
-    }
-    // How many pixels have a colour.
-    [[nodiscard]] int count(unsigned int color) const {
-        int found = 0;
-        for (int y = 0; y < height(); ++y) {
-            for (int x = 0; x < width(); ++x)
-                found += at(x, y) == color ? 1 : 0;
-        }
-        return found;
-    }
-
-private:
-    static cairo_status_t read(void* closure, unsigned char* data, unsigned int length) {
-        auto* const self = static_cast<Picture*>(closure);
-        if (self->bytes_.size() - self->next_ < length) return CAIRO_STATUS_READ_ERROR;
-        std::memcpy(data, self->bytes_.data() + self->next_, length);
-        self->next_ += length;
-        return CAIRO_STATUS_SUCCESS;
-    }
-
-    std::string bytes_;
-    std::size_t next_ = 0;
-    cairo_surface_t* surface_;
-};
 
 Picture plotted(DrawList const& list, ViewAxes const& axes = ViewAxes()) {
     return Picture(paintPlot(makeScene(list, axes), PlotFormat::png));
@@ -237,6 +192,8 @@ TEST(Plots, PlaceTextsByTheirStyle) {
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setBackward(true); }), "-40 0 -1 10 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setUpsideDown(true); }), "1 -10 40 0 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setVertical(true); }), "-4 -50 4 0 ");
+    EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setFont(L"@DejaVu Sans", false, false, 0, 0); }),
+              "1 0 40 10 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.direction = {0, 1, 0}; }), "-10 1 0 40 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.normal = {0, 0, -1}; }), "1 -10 40 0 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.position = {7, 8, 9}; }), "71 80 110 90 ");

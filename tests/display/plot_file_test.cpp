@@ -1,0 +1,123 @@
+#include "host/display/plot.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <memory>
+#include <string>
+
+#include "host/base/file_bytes.h"
+#include "host/base/variables.h"
+#include "host/database/drawing.h"
+#include "tests/display/picture.h"
+#include "tz/db/mtext.h"
+#include "tz/db/shapes.h"
+
+namespace {
+
+using namespace tzhost;
+
+constexpr int kRed = 0xFF0000;
+constexpr int kBlue = 0x0000FF;
+
+// A drawing of a red layer's line in model space, a blue circle on the paper, and something
+// invisible in both.
+class PlotFiles : public testing::Test {
+protected:
+    void SetUp() override {
+        Variables::instance().resetKept(KeptIn::drawing);
+        drawing_ = Drawing::create();
+        setWorkingDrawing(drawing_.get());
+        auto line = std::make_unique<TzDbLine>();
+        ASSERT_EQ(line->setEndPoint({10, 10, 0}), Tzad::eOk);
+        ASSERT_EQ(line->setLayer(redLayer()), Tzad::eOk);
+        post(std::move(line), kModelSpaceName);
+        auto circle = std::make_unique<TzDbCircle>();
+        ASSERT_EQ(circle->setRadius(5), Tzad::eOk);
+        ASSERT_EQ(circle->setColorIndex(5), Tzad::eOk);
+        post(std::move(circle), kPaperSpaceName);
+        for (wchar_t const* const space : {kModelSpaceName, kPaperSpaceName}) {
+            auto hidden = std::make_unique<TzDbCircle>();
+            ASSERT_EQ(hidden->setRadius(1000), Tzad::eOk);
+            ASSERT_EQ(hidden->setVisibility(TzDb::kInvisible), Tzad::eOk);
+            post(std::move(hidden), space);
+        }
+    }
+    void TearDown() override {
+        setWorkingDrawing(nullptr);
+        Variables::instance().resetKept(KeptIn::drawing);
+    }
+
+    TzDbObjectId redLayer() {
+        TzDbLayerTable* table = nullptr;
+        EXPECT_EQ(drawing_->getLayerTable(table, TzDb::kForWrite), Tzad::eOk);
+        auto* const layer = new TzDbLayerTableRecord;
+        EXPECT_EQ(layer->setName(L"Red"), Tzad::eOk);
+        EXPECT_EQ(layer->setColor(TzCmEntityColor::fromIndex(1)), Tzad::eOk);
+        TzDbObjectId id;
+        EXPECT_EQ(table->addRecord(layer, id), Tzad::eOk);
+        layer->close();
+        table->close();
+        return id;
+    }
+
+    void post(std::unique_ptr<TzDbEntity> entity, wchar_t const* space) {
+        TzDbBlockTable* table = nullptr;
+        ASSERT_EQ(drawing_->getBlockTable(table, TzDb::kForRead), Tzad::eOk);
+        TzDbBlockTableRecord* record = nullptr;
+        ASSERT_EQ(table->getAt(space, record, TzDb::kForWrite), Tzad::eOk);
+        table->close();
+        TzDbObjectId id;
+        TzDbEntity* const posted = entity.release();
+        ASSERT_EQ(record->appendTzDbEntity(id, posted), Tzad::eOk);
+        posted->close();
+        record->close();
+    }
+
+    [[nodiscard]] Picture plotted() const {
+        std::string const file = "plot.png";
+        EXPECT_EQ(plotDrawing(*drawing_, PlotFormat::png, file), std::nullopt);
+        return Picture(readFile(file).value_or(""));
+    }
+
+    std::unique_ptr<Drawing> drawing_;
+};
+
+TEST_F(PlotFiles, ShowTheActiveSpace) {
+    EXPECT_GT(plotted().countShades(kRed), 500);
+    EXPECT_EQ(plotted().countShades(kBlue), 0);
+    ASSERT_TRUE(Variables::instance().setFromText(L"TILEMODE", L"0", Writer::host).isDone());
+    ASSERT_TRUE(Variables::instance().setFromText(L"CVPORT", L"1", Writer::host).isDone());
+    EXPECT_EQ(plotted().countShades(kRed), 0);
+    EXPECT_GT(plotted().countShades(kBlue), 500);
+}
+
+TEST_F(PlotFiles, OpenNothing) {
+    // An object that a command holds open for write is plotted all the same.
+    TzDbBlockTable* table = nullptr;
+    ASSERT_EQ(drawing_->getBlockTable(table, TzDb::kForWrite), Tzad::eOk);
+    EXPECT_GT(plotted().countShades(kRed), 500);
+    table->close();
+}
+
+TEST_F(PlotFiles, ShowTextsOnTheirBackground) {
+    auto text = std::make_unique<TzDbMText>();
+    ASSERT_EQ(text->setContents(L"\\C5;Blue \\C256;text"), Tzad::eOk);
+    ASSERT_EQ(text->setTextHeight(3), Tzad::eOk);
+    ASSERT_EQ(text->setBackgroundFill(true), Tzad::eOk);
+    ASSERT_EQ(text->setBackgroundFillColor(TzCmEntityColor::fromIndex(2)), Tzad::eOk);
+    post(std::move(text), kModelSpaceName);
+    Picture const picture = plotted();
+    EXPECT_GT(picture.count(kBlue), 500);
+    EXPECT_GT(picture.count(0x000000), 500);
+    EXPECT_GT(picture.count(0xFFFF00), 20000);
+}
+
+TEST_F(PlotFiles, SayWhatWentWrong) {
+    std::string const file = "missing/plan.svg";
+    auto const fault = plotDrawing(*drawing_, PlotFormat::svg, file);
+    EXPECT_EQ(fault, "missing/plan.svg: cannot be written: No such file or directory");
+    EXPECT_FALSE(std::filesystem::exists("missing"));
+}
+
+}  // namespace
