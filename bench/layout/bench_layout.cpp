@@ -27,7 +27,7 @@ void countCharacters(benchmark::State& state, std::size_t length) {
 
 void readMarkupAlone(benchmark::State& state) {
     std::wstring const text = textOf(state);
-    for (auto _ : state) {
+    while (state.KeepRunning()) {
         benchmark::DoNotOptimize(tzhost::readMarkup(text, {0, 1.0, {}, false, false}));
     }
     countCharacters(state, text.size());
@@ -38,7 +38,7 @@ void layOut(benchmark::State& state) {
     input.contents = textOf(state);
     input.width = 50.0;
     input.textHeight = 1.0;
-    for (auto _ : state) {
+    while (state.KeepRunning()) {
         benchmark::DoNotOptimize(tzhost::layOutMText(input));
     }
     countCharacters(state, input.contents.size());

@@ -38,6 +38,7 @@ constexpr LineRow kLineRows[] = {
     {"HangingIndent",            L"\\pi-2466,l3699;a bb cc",        6,   "0:1,-1,4 0:3,-2.66667,2"                },
     {"LineFeedKeepsLeftIndent",  L"\\pi-1233,l1233;a\nb\\Pc",       0,
      "0:0,-1,1 0:1,-2.66667,1 0:0,-4.33333,1"                                                                     },
+    {"EachParagraphItsIndent",   L"\\pl1233;a\\P\\pl2466;b",        0,   "0:1,-1,1 0:2,-2.66667,1"                },
     {"IndentNeverLeavesTheEdge", L"\\pi-2466;a",                    0,   "0:0,-1,1"                               },
 };
 

@@ -49,6 +49,9 @@ constexpr RunRow kRunRows[] = {
      "o0,0.2-2,0.2"                                                                                                                                                  },
     {"UnderlineByColour",      L"\\La\\C1;b",                              "'a'@0,-1,1 'b'@1,-1,1",                                   "u0,-1.2-1,-1.2 u1,-1.2-2,-1.2"},
     {"UnderlinedTab",          L"\\pt2466;\\La\tb",                        "'a'@0,-1,1 'b'@2,-1,1",                                   "u0,-1.2-3,-1.2"               },
+ // The H of Liberation Sans advances 1479 units and is 1409 high.
+    {"FacesByTheirOwnMeasure", L"a{\\fLiberation Sans|b0|i0|c0|p0;H}b",
+     "'a'@0,-1,1 'H'@1,-1,1.27102 'b'@2.27102,-1,1",                                                                                  ""                             },
     {"ControlsAreDropped",     L"a\rb\x1F\x7F\x85",                        "'ab'@0,-1,2",                                             ""                             },
 };
 
@@ -157,6 +160,16 @@ TEST(Columns, TakeALineHigherThanThemselves) {
     input.columns = {2, true, 0, 4 * kLetter, 0.0, {}};
     input.height = kCapital * 3.0;
     EXPECT_EQ(printLines(layOutMText(input)), "0:0,-9,9 1:4,-1,1 1:4,-2.66667,1");
+}
+
+// The stack under the second line's baseline reaches 0.8 heights down, beyond the column's foot.
+TEST(Columns, HoldWhatHangsBelowTheLine) {
+    MTextLayoutInput input = monospaced(L"a\\P\\A1;\\S1/2;", 0);
+    input.columns = {2, true, 0, 4 * kLetter, 0.0, {}};
+    input.height = kCapital * (1.0 + 5.0 / 3.0 + 0.8 + 0.79);
+    EXPECT_EQ(layOutMText(input).lines.back().column, 1);
+    input.height = kCapital * (1.0 + 5.0 / 3.0 + 0.8 + 0.81);
+    EXPECT_EQ(layOutMText(input).lines.back().column, 0);
 }
 
 // Letters stand 4/3 heights apart, each in the middle of its step; lines go to the left, 5/3 apart.
