@@ -104,10 +104,8 @@ struct NestedResult {
 int tzedEntSel(wchar_t const* prompt, long long* name, double* point) {
     if (auto const failed = tzhost::failsAt("tzedEntSel")) return *failed;
     return tzhost::askForEntity(prompt, tzhost::Depth::top, [&](tzhost::PickedAt const& pick) {
-        TzDbObjectId const id =
-            pick.picked->references.empty() ? pick.picked->id : pick.picked->references.front();
         long long picked[2] = {};
-        if (tzdbGetTzsName(picked, id) != Tzad::eOk) return Tzad::ePromptError;
+        if (tzdbGetTzsName(picked, pick.picked->top) != Tzad::eOk) return Tzad::ePromptError;
         name[0] = picked[0];
         name[1] = picked[1];
         tzhost::putPoint(pick.point, point);

@@ -47,7 +47,7 @@ std::vector<Inside> insidesOf(Picked const& reference) {
 // The entity `record` inside a reference. An attribute is placed as its reference is, which so
 // counts as none around it.
 Picked stepInto(Picked const& outer, Inside const& inside, TzDbObjectRecord* record) {
-    Picked inner{TzDbObjectId(record), outer.references, inside.placed};
+    Picked inner{outer.top, TzDbObjectId(record), outer.references, inside.placed};
     if (record->owner != outer.id.record()) inner.references.push_back(outer.id);
     return inner;
 }
@@ -99,7 +99,7 @@ std::optional<Picked> pickAt(TzGePoint3d const& user, Depth depth) {
     if (items == nullptr) return std::nullopt;
     for (auto at = items->rbegin(); at != items->rend(); ++at) {
         if (!boxHolds(*at, TzGeMatrix3d::kIdentity, user)) continue;
-        Picked const top{TzDbObjectId(*at), {}, {}};
+        Picked const top{TzDbObjectId(*at), TzDbObjectId(*at), {}, {}};
         if (depth == Depth::top) return top;
         if (auto const found = pickInside(top, user, 0)) return found;
     }
@@ -122,7 +122,7 @@ std::optional<Picked> pickByHandles(std::wstring_view text) {
         if (picked) {
             picked = findInside(*picked, *handle);
         } else if (TzDbObjectId const id = drawing->objectAt(*handle); isInActiveSpace(id)) {
-            picked = Picked{id, {}, {}};
+            picked = Picked{id, id, {}, {}};
         }
         if (!picked) return std::nullopt;
         isMore = end != std::wstring_view::npos;

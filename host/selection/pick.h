@@ -11,8 +11,10 @@
 namespace tzhost {
 
 // A picked entity and the block references around it, outermost first; `placed` maps the
-// coordinates of the innermost one's block to world coordinates.
+// coordinates of the innermost one's block to world coordinates. `top` is what stands in the space
+// itself.
 struct Picked {
+    TzDbObjectId top;
     TzDbObjectId id;
     std::vector<TzDbObjectId> references;
     TzGeMatrix3d placed;

@@ -95,7 +95,7 @@ Answered readHandles(Words const& words) {
     for (std::wstring_view const word : words) {
         auto const picked = pickByHandles(word);
         if (!picked) return std::nullopt;
-        ids.append(picked->references.empty() ? picked->id : picked->references.front());
+        ids.append(picked->top);
     }
     return answerWith(std::move(ids));
 }
@@ -127,7 +127,7 @@ std::optional<SelectionAnswer> readSelection(std::wstring_view text) {
     auto const point = takePoint(text);
     if (!point) return std::nullopt;
     EntityIds ids;
-    if (auto const picked = pickAt(*point, Depth::top)) ids.append(picked->id);
+    if (auto const picked = pickAt(*point, Depth::top)) ids.append(picked->top);
     return answerWith(std::move(ids));
 }
 

@@ -1,0 +1,117 @@
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "host/base/audit.h"
+#include "host/database/drawing.h"
+#include "host/runtime/documents.h"
+#include "tests/command_line/session.h"
+#include "tz/db/block_table.h"
+#include "tz/db/mtext.h"
+#include "tz/db/shapes.h"
+#include "tz/db/text.h"
+#include "tz/ed/selection.h"
+#include "tz/rx/status.h"
+
+namespace tzhost::test {
+
+// An open document with a drawing that can be filled, and the names of its entities in tests: their
+// handles, in capitals.
+class OpenDrawing {
+public:
+    OpenDrawing() : drawing_(Drawing::create()) {
+        setWorkingDrawing(drawing_.get());
+        documents().open(drawing_.get());
+    }
+    OpenDrawing(OpenDrawing const&) = delete;
+    OpenDrawing& operator=(OpenDrawing const&) = delete;
+    ~OpenDrawing() {
+        documents().close();
+        setWorkingDrawing(nullptr);
+    }
+
+    // Adds an entity to a block; its handle.
+    std::string add(TzDbEntity* entity, wchar_t const* block = kModelSpaceName) {
+        TzDbBlockTable* table = nullptr;
+        TzDbBlockTableRecord* record = nullptr;
+        TzDbObjectId id;
+        if (drawing_->getBlockTable(table, TzDb::kForRead) != Tzad::eOk) return "no table";
+        if (table->getAt(block, record, TzDb::kForWrite) == Tzad::eOk) {
+            if (record->appendTzDbEntity(id, entity) == Tzad::eOk) entity->close();
+            record->close();
+        }
+        table->close();
+        return handle(id);
+    }
+    std::string addLine(TzGePoint3d const& from,
+                        TzGePoint3d const& to,
+                        wchar_t const* block = kModelSpaceName) {
+        auto* const line = new TzDbLine;
+        line->setDatabaseDefaults();
+        line->setStartPoint(from);
+        line->setEndPoint(to);
+        return add(line, block);
+    }
+    std::string addText(TzGePoint3d const& at, wchar_t const* contents, double degrees = 0) {
+        auto* const text = new TzDbMText;
+        text->setDatabaseDefaults();
+        text->setLocation(at);
+        text->setTextHeight(1);
+        text->setContents(contents);
+        text->setRotation(degrees * 3.14159265358979323846 / 180);
+        return add(text);
+    }
+    // An empty block.
+    TzDbObjectId addBlock(wchar_t const* name) {
+        TzDbBlockTable* table = nullptr;
+        TzDbObjectId id;
+        auto* const record = new TzDbBlockTableRecord;
+        record->setName(name);
+        if (drawing_->getBlockTable(table, TzDb::kForWrite) != Tzad::eOk) return id;
+        if (table->addRecord(record, id) == Tzad::eOk) record->close();
+        table->close();
+        return id;
+    }
+    std::string addLayer(wchar_t const* name, bool isLocked) {
+        TzDbLayerTable* table = nullptr;
+        TzDbObjectId id;
+        auto* const record = new TzDbLayerTableRecord;
+        record->setName(name);
+        record->setIsLocked(isLocked);
+        if (drawing_->getLayerTable(table, TzDb::kForWrite) != Tzad::eOk) return "no table";
+        if (table->addRecord(record, id) == Tzad::eOk) record->close();
+        table->close();
+        return handle(id);
+    }
+
+    [[nodiscard]] static std::string handle(TzDbObjectId id) {
+        return TzString::formatted(L"%llX", static_cast<unsigned long long>(id.handle())).toUtf8();
+    }
+    [[nodiscard]] static std::string handleOf(long long const* name) {
+        TzDbObjectId id;
+        return tzdbGetObjectId(id, name) == Tzad::eOk ? handle(id) : "none";
+    }
+    [[nodiscard]] TzDbObjectId id(std::string const& handle) const {
+        return drawing_->objectAt(std::stoull(handle, nullptr, 16));
+    }
+    [[nodiscard]] Drawing& drawing() const { return *drawing_; }
+
+private:
+    std::unique_ptr<Drawing> drawing_;
+};
+
+// The handles of a set, apart by blanks, or "none" for a set that is not there.
+[[nodiscard]] inline std::string handlesOf(long long const* set) {
+    int length = 0;
+    if (tzedSSLength(set, &length) != Tzad::ePromptNormal) return "none";
+    std::string all;
+    for (int i = 0; i < length; ++i) {
+        long long name[2] = {};
+        if (tzedSSName(set, i, name) != Tzad::ePromptNormal) return "broken";
+        all += (i > 0 ? " " : "") + OpenDrawing::handleOf(name);
+    }
+    return all;
+}
+
+}  // namespace tzhost::test
