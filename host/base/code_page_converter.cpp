@@ -11,59 +11,88 @@ namespace tzhost {
 
 namespace {
 
-// Both directions of one page. Opened once and kept, as opening costs far more than a character.
+// One open converter of iconv.
+class Converter {
+public:
+    Converter(char const* to, char const* from) : handle_(::iconv_open(to, from)) {}
+    ~Converter() {
+        if (isOpen()) ::iconv_close(handle_);
+    }
+    Converter(Converter const&) = delete;
+    Converter& operator=(Converter const&) = delete;
+
+    [[nodiscard]] bool isOpen() const {
+        return handle_ != reinterpret_cast<iconv_t>(-1);  // as iconv_open fails
+    }
+
+    // Converts `size` bytes at `from` into `room` bytes at `to`, whole characters from a fresh
+    // start: how many bytes were written, or nothing when some cannot be converted, or only to
+    // others.
+    std::optional<std::size_t> run(char* from, std::size_t size, char* to, std::size_t room) const {
+        std::size_t const before = room;
+        ::iconv(handle_, nullptr, nullptr, nullptr, nullptr);
+        if (::iconv(handle_, &from, &size, &to, &room) != 0 || size != 0) return std::nullopt;
+        ::iconv(handle_, nullptr, nullptr, &to, &room);
+        return before - room;
+    }
+
+private:
+    iconv_t handle_;
+};
+
+// Both directions of one page. Opened once and kept, as opening costs far more than a character;
+// the characters of a single byte stand in a table.
 class Page {
 public:
-    explicit Page(int number)
-        : toText_(::iconv_open("WCHAR_T", iconvNameOf(number).c_str())),
-          toBytes_(::iconv_open(iconvNameOf(number).c_str(), "WCHAR_T")) {}
-    ~Page() {
-        if (isOpen(toText_)) ::iconv_close(toText_);
-        if (isOpen(toBytes_)) ::iconv_close(toBytes_);
-    }
-    Page(Page const&) = delete;
-    Page& operator=(Page const&) = delete;
+    explicit Page(int number) : Page(number, iconvNameOf(number)) {}
 
-    [[nodiscard]] bool isKnown() const { return isOpen(toText_) && isOpen(toBytes_); }
+    [[nodiscard]] bool isKnown() const { return toText_.isOpen() && toBytes_.isOpen(); }
+    // The character of a single byte, or kNone.
+    [[nodiscard]] wchar_t single(char byte) const {
+        return singles_[static_cast<unsigned char>(byte)];
+    }
+    static constexpr wchar_t kNone = -1;
 
     // Appends the text of the bytes; false, with the text as it was, when they are no characters.
     bool decode(std::string_view bytes, std::wstring& text) const {
         std::wstring room(bytes.size() + 1, L'\0');
         std::string source(bytes);
-        char* in = source.data();
-        std::size_t inLeft = source.size();
-        char* out = reinterpret_cast<char*>(room.data());  // iconv writes wide characters as bytes
-        std::size_t outLeft = room.size() * sizeof(wchar_t);
-        ::iconv(toText_, nullptr, nullptr, nullptr, nullptr);
-        if (::iconv(toText_, &in, &inLeft, &out, &outLeft) == kFailed || inLeft != 0) return false;
-        ::iconv(toText_, nullptr, nullptr, &out, &outLeft);
-        text.append(room, 0, room.size() - outLeft / sizeof(wchar_t));
+        // iconv writes wide characters as bytes.
+        auto const written =
+            toText_.run(source.data(), source.size(), reinterpret_cast<char*>(room.data()),
+                        room.size() * sizeof(wchar_t));
+        if (!written) return false;
+        text.append(room, 0, *written / sizeof(wchar_t));
         return true;
     }
 
     // Appends the bytes of one character; false when the page lacks it.
     bool encode(wchar_t c, std::string& bytes) const {
         std::array<char, 16> room{};
-        char* in = reinterpret_cast<char*>(&c);  // iconv reads wide characters as bytes
-        std::size_t inLeft = sizeof c;
-        char* out = room.data();
-        std::size_t outLeft = room.size();
-        ::iconv(toBytes_, nullptr, nullptr, nullptr, nullptr);
-        // More than 0 counts characters that were replaced by similar ones.
-        if (::iconv(toBytes_, &in, &inLeft, &out, &outLeft) != 0) return false;
-        ::iconv(toBytes_, nullptr, nullptr, &out, &outLeft);
-        bytes.append(room.data(), room.size() - outLeft);
-        return true;
+        // iconv reads wide characters as bytes.
+        auto const written =
+            toBytes_.run(reinterpret_cast<char*>(&c), sizeof c, room.data(), room.size());
+        if (written) bytes.append(room.data(), *written);
+        return written.has_value();
     }
 
 private:
-    static constexpr auto kFailed = static_cast<std::size_t>(-1);
-    static bool isOpen(iconv_t converter) {
-        return converter != reinterpret_cast<iconv_t>(-1);  // as iconv_open fails
+    Page(int number, std::string const& name)
+        : toText_("WCHAR_T", name.c_str()), toBytes_(name.c_str(), "WCHAR_T") {
+        for (int byte = 0; byte < 0x100; ++byte) {
+            auto const at = static_cast<std::size_t>(byte);
+            std::wstring text;
+            bool const isAlone =
+                byte >= 0x80 && !isLeadByte(number, static_cast<unsigned char>(byte));
+            bool const isRead =
+                isAlone && isKnown() && decode(std::string(1, static_cast<char>(byte)), text);
+            singles_[at] = isRead && text.size() == 1 ? text[0] : byte < 0x80 ? byte : kNone;
+        }
     }
 
-    iconv_t toText_;
-    iconv_t toBytes_;
+    Converter toText_;
+    Converter toBytes_;
+    std::array<wchar_t, 0x100> singles_{};
 };
 
 Page const& pageOf(int number) {
@@ -83,6 +112,17 @@ bool isAscii(char byte) {
     return static_cast<unsigned char>(byte) < 0x80;
 }
 
+// How many bytes at the start of `bytes`, which is no single byte's character, are read at once: a
+// lead byte with its trail byte, or, in a page of characters of any length, up to the next ASCII
+// character.
+std::size_t lengthOfCharacters(int page, std::string_view bytes) {
+    std::size_t const most = hasLeadBytes(page) ? 2 : bytes.size();
+    std::size_t count = 1;
+    while (count < most && count < bytes.size() && (most == 2 || !isAscii(bytes[count])))
+        ++count;
+    return count;
+}
+
 }  // namespace
 
 std::optional<std::wstring> decode(int codePage, std::string_view bytes) {
@@ -90,18 +130,13 @@ std::optional<std::wstring> decode(int codePage, std::string_view bytes) {
     Page const& page = pageOf(number);
     std::wstring text;
     while (!bytes.empty()) {
-        std::size_t count = 1;
-        if (isAscii(bytes[0])) {
-            text += static_cast<wchar_t>(bytes[0]);
+        wchar_t const single = page.single(bytes[0]);
+        if (single != Page::kNone) {
+            text += single;
             bytes.remove_prefix(1);
             continue;
         }
-        if (isLeadByte(number, static_cast<unsigned char>(bytes[0])) && bytes.size() > 1) {
-            count = 2;
-        } else if (!hasLeadBytes(number)) {
-            while (count < bytes.size() && !isAscii(bytes[count]))
-                ++count;
-        }
+        std::size_t const count = lengthOfCharacters(number, bytes);
         if (!page.decode(bytes.substr(0, count), text)) return std::nullopt;
         bytes.remove_prefix(count);
     }

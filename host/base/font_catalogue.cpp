@@ -95,15 +95,11 @@ FontCatalogue const& FontCatalogue::instance() {
     return catalogue;
 }
 
-FontCatalogue::FontCatalogue() : config_(FcInitLoadConfigAndFonts()) {
-    FcFontSet const* const fonts = config_ ? FcConfigGetFonts(config_, FcSetSystem) : nullptr;
+FontCatalogue::FontCatalogue() : config_(FcInitLoadConfigAndFonts(), &FcConfigDestroy) {
+    FcFontSet const* const fonts = config_ ? FcConfigGetFonts(config_.get(), FcSetSystem) : nullptr;
     for (int i = 0; fonts != nullptr && i < fonts->nfont; ++i)
         add(fonts->fonts[i]);
     nameForms();
-}
-
-FontCatalogue::~FontCatalogue() {
-    if (config_ != nullptr) FcConfigDestroy(config_);
 }
 
 void FontCatalogue::add(FcPattern* pattern) {

@@ -11,6 +11,7 @@
 
 #include <deque>
 #include <map>
+#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -65,11 +66,11 @@ public:
 
 private:
     FontCatalogue();
-    ~FontCatalogue();
     void add(FcPattern* pattern);
     void nameForms();
 
-    FcConfig* config_;                              // owns the patterns and their character sets
+    std::unique_ptr<FcConfig, void (*)(FcConfig*)>
+        config_;                                    // owns the patterns and their character sets
     std::deque<FontForm> forms_;                    // keep their places
     std::map<std::wstring, FontFamilyRow> byName_;  // in lower case
     std::map<std::wstring, FontForm const*> byFile_;

@@ -38,11 +38,27 @@ std::wstring lowered(std::wstring_view text) {
     return lower;
 }
 
+std::string withEqualsSigns(std::string_view bytes) {
+    std::string whole;
+    whole.reserve(bytes.size());
+    while (!bytes.empty()) {
+        std::size_t const end = std::min(bytes.find_first_of("\r\n"), bytes.size());
+        std::string_view const line = bytes.substr(0, end);
+        std::size_t const start = line.find_first_not_of(" \t");
+        bool const isKey =
+            start != line.npos && std::string_view("[;#").find(line[start]) == line.npos;
+        whole += line;
+        if (isKey && line.find('=') == line.npos) whole += '=';
+        if (end < bytes.size()) whole += bytes[end];
+        bytes.remove_prefix(std::min(end + 1, bytes.size()));
+    }
+    return whole;
+}
+
 IniData IniData::fromBytes(std::string_view bytes) {
     CSimpleIniA reader(true, true, false);  // UTF-8, keys more than once, values on one line
-    reader.SetAllowKeyOnly(true);
     IniData data;
-    if (reader.LoadData(bytes.data(), bytes.size()) < 0) return data;
+    if (reader.LoadData(withEqualsSigns(bytes)) < 0) return data;
     CSimpleIniA::TNamesDepend sections;
     reader.GetAllSections(sections);
     sections.sort(CSimpleIniA::Entry::LoadOrder());

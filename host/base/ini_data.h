@@ -35,6 +35,10 @@ private:
 // Never null.
 [[nodiscard]] std::shared_ptr<IniData const> openIni(std::string const& path);
 
+// The bytes with an equals sign behind each key that stands alone, as the file reader needs it: it
+// would give such a key the value of the line before.
+[[nodiscard]] std::string withEqualsSigns(std::string_view bytes);
+
 // Text in lower case, by the host's table.
 [[nodiscard]] std::wstring lowered(std::wstring_view text);
 

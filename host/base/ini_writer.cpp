@@ -4,6 +4,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/base/file_bytes.h"
+#include "host/base/ini_data.h"
 #include "host/base/utf8.h"
 #include "tz/pal/ini_file.h"
 
@@ -17,10 +18,9 @@ bool WritePrivateProfileString(wchar_t const* section,
     std::string const name = tzhost::toUtf8(section);
     std::string const keyName = tzhost::toUtf8(key ? key : L"");
     CSimpleIniA ini(true, true, false);  // UTF-8, keys more than once, values on one line
-    ini.SetAllowKeyOnly(true);
     ini.SetSpaces(false);
     std::string const old = tzhost::readFile(path).value_or("");
-    if (ini.LoadData(old) < 0) return false;
+    if (ini.LoadData(tzhost::withEqualsSigns(old)) < 0) return false;
     if (key == nullptr) {
         ini.Delete(name.c_str(), nullptr);
     } else if (value == nullptr) {

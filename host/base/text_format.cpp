@@ -3,6 +3,7 @@
 // follow the locale, and it must be told the size of its result.
 
 #include <array>
+#include <charconv>
 #include <cstddef>
 #include <cstdint>
 #include <cstdio>
@@ -28,6 +29,11 @@ struct Directive {
     Length length = Length::normal;
     wchar_t letter = 0;
 
+    // The common case, which needs none of the C library's care.
+    [[nodiscard]] bool isPlainDecimal() const {
+        return flags.empty() && width < 0 && precision < 0 &&
+               (letter == L'd' || letter == L'i' || letter == L'u');
+    }
     [[nodiscard]] bool isLeft() const { return flags.find('-') != std::string::npos; }
 };
 
@@ -174,7 +180,13 @@ private:
 
     template <class Value>
     void number(Directive const& directive, Value value) {
-        appendNarrow(narrowFormat(directive, "ll"), value);
+        if (!directive.isPlainDecimal()) {
+            appendNarrow(narrowFormat(directive, "ll"), value);
+            return;
+        }
+        std::array<char, 24> room;
+        auto const [end, error] = std::to_chars(room.data(), room.data() + room.size(), value);
+        text_.append(room.data(), end);
     }
 
     void real(Directive const& directive) {
@@ -220,10 +232,11 @@ private:
         }
         wchar_t const* text = va_arg(arguments_, wchar_t const*);
         if (text == nullptr) text = L"(null)";
-        field(directive, std::wstring(text, isBounded ? wcsnlen(text, most) : std::wcslen(text)));
+        field(directive,
+              std::wstring_view(text, isBounded ? wcsnlen(text, most) : std::wcslen(text)));
     }
 
-    void field(Directive const& directive, std::wstring const& content) {
+    void field(Directive const& directive, std::wstring_view content) {
         auto const width = static_cast<std::size_t>(directive.width > 0 ? directive.width : 0);
         std::size_t const blanks = width > content.size() ? width - content.size() : 0;
         if (!directive.isLeft()) text_.append(blanks, L' ');

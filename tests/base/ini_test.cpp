@@ -53,7 +53,7 @@ constexpr IniRow kIniRows[] = {
     {"WrittenTwice",           "[A]\nk=1\nx=2\nK=3\n",           L"k=3|x=2|K=3|"        },
     {"SectionInAnotherCase",   "[a]\nk=v\n",                     L"k=v|"                },
     {"SectionInTwoPieces",     "[A]\nk=1\n[B]\nk=2\n[A]\nj=3\n", L"k=1|j=3|"            },
-    {"NoValue",                "[A]\nk=\nj\n",                   L"k=|j=|"              },
+    {"NoValue",                "[A]\ni=1\nk=\nj\n l \n",         L"i=1|k=|j=|l=|"       },
     {"Bom",                    "\xEF\xBB\xBF[A]\nk=v\n",         L"k=v|"                },
     {"Utf8WithoutCase",
      "[A]\nGr\xC3\x96\xC3\x9F"
