@@ -6,6 +6,7 @@
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
+#include "host/faults/memory.h"
 #include "host/runtime/documents.h"
 #include "tz/rx/status.h"
 
@@ -130,15 +131,18 @@ bool addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* 
     tzhost::Document* const open = tzhost::asOpen(document);
     if (open == nullptr || filter == nullptr) return false;
     if (tzhost::findFilter(open->filters, filter) != open->filters.end()) return false;
+    // All that may lack memory comes first, so that a filter is either there or not.
+    open->filters.reserve(open->filters.size() + 1);
+    tzhost::reportFilter("add", flags);
     open->filters.push_back({filter, flags});
     ++tzhost::audit().filters;
-    tzhost::reportFilter("add", flags);
     return true;
 }
 
 // Takes the filter back even when the plan makes it report a failure.
 bool removeSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter) {
     bool const isFaulty = tzhost::faultAt("removeSSgetFilterInputContextReactor").has_value();
+    tzhost::MemoryFaultPause const pause;  // destructors call this
     tzhost::Document* const open = tzhost::asOpen(document);
     if (open == nullptr) return false;
     auto const at = tzhost::findFilter(open->filters, filter);

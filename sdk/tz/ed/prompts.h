@@ -21,16 +21,17 @@ class TzDbDatabase;
 
 // Arms the next question. `keywords` lists the words, apart by blanks, the local ones first; behind
 // " _" the same number of global words may follow. A word's capitals are its abbreviation. Null and
-// "" mean none. 5100, or -5001 when the two lists differ in length.
+// "" mean none. 5100, or -5001 when the two lists differ in length, and what was armed stays.
 TZ_API int tzedInitGet(int flags, wchar_t const* keywords);
 // A keyword of the armed list; `result` takes the global word. An empty answer gives 5000 when the
-// flags let it through.
+// flags let it through, which leaves `result` alone, as a failure does.
 [[nodiscard]] TZ_API int tzedGetKword(wchar_t const* prompt, TzString& result);
 // A line of text; with `allowSpaces` not 0 blanks belong to it, else a blank ends it. `result` is
 // emptied first. An empty answer gives 5100 and an empty text.
 [[nodiscard]] TZ_API int tzedGetString(int allowSpaces, wchar_t const* prompt, TzString& result);
-// A point in user coordinates; with a base point, given in user coordinates or null, the answer may
-// be relative to it in the drag. `result` holds three coordinates and is left alone but for 5100.
+// A point in user coordinates, which becomes the last point. A base point, in user coordinates or
+// null, is for hosts with a screen. `result` holds three coordinates and is left alone but for
+// 5100.
 [[nodiscard]] TZ_API int tzedGetPoint(double const* base, wchar_t const* prompt, double* result);
 // A real number; no points.
 [[nodiscard]] TZ_API int tzedGetReal(wchar_t const* prompt, double* result);
@@ -53,8 +54,7 @@ TZ_API int tzedInitGet(int flags, wchar_t const* keywords);
 [[nodiscard]] TZ_API bool tzedMacroPlayback();
 
 // The question for a name of a symbol (style, layer, block). It lets "?", "*", patterns and names
-// with
-// "|" through and refuses other characters that no symbol may hold.
+// with "|" through and refuses other characters that no symbol may hold.
 class TZ_API TzEdSymbolUtilities {
 public:
     class TZ_API Services {

@@ -7,18 +7,21 @@ struct resbuf;
 // Selections and picks. A selection set and an entity are named by pairs of 64-bit integers; a set
 // lives from tzedSSGet to tzedSSFree, within the command. Statuses as in tz/ed/prompts.h.
 //
-// Modes of tzedSSGet, in one text: "_" nothing further; "I" the implied set, without a question;
-// "X" all entities; ":$" the second argument is a pair of prompts (to add and to remove); ":K" the
-// words armed by tzedInitGet go to the keyword callback and the question goes on; ":L" and ":l"
-// leave out entities on locked layers; ":c" and ":p" change nothing. Null asks in the ordinary way.
+// Modes of tzedSSGet, in one text, null as "": "_" nothing further; "I" the implied set; "X" all
+// entities of both spaces; "L" the newest entity; "P" the set that was selected last; "W" and "C"
+// what lies in the box between two points, and what it touches; ":$" the second argument is a pair
+// of prompts (to add and to remove); ":K" the words armed by tzedInitGet go to the keyword callback
+// and the question goes on; ":L" and ":l" leave out entities on locked layers; ":c" and ":p" change
+// nothing. Without a capital the user is asked, or a point given as the second argument taken.
 //
 // A filter is a list of conditions that an entity must meet all: codes 0 and 5020 the type's name,
 // 8 the layer, 7 the text style; names may hold the wildcards of tzutWcMatchEx.
 
-// [command] `first` and `second` are points (double[3]) or, with ":$", `first` is a wchar_t
-// const*[2] of prompts; they may be null. `filter` may be null. `set` takes the name of the new
-// set, also when nothing was selected: 5100 with at least one entity, -5001 with none, -5002 on
-// cancel.
+// [command] `first` and `second` are points (double[3], user coordinates) or, with ":$", `first` is
+// a wchar_t const*[2] of prompts and `second` is not looked at; they may be null. `filter` may be
+// null. 5100 with at least one entity, and `set` takes the name of a new set; -5001 with none, for
+// an unknown mode or filter code, -5002 on cancel, -5005 for a keyword that goes to no callback:
+// then `set` takes a name of no set. The flags of tzedInitGet do not apply, its words do.
 [[nodiscard]] TZ_API int tzedSSGet(wchar_t const* mode,
                                    void const* first,
                                    void const* second,

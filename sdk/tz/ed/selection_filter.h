@@ -45,9 +45,9 @@ public:
                           TzArray<TzDbObjectId> const& selectionSet);
 };
 
-// [command] Installs a filter on a document's input, or takes it back; the host does not own it. 15
-// as `flags` asks for every hook. False when the document is null, or the filter is there already
-// or not.
+// [command] Installs a filter on a document's input, or takes it back; the host does not own it.
+// The bits of `flags` ask for hooks: 1 additions, 2 removals, 4 the end; 15 asks for every one.
+// False when the document is null, or the filter is there already or not.
 TZ_API bool
 addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter, int flags);
 TZ_API bool removeSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter);
