@@ -36,7 +36,7 @@ enum class QuestionKind {
 // What is asked, for sources that let a person see and edit.
 struct AnswerRequest {
     QuestionKind kind = QuestionKind::command;
-    std::wstring_view prompt;         // what stands on the screen ahead of the answer
+    std::wstring_view prompt;         // ahead of the answer; to a terminal, one line that it shows
     std::vector<std::wstring> words;  // what completion may offer
 };
 

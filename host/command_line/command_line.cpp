@@ -78,12 +78,16 @@ Answer CommandLine::readFromSource(AnswerRequest const& request) {
 Answer CommandLine::ask(AnswerRequest const& request) {
     bool const isSent = !sent_.isEmpty();
     bool const isOnTerminal = !isSent && !isScripted();
+    AnswerRequest shown = request;
     if (isOnTerminal) {
-        transcript_.freshLine();
+        // The terminal edits one line: what stands above it is shown from here.
+        std::size_t const above = request.prompt.rfind(L'\n') + 1;
+        shown.prompt.remove_prefix(above);
+        transcript_.prompt(request.prompt.substr(0, above));
     } else {
         transcript_.prompt(request.prompt);
     }
-    Answer answer = isSent ? sent_.next() : readFromSource(request);
+    Answer answer = isSent ? sent_.next() : readFromSource(shown);
     if (answer.kind != Answer::Kind::end) failures_ = 0;
     if (isOnTerminal) {
         transcript_.answeredOnTerminal();

@@ -1,0 +1,103 @@
+// The idle prompt: commands from scripts, from strings that were sent, and from a terminal.
+
+#include <gtest/gtest.h>
+
+#include <deque>
+
+#include "host/runtime/documents.h"
+#include "tests/command_line/session.h"
+#include "tz/ed/print.h"
+#include "tz/ed/prompts.h"
+#include "tz/rx/status.h"
+
+namespace {
+
+using tzhost::commandLine;
+using tzhost::test::Session;
+
+// Every command up to the end of the input, apart by bars.
+std::wstring commands() {
+    std::wstring all;
+    while (auto const command = commandLine().readCommand())
+        all += *command + L"|";
+    return all;
+}
+
+TEST(IdlePrompt, ReadsCommandsAndStepsOverTheRest) {
+    Session const session(";; a comment\nMTEXT\n\n^C\n<<<\nx\n>>>\n" + std::string(40000, 'x') +
+                          "\nQUIT");
+    EXPECT_EQ(commands(), L"MTEXT||QUIT|");
+    EXPECT_EQ(session.errors(), L"script:5: no editor takes this block\n");
+    EXPECT_EQ(session.transcript(), L"Command: MTEXT\nCommand: \nCommand: ^C\nCommand: \n"
+                                    L"That line is too long.\nCommand: QUIT\nCommand: ");
+}
+
+TEST(IdlePrompt, EndsWithoutAFault) {
+    Session const session("");
+    EXPECT_EQ(commands(), L"");
+    EXPECT_FALSE(commandLine().hasFailed());
+    EXPECT_EQ(session.events(), "");
+}
+
+TEST(IdlePrompt, TakesSentStringsAheadOfTheScript) {
+    Session const session("from the script\n");
+    tzhost::documents().open(nullptr);
+    auto* const document = tzhost::documents().current();
+    ASSERT_EQ(tzDocManagerPtr()->sendStringToExecute(document, L"_TEST 1.5 ", true, false, true),
+              0);
+    EXPECT_EQ(commandLine().readCommand(), L"_TEST");
+    // What is sent while a command runs waits until it has ended.
+    ASSERT_EQ(tzDocManagerPtr()->sendStringToExecute(document, L"NEXT\n", true, false, true), 0);
+    double value = 0;
+    EXPECT_EQ(tzedGetReal(L"? ", &value), Tzad::ePromptNormal);
+    EXPECT_EQ(value, 1.5);
+    TzString text;
+    EXPECT_EQ(tzedGetString(1, L"? ", text), Tzad::ePromptNormal);
+    EXPECT_EQ(text, L"from the script");
+    EXPECT_EQ(commandLine().readCommand(), L"NEXT");
+    tzhost::documents().close();
+}
+
+// Shows prompts and answers on the same screen, and an Enter behind each.
+class Terminal : public tzhost::AnswerSource {
+public:
+    Terminal(std::wstring& screen, std::deque<std::wstring> lines)
+        : screen_(screen), lines_(std::move(lines)) {}
+    tzhost::Answer next(tzhost::AnswerRequest const& request) override {
+        words += std::to_string(request.words.size());
+        if (lines_.empty()) return {};
+        screen_ += std::wstring(request.prompt) + lines_.front() + L"\n";
+        tzhost::Answer answer{tzhost::Answer::Kind::line, lines_.front()};
+        lines_.pop_front();
+        return answer;
+    }
+    [[nodiscard]] bool isTerminal() const override { return true; }
+
+    std::string words;  // how many words each question offered
+
+private:
+    std::wstring& screen_;
+    std::deque<std::wstring> lines_;
+};
+
+TEST(Terminals, ShowEachLineOnce) {
+    Session const session("");
+    std::wstring screen;
+    Terminal terminal(screen, {L"MTEXT", L"b", L"7"});
+    commandLine().setSource(&terminal);
+    commandLine().setScreen([&](std::wstring_view text) { screen += text; });
+    EXPECT_FALSE(commandLine().isScripted());
+    EXPECT_EQ(commandLine().readCommand({L"MTEXT", L"MTEDIT"}), L"MTEXT");
+    tzutPrintf(L"\nStarting");
+    TzString word;
+    ASSERT_EQ(tzedInitGet(0, L"Breite Tief Hoch"), Tzad::ePromptNormal);
+    EXPECT_EQ(tzedGetKword(L"Which: ", word), Tzad::ePromptNormal);
+    tzutPrintf(L"\n");
+    double value = 0;
+    EXPECT_EQ(tzedGetReal(L"\nHow much: ", &value), Tzad::ePromptNormal);
+    tzutPrintf(L"Done");
+    EXPECT_EQ(screen, L"Command: MTEXT\nStarting\nWhich: b\nHow much: 7\nDone");
+    EXPECT_EQ(terminal.words, "230");
+}
+
+}  // namespace
