@@ -162,7 +162,7 @@ void DrawingWriter::header() {
     members_.open();
     writeText(members_.begin("format"), "tz-drawing");
     members_.number("version", 1);
-    out_ += '\n';
+    members_.breakLines();
     variables();
     DrawingSettings const& settings = drawing_.settings();
     userSystem("ucs", settings.modelSystem);
@@ -192,7 +192,6 @@ void DrawingWriter::variables() {
             }
         }
     });
-    out_ += '\n';
 }
 
 void DrawingWriter::userSystem(char const* name, UserSystem const& system) {
@@ -201,7 +200,6 @@ void DrawingWriter::userSystem(char const* name, UserSystem const& system) {
         inner.direction("x", system.xAxis);
         inner.direction("y", system.yAxis);
     });
-    out_ += '\n';
 }
 
 template <class Imp>
@@ -210,7 +208,7 @@ void DrawingWriter::table(char const* name, TzDbObjectId table) {
     bool first = true;
     for (TzDbObjectRecord const* const each : listOf(*table.record())->items) {
         if (each->erased) continue;
-        out_ += first ? "\n" : ",\n";
+        out_ += first ? "\n  " : ",\n  ";
         first = false;
         Imp& values = valuesOf<Imp>(*each->object);
         MemberWriter members(out_, values.unknown.get());
@@ -219,14 +217,14 @@ void DrawingWriter::table(char const* name, TzDbObjectId table) {
         describe(members, values);
         members.close();
     }
-    out_ += "]\n";
+    out_ += ']';
 }
 
 void DrawingWriter::entities(TzDbObjectId block, Named space, bool& first) {
     for (TzDbObjectRecord const* const each :
          valuesOf<BlockImp>(*block.record()->object).entities->items) {
         if (each->erased) continue;
-        out_ += first ? "\n" : ",\n";
+        out_ += first ? "\n  " : ",\n  ";
         first = false;
         EntityWriter(out_, *each).write(space);
         good_ = good_ && flush();
@@ -240,7 +238,7 @@ void DrawingWriter::blocks() {
     for (TzDbObjectRecord* const each : listOf(*drawing_.blockTableId().record())->items) {
         TzDbObjectId const id(each);
         if (each->erased || id == drawing_.modelSpace() || id == drawing_.paperSpace()) continue;
-        out_ += firstBlock ? "\n" : ",\n";
+        out_ += firstBlock ? "\n  " : ",\n  ";
         firstBlock = false;
         BlockImp& values = valuesOf<BlockImp>(*each->object);
         MemberWriter members(out_, values.unknown.get());
@@ -253,7 +251,7 @@ void DrawingWriter::blocks() {
         out_ += ']';
         members.close();
     }
-    out_ += "]\n";
+    out_ += ']';
 }
 
 bool DrawingWriter::flush() {
@@ -271,7 +269,7 @@ bool DrawingWriter::write() {
     bool first = true;
     entities(drawing_.modelSpace(), Named::asSpace, first);
     entities(drawing_.paperSpace(), Named::asSpace, first);
-    out_ += "]\n";
+    out_ += ']';
     DrawingSettings const& settings = drawing_.settings();
     members_.nested("workingSet", [&](MemberWriter& inner) {
         inner.flag("exists", settings.workingSetExists);

@@ -34,7 +34,7 @@ void MemberWriter::close() {
 }
 
 std::string& MemberWriter::begin(std::string_view name) {
-    if (!first_) out_ += ',';
+    if (!first_) out_ += separator_;
     first_ = false;
     writeText(out_, name);
     out_ += ':';

@@ -23,6 +23,8 @@ public:
         : out_(out), kept_(kept), path_(std::move(path)) {}
 
     void open();
+    // The members that follow stand on lines of their own.
+    void breakLines() { separator_ = ",\n "; }
     // The unknown members come last.
     void close();
 
@@ -57,6 +59,7 @@ private:
     std::string& out_;
     UnknownMembers const* kept_;
     std::string path_;
+    char const* separator_ = ",";
     bool first_ = true;
 };
 

@@ -1,0 +1,155 @@
+#include "host/base/variables.h"
+#include "tests/database/drawing_fixture.h"
+#include "tz/db/field.h"
+#include "tz/db/shapes.h"
+#include "tz/db/text.h"
+#include "tz/ed/ucs.h"
+
+using tzhost::Variables;
+using tzhost::test::DrawingFixture;
+using tzhost::test::DrawingTest;
+
+namespace {
+
+// What a command does, and a view of the drawing that must be the same before it and after undo.
+struct Deed {
+    char const* name;
+    void (*act)(DrawingFixture& fixture, TzDbObjectId text);
+};
+
+template <class T>
+void change(TzDbObjectId id, void (*act)(T& object)) {
+    T* object = nullptr;
+    ASSERT_EQ(tzdbOpenObject(object, id, TzDb::kForWrite), Tzad::eOk);
+    act(*object);
+    object->close();
+}
+
+Deed const kDeeds[] = {
+    {"Append", [](DrawingFixture& f, TzDbObjectId) { f.addText(L"new"); }},
+    {"AppendMany",
+     [](DrawingFixture& f, TzDbObjectId) {
+         for (int i = 0; i < 5; ++i) f.add(new TzDbLine);
+     }},
+    {"Erase",
+     [](DrawingFixture&, TzDbObjectId id) {
+         change<TzDbMText>(id, [](TzDbMText& text) { text.erase(); });
+     }},
+    {"ChangeTwice",
+     [](DrawingFixture&, TzDbObjectId id) {
+         change<TzDbMText>(id, [](TzDbMText& text) { text.setContents(L"one"); });
+         change<TzDbMText>(id, [](TzDbMText& text) {
+             text.setContents(L"two");
+             text.setStaticColumns(3, 1, 2);
+             text.setBackgroundFill(true);
+         });
+     }},
+    {"Move",
+     [](DrawingFixture&, TzDbObjectId id) {
+         change<TzDbMText>(id, [](TzDbMText& text) {
+             text.transformBy(TzGeMatrix3d::translation({1, 2, 3}));
+         });
+     }},
+    {"AppendAndErase",
+     [](DrawingFixture& f, TzDbObjectId) {
+         change<TzDbMText>(f.addText(L"new"), [](TzDbMText& text) { text.erase(); });
+     }},
+    {"Field",
+     [](DrawingFixture&, TzDbObjectId id) {
+         change<TzDbMText>(id, [](TzDbMText& text) { text.setContents(L"%<\\Var LUNITS>%"); });
+     }},
+    {"Layer",
+     [](DrawingFixture& f, TzDbObjectId id) {
+         TzDbObjectId const layer = f.addLayer(L"New");
+         TzDbMText* text = nullptr;
+         ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
+         EXPECT_EQ(text->setLayer(layer), Tzad::eOk);
+         text->close();
+         EXPECT_EQ(f.drawing->setClayer(layer), Tzad::eOk);
+     }},
+    {"Rename",
+     [](DrawingFixture& f, TzDbObjectId) {
+         change<TzDbLayerTableRecord>(
+             f.drawing->clayer(), [](TzDbLayerTableRecord& layer) { layer.setName(L"Walls"); });
+     }},
+    {"Style",
+     [](DrawingFixture& f, TzDbObjectId) {
+         change<TzDbTextStyleTableRecord>(
+             f.drawing->textstyle(),
+             [](TzDbTextStyleTableRecord& style) { style.setXScale(2.0); });
+     }},
+    {"Variables",
+     [](DrawingFixture&, TzDbObjectId) {
+         (void)Variables::instance().set(L"TEXTSIZE", 7.5, tzhost::Writer::module);
+         (void)Variables::instance().set(L"TILEMODE", short{0}, tzhost::Writer::user);
+     }},
+    {"UserSystem",
+     [](DrawingFixture&, TzDbObjectId) {
+         TzGeMatrix3d const turned = TzGeMatrix3d::rotation(0.5, TzGeVector3d::kXAxis);
+         ASSERT_EQ(tzedSetCurrentUCS(turned), 0);
+         ASSERT_EQ(tzedSetCurrentUCS(TzGeMatrix3d()), 0);
+         EXPECT_EQ(tzedRestorePreviousUCS(), 0);
+     }},
+};
+
+class Undo : public testing::TestWithParam<Deed>, protected DrawingFixture {
+protected:
+    std::string view() {
+        std::string text = list();
+        TzDbMText const& lines = at<TzDbMText>(id_);
+        text += '\n' + lines.contents().toUtf8() + ' ' + std::to_string(lines.location().x) + ' ' +
+                std::to_string(lines.columns().columnCount) + ' ' +
+                std::to_string(lines.backgroundFillOn()) + ' ' +
+                std::to_string(lines.actualWidth()) + '\n';
+        TzDbField* field = nullptr;
+        text += std::to_string(lines.getField(L"TEXT", field, TzDb::kForRead));
+        if (field) field->close();
+        for (auto const& [name, value] : Variables::instance().kept(tzhost::KeptIn::drawing))
+            text += '\n' + TzString(name).toUtf8() + TzString(writeValue(value)).toUtf8();
+        text += '\n' + std::to_string(drawing->ucsydir().z);
+        for (wchar_t const* const layer : {L"0", L"New", L"Walls"}) {
+            TzDbLayerTable* table = nullptr;
+            EXPECT_EQ(drawing->getLayerTable(table, TzDb::kForRead), Tzad::eOk);
+            text += table->has(layer) ? " yes" : " no";
+            table->close();
+        }
+        return text;
+    }
+
+    TzDbObjectId id_ = addText(L"abc");
+};
+
+TEST_P(Undo, TakesBackAllOf) {
+    std::string const before = view();
+    drawing->undoLog().begin();
+    GetParam().act(*this, id_);
+    drawing->undoLog().end();
+    EXPECT_TRUE(drawing->undoLog().takeBack());
+    EXPECT_EQ(view(), before);
+    EXPECT_FALSE(drawing->undoLog().takeBack());
+    while (tzedRestorePreviousUCS() == 0) {}
+}
+
+INSTANTIATE_TEST_SUITE_P(Deeds, Undo, testing::ValuesIn(kDeeds), [](auto const& row) {
+    return row.param.name;
+});
+
+TEST_F(DrawingTest, UndoGoesStepByStep) {
+    auto& log = drawing->undoLog();
+    for (wchar_t const* const text : {L"a", L"b"}) {
+        log.begin();
+        addText(text);
+        log.end();
+    }
+    log.begin();  // a command that changes nothing is no step
+    log.end();
+    log.begin();
+    EXPECT_TRUE(log.takeBack());
+    log.end();
+    EXPECT_EQ(list(), "1 MTEXT 0");
+    EXPECT_TRUE(log.takeBack());
+    EXPECT_EQ(list(), "");
+    EXPECT_FALSE(log.takeBack());
+}
+
+}  // namespace
