@@ -184,12 +184,12 @@ void EntityReader::refuseCycles() {
         std::size_t next;
     };
     std::map<TzDbObjectRecord const*, Mark> marks;
-    for (auto const& start : inside) {
-        if (marks.contains(start.first)) continue;
+    for (OpenReference const& each : references_) {
+        TzDbObjectRecord const* const start = each.reference->owner;
+        if (!marks.emplace(start, Mark::open).second) continue;
         std::vector<Visit> path{
-            {start.first, 0}
+            {start, 0}
         };
-        marks[start.first] = Mark::open;
         while (!path.empty()) {
             auto& [block, next] = path.back();
             auto const at = inside.find(block);
@@ -207,7 +207,7 @@ void EntityReader::refuseCycles() {
                                          "leads back to the block that holds it, expected another");
             }
             if (mark != marks.end()) continue;
-            marks[target] = Mark::open;
+            marks.emplace(target, Mark::open);
             path.push_back({target, 0});
         }
     }

@@ -105,7 +105,7 @@ protected:
         text += std::to_string(lines.getField(L"TEXT", field, TzDb::kForRead));
         if (field) field->close();
         for (auto const& [name, value] : Variables::instance().kept(tzhost::KeptIn::drawing))
-            text += '\n' + TzString(name).toUtf8() + TzString(writeValue(value)).toUtf8();
+            text += '\n' + TzString(name).toUtf8() + TzString(tzhost::writeValue(value)).toUtf8();
         text += '\n' + std::to_string(drawing->ucsydir().z);
         for (wchar_t const* const layer : {L"0", L"New", L"Walls"}) {
             TzDbLayerTable* table = nullptr;

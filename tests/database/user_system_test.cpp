@@ -64,7 +64,7 @@ TEST_F(DrawingTest, RotationCountsFromTheSystemsAxis) {
     (void)text.setDirection({0, 1, 0});
     EXPECT_DOUBLE_EQ(text.rotation(), kRight);
     ASSERT_EQ(tzedSetCurrentUCS(TzGeMatrix3d::rotation(kRight, {0, 0, 1})), 0);
-    EXPECT_DOUBLE_EQ(text.rotation(), 0.0);
+    EXPECT_NEAR(text.rotation(), 0.0, 1e-15);
     (void)text.setRotation(kRight);
     EXPECT_EQ(text.direction(), TzGeVector3d(-1, 0, 0));
     EXPECT_EQ(tzedRestorePreviousUCS(), 0);

@@ -1,7 +1,3 @@
-#include <filesystem>
-#include <fstream>
-#include <sstream>
-
 #include <gtest/gtest.h>
 
 #include "host/drawing_file/drawing_file.h"
@@ -32,8 +28,59 @@ struct KeptCase {
 };
 
 constexpr KeptCase kKept[] = {
-    {"Contents", R"("entities":[{"type":"MTEXT","contents":"a\"\\P\u00e9\ud834\udd1e"}])",
-     "\"contents\":\"a\\\"\\\\P\u00e9\U0001D11E\""},
+    {"Contents", R"("entities":[{"type":"MTEXT","contents":"a\"\\P\u00e9\ud834\udd1e\n\u0001"}])",
+     "\"contents\":\"a\\\"\\\\P\u00e9\U0001D11E\\n\\u0001\""},
+    {"Doubles",
+     R"("entities":[{"type":"LINE","start":[0.1,1e22,-0.0],"end":[5e-324,1.7976931348623157e308,3.0]}])",
+     R"("start":[0.1,1e+22,0],"end":[5e-324,1.7976931348623157e+308,3])"},
+    {"SlantedDirection", R"("entities":[{"type":"MTEXT","direction":[0,5,7]}])",
+     R"("direction":[0,1,0])"},
+    {"SkewNormal", R"("entities":[{"type":"CIRCLE","normal":[1,2,3],"center":[1,2,3]}])",
+     R"("center":[1,2,3],"normal":[0.26)"},
+    {"Columns",
+     R"("entities":[{"type":"MTEXT","columns":{"type":2,"heights":[3,4],"flowReversed":true}}])",
+     R"("columns":{"type":2,"autoHeight":false,"count":0,"width":0,"gutter":0,"heights":[3,4],"flowReversed":true})"},
+    {"Background", R"("entities":[{"type":"MTEXT","background":{"fill":true,"color":"#0a0B0c"}}])",
+     R"("background":{"fill":true,"color":"#0A0B0C","scale":1.5,"useBackgroundColor":false,"transparency":0})"},
+    {"PaperSpace", R"("entities":[{"type":"LINE","space":"paper"},{"type":"CIRCLE"}])",
+     R"({"handle":"1","type":"LINE","space":"paper")"},
+    {"Handles", R"("entities":[{"type":"LINE"},{"handle":"ff","type":"CIRCLE"}])",
+     R"({"handle":"100","type":"LINE")"},
+    {"Field", R"("entities":[{"type":"MTEXT","contents":"old","field":"%<\\Date>%"}])",
+     R"("field":"%<\\Date>%")"},
+    {"FieldText", R"("entities":[{"type":"MTEXT","contents":"old","field":"%<\\Date>%"}])",
+     R"("contents":"old")"},
+    {"WorkingSet",
+     R"("workingSet":{"exists":true,"active":true},"workingAngle":0.5,"entities":[{"type":"LINE","inWorkingSet":false}])",
+     "\"inWorkingSet\":false}],\n \"workingSet\":{\"exists\":true,\"active\":true},\n "
+     "\"workingAngle\":0.5"},
+    {"Definition",
+     R"("entities":[{"type":"ATTDEF","tag":"T","prompt":"P","mtext":{"contents":"c","width":3}}])",
+     R"("tag":"T","prompt":"P","mtext":{"location":[0,0,0])"},
+    {"Reference",
+     R"("entities":[{"type":"INSERT","block":"b","attributes":[{"type":"ATTRIB","tag":"T"}]}],"blocks":[{"name":"B","entities":[{"type":"INSERT","block":"C"}]},{"name":"C","origin":[1,2,3]}])",
+     R"("block":"B","position":[0,0,0],"normal":[0,0,1],"rotation":0,"scale":1,"attributes":[{"handle":"2","type":"ATTRIB")"},
+    {"TablesBehindEntities",
+     R"("entities":[{"type":"TEXT","layer":"walls","style":"Fancy"}],"textStyles":[{"name":"Fancy","height":2,"backward":true}],"layers":[{"name":"Walls","color":"#102030","locked":true}],"currentLayer":"WALLS","currentTextStyle":"fancy")",
+     R"("layer":"Walls","color":256)"},
+    {"LayersKeepTheirOrder", R"("layers":[{"name":"b"},{"name":"a"}])",
+     "{\"name\":\"b\",\"color\":7,\"locked\":false},\n  {\"name\":\"a\""},
+    {"Linetypes", R"("linetypes":[{"name":"Dashed","dashes":[1,-0.5]}])", R"("dashes":[1,-0.5])"},
+    {"Systems", R"("ucs":{"origin":[1,2,3],"x":[0,1,0],"y":[0,0,1]})",
+     R"("ucs":{"origin":[1,2,3],"x":[0,1,0],"y":[0,0,1]})"},
+    {"Variables", R"("variables":{"TEXTSIZE":2.5,"TEXTLAYER":"A","LASTPOINT":[1,2,3]})",
+     R"("LASTPOINT":[1,2,3])"},
+    {"UnknownOfTheDrawing", R"("unheardOf":{"a":[1,2.50,null,"x"]})",
+     R"("unheardOf":{"a":[1,2.50,null,"x"]})"},
+    {"UnknownVariable", R"("variables":{"NEWVAR":1})", R"("NEWVAR":1})"},
+    {"UnknownOfAnEntity", R"("entities":[{"type":"LINE","weight":0.35}])", R"("weight":0.35})"},
+    {"UnknownOfColumns", R"("entities":[{"type":"MTEXT","columns":{"rule":true}}])",
+     R"("gutter":0,"rule":true})"},
+    {"UnknownOfLines", R"("entities":[{"type":"ATTDEF","mtext":{"background":{"edge":1}}}])",
+     R"("transparency":0,"edge":1})"},
+    {"UnknownOfALayer", R"("layers":[{"name":"0","frozen":true}])",
+     R"("locked":false,"frozen":true})"},
+    {"UnknownOfABlock", R"("blocks":[{"name":"B","author":"me"}])", R"("entities":[],"author":"me"})"},
 };
 
 class RoundTrips : public testing::TestWithParam<KeptCase> {};
