@@ -20,24 +20,24 @@ struct Walk {
 };
 
 Walk const kWalks[] = {
-    {"ReadTwice",          "RRcc",   {0, 0, 0, 0},          0},
-    {"WriteBlocksRead",    "WRc",    {0, 45, 0},            0},
-    {"WriteBlocksWrite",   "WWc",    {0, 83, 0},            0},
-    {"ReadBlocksWrite",    "RWc",    {0, 15, 0},            0},
-    {"Upgrade",            "Rudcc",  {0, 0, 0, 0, 1010},    0},
+    {"ReadTwice",          "RRcc",   {0, 0, 0, 0},           0},
+    {"WriteBlocksRead",    "WRc",    {0, 45, 0},             0},
+    {"WriteBlocksWrite",   "WWc",    {0, 83, 0},             0},
+    {"ReadBlocksWrite",    "RWc",    {0, 15, 0},             0},
+    {"Upgrade",            "Rudcc",  {0, 0, 0, 0, 1010},     0},
     {"UpgradeOfTwo",       "RRuccu", {0, 0, 15, 0, 0, 1010}, 0},
-    {"UpgradeTwice",       "Ruuc",   {0, 0, 83, 0},         0},
-    {"UpgradeOfWriter",    "Wuc",    {0, 83, 0},            0},
-    {"UpgradeOfClosed",    "u",      {1010},                0},
-    {"DowngradeOfReader",  "Rdc",    {0, 1011, 0},          0},
-    {"DowngradeLetsRead",  "WdRcc",  {0, 0, 0, 0, 0},       0},
-    {"LockedForRead",      "lRc",    {0, 0, 0},             0},
-    {"LockedForWrite",     "lW",     {0, 87},               0},
-    {"LockedUpgrade",      "lRuc",   {0, 0, 87, 0},         0},
-    {"LockedWhileOpen",    "WldRcc", {0, 0, 0, 0, 0, 0},    0},
-    {"Erased",             "WecRW",  {0, 0, 0, 1009, 1009}, 0},
-    {"ReaderDoesNotErase", "Rec",    {0, 1011, 0},          0},
-    {"LeftOpen",           "RR",     {0, 0},                2},
+    {"UpgradeTwice",       "Ruuc",   {0, 0, 83, 0},          0},
+    {"UpgradeOfWriter",    "Wuc",    {0, 83, 0},             0},
+    {"UpgradeOfClosed",    "u",      {1010},                 0},
+    {"DowngradeOfReader",  "Rdc",    {0, 1011, 0},           0},
+    {"DowngradeLetsRead",  "WdRcc",  {0, 0, 0, 0, 0},        0},
+    {"LockedForRead",      "lRc",    {0, 0, 0},              0},
+    {"LockedForWrite",     "lW",     {0, 87},                0},
+    {"LockedUpgrade",      "lRuc",   {0, 0, 87, 0},          0},
+    {"LockedWhileOpen",    "WldRcc", {0, 0, 0, 0, 0, 0},     0},
+    {"Erased",             "WecRW",  {0, 0, 0, 1009, 1009},  0},
+    {"ReaderDoesNotErase", "Rec",    {0, 1011, 0},           0},
+    {"LeftOpen",           "RR",     {0, 0},                 2},
 };
 
 class Openings : public testing::TestWithParam<Walk>, protected DrawingFixture {
@@ -65,7 +65,8 @@ TEST_P(Openings, GiveTheStatusOf) {
         statuses.push_back(step(*at));
     EXPECT_EQ(statuses, GetParam().statuses);
     EXPECT_EQ(tzhost::audit().openObjects, GetParam().open);
-    while (at<TzDbMText>(id_).close() == Tzad::eOk) {}
+    while (at<TzDbMText>(id_).close() == Tzad::eOk) {
+    }
 }
 
 INSTANTIATE_TEST_SUITE_P(Walks, Openings, testing::ValuesIn(kWalks), [](auto const& row) {

@@ -26,70 +26,70 @@ void change(TzDbObjectId id, void (*act)(T& object)) {
 }
 
 Deed const kDeeds[] = {
-    {"Append", [](DrawingFixture& f, TzDbObjectId) { f.addText(L"new"); }},
+    {"Append",         [](DrawingFixture& f, TzDbObjectId) { f.addText(L"new"); }},
     {"AppendMany",
-     [](DrawingFixture& f, TzDbObjectId) {
-         for (int i = 0; i < 5; ++i) f.add(new TzDbLine);
-     }},
+     [](DrawingFixture& f,                   TzDbObjectId) {
+         for (int i = 0; i < 5; ++i)
+             f.add(new TzDbLine);
+     }                                                 },
     {"Erase",
-     [](DrawingFixture&, TzDbObjectId id) {
+     [](DrawingFixture&,                     TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) { text.erase(); });
-     }},
+     }                                                   },
     {"ChangeTwice",
-     [](DrawingFixture&, TzDbObjectId id) {
+     [](DrawingFixture&,                     TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) { text.setContents(L"one"); });
          change<TzDbMText>(id, [](TzDbMText& text) {
              text.setContents(L"two");
              text.setStaticColumns(3, 1, 2);
              text.setBackgroundFill(true);
          });
-     }},
+     }                                                   },
     {"Move",
-     [](DrawingFixture&, TzDbObjectId id) {
+     [](DrawingFixture&,                     TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) {
              text.transformBy(TzGeMatrix3d::translation({1, 2, 3}));
          });
-     }},
+     }                                                   },
     {"AppendAndErase",
-     [](DrawingFixture& f, TzDbObjectId) {
+     [](DrawingFixture& f,                   TzDbObjectId) {
          change<TzDbMText>(f.addText(L"new"), [](TzDbMText& text) { text.erase(); });
-     }},
+     }                                                 },
     {"Field",
-     [](DrawingFixture&, TzDbObjectId id) {
+     [](DrawingFixture&,                     TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) { text.setContents(L"%<\\Var LUNITS>%"); });
-     }},
+     }                                                   },
     {"Layer",
-     [](DrawingFixture& f, TzDbObjectId id) {
+     [](DrawingFixture& f,                   TzDbObjectId id) {
          TzDbObjectId const layer = f.addLayer(L"New");
          TzDbMText* text = nullptr;
          ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
          EXPECT_EQ(text->setLayer(layer), Tzad::eOk);
          text->close();
          EXPECT_EQ(f.drawing->setClayer(layer), Tzad::eOk);
-     }},
+     }                                                 },
     {"Rename",
-     [](DrawingFixture& f, TzDbObjectId) {
-         change<TzDbLayerTableRecord>(
-             f.drawing->clayer(), [](TzDbLayerTableRecord& layer) { layer.setName(L"Walls"); });
-     }},
+     [](DrawingFixture& f,                   TzDbObjectId) {
+         change<TzDbLayerTableRecord>(f.drawing->clayer(),
+                                      [](TzDbLayerTableRecord& layer) { layer.setName(L"Walls"); });
+     }                                                 },
     {"Style",
-     [](DrawingFixture& f, TzDbObjectId) {
+     [](DrawingFixture& f,                   TzDbObjectId) {
          change<TzDbTextStyleTableRecord>(
-             f.drawing->textstyle(),
-             [](TzDbTextStyleTableRecord& style) { style.setXScale(2.0); });
-     }},
+             f.drawing->textstyle(), [](TzDbTextStyleTableRecord& style) { style.setXScale(2.0); });
+     }                                                 },
     {"Variables",
-     [](DrawingFixture&, TzDbObjectId) {
+     [](DrawingFixture&,                     TzDbObjectId) {
          (void)Variables::instance().set(L"TEXTSIZE", 7.5, tzhost::Writer::module);
          (void)Variables::instance().set(L"TILEMODE", short{0}, tzhost::Writer::user);
-     }},
+     }                                                   },
     {"UserSystem",
-     [](DrawingFixture&, TzDbObjectId) {
+     [](DrawingFixture&,                     TzDbObjectId) {
          TzGeMatrix3d const turned = TzGeMatrix3d::rotation(0.5, TzGeVector3d::kXAxis);
          ASSERT_EQ(tzedSetCurrentUCS(turned), 0);
          ASSERT_EQ(tzedSetCurrentUCS(TzGeMatrix3d()), 0);
          EXPECT_EQ(tzedRestorePreviousUCS(), 0);
-     }},
+     }                                                   },
 };
 
 class Undo : public testing::TestWithParam<Deed>, protected DrawingFixture {
@@ -127,7 +127,8 @@ TEST_P(Undo, TakesBackAllOf) {
     EXPECT_TRUE(drawing->undoLog().takeBack());
     EXPECT_EQ(view(), before);
     EXPECT_FALSE(drawing->undoLog().takeBack());
-    while (tzedRestorePreviousUCS() == 0) {}
+    while (tzedRestorePreviousUCS() == 0) {
+    }
 }
 
 INSTANTIATE_TEST_SUITE_P(Deeds, Undo, testing::ValuesIn(kDeeds), [](auto const& row) {
