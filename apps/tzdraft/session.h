@@ -3,8 +3,10 @@
 #include <filesystem>
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "host/database/drawing.h"
+#include "host/display/plot.h"
 
 // One run of the program: the drawing that is open, and what the commands of the program do with
 // it. Every operation that can fail says why in one line, with the file in it.
@@ -12,7 +14,7 @@ namespace tzdraft {
 
 class Session {
 public:
-    Session() = default;
+    Session();
     Session(Session const&) = delete;
     Session& operator=(Session const&) = delete;
     ~Session();
@@ -28,6 +30,9 @@ public:
     [[nodiscard]] bool save(std::filesystem::path const& file, std::string& error);
     // The active space as a picture; the file's ending (.svg, .png, .pdf) says which.
     [[nodiscard]] bool plot(std::filesystem::path const& file, std::string& error) const;
+    // The same with the kind of picture given.
+    [[nodiscard]] bool
+    plotAs(tzhost::PlotFormat format, std::filesystem::path const& file, std::string& error) const;
     // The open drawing; there is always one once makeNew or open was called.
     [[nodiscard]] tzhost::Drawing& drawing() const { return *drawing_; }
 
@@ -43,8 +48,9 @@ private:
     void replaceBy(std::unique_ptr<tzhost::Drawing> drawing);
 
     std::unique_ptr<tzhost::Drawing> drawing_;
-    // A drawing that a command has replaced lives until that command has ended.
-    std::unique_ptr<tzhost::Drawing> retired_;
+    // Drawings that a command has replaced live until that command has ended.
+    std::vector<std::unique_ptr<tzhost::Drawing>> retired_;
+    bool isInCommand_ = false;
     bool wantsToEnd_ = false;
 };
 

@@ -122,6 +122,11 @@ void Variables::resetKept(KeptIn kind) {
     }
 }
 
+void Variables::reset() {
+    for (VariableDefinition const& row : variableTable())
+        slotOf(row) = {row.defaultValue(), std::nullopt};
+}
+
 WriteResult Variables::setKept(std::wstring_view name, VariableValue const& value) {
     VariableDefinition const* const row = findVariable(name);
     if (row == nullptr) return unknown(name);

@@ -67,6 +67,8 @@ public:
     // Puts every variable of one kind back to its default beneath the overrides, as a new drawing
     // does.
     void resetKept(KeptIn kind);
+    // Everything as at the start, without overrides. Observers stay and are not told.
+    void reset();
     // Puts a value that a drawing or the settings kept in its place beneath an override, read-only
     // variables included. Observers are not told.
     WriteResult setKept(std::wstring_view name, VariableValue const& value);

@@ -136,8 +136,8 @@ int IPEInvokeEditorOn(TzDbMText* text, IPESettings const* settings) {
 bool IPEIsEditor(bool /*current*/) {
     if (tzhost::faultAt("IPEIsEditor")) return false;
     TzString const name(tzhost::Variables::instance().text(L"MTEXTED"));
-    for (std::string const& each : tzhost::editorConfiguration().inPlaceEditors) {
-        if (name.compareNoCase(TzString::fromUtf8(each)) == 0) return true;
+    for (std::wstring const& each : tzhost::editorConfiguration().inPlaceEditors) {
+        if (name.compareNoCase(each.c_str()) == 0) return true;
     }
     return false;
 }

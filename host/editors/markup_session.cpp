@@ -1,11 +1,10 @@
 #include "host/editors/markup_session.h"
 
-#include "host/base/output.h"
 #include "host/base/utf8.h"
+#include "host/command_line/command_line.h"
 #include "host/editors/markup_lines.h"
 #include "host/editors/private_file.h"
 #include "host/editors/program.h"
-#include "tz/ed/print.h"
 
 namespace tzhost {
 namespace {
@@ -17,7 +16,7 @@ void refuse(std::string const& program,
             std::string const& problem,
             PrivateFile& file,
             std::string const& before) {
-    TzString message = TzString::formatted(L"\nThe editor \"%ls\" %ls; the text stays as it was.",
+    TzString message = TzString::formatted(L"The editor \"%ls\" %ls; the text stays as it was.",
                                            TzString::fromUtf8(program).kwszPtr(),
                                            TzString::fromUtf8(problem).kwszPtr());
     std::optional<std::string> const now = file.read();
@@ -26,8 +25,7 @@ void refuse(std::string const& program,
         message += TzString::formatted(L" What was edited is kept in %ls",
                                        TzString::fromUtf8(file.path().string()).kwszPtr());
     }
-    message += L"\n";
-    print(message.str());
+    commandLine().say(message.str());
 }
 
 // What is wrong with the bytes that an editor left; empty when they can be taken.
@@ -44,7 +42,7 @@ std::optional<TzString> editWithProgram(TzString const& contents, std::string co
     std::string const before = TzString(markupToLines(contents.str())).toUtf8() + "\n";
     PrivateFile file(kFileName, before);
     if (!file.made()) {
-        print(L"\nNo file can be made for the editor; the text stays as it was.\n");
+        commandLine().say(L"No file can be made for the editor; the text stays as it was.");
         return std::nullopt;
     }
     ProgramResult const result = runProgram(program, file.path());
@@ -54,8 +52,11 @@ std::optional<TzString> editWithProgram(TzString const& contents, std::string co
         refuse(program, problem, file, before);
         return std::nullopt;
     }
-    if (*now == before) return contents;
-    return TzString(linesToMarkup(TzString::fromUtf8(*now).str()));
+    if (*now != before) return TzString(linesToMarkup(TzString::fromUtf8(*now).str()));
+    if (!contents.isEmpty()) return contents;
+    // A new text of which nothing was written is no text.
+    commandLine().say(L"Nothing was written in the editor.");
+    return std::nullopt;
 }
 
 }  // namespace
@@ -66,12 +67,9 @@ EditorConfiguration& editorConfiguration() {
 }
 
 std::optional<TzString> editMarkup(TzString const& contents, std::string const& program) {
-    EditorConfiguration const& configuration = editorConfiguration();
-    if (configuration.nextBlock) {
-        if (std::optional<EditorBlock> const block = configuration.nextBlock()) {
-            if (!block->accepted) return std::nullopt;
-            return TzString(linesToMarkup(block->text + L"\n"));
-        }
+    if (std::optional<EditorBlock> const block = commandLine().takeEditorBlock()) {
+        if (!block->accepted) return std::nullopt;
+        return TzString(linesToMarkup(block->text + L"\n"));
     }
     if (program.empty()) return std::nullopt;
     return editWithProgram(contents, program);

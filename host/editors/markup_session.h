@@ -1,23 +1,19 @@
 #pragma once
 
-#include <functional>
 #include <optional>
 #include <string>
 #include <vector>
 
-#include "host/command_line/answer_source.h"
 #include "tz/text/string.h"
 
 // One session of an editor that holds markup: the in-place, the raw and the external one.
 namespace tzhost {
 
-// Where editors get their answers from: the block that comes next in a script, if one does, and the
-// program that serves for the in-place and raw editors or for the dialog, empty for none.
+// The program that serves for the in-place and raw editors or for the dialog, empty for none.
 struct EditorConfiguration {
-    std::function<std::optional<EditorBlock>()> nextBlock;
     std::string textEditor;
     std::string richTextEditor;
-    std::vector<std::string> inPlaceEditors;  // values of MTEXTED that name an in-place editor
+    std::vector<std::wstring> inPlaceEditors;  // values of MTEXTED that name an in-place editor
 };
 [[nodiscard]] EditorConfiguration& editorConfiguration();
 

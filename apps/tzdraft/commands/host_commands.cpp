@@ -10,7 +10,6 @@
 namespace tzdraft {
 namespace {
 
-constexpr wchar_t kGroup[] = L"TZDRAFT";
 // A command of the program sees the selection made before it.
 constexpr int kFlags = 2;
 
@@ -44,8 +43,8 @@ void registerHostCommands() {
         static_cast<TzEdCommandStack*>(tzrxSysRegistry()->at(L"TZAD_REGISTERED_COMMANDS"));
     for (HostCommand const& each : kCommands) {
         // The names are fixed and differ, so nothing can be refused but by a fault plan.
-        (void)stack->addCommand(kGroup, each.name, each.name, kFlags, each.body, nullptr, -1,
-                                TzRxResourceInstance::empty, nullptr);
+        (void)stack->addCommand(kHostCommandGroup, each.name, each.name, kFlags, each.body, nullptr,
+                                -1, TzRxResourceInstance::empty, nullptr);
         (void)tzedSetFunHelp(each.name, nullptr, each.help, 0);
     }
 }

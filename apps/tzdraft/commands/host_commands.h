@@ -4,6 +4,9 @@
 
 namespace tzdraft {
 
+// The group of the command stack that they stand in.
+inline constexpr wchar_t kHostCommandGroup[] = L"TZDRAFT";
+
 // A command of the program itself, beside those of modules.
 struct HostCommand {
     wchar_t const* name;

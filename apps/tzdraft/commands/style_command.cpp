@@ -122,7 +122,9 @@ StyleAnswers startingValues(TzString const& name) {
     if (Session::current().drawing().getTextStyleTable(table, TzDb::kForRead) != Tzad::eOk)
         return {};
     Opened<TzDbTextStyleTable> const opened(table);
-    if (table->getIdAt(name, id) != Tzad::eOk) return {.font = L"txt.shx"};
+    StyleAnswers values;
+    values.font = L"txt.shx";
+    if (table->getIdAt(name, id) != Tzad::eOk) return values;
     Opened<TzDbTextStyleTableRecord> const style(id, TzDb::kForRead);
     return style ? presentValues(*style.get()) : StyleAnswers();
 }

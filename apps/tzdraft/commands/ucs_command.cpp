@@ -15,11 +15,16 @@ TzGeMatrix3d present() {
     return system;
 }
 
-// Makes a system that lies in the present one current, for good.
+void makeCurrent(TzGeMatrix3d const& system) {
+    tzhost::UserSystem user;
+    TzGeVector3d zAxis;
+    system.getCoordSystem(user.origin, user.xAxis, user.yAxis, zAxis);
+    if (!tzhost::setUserSystem(user)) tzutPrintf(L"\nThat is no coordinate system.\n");
+}
+
+// Makes a system that is given in the present one current, for good.
 void use(TzGeMatrix3d const& inPresent) {
-    if (tzhost::setUserSystem(present() * inPresent) != Tzad::eOk) {
-        tzutPrintf(L"\nThat is no coordinate system.\n");
-    }
+    makeCurrent(present() * inPresent);
 }
 
 void turn(TzGeVector3d const& axis) {
@@ -39,7 +44,7 @@ void turnZ() {
 }
 
 void world() {
-    (void)tzhost::setUserSystem(TzGeMatrix3d());
+    makeCurrent(TzGeMatrix3d());
 }
 
 void threePoints() {

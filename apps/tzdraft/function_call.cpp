@@ -1,0 +1,80 @@
+#include "apps/tzdraft/function_call.h"
+
+#include <charconv>
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "apps/tzdraft/session.h"
+#include "host/base/utf8.h"
+#include "host/command_line/command_line.h"
+#include "host/runtime/functions.h"
+#include "tz/rx/app.h"
+#include "tz/rx/resbuf.h"
+
+namespace tzdraft {
+namespace {
+
+struct ListDeleter {
+    void operator()(resbuf* list) const { tzutRelRb(list); }
+};
+using Arguments = std::unique_ptr<resbuf, ListDeleter>;
+
+constexpr std::wstring_view kBlanks = L" \t";
+
+std::wstring_view trimmed(std::wstring_view text) {
+    std::size_t const first = text.find_first_not_of(kBlanks);
+    if (first == std::wstring_view::npos) return {};
+    return text.substr(first, text.find_last_not_of(kBlanks) - first + 1);
+}
+
+std::optional<std::uint64_t> readHandle(std::wstring_view digits) {
+    std::string const bytes = tzhost::toUtf8(digits);
+    std::uint64_t handle = 0;
+    auto const [end, problem] =
+        std::from_chars(bytes.data(), bytes.data() + bytes.size(), handle, 16);
+    if (problem != std::errc() || end != bytes.data() + bytes.size()) return std::nullopt;
+    return handle;
+}
+
+// The one argument as the function gets it; null when it is neither an entity nor a text.
+Arguments readArgument(std::wstring_view text) {
+    if (text.size() >= 2 && text.front() == L'"' && text.back() == L'"') {
+        Arguments argument(tzutNewRb(Tzad::eResultString));
+        argument->resval.rstring =
+            tzutNewString(std::wstring(text.substr(1, text.size() - 2)).c_str());
+        return argument;
+    }
+    if (text.empty() || text.front() != L'#') return nullptr;
+    std::optional<std::uint64_t> const handle = readHandle(text.substr(1));
+    if (!handle) return nullptr;
+    Arguments argument(tzutNewRb(Tzad::eResultEntityName));
+    TzDbObjectId const id = Session::current().drawing().objectAt(*handle);
+    if (tzdbGetTzsName(argument->resval.rlname, id) != Tzad::eOk) return nullptr;
+    return argument;
+}
+
+void complain(std::wstring_view call, wchar_t const* what) {
+    tzhost::commandLine().say(std::wstring(call) + L": " + what);
+}
+
+}  // namespace
+
+void callTyped(std::wstring_view line) {
+    std::wstring_view const whole = trimmed(line);
+    if (whole.size() < 2 || whole.back() != L')') return complain(whole, L"a call ends in \")\"");
+    std::wstring_view const inside = trimmed(whole.substr(1, whole.size() - 2));
+    std::size_t const blank = inside.find_first_of(kBlanks);
+    std::wstring const name(inside.substr(0, blank));
+    Arguments arguments;
+    if (blank != std::wstring_view::npos) {
+        arguments = readArgument(trimmed(inside.substr(blank)));
+        if (!arguments)
+            return complain(whole, L"the argument is neither an entity (#2A) nor a text (\"...\")");
+    }
+    int const status = tzhost::callFunction(TzString(name), arguments.get());
+    if (status == -1) return complain(whole, L"no module defines this function");
+    if (status != TzRx::kRetOK) complain(whole, L"the function failed");
+}
+
+}  // namespace tzdraft

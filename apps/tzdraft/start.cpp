@@ -1,0 +1,116 @@
+#include "apps/tzdraft/start.h"
+
+#include <cstdlib>
+
+#include "host/base/font_map_path.h"
+#include "host/base/install_paths.h"
+#include "host/base/resource_search.h"
+#include "host/base/settings.h"
+#include "host/base/utf8.h"
+#include "host/base/variables.h"
+#include "host/command_line/command_line.h"
+#include "host/database/user_system.h"
+#include "host/editors/markup_session.h"
+
+namespace tzdraft {
+namespace {
+
+constexpr char kModuleName[] = "tzmted.tzx";
+
+// The first that says something.
+std::string firstOf(std::initializer_list<std::string> candidates) {
+    for (std::string const& each : candidates) {
+        if (!each.empty()) return each;
+    }
+    return {};
+}
+
+std::string environment(char const* name) {
+    char const* const value = std::getenv(name);
+    return value ? value : "";
+}
+
+// Settings that cannot be used are reported, and the defaults hold.
+bool loadSettings(Options const& options, std::string& error) {
+    tzhost::settings() = tzhost::Settings();
+    bool const isNamed = !options.settings.empty();
+    auto const problem =
+        isNamed
+            ? tzhost::loadSettings(options.settings.string(), tzhost::IfMissing::fail)
+            : tzhost::loadSettings(tzhost::defaultSettingsFile(), tzhost::IfMissing::useDefaults);
+    if (!problem) return true;
+    error = *problem;
+    if (!isNamed) tzhost::commandLine().say(tzhost::fromUtf8(*problem));
+    return !isNamed;
+}
+
+bool setVariables(Options const& options, std::string& error) {
+    tzhost::Variables& variables = tzhost::Variables::instance();
+    for (std::string const& each : options.variables) {
+        std::size_t const equals = each.find('=');
+        if (equals == std::string::npos) {
+            error = "--var " + each + ": expected NAME=VALUE";
+            return false;
+        }
+        tzhost::WriteResult const written = variables.overrideFromText(
+            tzhost::fromUtf8(each.substr(0, equals)), tzhost::fromUtf8(each.substr(equals + 1)));
+        if (written.isDone()) continue;
+        error = "--var " + each + ": " + tzhost::toUtf8(written.reason);
+        return false;
+    }
+    return true;
+}
+
+// The language's name out of a locale's: "de" of "de_AT.UTF-8"; empty for English and for none.
+std::string languageOf(std::string const& locale) {
+    std::string const language = locale.substr(0, locale.find_first_of("_.@"));
+    return language == "C" || language == "POSIX" || language == "en" ? "" : language;
+}
+
+void findResources(Options const& options) {
+    tzhost::ResourceSearch search;
+    search.folder = modulePath(options).parent_path().string();
+    search.locale = !options.locale.empty()
+                        ? languageOf(options.locale)
+                        : languageOf(firstOf({environment("LC_ALL"), environment("LC_MESSAGES"),
+                                              environment("LANG")}));
+    search.file = options.resources.string();
+    tzhost::setResourceSearch(search);
+}
+
+void chooseEditors(Options const& options) {
+    tzhost::Settings const& settings = tzhost::settings();
+    tzhost::EditorConfiguration& editors = tzhost::editorConfiguration();
+    editors.textEditor = firstOf({options.textEditor, tzhost::toUtf8(settings.textEditor),
+                                  environment("VISUAL"), environment("EDITOR")});
+    editors.richTextEditor = firstOf({options.richTextEditor, tzhost::toUtf8(settings.rtfEditor)});
+    editors.inPlaceEditors.assign(settings.inPlaceEditors.begin(), settings.inPlaceEditors.end());
+}
+
+// The view stands still in every run of this process.
+void watchViewOnce() {
+    static bool const isWatched = [] {
+        tzhost::watchUserSystem();
+        return true;
+    }();
+    (void)isWatched;
+}
+
+}  // namespace
+
+std::filesystem::path modulePath(Options const& options) {
+    if (!options.module.empty()) return std::filesystem::absolute(options.module);
+    return std::filesystem::path(tzhost::libraryFolder()) / kModuleName;
+}
+
+bool configureHost(Options const& options, std::string& error) {
+    tzhost::Variables::instance().reset();
+    watchViewOnce();
+    if (!loadSettings(options, error) || !setVariables(options, error)) return false;
+    findResources(options);
+    tzhost::setFontMapFile(options.fontMap.string());
+    chooseEditors(options);
+    return true;
+}
+
+}  // namespace tzdraft

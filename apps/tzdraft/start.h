@@ -1,0 +1,19 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+
+#include "apps/tzdraft/options.h"
+
+// What the host needs to know before a drawing opens.
+namespace tzdraft {
+
+// The module to load: the one that was named, else that beside the host's library.
+[[nodiscard]] std::filesystem::path modulePath(Options const& options);
+
+// Puts the settings, the variables of this run, the language, the resources, the font map and the
+// editors in place, all else at its start. False and one line in `error` for what the options name
+// and cannot be used.
+[[nodiscard]] bool configureHost(Options const& options, std::string& error);
+
+}  // namespace tzdraft
