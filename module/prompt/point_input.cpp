@@ -20,7 +20,8 @@ void CTzsPointInput::GetPoint(double* point) const {
 }
 
 void CTzsPointInput::GetPointInWorldCS(double* point) const {
-    tzdbUcs2Wcs(result_, point, false);
+    GetPoint(point);
+    tzdbUcs2Wcs(point, point, false);
 }
 
 TzString CTzsPointInput::PromptString() const {
