@@ -16,14 +16,13 @@ inline constexpr unsigned int kClose = 1;   // close at the end
 inline constexpr unsigned int kDelete = 2;  // delete at the end, after closing
 }  // namespace EasyFlags
 
+// What holders of objects and of tables have in common.
 template <class T>
-class EasyObject {
+class EasyHolder {
 public:
-    explicit EasyObject(T* held = nullptr, unsigned int duties = EasyFlags::kClose)
-        : object(held), flags(duties) {}
-    EasyObject(EasyObject const&) = delete;
-    EasyObject& operator=(EasyObject const&) = delete;
-    virtual ~EasyObject() {
+    EasyHolder(EasyHolder const&) = delete;
+    EasyHolder& operator=(EasyHolder const&) = delete;
+    virtual ~EasyHolder() {
         if (!object) return;
         if (flags & EasyFlags::kClose) object->close();
         if (flags & EasyFlags::kDelete) delete object;
@@ -34,30 +33,27 @@ public:
 
     T* object;
     unsigned int flags;
+
+protected:
+    EasyHolder(T* held, unsigned int duties) : object(held), flags(duties) {}
+};
+
+template <class T>
+class EasyObject : public EasyHolder<T> {
+public:
+    explicit EasyObject(T* held = nullptr, unsigned int duties = EasyFlags::kClose)
+        : EasyHolder<T>(held, duties) {}
+
     // Filled by an editor session alone, for a text without a database; whoever ran the session
     // attaches and closes it.
     TzDbField* field = nullptr;
 };
 
-// The same for a table.
 template <class T>
-class EasyTable {
+class EasyTable : public EasyHolder<T> {
 public:
     explicit EasyTable(T* held = nullptr, unsigned int duties = EasyFlags::kClose)
-        : object(held), flags(duties) {}
-    EasyTable(EasyTable const&) = delete;
-    EasyTable& operator=(EasyTable const&) = delete;
-    virtual ~EasyTable() {
-        if (!object) return;
-        if (flags & EasyFlags::kClose) object->close();
-        if (flags & EasyFlags::kDelete) delete object;
-        object = nullptr;
-    }
-
-    T* operator->() const { return object; }
-
-    T* object;
-    unsigned int flags;
+        : EasyHolder<T>(held, duties) {}
 };
 
 // The iterator I of a table T; iterators are deleted and never closed.
