@@ -1,0 +1,120 @@
+// What the difference between two looks is in MTEXT codes.
+
+#include "module/markup/font_state.h"
+#include "module/markup/number_text.h"
+#include "tz/gi/color.h"
+#include "tz/mte/font_map_database.h"
+#include "tz/text/code_page.h"
+#include "tz/text/font_info.h"
+
+namespace {
+
+constexpr int kByBlock = 0;
+constexpr int kByLayer = 256;
+
+void appendNumberCode(CStdStrW& codes, wchar_t const* code, long long value) {
+    codes += code;
+    appendDecimal(codes, value);
+    codes += L';';
+}
+
+void appendSwitch(CStdStrW& codes, bool isOn, bool wasOn, wchar_t const* on, wchar_t const* off) {
+    if (isOn != wasOn) codes += isOn ? on : off;
+}
+
+}  // namespace
+
+CStdStrW CFontState::EmitStateInMText() {
+    CStdStrW codes;
+    appendState(codes);
+    return codes;
+}
+
+void CFontState::appendState(CStdStrW& codes) {
+    if (appendBrace(codes)) return;
+    if (!m_current.IsSameTypeface(m_emitted)) codes += faceCode();
+    appendSize(codes);
+    appendSwitch(codes, m_current.m_bUnderline, m_emitted.m_bUnderline, L"\\L", L"\\l");
+    appendSwitch(codes, m_current.m_bStrikethrough, m_emitted.m_bStrikethrough, L"\\O", L"\\o");
+    appendColor(codes);
+}
+
+// True when the closing brace says it all.
+bool CFontState::appendBrace(CStdStrW& codes) {
+    if (m_current == m_emitted) return false;
+    if (m_current == m_base) {
+        codes += L'}';
+        --m_nBraceDepth;
+        return true;
+    }
+    if (m_emitted == m_base) {
+        codes += L'{';
+        ++m_nBraceDepth;
+    }
+    return false;
+}
+
+std::size_t CFontState::FaceKeyHash::operator()(FaceKey const& key) const {
+    std::size_t const styles = (key.bold ? 1U : 0U) + (key.italic ? 2U : 0U);
+    std::size_t const numbers = static_cast<unsigned int>(key.charset) * 0x9E3779B1U +
+                                static_cast<unsigned int>(key.pitch) * 4U + styles;
+    return std::hash<void const*>()(key.name) + numbers * 0x9E3779B97F4A7C15U;
+}
+
+CStdStrW const& CFontState::faceCode() {
+    FaceKey const key{m_current.m_sFontName.identity(), m_current.m_bBold, m_current.m_bItalic,
+                      m_current.m_nCharset, m_current.m_nPitchAndFamily};
+    auto const [at, isNew] = faceCodes_.try_emplace(key);
+    if (isNew) at->second = {m_current.m_sFontName, newFaceCode()};
+    return at->second.code;
+}
+
+// A file when the font map has one, else a face; the file form keeps the set 1, which the face form
+// replaces by the system's.
+CStdStrW CFontState::newFaceCode() const {
+    CStdStrW const& name = m_current.m_sFontName.text();
+    bool const isPair = m_pFontMap->IsBigfontProxyFont(name);
+    Charset const system = TzCodePage::SysCharset();
+    auto type = CMTextFontMapDatabase::MapTypeSystem;
+    CStdStrW const file = m_pFontMap->MapFontToFile(
+        type, name, m_current.m_bBold, m_current.m_bItalic,
+        isPair ? system : m_current.m_nCharset, m_current.m_nPitchAndFamily);
+    CStdStrW code;
+    if (isPair || (type != CMTextFontMapDatabase::MapTypeSystem && !file.empty())) {
+        code = L"\\F" + file;
+        appendNumberCode(code, L"|c", m_current.m_nCharset);
+        return code;
+    }
+    bool const isMapped = type != CMTextFontMapDatabase::MapTypeSystem;
+    code = L"\\f" + (isMapped ? name : tzFontInfo().TypefaceNativeToEnglish(name));
+    code += m_current.m_bBold ? L"|b1" : L"|b0";
+    code += m_current.m_bItalic ? L"|i1" : L"|i0";
+    code += L"|c";
+    appendDecimal(code, m_current.m_nCharset == kDefaultCharset ? system : m_current.m_nCharset);
+    appendNumberCode(code, L"|p", m_current.m_nPitchAndFamily);
+    return code;
+}
+
+// Always a factor of the size last written, in four digits, whose rounding nothing makes up for.
+void CFontState::appendSize(CStdStrW& codes) const {
+    double const emitted = m_emitted.m_dSize;
+    if (m_current.m_dSize == emitted || emitted == 0.0) return;
+    codes += L"\\H";
+    appendReal(codes, m_current.m_dSize / emitted, 4);
+    codes += L"x;";
+}
+
+void CFontState::appendColor(CStdStrW& codes) const {
+    int const index = m_current.m_nColorIndex;
+    unsigned int const rgb = m_current.m_nRGB;
+    if (index == m_emitted.m_nColorIndex && rgb == m_emitted.m_nRGB) return;
+    appendNumberCode(codes, L"\\C", index);
+    if (index != kByBlock && index != kByLayer && tzedGetRGB(index) != rgb)
+        appendNumberCode(codes, L"\\c", static_cast<int>(rgb));
+}
+
+CStdStrW CFontState::EmitTerminatingStateInMText() {
+    CStdStrW const braces(std::wstring(static_cast<std::size_t>(m_nBraceDepth), L'}'));
+    m_nBraceDepth = 0;
+    return braces;
+}

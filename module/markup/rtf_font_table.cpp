@@ -1,0 +1,115 @@
+#include "module/markup/rtf_font_table.h"
+
+#include <algorithm>
+#include <limits>
+#include <vector>
+
+#include "module/markup/number_text.h"
+#include "module/markup/rtf_writing.h"
+#include "tz/text/code_page.h"
+
+namespace {
+
+struct FamilyRow {
+    int family;  // bits 4 to 7 of pitch and family
+    wchar_t const* word;
+};
+constexpr FamilyRow kFamilies[] = {
+    {0x10, L"froman" },
+    {0x20, L"fswiss" },
+    {0x30, L"fmodern"},
+    {0x40, L"fscript"},
+    {0x50, L"fdecor" },
+};
+
+wchar_t const* familyWord(int pitchAndFamily) {
+    for (FamilyRow const& row : kFamilies) {
+        if (row.family == (pitchAndFamily & 0xF0)) return row.word;
+    }
+    return L"fnil";
+}
+
+void appendFont(CStdStrW& text, int slot, CRichTextFontTable::Record const& font) {
+    text += L"{\\f";
+    appendDecimal(text, slot);
+    text += L'\\';
+    text += familyWord(font.pitchAndFamily);
+    if (int const pitch = font.pitchAndFamily & 0xF; pitch != 0) {
+        text += L"\\fprq";
+        appendDecimal(text, pitch);
+    }
+    text += L"\\fcharset";
+    appendDecimal(text, font.charset);
+    text += L' ';
+    text += HandleEscaped8Bits(font.name.text(), TzCodePage::CharSetToCodePageId(font.charset));
+    text += L";}";
+}
+
+}  // namespace
+
+std::size_t CRichTextFontTable::KeyHash::operator()(Key const& key) const {
+    std::size_t const numbers = static_cast<std::size_t>(static_cast<unsigned int>(key.charset)) *
+                                    0x9E3779B97F4A7C15U +
+                                static_cast<unsigned int>(key.pitch);
+    return std::hash<void const*>()(key.name) * 31 + (numbers ^ (numbers >> 29));
+}
+
+int CRichTextFontTable::FindFont(wchar_t const* name, Charset charset, int pitch) {
+    if (!isIndexed_) indexSlots();
+    auto const at = firstSlots_.find({names_.intern(name).caseIdentity(), charset, pitch});
+    return at == firstSlots_.end() ? -1 : at->second;
+}
+
+int CRichTextFontTable::AddFont(wchar_t const* name, Charset charset, int pitch) {
+    if (int const slot = FindFont(name, charset, pitch); slot >= 0) return slot;
+    int const slot = static_cast<int>(length_++);
+    Record const font{charset, pitch, names_.intern(name)};
+    firstSlots_.try_emplace({font.name.caseIdentity(), charset, pitch}, slot);
+    m_aFonts[slot] = font;
+    return slot;
+}
+
+void CRichTextFontTable::AddFont(long long slot, wchar_t const* name, Charset charset, int pitch) {
+    if (slot < 0 || slot > std::numeric_limits<int>::max()) return;
+    m_aFonts[static_cast<int>(slot)] = {charset, pitch, names_.intern(name)};
+    length_ = std::max(length_, slot + 1);
+    isIndexed_ = false;
+}
+
+bool CRichTextFontTable::GetFont(int slot, CStdStrW& name, Charset& charset, int& pitch) const {
+    Record const none;
+    Record const* const font = fontAt(slot);
+    Record const& shown = font ? *font : none;
+    name = shown.name.text();
+    charset = shown.charset;
+    pitch = shown.pitchAndFamily;
+    return font != nullptr;
+}
+
+CStdStrW CRichTextFontTable::EmitFontTable() const {
+    std::vector<int> slots;
+    slots.reserve(m_aFonts.size());
+    for (auto const& font : m_aFonts)
+        slots.push_back(font.first);
+    std::sort(slots.begin(), slots.end());
+    CStdStrW text(L"{\\fonttbl");
+    for (int const slot : slots)
+        appendFont(text, slot, m_aFonts.at(slot));
+    text += L'}';
+    return text;
+}
+
+CRichTextFontTable::Record const* CRichTextFontTable::fontAt(int slot) const {
+    auto const at = m_aFonts.find(slot);
+    return at == m_aFonts.end() ? nullptr : &at->second;
+}
+
+void CRichTextFontTable::indexSlots() {
+    firstSlots_.clear();
+    for (auto const& [slot, font] : m_aFonts) {
+        Key const key{font.name.caseIdentity(), font.charset, font.pitchAndFamily};
+        auto const [at, isNew] = firstSlots_.try_emplace(key, slot);
+        if (!isNew) at->second = std::min(at->second, slot);
+    }
+    isIndexed_ = true;
+}
