@@ -77,8 +77,8 @@ CStdStrW CFontState::newFaceCode() const {
     Charset const system = TzCodePage::SysCharset();
     auto type = CMTextFontMapDatabase::MapTypeSystem;
     CStdStrW const file = m_pFontMap->MapFontToFile(
-        type, name, m_current.m_bBold, m_current.m_bItalic,
-        isPair ? system : m_current.m_nCharset, m_current.m_nPitchAndFamily);
+        type, name, m_current.m_bBold, m_current.m_bItalic, isPair ? system : m_current.m_nCharset,
+        m_current.m_nPitchAndFamily);
     CStdStrW code;
     if (isPair || (type != CMTextFontMapDatabase::MapTypeSystem && !file.empty())) {
         code = L"\\F" + file;

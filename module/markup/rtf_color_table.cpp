@@ -41,8 +41,7 @@ int CRichTextColorTable::AddColor(int index, bool bForce) {
     return AddColor(GetRGB(index, m_nByLayerColor, m_nByBlockColor), bForce);
 }
 
-unsigned int
-CRichTextColorTable::GetRGB(int index, unsigned int byLayer, unsigned int byBlock) {
+unsigned int CRichTextColorTable::GetRGB(int index, unsigned int byLayer, unsigned int byBlock) {
     if (index == kByLayer) return byLayer;
     return index == kByBlock ? byBlock : tzedGetRGB(index);
 }

