@@ -13,134 +13,138 @@ struct MarkupCase {
     char const* name;
     wchar_t const* markup;
     wchar_t const* body;
-    unsigned int incidents = 0;
+    unsigned int incidents;
 };
 
+// Rows worth a word: bits 7 to 15 alone tell what is escaped; no ";" is needed behind a number; the
+// colour of ByLayer is red here, as that of index 1.
 constexpr MarkupCase kCharacters[] = {
-    {"Empty",            L"",                  L""},
-    {"Plain",            L"A b;",              L"A b;"},
-    {"Latin",            L"\u0080\u00FF",      L"\\u128?\\u255?"},
-    {"Wide",             L"\u4E2Dx",           L"\\u20013?x"},
-    {"AboveBits",        L"\U00010041",        L"\U00010041"},  // bits 7 to 15 alone are looked at
-    {"AboveBmp",         L"\U0001F600",        L"\\u128512?"},
-    {"LineFeed",         L"a\nb",              L"a\\line b"},
-    {"Tab",              L"a\tb",              L"a\tb"},
-    {"CarriageReturn",   L"a\rb",              L"a\rb"},
-    {"Escapes",          L"\\\\\\{\\}\\~",     L"\\\\\\{\\}\\~"},
-    {"Group",            L"{a}b",              L"{a}b"},
-    {"StrayBrace",       L"}a",                L"}a"},
-    {"OpenBrace",        L"{a",                L"{a"},
-    {"Unicode",          L"\\U+00e9\\u+4E2D",  L"\\u233?\\u20013?"},
-    {"UnicodeTakesFive", L"\\Uabcdefg",        L"\\u0?fg"},
-    {"UnicodeCutOff",    L"a\\U+00",           L"a\\u0?"},
-    {"UnicodeAlone",     L"a\\U",              L"a\\u0?"},
-    {"Multibyte",        L"\\M+182A0x",        L"\\\\M+182A0x"},
-    {"MultibyteSmall",   L"\\m+5b0a1",         L"\\\\m+5b0a1"},
-    {"MultibyteOther",   L"\\M+6B0A1",         L"\\\\M+6B0A1",  kUnknownCode},
-    {"MultibyteCutOff",  L"\\M+182",           L"\\\\M+182",    kUnknownCode},
-    {"UnknownLetters",   L"\\K\\k\\N\\n\\X",   L"\\\\K\\\\k\\\\N\\\\n\\\\X", kUnknownCode},
-    {"UnknownSigns",     L"\\1\\ \\|\\z\\?",   L"\\\\1\\\\ \\\\|\\\\z\\\\?", kUnknownCode},
-    {"UnknownLatin",     L"\\\u00E9",          L"\\\\\\'e9",    kUnknownCode},
-    {"UnknownWide",      L"\\\u4E2D",          L"\\\\\\'2d",    kUnknownCode},
-    {"LoneBackslash",    L"a\\",               L"a\\\\",        kUnknownCode},
-    {"Paragraph",        L"a\\Pb",             L"a\\par b"},
-    {"Underline",        L"\\La\\l",           L"\\ul a\\ul0 "},
-    {"Overline",         L"\\Oa\\o",           L"\\strike a\\strike0 "},
+    {"Empty",            L"",                 L"",                          0           },
+    {"Plain",            L"A b;",             L"A b;",                      0           },
+    {"Latin",            L"\u0080\u00FF",     L"\\u128?\\u255?",            0           },
+    {"Wide",             L"\u4E2Dx",          L"\\u20013?x",                0           },
+    {"AboveBits",        L"\U00010041",       L"\U00010041",                0           },
+    {"AboveBmp",         L"\U0001F600",       L"\\u128512?",                0           },
+    {"LineFeed",         L"a\nb",             L"a\\line b",                 0           },
+    {"Tab",              L"a\tb",             L"a\tb",                      0           },
+    {"CarriageReturn",   L"a\rb",             L"a\rb",                      0           },
+    {"Escapes",          L"\\\\\\{\\}\\~",    L"\\\\\\{\\}\\~",             0           },
+    {"Group",            L"{a}b",             L"{a}b",                      0           },
+    {"StrayBrace",       L"}a",               L"}a",                        0           },
+    {"OpenBrace",        L"{a",               L"{a",                        0           },
+    {"Unicode",          L"\\U+00e9\\u+4E2D", L"\\u233?\\u20013?",          0           },
+    {"UnicodeTakesFive", L"\\Uabcdefg",       L"\\u0?fg",                   0           },
+    {"UnicodeCutOff",    L"a\\U+00",          L"a\\u0?",                    0           },
+    {"UnicodeAlone",     L"a\\U",             L"a\\u0?",                    0           },
+    {"Multibyte",        L"\\M+182A0x",       L"\\\\M+182A0x",              0           },
+    {"MultibyteSmall",   L"\\m+5b0a1",        L"\\\\m+5b0a1",               0           },
+    {"MultibyteOther",   L"\\M+6B0A1",        L"\\\\M+6B0A1",               kUnknownCode},
+    {"MultibyteCutOff",  L"\\M+182",          L"\\\\M+182",                 kUnknownCode},
+    {"UnknownLetters",   L"\\K\\k\\N\\n\\X",  L"\\\\K\\\\k\\\\N\\\\n\\\\X", kUnknownCode},
+    {"UnknownSigns",     L"\\1\\ \\|\\z\\?",  L"\\\\1\\\\ \\\\|\\\\z\\\\?", kUnknownCode},
+    {"UnknownLatin",     L"\\\u00E9",         L"\\\\\\'e9",                 kUnknownCode},
+    {"UnknownWide",      L"\\\u4E2D",         L"\\\\\\'2d",                 kUnknownCode},
+    {"LoneBackslash",    L"a\\",              L"a\\\\",                     kUnknownCode},
+    {"Paragraph",        L"a\\Pb",            L"a\\par b",                  0           },
+    {"Underline",        L"\\La\\l",          L"\\ul a\\ul0 ",              0           },
+    {"Overline",         L"\\Oa\\o",          L"\\strike a\\strike0 ",      0           },
 };
 
 constexpr MarkupCase kLooks[] = {
-    {"ColorIndex",       L"\\C1;a\\C2b",       L"\\cf1 a\\cf2 b"},  // no ";" is needed
-    {"ColorAgain",       L"\\C1;\\C2;\\C1;",   L"\\cf1 \\cf2 \\cf1 "},
-    {"ColorOfTheStart",  L"\\C7;",             L"\\cf0 "},
-    {"ColorByLayer",     L"\\C256;\\C1;",      L"\\cf1 \\cf1 "},  // both are red here
-    {"ColorByBlock",     L"\\C0;\\C3;",        L"\\cf1 \\cf1 "},
-    {"ColorNone",        L"\\C;\\Cx",          L"\\cf1 \\cf1 x"},
-    {"ColorWraps",       L"\\C4294967298;",    L"\\cf1 "},
-    {"Rgb",              L"\\c255;\\c4278190335;", L"\\cf1 \\cf1 "},  // masked
-    {"RgbNone",          L"\\c;a\\cx",         L"\\cf1 a\\cf1 x"},
-    {"Height",           L"\\H0.4;a\\H2xb",    L"\\fs56 a\\fs112 b"},
-    {"HeightRoundsUp",   L"\\H0.2008;",        L"\\fs29 "},
-    {"HeightInAGroup",   L"{\\H0.4;\\La}b",    L"{\\ul \\fs56 a}b"},
-    {"HeightForEscape",  L"{\\H0.4;\\\\}",     L"{\\fs56 \\\\}"},
-    {"HeightForUnicode", L"{\\H0.4;\\U+0041}", L"{\\fs56 \\u65?}"},
-    {"HeightForUnknown", L"{\\H0.4;\\K}",      L"{\\fs56 \\\\K}", kUnknownCode},
-    {"HeightForBrace",   L"{\\H0.4;}a",        L"{\\fs56 }a"},
-    {"HeightForFeed",    L"{\\H0.4;\n}",       L"{\\fs56 \\line }"},
-    {"HeightOfAState",   L"{\\H2x;a}\\H2x;b",  L"{\\fs56 a}\\fs56 b"},
-    {"HeightZero",       L"\\H0;a\\Hx;b",      L"ab"},
-    {"HeightNegative",   L"\\H-0.2;a",         L"\\fs-27 a"},
-    {"Face",      L"\\fA|b1|i0|c204|p2;x",     L"\\f1 \\b1 \\i0 x", kFaceWithoutFile},
-    {"FaceKnown", L"\\fLiberation Sans|b1|i1|c0|p34;x", L"\\f0 \\b1 \\i1 x"},
-    {"FaceOpen",  L"\\fA;x",                   L"\\f1 \\b0 \\i0 ;x", kFaceWithoutFile},
-    {"FaceOdd",   L"\\fA|b2|iX|zz|c;x",        L"\\f1 \\b0 \\i0 x", kFaceWithoutFile},
-    {"FaceFlagTakesOne", L"\\fA|b;x;y",        L"\\f1 \\b0 \\i0 y", kFaceWithoutFile},
-    {"FaceCutOff", L"\\fA|b1",                 L"\\f1 \\b1 \\i0 ",  kFaceWithoutFile},
-    {"FaceTwice", L"\\fA|c1;\\fa|c1;\\fA|c2;", L"\\f1 \\b0 \\i0 \\f1 \\b0 \\i0 \\f2 \\b0 \\i0 ", kFaceWithoutFile},
-    {"FaceMapped", L"\\fPlotter|b0|i0|c0|p49;x", L"\\f1 \\b0 \\i0 x"},
-    {"File",      L"\\Fromans;x\\FROMANS.SHX|c0;y", L"\\f1 \\b0 \\i0 x\\f2 \\b0 \\i0 y"},
-    {"FileFolder", L"\\Fc:\\fonts\\slanted.shx;x", L"\\f1 \\b1 \\i1 x"},
-    {"FileLent",  L"\\Fnone;x",                L"\\f1 \\b0 \\i0 x", kFontByProxy},
-    {"FilePair",  L"\\Ftxt,big;x",             L"\\f1 \\b0 \\i0 x", kFontByProxy},
-    {"FileOdd",   L"\\Ftxt|xc204y;z",          L"\\f1 \\b0 \\i0 z"},
-    {"FileCutOff", L"a\\Ftxt",                 L"a\\f1 \\b0 \\i0 "},
-    {"FileOfTheService", L"\\FDejaVuSans-Bold.ttf;x", L"\\f1 \\b1 \\i0 x"},
+    {"ColorIndex",       L"\\C1;a\\C2b",                       L"\\cf1 a\\cf2 b",                                0               },
+    {"ColorAgain",       L"\\C1;\\C2;\\C1;",                   L"\\cf1 \\cf2 \\cf1 ",                            0               },
+    {"ColorOfTheStart",  L"\\C7;",                             L"\\cf0 ",                                        0               },
+    {"ColorByLayer",     L"\\C256;\\C1;",                      L"\\cf1 \\cf1 ",                                  0               },
+    {"ColorByBlock",     L"\\C0;\\C3;",                        L"\\cf1 \\cf1 ",                                  0               },
+    {"ColorNone",        L"\\C;\\Cx",                          L"\\cf1 \\cf1 x",                                 0               },
+    {"ColorWraps",       L"\\C4294967298;",                    L"\\cf1 ",                                        0               },
+    {"Rgb",              L"\\c255;\\c4278190335;",             L"\\cf1 \\cf1 ",                                  0               },
+    {"RgbNone",          L"\\c;a\\cx",                         L"\\cf1 a\\cf1 x",                                0               },
+    {"Height",           L"\\H0.4;a\\H2xb",                    L"\\fs56 a\\fs112 b",                             0               },
+    {"HeightRoundsUp",   L"\\H0.2008;",                        L"\\fs29 ",                                       0               },
+    {"HeightInAGroup",   L"{\\H0.4;\\La}b",                    L"{\\ul \\fs56 a}b",                              0               },
+    {"HeightForEscape",  L"{\\H0.4;\\\\}",                     L"{\\fs56 \\\\}",                                 0               },
+    {"HeightForUnicode", L"{\\H0.4;\\U+0041}",                 L"{\\fs56 \\u65?}",                               0               },
+    {"HeightForUnknown", L"{\\H0.4;\\K}",                      L"{\\fs56 \\\\K}",                                kUnknownCode    },
+    {"HeightForBrace",   L"{\\H0.4;}a",                        L"{\\fs56 }a",                                    0               },
+    {"HeightForFeed",    L"{\\H0.4;\n}",                       L"{\\fs56 \\line }",                              0               },
+    {"HeightOfAState",   L"{\\H2x;a}\\H2x;b",                  L"{\\fs56 a}\\fs56 b",                            0               },
+    {"HeightZero",       L"\\H0;a\\Hx;b",                      L"ab",                                            0               },
+    {"HeightNegative",   L"\\H-0.2;a",                         L"\\fs-27 a",                                     0               },
+    {"Face",             L"\\fA|b1|i0|c204|p2;x",              L"\\f1 \\b1 \\i0 x",                              kFaceWithoutFile},
+    {"FaceKnown",        L"\\fLiberation Sans|b1|i1|c0|p34;x", L"\\f0 \\b1 \\i1 x",                              0               },
+    {"FaceOpen",         L"\\fA;x",                            L"\\f1 \\b0 \\i0 ;x",                             kFaceWithoutFile},
+    {"FaceOdd",          L"\\fA|b2|iX|zz|c;x",                 L"\\f1 \\b0 \\i0 x",                              kFaceWithoutFile},
+    {"FaceFlagTakesOne", L"\\fA|b;x;y",                        L"\\f1 \\b0 \\i0 y",                              kFaceWithoutFile},
+    {"FaceCutOff",       L"\\fA|b1",                           L"\\f1 \\b1 \\i0 ",                               kFaceWithoutFile},
+    {"FaceTwice",        L"\\fA|c1;\\fa|c1;\\fA|c2;",          L"\\f1 \\b0 \\i0 \\f1 \\b0 \\i0 \\f2 \\b0 \\i0 ",
+     kFaceWithoutFile                                                                                                            },
+    {"FaceMapped",       L"\\fPlotter|b0|i0|c0|p49;x",         L"\\f1 \\b0 \\i0 x",                              0               },
+    {"File",             L"\\Fromans;x\\FROMANS.SHX|c0;y",     L"\\f1 \\b0 \\i0 x\\f2 \\b0 \\i0 y",              0               },
+    {"FileFolder",       L"\\Fc:\\fonts\\slanted.shx;x",       L"\\f1 \\b1 \\i1 x",                              0               },
+    {"FileLent",         L"\\Fnone;x",                         L"\\f1 \\b0 \\i0 x",                              kFontByProxy    },
+    {"FilePair",         L"\\Ftxt,big;x",                      L"\\f1 \\b0 \\i0 x",                              kFontByProxy    },
+    {"FileOdd",          L"\\Ftxt|xc204y;z",                   L"\\f1 \\b0 \\i0 z",                              0               },
+    {"FileCutOff",       L"a\\Ftxt",                           L"a\\f1 \\b0 \\i0 ",                              0               },
+    {"FileOfTheService", L"\\FDejaVuSans-Bold.ttf;x",          L"\\f1 \\b1 \\i0 x",                              0               },
 };
 
 constexpr MarkupCase kParagraphs[] = {
-    {"Indents",          L"\\pi-2,l3;x",       L"\\fi-2016 \\li3024 x"},
-    {"IndentSame",       L"\\pi1;\\pi1;x",     L"\\fi1008 x"},
-    {"IndentAndBack",    L"\\pi1;\\pi0;x",     L"\\fi1008 \\fi0 x"},
-    {"IndentMinusZero",  L"\\pi-0;x",          L"x"},
-    {"Tabs",             L"\\pt4,2,2,8;x",     L"\\pard \\fi0 \\li0 \\tx2016 \\tx4032 \\tx8064 x"},
-    {"TabsSame",         L"\\pt4;\\pt4;x",     L"\\pard \\fi0 \\li0 \\tx4032 x"},
-    {"TabsCleared",      L"\\pt4;\\ptz;x",     L"\\pard \\fi0 \\li0 \\tx4032 \\pard \\fi0 \\li0 x"},
-    {"TabsClearedEmpty", L"\\pt4;\\pt;x",      L"\\pard \\fi0 \\li0 \\tx4032 \\pard \\fi0 \\li0 x"},
-    {"TabsNone",         L"\\ptz;x",           L"x"},
-    {"TabsBelowOne",     L"\\pt0,-3,1;x",      L"\\pard \\fi0 \\li0 \\tx1008 x"},
-    {"TabsThenIndent",   L"\\pt1,i2;x",        L"\\pard \\fi2016 \\li0 \\tx1008 x"},
-    {"Relative",         L"\\pi1x,l2;x",       L"\\fi1008 \\li2016 x"},
-    {"Unknown",          L"\\pxyz;",           L"xyz;"},
-    {"StopsAtUnknown",   L"\\pi1,q2;x",        L"\\fi1008 q2;x"},
-    {"StopsAtBackslash", L"\\pl2\\Lx",         L"\\li2016 \\ul x"},
-    {"CutOff",           L"\\pi1,t2",          L"\\pard \\fi1008 \\li0 \\tx2016 "},
-    {"NoComma",          L"\\pi1l2;x",         L"\\fi1008 \\li2016 x"},
-    {"OutliveGroup",     L"{\\pl2;a}b",        L"{\\li2016 a}\\li2016 b"},
+    {"Indents",          L"\\pi-2,l3;x",   L"\\fi-2016 \\li3024 x",                                 0},
+    {"IndentSame",       L"\\pi1;\\pi1;x", L"\\fi1008 x",                                           0},
+    {"IndentAndBack",    L"\\pi1;\\pi0;x", L"\\fi1008 \\fi0 x",                                     0},
+    {"IndentMinusZero",  L"\\pi-0;x",      L"x",                                                    0},
+    {"Tabs",             L"\\pt4,2,2,8;x", L"\\pard \\fi0 \\li0 \\tx2016 \\tx4032 \\tx8064 x",      0},
+    {"TabsSame",         L"\\pt4;\\pt4;x", L"\\pard \\fi0 \\li0 \\tx4032 x",                        0},
+    {"TabsCleared",      L"\\pt4;\\ptz;x", L"\\pard \\fi0 \\li0 \\tx4032 \\pard \\fi0 \\li0 x",     0},
+    {"TabsClearedEmpty", L"\\pt4;\\pt;x",  L"\\pard \\fi0 \\li0 \\tx4032 \\pard \\fi0 \\li0 x",     0},
+    {"TabsNone",         L"\\ptz;x",       L"x",                                                    0},
+    {"TabsBelowOne",     L"\\pt0,-3,1;x",  L"\\pard \\fi0 \\li0 \\tx1008 x",                        0},
+    {"TabsThenIndent",   L"\\pt1,i2;x",    L"\\pard \\fi2016 \\li0 \\tx1008 x",                     0},
+    {"Relative",         L"\\pi1x,l2;x",   L"\\fi1008 \\li2016 x",                                  0},
+    {"Unknown",          L"\\pxyz;",       L"xyz;",                                                 0},
+    {"StopsAtUnknown",   L"\\pi1,q2;x",    L"\\fi1008 q2;x",                                        0},
+    {"StopsAtBackslash", L"\\pl2\\Lx",     L"\\li2016 \\ul x",                                      0},
+    {"CutOff",           L"\\pi1,t2",      L"\\pard \\fi1008 \\li0 \\tx2016 ",                      0},
+    {"NoComma",          L"\\pi1l2;x",     L"\\fi1008 \\li2016 x",                                  0},
+    {"OutliveGroup",     L"{\\pl2;a}b",    L"{\\li2016 a}\\li2016 b",                               0},
     {"OutliveTwoGroups", L"{{\\pt2;a}}b",
-     L"{{\\pard \\fi0 \\li0 \\tx2016 a}\\pard \\fi0 \\li0 \\tx2016 }\\pard \\fi0 \\li0 \\tx2016 b"},
-    {"KeptInGroup",      L"\\pl2;{a}b",        L"\\li2016 {a}b"},
+     L"{{\\pard \\fi0 \\li0 \\tx2016 a}\\pard \\fi0 \\li0 \\tx2016 }\\pard \\fi0 \\li0 \\tx2016 b", 0},
+    {"KeptInGroup",      L"\\pl2;{a}b",    L"\\li2016 {a}b",                                        0},
 };
 
 constexpr MarkupCase kStacks[] = {
-    {"Over",          L"\\S1/2;",              L"{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}"},
-    {"Fraction",      L"\\S1#2;x",             L"{\\dn1234 \\\\S<0,100>}1#2{\\dn1234 \\\\s}x"},
-    {"Tolerance",     L"\\S^2;",               L"{\\dn1234 \\\\S<0,100>}^2{\\dn1234 \\\\s}"},
-    {"Aligned",       L"\\A1;\\S1/2;",         L"{\\dn1234 \\\\S<1,100>}1/2{\\dn1234 \\\\s}"},
-    {"BadAlignment",  L"\\A2;\\A3;\\S1/2;",    L"{\\dn1234 \\\\S<2,100>}1/2{\\dn1234 \\\\s}"},
-    {"InAGroup",      L"{\\H.7x;\\S1/2;a}",    L"{{\\dn1234 \\\\S<0,70>}1/2{\\dn1234 \\\\s}\\fs20 a}"},
-    {"AbsoluteInAGroup", L"{\\H.7;\\S1/2;}",   L"{{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}\\fs98 }"},
-    {"NotInAGroup",   L"\\H.7x;\\S1/2;",       L"\\fs20 {\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}"},
-    {"Unicode",       L"\\S\\U+00e9/\\u+00E9;", L"{\\dn1234 \\\\S<0,100>}\\u233?/\\u233?{\\dn1234 \\\\s}"},
-    {"Bare",          L"\\S\u00e9/b;",         L"{\\dn1234 \\\\S<0,100>}\u00e9/b{\\dn1234 \\\\s}"},
-    {"EscapedSign",   L"\\S1\\/2;",            L"{\\dn1234 \\\\S<0,100>}1\\/2{\\dn1234 \\\\s}"},
-    {"EscapeHides",   L"\\S\\;;x/y;",          L"{\\dn1234 \\\\S<0,100>}\\;;x/y{\\dn1234 \\\\s}"},
-    {"LetterOfTheList", L"\\Sabz;",            L"{\\dn1234 \\\\S<0,100>}abz{\\dn1234 \\\\s}"},
-    {"CutOff",        L"\\S1/2",               L"{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}"},
-    {"CutOffEscape",  L"\\S1/2\\",             L"{\\dn1234 \\\\S<0,100>}1/2\\{\\dn1234 \\\\s}"},
-    {"CodeCutOff",    L"\\S/\\U+00;",          L"{\\dn1234 \\\\S<0,100>}/\\u0?{\\dn1234 \\\\s}"},
-    {"NoSign",        L"\\Sabc;d",             L"\\\\Sabc;d",      kStackWithoutSign},
-    {"NoSignAtAll",   L"\\S",                  L"\\\\S",           kStackWithoutSign},
-    {"SignBehind",    L"\\Sab;/",              L"\\\\Sab;/",       kStackWithoutSign},
-    {"SignInACode",   L"\\S\\U+002F;",         L"\\\\S\\u47?;",    kStackWithoutSign},
-    {"CodeHidesSign", L"\\S\\Uaa/aax;",        L"\\\\S\\u0?x;",    kStackWithoutSign},
-    {"ReadAgain",     L"\\Sx\\Ly;",            L"\\\\Sx\\ul y;",   kStackWithoutSign},
+    {"Over",             L"\\S1/2;",               L"{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}",             0                },
+    {"Fraction",         L"\\S1#2;x",              L"{\\dn1234 \\\\S<0,100>}1#2{\\dn1234 \\\\s}x",            0                },
+    {"Tolerance",        L"\\S^2;",                L"{\\dn1234 \\\\S<0,100>}^2{\\dn1234 \\\\s}",              0                },
+    {"Aligned",          L"\\A1;\\S1/2;",          L"{\\dn1234 \\\\S<1,100>}1/2{\\dn1234 \\\\s}",             0                },
+    {"BadAlignment",     L"\\A2;\\A3;\\S1/2;",     L"{\\dn1234 \\\\S<2,100>}1/2{\\dn1234 \\\\s}",             0                },
+    {"InAGroup",         L"{\\H.7x;\\S1/2;a}",     L"{{\\dn1234 \\\\S<0,70>}1/2{\\dn1234 \\\\s}\\fs20 a}",    0                },
+    {"AbsoluteInAGroup", L"{\\H.7;\\S1/2;}",       L"{{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}\\fs98 }",
+     0                                                                                                                         },
+    {"NotInAGroup",      L"\\H.7x;\\S1/2;",        L"\\fs20 {\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}",      0                },
+    {"Unicode",          L"\\S\\U+00e9/\\u+00E9;", L"{\\dn1234 \\\\S<0,100>}\\u233?/\\u233?{\\dn1234 \\\\s}",
+     0                                                                                                                         },
+    {"Bare",             L"\\S\u00e9/b;",          L"{\\dn1234 \\\\S<0,100>}\u00e9/b{\\dn1234 \\\\s}",        0                },
+    {"EscapedSign",      L"\\S1\\/2;",             L"{\\dn1234 \\\\S<0,100>}1\\/2{\\dn1234 \\\\s}",           0                },
+    {"EscapeHides",      L"\\S\\;;x/y;",           L"{\\dn1234 \\\\S<0,100>}\\;;x/y{\\dn1234 \\\\s}",         0                },
+    {"LetterOfTheList",  L"\\Sabz;",               L"{\\dn1234 \\\\S<0,100>}abz{\\dn1234 \\\\s}",             0                },
+    {"CutOff",           L"\\S1/2",                L"{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}",             0                },
+    {"CutOffEscape",     L"\\S1/2\\",              L"{\\dn1234 \\\\S<0,100>}1/2\\{\\dn1234 \\\\s}",           0                },
+    {"CodeCutOff",       L"\\S/\\U+00;",           L"{\\dn1234 \\\\S<0,100>}/\\u0?{\\dn1234 \\\\s}",          0                },
+    {"NoSign",           L"\\Sabc;d",              L"\\\\Sabc;d",                                             kStackWithoutSign},
+    {"NoSignAtAll",      L"\\S",                   L"\\\\S",                                                  kStackWithoutSign},
+    {"SignBehind",       L"\\Sab;/",               L"\\\\Sab;/",                                              kStackWithoutSign},
+    {"SignInACode",      L"\\S\\U+002F;",          L"\\\\S\\u47?;",                                           kStackWithoutSign},
+    {"CodeHidesSign",    L"\\S\\Uaa/aax;",         L"\\\\S\\u0?x;",                                           kStackWithoutSign},
+    {"ReadAgain",        L"\\Sx\\Ly;",             L"\\\\Sx\\ul y;",                                          kStackWithoutSign},
 };
 
 class Markup : public testing::TestWithParam<MarkupCase> {};
 
 TEST_P(Markup, IsWrittenAs) {
     Session session;
-    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(),
-                                    &session.marginScale());
+    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
     markuptest::setUp(context);
     EXPECT_EQ(TzString(bodyOf(context.Parse(GetParam().markup))).toUtf8(),
               TzString(GetParam().body).toUtf8());
@@ -164,8 +168,7 @@ TEST(Document, HasItsTablesAndHead) {
 
 TEST(Document, BeginsWithTheInitialFont) {
     Session session;
-    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(),
-                                    &session.marginScale());
+    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
     context.SetInitialFontFileName(L"slanted");
     context.SetInitialFontSize(0.0, 319);
     context.SetInitialFontColor(0);
@@ -189,16 +192,17 @@ struct WholeTextCase {
     unsigned int incidents;
 };
 constexpr WholeTextCase kWholeTexts[] = {
-    {"Ahead",          L"\\T2;\\W.8;\\Q15;a",     2, 0.8, 15, 0                },
-    {"Late",           L"a\\T2;\\W.8;\\Q15;",     2, 0.8, 15, kTrackingLate | kCharWidthLate | kObliqueLate},
-    {"Twice",          L"\\T2;\\T3;\\W2;\\W3;\\Q2;\\Q3;", 2, 2, 2, kTrackingIgnored | kCharWidthIgnored | kObliqueIgnored},
-    {"Default",        L"\\T1;\\T3;\\W1;\\W3;\\Q0;\\Q3;", 3, 3, 3, 0            },
-    {"LateDefault",    L"a\\T1;\\T3;",            1, 1,   0,  kTrackingLate | kTrackingIgnored},
-    {"ZeroTracking",   L"\\T0;\\T3;\\W0;\\W3;",   3, 0,   0,  kCharWidthIgnored},
-    {"BracesCount",    L"{}\\T2;",                2, 1,   0,  kTrackingLate    },
-    {"FeedsCount",     L"\n\\W2;",                1, 2,   0,  kCharWidthLate   },
-    {"CodesDoNot",     L"\\P\\U+0041\\\\\\T2;",   2, 1,   0,  0                },
-    {"InAGroup",       L"{\\Q-15;}",              1, 1,   -15, kObliqueLate    },
+    {"Ahead",        L"\\T2;\\W.8;\\Q15;a",             2, 0.8, 15,  0                                            },
+    {"Late",         L"a\\T2;\\W.8;\\Q15;",             2, 0.8, 15,  kTrackingLate | kCharWidthLate | kObliqueLate},
+    {"Twice",        L"\\T2;\\T3;\\W2;\\W3;\\Q2;\\Q3;", 2, 2,   2,
+     kTrackingIgnored | kCharWidthIgnored | kObliqueIgnored                                                       },
+    {"Default",      L"\\T1;\\T3;\\W1;\\W3;\\Q0;\\Q3;", 3, 3,   3,   0                                            },
+    {"LateDefault",  L"a\\T1;\\T3;",                    1, 1,   0,   kTrackingLate | kTrackingIgnored             },
+    {"ZeroTracking", L"\\T0;\\T3;\\W0;\\W3;",           3, 0,   0,   kCharWidthIgnored                            },
+    {"BracesCount",  L"{}\\T2;",                        2, 1,   0,   kTrackingLate                                },
+    {"FeedsCount",   L"\n\\W2;",                        1, 2,   0,   kCharWidthLate                               },
+    {"CodesDoNot",   L"\\P\\U+0041\\\\\\T2;",           2, 1,   0,   0                                            },
+    {"InAGroup",     L"{\\Q-15;}",                      1, 1,   -15, kObliqueLate                                 },
 };
 
 TEST(WholeTextValues, CountOnce) {
@@ -221,10 +225,10 @@ TEST(Sizes, AreTracked) {
         int twips, initial, current, least, most;
     };
     constexpr Row kRows[] = {
-        {L"a",               280, 28, 28, 28, 28},
-        {L"a",               200, 20, 20, 20, 28},  // the first 28 is never forgotten
-        {L"\\H.4;\\H.1;a",   280, 28, 14, 14, 56},
-        {L"{\\H.4;}a",       320, 32, 56, 28, 56},
+        {L"a",             280, 28, 28, 28, 28},
+        {L"a",             200, 20, 20, 20, 28}, // the first 28 is never forgotten
+        {L"\\H.4;\\H.1;a", 280, 28, 14, 14, 56},
+        {L"{\\H.4;}a",     320, 32, 56, 28, 56},
     };
     for (Row const& row : kRows) {
         Session session;
@@ -241,8 +245,7 @@ TEST(Sizes, AreTracked) {
 
 TEST(States, AreThirtyTwoAtMost) {
     Session session;
-    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(),
-                                    &session.marginScale());
+    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
     markuptest::setUp(context);
     // 33 groups open, 31 of them push; after 31 braces the outermost state is in force, so that the
     // height of the 32nd is written at once.

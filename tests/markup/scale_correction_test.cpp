@@ -24,18 +24,20 @@ TEST(Scale, TurnsUnitsToTwips) {
         int twips;
     };
     constexpr Row kRows[] = {
-        {0, 0.2,    280     },
-        {0, 0.25,   350     },
-        {0, 1e-9,   1       },  // a positive length never vanishes
-        {1, 1e-9,   10      },
-        {1, 0.2,    280     },
-        {1, 0.2001, 280     },  // 280.14, truncated ahead of the rounding
-        {1, 0.2008, 290     },
-        {0, 0.0,    0       },
-        {0, -1.0,   -1400   },
-        {1, -1.0,   -1390   },
-        {0, 1e300,  INT_MAX },
-        {0, -1e300, INT_MIN },
+        {0, 0.2,    280    },
+        {0, 0.25,   350    },
+        {0, 1e-9,   1      }, // a positive length never
+  // vanishes
+        {1, 1e-9,   10     },
+        {1, 0.2,    280    },
+        {1, 0.2001, 280    }, // 280.14, truncated ahead of
+  // the rounding
+        {1, 0.2008, 290    },
+        {0, 0.0,    0      },
+        {0, -1.0,   -1400  },
+        {1, -1.0,   -1390  },
+        {0, 1e300,  INT_MAX},
+        {0, -1e300, INT_MIN},
     };
     for (Row const& row : kRows) {
         CScaleCorrection scale = scaleOf(static_cast<signed char>(row.roundToTen), 280, 0.2);

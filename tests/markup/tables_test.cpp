@@ -37,7 +37,7 @@ TEST(ColorTable, AnswersWithColorAndIndex) {
         int index;
     };
     constexpr Row kRows[] = {
-        {0,  true,  0x0000FF, 256},  // red is ByLayer here, not index 1
+        {0,  true,  0x0000FF, 256}, // red is ByLayer here, not index 1
         {1,  true,  0x00FF00, 0  },
         {2,  true,  0xFF0000, 5  },
         {3,  true,  0xFF0102, 5  },
@@ -67,13 +67,13 @@ TEST(FontTable, WritesItsFonts) {
         wchar_t const* text;
     };
     constexpr Row kRows[] = {
-        {0,   0,    L"Arial",  L"\\fnil\\fcharset0 Arial;"          },
-        {0,   0x22, L"Arial",  L"\\fswiss\\fprq2\\fcharset0 Arial;" },
-        {1,   0x11, L"A;}",    L"\\froman\\fprq1\\fcharset1 A;};"   },
-        {204, 0x31, L"\u0410", L"\\fmodern\\fprq1\\fcharset204 \\'c0;"},
+        {0,   0,    L"Arial",  L"\\fnil\\fcharset0 Arial;"             },
+        {0,   0x22, L"Arial",  L"\\fswiss\\fprq2\\fcharset0 Arial;"    },
+        {1,   0x11, L"A;}",    L"\\froman\\fprq1\\fcharset1 A;};"      },
+        {204, 0x31, L"\u0410", L"\\fmodern\\fprq1\\fcharset204 \\'c0;" },
         {128, 0x42, L"\uFF2D", L"\\fscript\\fprq2\\fcharset128 \\'82l;"},
-        {2,   0x50, L"",       L"\\fdecor\\fcharset2 ;"             },
-        {0,   0x60, L"x",      L"\\fnil\\fcharset0 x;"              },
+        {2,   0x50, L"",       L"\\fdecor\\fcharset2 ;"                },
+        {0,   0x60, L"x",      L"\\fnil\\fcharset0 x;"                 },
     };
     EXPECT_STREQ(CRichTextFontTable().EmitFontTable().c_str(), L"{\\fonttbl}");
     for (Row const& row : kRows) {
