@@ -1,7 +1,9 @@
 #pragma once
 
 #include <algorithm>
+#include <cstddef>
 #include <initializer_list>
+#include <utility>
 #include <vector>
 
 // The host's growable array. Elements are values; indices count from 0 and are not checked but
@@ -43,11 +45,21 @@ public:
 
     // Adds at the end and returns the new index.
     int append(T const& item) {
-        makeRoom();
-        items_.push_back(item);
+        if (items_.size() < items_.capacity()) {
+            items_.push_back(item);
+        } else {
+            T copy(item);  // the item may lie in this very array, which moves now
+            makeRoom(1);
+            items_.push_back(std::move(copy));
+        }
         return length() - 1;
     }
-    void append(TzArray const& other) { items_.insert(items_.end(), other.begin(), other.end()); }
+    void append(TzArray const& other) {
+        if (items_.capacity() - items_.size() < other.items_.size()) makeRoom(other.items_.size());
+        // Counted beforehand, as an array may be added to itself.
+        for (std::size_t i = 0, count = other.items_.size(); i < count; ++i)
+            items_.push_back(other.items_[i]);
+    }
     // `index` may be the length; outside 0 to the length nothing happens.
     void insertAt(int index, T const& item) {
         if (index >= 0 && index <= length()) items_.insert(items_.begin() + index, item);
@@ -74,10 +86,11 @@ public:
     [[nodiscard]] auto end() const { return items_.end(); }
 
 private:
-    void makeRoom() {
-        if (items_.size() < items_.capacity()) return;
+    // For at least `count` more: never less than the grow length, nor than half of what there is,
+    // so that adding one by one stays linear.
+    void makeRoom(std::size_t count) {
         auto const step = static_cast<std::size_t>(std::max(growLength_, 1));
-        items_.reserve(items_.size() + std::max(step, items_.size() / 2));
+        items_.reserve(items_.size() + std::max({step, count, items_.size() / 2}));
     }
 
     std::vector<T> items_;

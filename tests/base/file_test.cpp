@@ -1,0 +1,75 @@
+// Whole files: what a safe write leaves behind when it works and when it does not.
+
+#include <gtest/gtest.h>
+
+#include <cstddef>
+#include <filesystem>
+#include <string>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include "host/base/file_bytes.h"
+#include "host/base/install_paths.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+class FileBytes : public testing::Test {
+protected:
+    FileBytes() : folder_(fs::temp_directory_path() / "tz-file-test") {
+        fs::remove_all(folder_);
+        fs::create_directories(folder_);
+    }
+    ~FileBytes() override { fs::remove_all(folder_); }
+
+    [[nodiscard]] std::string path(char const* name) const { return (folder_ / name).string(); }
+    [[nodiscard]] std::ptrdiff_t filesThere() const {
+        return std::distance(fs::directory_iterator(folder_), fs::directory_iterator());
+    }
+
+    fs::path folder_;
+};
+
+TEST_F(FileBytes, ComeBackAsTheyWere) {
+    std::string bytes = "zero \0 and \xFF";
+    bytes.resize(200000, 'x');
+    ASSERT_TRUE(tzhost::writeFileSafely(path("a"), bytes));
+    EXPECT_EQ(tzhost::readFile(path("a")), bytes);
+    ASSERT_TRUE(tzhost::writeFileSafely(path("a"), ""));
+    EXPECT_EQ(tzhost::readFile(path("a")), "");
+    EXPECT_EQ(filesThere(), 1);
+}
+
+TEST_F(FileBytes, OfWhatIsNoFileAreNothing) {
+    EXPECT_FALSE(tzhost::readFile(path("none")));
+    EXPECT_FALSE(tzhost::systemReason().empty());
+    EXPECT_FALSE(tzhost::readFile(folder_.string()));
+}
+
+TEST_F(FileBytes, KeepPermissionsAndLinks) {
+    ASSERT_TRUE(tzhost::writeFileSafely(path("real"), "old"));
+    ASSERT_EQ(::chmod(path("real").c_str(), 0640), 0);
+    fs::create_symlink("real", path("link"));
+    ASSERT_TRUE(tzhost::writeFileSafely(path("link"), "new"));
+    EXPECT_TRUE(fs::is_symlink(path("link")));
+    EXPECT_EQ(tzhost::readFile(path("real")), "new");
+    struct stat status {};
+    ASSERT_EQ(::stat(path("real").c_str(), &status), 0);
+    EXPECT_EQ(status.st_mode & 07777U, 0640U);
+}
+
+TEST_F(FileBytes, StayOldWhenTheyCannotBeWritten) {
+    EXPECT_FALSE(tzhost::writeFileSafely(path("no/such/file"), "new"));
+    fs::create_directory(path("folder"));
+    EXPECT_FALSE(tzhost::writeFileSafely(path("folder"), "new"));
+    EXPECT_TRUE(fs::is_directory(path("folder")));
+    EXPECT_EQ(filesThere(), 1);  // no temporary file is left
+}
+
+TEST(InstallPaths, LeadToTheLibraries) {
+    EXPECT_TRUE(fs::exists(fs::path(tzhost::libraryFolder()) / "libtz.so.1"));
+}
+
+}  // namespace
