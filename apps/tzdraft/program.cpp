@@ -10,6 +10,7 @@
 #include "apps/tzdraft/session.h"
 #include "apps/tzdraft/start.h"
 #include "host/base/audit.h"
+#include "host/base/settings.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/script_source.h"
@@ -42,6 +43,7 @@ private:
     void runTyped(std::wstring const& line);
     int finish();
     bool writeResults();
+    bool saveSettings();
     bool complain(std::string const& error) const;
 
     Options const& options_;
@@ -50,6 +52,7 @@ private:
     EventFile events_;
     Session session_;
     tzhost::FaultPlan faults_;
+    SettingsState settings_ = SettingsState::unusable;
 };
 
 bool Run::complain(std::string const& error) const {
@@ -93,7 +96,7 @@ bool Run::begin() {
     tzhost::audit() = tzhost::Audit();
     tzhost::resetWorstAudit();
     std::string error;
-    if (!configureHost(options_, error)) return complain(error);
+    if (!configureHost(options_, settings_, error)) return complain(error);
     if (!openScript() || !planFaults()) return false;
     line.setSource(source_.get());
     if (!options_.events.empty() && !events_.begin(options_.events, error)) return complain(error);
@@ -149,11 +152,18 @@ bool Run::writeResults() {
     return done;
 }
 
+bool Run::saveSettings() {
+    if (settings_ == SettingsState::unusable) return true;
+    auto const problem = tzhost::saveUserVariables(settingsFile(options_));
+    return !problem || complain(*problem);
+}
+
 int Run::finish() {
     tzhost::commandLine().freshLine();
     faults_.remove();
     std::string error;
     bool written = writeResults();
+    if (!saveSettings()) written = false;
     bool const leftOver = !tzhost::worstAudit().clean();
     tzhost::dynamicLinker().unloadAll();
     if (!events_.finish(error)) written = complain(error);

@@ -31,13 +31,12 @@ std::string environment(char const* name) {
 }
 
 // Settings that cannot be used are reported, and the defaults hold.
-bool loadSettings(Options const& options, std::string& error) {
+bool loadSettings(Options const& options, SettingsState& state, std::string& error) {
     tzhost::settings() = tzhost::Settings();
     bool const isNamed = !options.settings.empty();
-    auto const problem =
-        isNamed
-            ? tzhost::loadSettings(options.settings.string(), tzhost::IfMissing::fail)
-            : tzhost::loadSettings(tzhost::defaultSettingsFile(), tzhost::IfMissing::useDefaults);
+    auto const problem = tzhost::loadSettings(
+        settingsFile(options), isNamed ? tzhost::IfMissing::fail : tzhost::IfMissing::useDefaults);
+    state = problem ? SettingsState::unusable : SettingsState::usable;
     if (!problem) return true;
     error = *problem;
     if (!isNamed) tzhost::commandLine().say(tzhost::fromUtf8(*problem));
@@ -103,10 +102,14 @@ std::filesystem::path modulePath(Options const& options) {
     return std::filesystem::path(tzhost::libraryFolder()) / kModuleName;
 }
 
-bool configureHost(Options const& options, std::string& error) {
+std::string settingsFile(Options const& options) {
+    return options.settings.empty() ? tzhost::defaultSettingsFile() : options.settings.string();
+}
+
+bool configureHost(Options const& options, SettingsState& settings, std::string& error) {
     tzhost::Variables::instance().reset();
     watchViewOnce();
-    if (!loadSettings(options, error) || !setVariables(options, error)) return false;
+    if (!loadSettings(options, settings, error) || !setVariables(options, error)) return false;
     findResources(options);
     tzhost::setFontMapFile(options.fontMap.string());
     chooseEditors(options);
