@@ -4,6 +4,7 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/utf8.h"
+#include "host/command_line/jig_driver.h"
 #include "host/runtime/documents.h"
 #include "tz/rx/status.h"
 
@@ -48,6 +49,7 @@ void CommandLine::reset() {
     voice_ = Voice::module;
     failures_ = 0;
     hasFailed_ = false;
+    resetDragCursor();
 }
 
 void CommandLine::print(std::wstring_view text) {

@@ -52,6 +52,10 @@ bool goesOn(int status) {
 
 }  // namespace
 
+void tzhost::resetDragCursor() {
+    cursor() = TzGePoint3d::kOrigin;
+}
+
 TzEdJigDriver::TzEdJigDriver(TzEdJig& jig) : jig_(jig), outer_(std::exchange(jig.driver_, this)) {
     jig_.data_ = {};
 }

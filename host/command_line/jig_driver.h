@@ -13,6 +13,13 @@
 #include "host/command_line/question.h"
 #include "tz/ed/jig.h"
 
+namespace tzhost {
+
+// Puts the cursor back to the origin, where it stands when the process starts.
+void resetDragCursor();
+
+}  // namespace tzhost
+
 class TzEdJigDriver {
 public:
     // Takes the jig's calls to acquirePoint until it ends.

@@ -34,6 +34,10 @@ TzString quoted(wchar_t const* name) {
     return TzString::formatted(L"\"%ls\"", name ? name : L"");
 }
 
+void printText(unsigned id) {
+    tzutPrintf(L"%ls", gStringTable[id].kwszPtr());
+}
+
 TzString modesOf(TzDbTextStyleTableRecord const& style) {
     TzString modes;
     if (style.flagBits() & kBackwardBit) modes += gStringTable[kBackward] + L" ";
@@ -104,10 +108,10 @@ void TzxMtextCommandBase::EnumerateStyles() {
     EasyIterator<TzDbTextStyleTable, TzDbTextStyleTableIterator> walk;
     if (table->newIterator(walk.object, true, true) != Tzad::eOk) return;
     tzedTextScr();
-    tzutPrintf(gStringTable[kHeading]);
+    printText(kHeading);
     walk->start(true, true);
     ListCounts const counts = printStyles(*walk.object, pattern);
-    if (counts.shown == 0) tzutPrintf(gStringTable[kNoneFound]);
+    if (counts.shown == 0) printText(kNoneFound);
     if (counts.external > 0) tzutPrintf(gStringTable[kExternalStyles], counts.external);
     tzutPrintf(gStringTable[kCurrentStyle], quoted(GetCurrentTextStyleName()).kwszPtr());
 }

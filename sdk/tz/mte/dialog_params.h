@@ -40,6 +40,8 @@ private:
 class TZ_API TzApHostRawEditorParamsFrameless : public TzApHostDialogParams {
 public:
     TzApHostRawEditorParamsFrameless();
+    TzApHostRawEditorParamsFrameless(TzApHostRawEditorParamsFrameless const&) = delete;
+    TzApHostRawEditorParamsFrameless& operator=(TzApHostRawEditorParamsFrameless const&) = delete;
     ~TzApHostRawEditorParamsFrameless() override;
     [[nodiscard]] EasyObject<TzDbMText>* easyMText() const { return imp_->easyMText(); }
     void setEasyMText(EasyObject<TzDbMText>* text) { imp_->setEasyMText(text); }
@@ -57,6 +59,8 @@ private:
 class TZ_API TzApHostOldEditorParamsFrameless : public TzApHostDialogParams {
 public:
     TzApHostOldEditorParamsFrameless();
+    TzApHostOldEditorParamsFrameless(TzApHostOldEditorParamsFrameless const&) = delete;
+    TzApHostOldEditorParamsFrameless& operator=(TzApHostOldEditorParamsFrameless const&) = delete;
     ~TzApHostOldEditorParamsFrameless() override;
     [[nodiscard]] CMTextEditorState* mTextEditorState() const { return imp_->mTextEditorState(); }
     void setMTextEditorState(CMTextEditorState* state) { imp_->setMTextEditorState(state); }

@@ -1,0 +1,93 @@
+// A text stays where it is on the page when another point of its box becomes the attached one.
+
+#include "module/edit/attachment.h"
+
+#include <gtest/gtest.h>
+
+#include "tests/mtext/held_text.h"
+
+namespace {
+
+void describe(TzDbMText& text, TzDbMText::AttachmentPoint attachment, double width) {
+    text.setDatabaseDefaults();
+    text.setNormal({0, -1, 0});
+    text.setDirection({0.6, 0, 0.8});
+    text.setLocation({3, 4, 5});
+    text.setTextHeight(2);
+    text.setWidth(width);
+    text.setContents(L"One\\PTwo and three");
+    text.setAttachment(attachment);
+}
+
+TzDbMText::AttachmentPoint point(int number) {
+    return static_cast<TzDbMText::AttachmentPoint>(number);
+}
+
+void expectStays(int from, int to, double width) {
+    TzDbMText text;
+    describe(text, point(from), width);
+    TzArray<TzGePoint3d> before;
+    text.getBoundingPoints(before);
+    EasyObject<TzDbMText> held(&text, EasyFlags::kNone);
+    UpdateAttachPoint(held, point(to), kMeasureHeight);
+    EXPECT_EQ(text.attachment(), point(from));
+    text.setAttachment(point(to));
+    TzArray<TzGePoint3d> after;
+    text.getBoundingPoints(after);
+    ASSERT_EQ(before.length(), 4);
+    EXPECT_TRUE(before[0].isEqualTo(after[0], TzGeTol(1e-9)));
+    EXPECT_TRUE(before[3].isEqualTo(after[3], TzGeTol(1e-9)));
+}
+
+// Without a width the measured one counts. A box wider than its text is another matter: the text
+// moves in it, the box does not.
+TEST(Attachment, LeavesTheTextWhereItIs) {
+    OpenDrawing const drawing;
+    for (int from = 1; from <= 9; ++from) {
+        for (int to = 1; to <= 9; ++to) {
+            SCOPED_TRACE(std::to_string(from) + " to " + std::to_string(to));
+            expectStays(from, to, 0);
+        }
+    }
+}
+
+struct MoveRow {
+    int from;
+    int to;
+    double height;
+    TzGePoint3d location;  // of a text at 0,0,0 with a width of 10
+};
+MoveRow const kMoves[] = {
+    {1, 1,  4, {0, 0, 0}  },
+    {1, 2,  4, {5, 0, 0}  },
+    {1, 3,  4, {10, 0, 0} },
+    {1, 4,  4, {0, -2, 0} },
+    {1, 5,  4, {5, -2, 0} },
+    {1, 6,  4, {10, -2, 0}},
+    {1, 7,  4, {0, -4, 0} },
+    {1, 8,  4, {5, -4, 0} },
+    {1, 9,  4, {10, -4, 0}},
+    {9, 1,  4, {-10, 4, 0}},
+    {5, 3,  4, {5, 2, 0}  },
+    {7, 9,  0, {10, 0, 0} },
+    {1, 9,  0, {10, 0, 0} },
+    {1, 0,  4, {0, 0, 0}  },
+    {9, 12, 4, {-10, 4, 0}},
+};
+
+TEST(Attachment, MovesTheLocationInAGivenBox) {
+    OpenDrawing const drawing;
+    for (MoveRow const& row : kMoves) {
+        SCOPED_TRACE(std::to_string(row.from) + " to " + std::to_string(row.to));
+        TzDbMText text;
+        text.setDatabaseDefaults();
+        text.setContents(L"Text");
+        text.setWidth(10);
+        text.setAttachment(point(row.from));
+        EasyObject<TzDbMText> held(&text, EasyFlags::kNone);
+        UpdateAttachPoint(held, point(row.to), row.height);
+        EXPECT_TRUE(text.location().isEqualTo(row.location));
+    }
+}
+
+}  // namespace

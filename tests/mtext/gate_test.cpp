@@ -1,0 +1,183 @@
+// The gate to the editors: which texts pass, what is said when they do not, and how a text is left.
+
+#include <gtest/gtest.h>
+
+#include "module/access/space_posting.h"
+#include "tests/mtext/held_text.h"
+#include "tz/db/mtext.h"
+#include "tz/db/shapes.h"
+#include "tz/ed/variables.h"
+#include "tz/mte/edit_mtext.h"
+#include "tz/mte/globals.h"
+
+namespace {
+
+constexpr char const* kBlock = "<<<\nafter\n>>>\n";
+
+TzDbObjectId post(TzDbEntity* entity) {
+    entity->setDatabaseDefaults();
+    TzDbObjectId id;
+    EXPECT_EQ(postToDb(entity, id, false), Tzad::eOk);
+    return id;
+}
+
+TzDbObjectId postText() {
+    auto* const text = new TzDbMText;
+    text->setContents(L"before");
+    return post(text);
+}
+
+TzString contentsOf(TzDbObjectId id) {
+    EasyObject<TzDbMText> text;
+    EXPECT_EQ(tzdbOpenObject(text.object, id, TzDb::kForRead), Tzad::eOk);
+    return text.object ? text->contents() : TzString();
+}
+
+void lockLayerZero() {
+    EasyObject<TzDbLayerTableRecord> layer;
+    ASSERT_EQ(tzdbOpenObject(layer.object, tzhost::workingDrawing()->clayer(), TzDb::kForWrite),
+              Tzad::eOk);
+    layer->setIsLocked(true);
+}
+
+void activateWorkingSet(TzDbObjectId left) {
+    tzhost::DrawingSettings settings = tzhost::workingDrawing()->settings();
+    settings.workingSetExists = true;
+    settings.workingSetActive = true;
+    tzhost::workingDrawing()->setSettings(settings);
+    left.record()->inWorkingSet = false;
+}
+
+int editById(TzDbObjectId id) {
+    return InvokeEditorOn(id, kMTETabText, 0, true, true);
+}
+
+// The holder of the second overload closes the text.
+int editByPointer(TzDbObjectId id) {
+    TzDbMText* text = nullptr;
+    EXPECT_EQ(tzdbOpenObject(text, id, TzDb::kForRead), Tzad::eOk);
+    int const result = InvokeEditorOn(text, kMTETabText, 0, true, true, false, false);
+    Tzad::ErrorStatus const status = tzdbOpenObject(text, id, TzDb::kForWrite);
+    EXPECT_TRUE(status == Tzad::eOk || status == Tzad::eOnLockedLayer) << status;
+    if (text) text->close();
+    return result;
+}
+
+struct GateRow {
+    char const* name;
+    int (*edit)(TzDbObjectId);
+    void (*prepare)(TzDbObjectId);
+    int result;
+    wchar_t const* shown;  // of the transcript
+    wchar_t const* contents;
+};
+
+void nothing(TzDbObjectId) {}
+void lock(TzDbObjectId) {
+    lockLayerZero();
+}
+
+GateRow const kGates[] = {
+    {"ById",                editById,      nothing,            1, L"",                   L"after" },
+    {"ByPointer",           editByPointer, nothing,            1, L"",                   L"after" },
+    {"LockedById",          editById,      lock,               3, L"on a locked layer",  L"before"},
+    {"LockedByPointer",     editByPointer, lock,               3, L"on a locked layer",  L"before"},
+    {"WorkingSetById",      editById,      activateWorkingSet, 3, L"in the working set", L"before"},
+    {"WorkingSetByPointer", editByPointer, activateWorkingSet, 3, L"in the working set", L"before"},
+};
+
+class Gates : public testing::TestWithParam<GateRow> {};
+TEST_P(Gates, LetTextsThrough) {
+    GateRow const& row = GetParam();
+    OpenDrawing const drawing(kBlock);
+    TzDbObjectId const id = postText();
+    row.prepare(id);
+    EXPECT_EQ(row.edit(id), row.result);
+    EXPECT_EQ(contentsOf(id).str(), row.contents);
+    EXPECT_NE(drawing.transcript().find(row.shown), std::wstring::npos) << row.shown;
+    EXPECT_EQ(gpText, nullptr);
+}
+INSTANTIATE_TEST_SUITE_P(Overloads, Gates, testing::ValuesIn(kGates), [](auto const& row) {
+    return row.param.name;
+});
+
+TEST(Gate, ReportsWhatIsNoText) {
+    OpenDrawing const drawing;
+    TzDbObjectId const line = post(new TzDbLine);
+    EXPECT_EQ(editById(line), 3);
+    EXPECT_EQ(editById(TzDbObjectId()), 3);
+    TzDbMText* const none = nullptr;
+    EXPECT_EQ(InvokeEditorOn(none, kMTETabText, 0, true, true, false, false), 3);
+    std::wstring const shown = drawing.transcript();
+    int count = 0;
+    for (std::size_t at = 0; (at = shown.find(L"no multi-line text", at)) != std::wstring::npos;
+         ++at)
+        ++count;
+    EXPECT_EQ(count, 3);
+}
+
+TEST(Gate, LeavesTheOpeningAsItWas) {
+    OpenDrawing const drawing(kBlock);
+    gdJigBoundBoxHeight = 5;
+    TzDbObjectId const id = postText();
+    EasyObject<TzDbMText> text;
+    ASSERT_EQ(tzdbOpenObject(text.object, id, TzDb::kForRead), Tzad::eOk);
+    EXPECT_EQ(InvokeEditorOn(text, kMTETabText, 0, true, true, false, false, false), 1);
+    EXPECT_TRUE(text->isReadEnabled());
+    EXPECT_FALSE(text->isWriteEnabled());
+    // The height of a dragged box is for texts that are in no drawing.
+    EXPECT_EQ(drawing.events().find("\"16\":"), std::string::npos);
+}
+
+TEST(Gate, RefusesWhatItCannotWrite) {
+    OpenDrawing const drawing(kBlock);
+    TzDbObjectId const id = postText();
+    EasyObject<TzDbMText> elsewhere;
+    ASSERT_EQ(tzdbOpenObject(elsewhere.object, id, TzDb::kForRead), Tzad::eOk);
+    EasyObject<TzDbMText> text;
+    ASSERT_EQ(tzdbOpenObject(text.object, id, TzDb::kForRead), Tzad::eOk);
+    EXPECT_EQ(InvokeEditorOn(text, kMTETabText, 0, true, true, false, false, false), 3);
+    EXPECT_NE(drawing.events().find("cannot be opened for writing"), std::string::npos);
+}
+
+struct RecordRow {
+    char const* name;
+    int attributeInPlace;  // ATTIPE
+    bool view;
+    bool attribute;
+    bool option13;
+    bool option14;
+    char const* settings;  // how the record begins
+};
+constexpr RecordRow kRecords[] = {
+    {"View",             0, true,  false, false, false, R"({"0":1,"5":1,"16":5.0,)"           },
+    {"NoView",           1, false, false, false, false, R"({"5":1,"16":5.0,)"                 },
+    {"Attribute",        0, true,  true,  false, false, R"({"4":1,"5":1,"6":1,"16":5.0,)"     },
+    {"AttributeInPlace", 1, false, true,  false, false, R"({"0":1,"4":1,"5":1,"16":5.0,)"     },
+    {"Option13",         0, true,  false, true,  false, R"({"0":1,"5":1,"12":8192,"16":5.0,)" },
+    {"BothOptions",      0, true,  false, true,  true,  R"({"0":1,"5":1,"12":24576,"16":5.0,)"},
+};
+
+class Records : public testing::TestWithParam<RecordRow> {};
+TEST_P(Records, TellTheInPlaceEditor) {
+    RecordRow const& row = GetParam();
+    OpenDrawing const drawing(kBlock);
+    resbuf value{nullptr, Tzad::eResultShort, {}};
+    value.resval.rint = static_cast<short>(row.attributeInPlace);
+    ASSERT_EQ(tzedSetVar(L"ATTIPE", &value), Tzad::ePromptNormal);
+    gdJigBoundBoxHeight = 5;
+    gbUsedIPE = 0;
+    TzDbMText text;
+    text.setDatabaseDefaults();
+    EasyObject<TzDbMText> held(&text, EasyFlags::kNone);
+    EXPECT_EQ(InvokeEditorOn(held, kMTETabText, 0, true, row.view, row.attribute, row.option13,
+                             row.option14),
+              1);
+    EXPECT_EQ(gbUsedIPE, 1);
+    EXPECT_NE(drawing.events().find(row.settings), std::string::npos) << drawing.events();
+}
+INSTANTIATE_TEST_SUITE_P(Arguments, Records, testing::ValuesIn(kRecords), [](auto const& row) {
+    return row.param.name;
+});
+
+}  // namespace

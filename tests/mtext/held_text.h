@@ -1,0 +1,36 @@
+#pragma once
+
+#include <memory>
+#include <string_view>
+
+#include "host/database/drawing.h"
+#include "host/runtime/documents.h"
+#include "tests/command_line/session.h"
+
+// An open drawing with a script's answers, for tests that hold a text of their own and call the
+// module's code directly.
+//
+//   OpenDrawing const drawing("3,4\nAbc\n\n");
+//   TzDbMText text;
+//   EXPECT_EQ(doMTextCommandForAttributeDlg(&text), 1);
+class OpenDrawing {
+public:
+    explicit OpenDrawing(std::string_view script = {})
+        : session_(script), drawing_(tzhost::Drawing::create()) {
+        tzhost::setWorkingDrawing(drawing_.get());
+        tzhost::documents().open(drawing_.get());
+    }
+    OpenDrawing(OpenDrawing const&) = delete;
+    OpenDrawing& operator=(OpenDrawing const&) = delete;
+    ~OpenDrawing() {
+        tzhost::documents().close();
+        tzhost::setWorkingDrawing(nullptr);
+    }
+
+    [[nodiscard]] std::string const& events() const { return session_.events(); }
+    [[nodiscard]] std::wstring const& transcript() const { return session_.transcript(); }
+
+private:
+    tzhost::test::Session session_;
+    std::unique_ptr<tzhost::Drawing> drawing_;
+};
