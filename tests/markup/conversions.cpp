@@ -30,12 +30,39 @@ CStdStrW Session::toRtf(std::wstring const& markup) {
     return context.Parse(markup.c_str());
 }
 
+CStdStrW Session::toMtext(std::wstring const& rtf) {
+    CRichTextToMTextContext context(&fonts_, &fontScale_, &marginScale_);
+    setUp(context);
+    return context.Parse(rtf.c_str());
+}
+
+CStdStrW Session::roundTrip(std::wstring const& markup) {
+    CMTextToRichTextContext there(&fonts_, &fontScale_, &marginScale_);
+    setUp(there);
+    CStdStrW const rtf = there.Parse(markup.c_str());
+    CRichTextToMTextContext back(&fonts_, &fontScale_, &marginScale_);
+    setUp(back);
+    back.SetTracking(there.GetTracking());
+    back.SetCharWidth(there.GetCharWidth());
+    back.SetOblique(there.GetOblique());
+    back.SetBaseAlignment(there.GetBaseAlignment(), 0);
+    return back.Parse(rtf.c_str());
+}
+
 void setUp(CMTextToRichTextContext& context) {
     context.SetInitialFontName(L"Liberation Sans", false, false, kAnsiCharset, 34);
     context.SetInitialFontSize(kSize, kTwips);
     context.SetInitialFontColor(0xFFFFFF);
     context.SetByLayerColor(0x0000FF);
     context.SetByBlockColor(0x00FF00);
+}
+
+void setUp(CRichTextToMTextContext& context) {
+    context.SetInitialFontName(L"Liberation Sans", false, false, kAnsiCharset, 34);
+    context.SetInitialFontSize(kSize, kTwips);
+    context.SetByLayerColor(0x0000FF);
+    context.SetByBlockColor(0x00FF00);
+    context.SetInitialColor(0xFFFFFF);
 }
 
 std::wstring bodyOf(std::wstring const& document) {

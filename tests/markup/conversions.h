@@ -5,6 +5,7 @@
 #include <string>
 
 #include "module/markup/mtext_to_rtf.h"
+#include "module/markup/rtf_to_mtext.h"
 #include "module/markup/scale_correction.h"
 #include "tz/mte/font_map_database.h"
 
@@ -37,6 +38,10 @@ public:
 
     // The whole document.
     [[nodiscard]] CStdStrW toRtf(std::wstring const& markup);
+    // The whole markup.
+    [[nodiscard]] CStdStrW toMtext(std::wstring const& rtf);
+    // To rich text and back, with the whole-text values carried over as an editor does.
+    [[nodiscard]] CStdStrW roundTrip(std::wstring const& markup);
 
 private:
     OwnFontMap map_;
@@ -47,6 +52,7 @@ private:
 
 // A context set up as a session does.
 void setUp(CMTextToRichTextContext& context);
+void setUp(CRichTextToMTextContext& context);
 
 // What stands between the head of a document, "\deftab0 " included, and the last "\par }".
 [[nodiscard]] std::wstring bodyOf(std::wstring const& document);

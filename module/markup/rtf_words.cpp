@@ -1,0 +1,265 @@
+// What the control words do.
+
+#include <algorithm>
+#include <array>
+
+#include "module/access/resources.h"
+#include "module/markup/number_text.h"
+#include "module/markup/rtf_reading.h"
+#include "module/markup/rtf_to_mtext.h"
+#include "module/markup/rtf_tokens.h"
+#include "module/markup/scale_correction.h"
+#include "module/markup/wrapping.h"
+
+// The words in alphabetical order; what is not among them is unknown.
+struct RtfWords {
+    using Context = CRichTextToMTextContext;
+    struct Row {
+        std::wstring_view word;
+        void (Context::*handler)(wchar_t const*&, int);
+    };
+    static constexpr Row kRows[] = {
+        {L"ansicpg",   &Context::OnCodePage        },
+        {L"b",         &Context::OnBold            },
+        {L"cf",        &Context::OnForegroundColor },
+        {L"colortbl",  &Context::OnColorTable      },
+        {L"cpg",       &Context::OnCodePage        },
+        {L"deff",      &Context::OnNothing         },
+        {L"dn",        &Context::OnBaselineDown    },
+        {L"emdash",    &Context::OnEmDash          },
+        {L"emspace",   &Context::OnEmSpace         },
+        {L"endash",    &Context::OnEnDash          },
+        {L"enspace",   &Context::OnEnSpace         },
+        {L"f",         &Context::OnFont            },
+        {L"fonttbl",   &Context::OnFontTable       },
+        {L"fs",        &Context::OnFontSize        },
+        {L"i",         &Context::OnItalic          },
+        {L"lang",      &Context::OnNothing         },
+        {L"ldblquote", &Context::OnLeftDoubleQuote },
+        {L"line",      &Context::OnLineBreak       },
+        {L"lquote",    &Context::OnLeftSingleQuote },
+        {L"par",       &Context::OnParagraph       },
+        {L"pard",      &Context::OnDefaultParagraph},
+        {L"plain",     &Context::OnPlain           },
+        {L"pntext",    &Context::OnPnText          },
+        {L"rdblquote", &Context::OnRightDoubleQuote},
+        {L"rquote",    &Context::OnRightSingleQuote},
+        {L"rtf",       &Context::OnNothing         },
+        {L"strike",    &Context::OnStrikethrough   },
+        {L"tab",       &Context::OnTab             },
+        {L"u",         &Context::OnUnicode         },
+        {L"ul",        &Context::OnUnderline       },
+        {L"ulnone",    &Context::OnUnderlineOff    },
+        {L"up",        &Context::OnBaselineUp      },
+    };
+
+    static constexpr bool isSorted() {
+        return std::is_sorted(std::begin(kRows), std::end(kRows),
+                              [](Row const& a, Row const& b) { return a.word < b.word; });
+    }
+};
+
+// A character that is no word of the markup: a text of the resource library, else a plain one.
+struct CRichTextToMTextContext::Replacement {
+    int id;
+    wchar_t const* fallback;
+};
+
+namespace {
+
+static_assert(RtfWords::isSorted());
+
+constexpr int kStackMarker = 1234;
+constexpr int kUsualBaseline = 6;
+constexpr int kTwipsPerHalfPoint = 10;
+
+enum ReplacementPlace : std::size_t {
+    kEmDash,
+    kEnDash,
+    kLeftSingleQuote,
+    kRightSingleQuote,
+    kLeftDoubleQuote,
+    kRightDoubleQuote,
+};
+
+}  // namespace
+
+bool CRichTextToMTextContext::HandleToken(wchar_t const*& cursor,
+                                          std::wstring_view word,
+                                          int value) {
+    auto const* const end = std::end(RtfWords::kRows);
+    auto const* const row = std::lower_bound(
+        std::begin(RtfWords::kRows), end, word,
+        [](RtfWords::Row const& each, std::wstring_view sought) { return each.word < sought; });
+    if (row == end || row->word != word) return false;
+    if (!m_bSwallowTokens) (this->*row->handler)(cursor, value);
+    return true;
+}
+
+void CRichTextToMTextContext::OnNothing(wchar_t const*&, int) {}
+
+void CRichTextToMTextContext::OnParagraph(wchar_t const*&, int) {
+    PreEmitChar();
+    Append(L"\\P");
+}
+
+void CRichTextToMTextContext::OnLineBreak(wchar_t const*&, int) {
+    PreEmitChar();
+    Append(L'\n');
+}
+
+void CRichTextToMTextContext::OnTab(wchar_t const*&, int) {
+    PreEmitChar();
+    Append(L'\t');
+}
+
+// Leaves character set and pitch as they are.
+void CRichTextToMTextContext::OnPlain(wchar_t const*&, int) {
+    SetFontName(base().m_sFontName);
+    SetColor(base().m_nColorIndex, base().m_nRGB);
+    SetFontSize(base().m_dSize);
+    SetBold(false);
+    SetItalic(false);
+    SetUnderline(false);
+    SetStrikethrough(false);
+}
+
+void CRichTextToMTextContext::OnFont(wchar_t const*&, int value) {
+    Record const* const font = fontAt(value);
+    if (!font) {
+        SetFontName(base().m_sFontName);
+        SetBold(base().m_bBold);
+        SetItalic(base().m_bItalic);
+        return;
+    }
+    SetFontName(font->name);
+    SetCharSet(font->charset);
+    SetPitchAndFamily(font->pitchAndFamily);
+    m_nCodePage = TzCodePage::CharSetToCodePageId(font->charset);
+}
+
+void CRichTextToMTextContext::OnForegroundColor(wchar_t const*&, int value) {
+    int index = 0;
+    unsigned int rgb = 0;
+    if (GetColor(value, &index) && GetColor(value, rgb)) SetColor(index, rgb);
+}
+
+void CRichTextToMTextContext::OnFontSize(wchar_t const*&, int value) {
+    SetFontSize(value >= 1
+                    ? m_pFontScale->ScaleTwipsToUnits(wrappingProduct(value, kTwipsPerHalfPoint))
+                    : base().m_dSize);
+}
+
+void CRichTextToMTextContext::OnBold(wchar_t const*&, int value) {
+    SetBold(value != 0);
+}
+
+void CRichTextToMTextContext::OnItalic(wchar_t const*&, int value) {
+    SetItalic(value != 0);
+}
+
+void CRichTextToMTextContext::OnUnderline(wchar_t const*&, int value) {
+    SetUnderline(value != 0);
+}
+
+void CRichTextToMTextContext::OnUnderlineOff(wchar_t const*&, int) {
+    SetUnderline(false);
+}
+
+void CRichTextToMTextContext::OnStrikethrough(wchar_t const*&, int value) {
+    SetStrikethrough(value != 0);
+}
+
+void CRichTextToMTextContext::OnBaselineUp(wchar_t const*&, int value) {
+    SetBaseAlignment(value != 0 ? kAlignTop : kAlignMiddle, 0);
+    m_bInStack = false;
+}
+
+void CRichTextToMTextContext::OnBaselineDown(wchar_t const*&, int value) {
+    if (value == kNoValue) value = kUsualBaseline;
+    m_bInStack = value == kStackMarker;
+    if (!m_bInStack) SetBaseAlignment(value == 0 ? kAlignMiddle : kAlignBottom, 1);
+}
+
+void CRichTextToMTextContext::OnCodePage(wchar_t const*&, int value) {
+    m_nCodePage = value;
+}
+
+// Spaces, dashes and quotes leave a change of the look pending, which is written behind them.
+void CRichTextToMTextContext::OnEmSpace(wchar_t const*&, int) {
+    Append(L"  ");
+}
+
+void CRichTextToMTextContext::OnEnSpace(wchar_t const*&, int) {
+    Append(L' ');
+}
+
+void CRichTextToMTextContext::appendReplacement(std::size_t which) {
+    static constexpr Replacement kReplacements[] = {
+        {1033, L"--"},
+        {1034, L"-" },
+        {1035, L"'" },
+        {1036, L"'" },
+        {1037, L"\""},
+        {1038, L"\""},
+    };
+    TzString& text = replacements_[which];
+    if (text.isEmpty()) text = loadResourceString(kReplacements[which].id);
+    if (text.isEmpty()) text = kReplacements[which].fallback;
+    Append(text.kwszPtr());
+}
+
+void CRichTextToMTextContext::OnEmDash(wchar_t const*&, int) {
+    appendReplacement(kEmDash);
+}
+
+void CRichTextToMTextContext::OnEnDash(wchar_t const*&, int) {
+    appendReplacement(kEnDash);
+}
+
+void CRichTextToMTextContext::OnLeftSingleQuote(wchar_t const*&, int) {
+    appendReplacement(kLeftSingleQuote);
+}
+
+void CRichTextToMTextContext::OnRightSingleQuote(wchar_t const*&, int) {
+    appendReplacement(kRightSingleQuote);
+}
+
+void CRichTextToMTextContext::OnLeftDoubleQuote(wchar_t const*&, int) {
+    appendReplacement(kLeftDoubleQuote);
+}
+
+void CRichTextToMTextContext::OnRightDoubleQuote(wchar_t const*&, int) {
+    appendReplacement(kRightDoubleQuote);
+}
+
+// Always takes one character behind the word for its substitute, also a backslash.
+void CRichTextToMTextContext::OnUnicode(wchar_t const*& cursor, int value) {
+    (void)GetCharacterMBCS(cursor, m_nCodePage);  // not shown
+    PreEmitChar();
+    CStdStrW code(L"\\U+");
+    appendHex4(code, static_cast<unsigned int>(value));
+    Append(std::wstring_view(code));
+}
+
+// The number or bullet of a list as plain text, up to the end of its group. A `\pntext` inside it
+// reads on to the same end, so it needs no reading of its own.
+void CRichTextToMTextContext::OnPnText(wchar_t const*& cursor, int) {
+    while (*cursor != 0 && *cursor != L'}') {
+        if (*cursor == L'{') {
+            skipGroup(cursor);
+            continue;
+        }
+        if (*cursor != L'\\') {
+            PreEmitChar();
+            Append(*cursor++);
+            continue;
+        }
+        int value = 0;
+        std::wstring_view const word = GetToken(++cursor, value);
+        if (word.empty())
+            onSymbol(cursor);
+        else if (word != L"pntext")
+            HandleToken(cursor, word, value);
+    }
+}
