@@ -144,14 +144,16 @@ std::span<VariableDefinition const> variableTable() {
     return kVariables;
 }
 
+// Takes no memory, since what gives something back reads variables too.
 VariableDefinition const* findVariable(std::wstring_view name) {
-    std::wstring capitals(name);
-    for (wchar_t& c : capitals)
-        c = upperOf(c);
-    auto const at = std::lower_bound(kVariables.begin(), kVariables.end(), capitals,
-                                     [](VariableDefinition const& row, std::wstring const& wanted) {
-                                         return row.name < wanted;
-                                     });
+    constexpr std::size_t kLongest = 32;
+    std::array<wchar_t, kLongest> buffer{};
+    if (name.size() > buffer.size()) return nullptr;
+    std::transform(name.begin(), name.end(), buffer.begin(), upperOf);
+    std::wstring_view const capitals(buffer.data(), name.size());
+    auto const at = std::lower_bound(
+        kVariables.begin(), kVariables.end(), capitals,
+        [](VariableDefinition const& row, std::wstring_view wanted) { return row.name < wanted; });
     return at != kVariables.end() && at->name == capitals ? &*at : nullptr;
 }
 

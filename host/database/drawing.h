@@ -88,7 +88,8 @@ public:
     [[nodiscard]] DrawingSettings const& settings() const { return settings_; }
     // Puts settings in place unchecked and shows the style's name in TEXTSTYLE.
     void setSettings(DrawingSettings const& settings);
-    // The same for a drawing that is not worked on yet: no variable changes.
+    // The same for settings whose style is that of before, or a drawing that is not worked on yet:
+    // no variable changes, and nothing can fail.
     void restoreSettings(DrawingSettings const& settings) { settings_ = settings; }
     void setFile(std::filesystem::path file) { fileName_ = std::move(file); }
     [[nodiscard]] std::filesystem::path const& file() const { return fileName_; }

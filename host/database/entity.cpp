@@ -8,6 +8,7 @@
 #include "host/database/geometry.h"
 #include "host/database/open_state.h"
 #include "host/database/symbol_imp.h"
+#include "host/faults/memory.h"
 #include "tz/db/host_services.h"
 #include "tz/gi/draw.h"
 
@@ -88,11 +89,12 @@ void markHighlighted(TzDbObjectRecord& record, bool on) {
     if (record.highlighted != on) tzhost::audit().highlighted += on ? 1 : -1;
     record.highlighted = on;
     if (!tzhost::eventsWanted()) return;
-    tzhost::reportEvent({
-        {"event",  "highlight"                                    },
-        {"handle", tzhost::utf8(tzhost::handleText(record.handle))},
-        {"on",     on                                             }
-    });
+    tzhost::MemoryFaultPause const pause;  // what happened is told in any case
+    tzhost::Event event;
+    event["event"] = "highlight";
+    event["handle"] = tzhost::utf8(tzhost::handleText(record.handle));
+    event["on"] = on;
+    tzhost::reportEvent(event);
 }
 
 }  // namespace

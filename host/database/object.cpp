@@ -1,6 +1,7 @@
 #include "tz/db/object.h"
 
 #include <algorithm>
+#include <new>
 
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
@@ -82,6 +83,17 @@ TzDbObject* TzDbObject::clone() const {
     return copy.release();
 }
 
+namespace {
+
+// A field that cannot be evaluated is attached all the same; what fails in it shows "####".
+void evaluateAttached(TzDbField& field, tzhost::Drawing& drawing) try {
+    (void)field.evaluate(0x20, &drawing);
+} catch (std::bad_alloc const&) {
+    // Its owner shows the text from before.
+}
+
+}  // namespace
+
 Tzad::ErrorStatus TzDbObject::setField(wchar_t const* key, TzDbField* field, TzDbObjectId& id) {
     id.setNull();
     if (auto const fault = faultStatus("TzDbObject::setField")) return fault;
@@ -106,7 +118,7 @@ Tzad::ErrorStatus TzDbObject::setField(wchar_t const* key, TzDbField* field, TzD
     } else {
         links.emplace_back(std::move(name), id);
     }
-    (void)field->evaluate(0x20, record->drawing);  // what fails shows "####"
+    evaluateAttached(*field, *record->drawing);
     return Tzad::eOk;
 }
 

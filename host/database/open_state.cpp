@@ -5,6 +5,7 @@
 #include "host/database/drawing.h"
 #include "host/database/entity_imp.h"
 #include "host/database/symbol_imp.h"
+#include "host/faults/memory.h"
 #include "tz/db/entity.h"
 #include "tz/db/field.h"
 
@@ -13,10 +14,11 @@ namespace {
 
 void reportWrite(TzDbObjectRecord const& record) {
     if (!eventsWanted() || !record.object->isKindOf(TzDbEntity::desc())) return;
-    reportEvent({
-        {"event",  "write"                        },
-        {"handle", utf8(handleText(record.handle))}
-    });
+    MemoryFaultPause const pause;  // what happened is told in any case
+    Event event;
+    event["event"] = "write";
+    event["handle"] = utf8(handleText(record.handle));
+    reportEvent(event);
 }
 
 }  // namespace

@@ -76,11 +76,13 @@ void UndoLog::noteAppended(TzDbObjectRecord& record) noexcept {
 void UndoLog::takeBack(Entry& entry) {
     TzDbObjectRecord& record = *entry.record;
     record.erased = entry.erased;
+    if (record.object->isKindOf(TzDbSymbolTableRecord::desc())) noteNamesChanged();
     if (!entry.values) {
         if (record.owner) removeFromList(*record.owner, record);
         return;
     }
     TzDbObjectAccess::exchange(*record.object, std::move(entry.values));
+    if (record.object->isKindOf(TzDbTextStyleTableRecord::desc())) noteLooksChanged();
 }
 
 void UndoLog::restoreVariables(Step const& step) {
@@ -98,8 +100,6 @@ bool UndoLog::takeBack() {
     for (auto entry = step.entries.rbegin(); entry != step.entries.rend(); ++entry) {
         takeBack(*entry);
     }
-    noteNamesChanged();
-    noteLooksChanged();
     if (step.settings) drawing_.setSettings(*step.settings);
     restoreVariables(step);
     noteUserSystem();

@@ -1,5 +1,6 @@
 #include "host/database/user_system.h"
 
+#include <new>
 #include <utility>
 #include <vector>
 
@@ -7,6 +8,7 @@
 #include "host/base/event_sink.h"
 #include "host/base/variables.h"
 #include "host/database/geometry.h"
+#include "host/faults/memory.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/ucs.h"
 #include "tz/ge/matrix3d.h"
@@ -43,7 +45,12 @@ void turnViewDirection(UserSystem const& from, UserSystem const& to) {
     direction.transformBy(fromAxes).transformBy(toAxes.inverse());
     VariablePoint const turned{direction.x, direction.y, direction.z};
     // Numbers of a rotated direction are finite and not all zero, so the variable takes them.
-    (void)variables.set(L"VIEWDIR", turned, Writer::host);
+    // Restoring a system must not fail for want of memory, which telling observers may take.
+    try {
+        (void)variables.set(L"VIEWDIR", turned, Writer::host);
+    } catch (std::bad_alloc const&) {
+        (void)variables.setKept(L"VIEWDIR", turned);
+    }
 }
 
 void place(Drawing& drawing, TzDbObjectId space, UserSystem const& system) {
@@ -51,7 +58,7 @@ void place(Drawing& drawing, TzDbObjectId space, UserSystem const& system) {
     bool const isActive = space == drawing.activeSpace();
     if (isActive) turnViewDirection(systemOf(drawing, space), system);
     (space == drawing.paperSpace() ? settings.paperSystem : settings.modelSystem) = system;
-    drawing.setSettings(settings);
+    drawing.restoreSettings(settings);
 }
 
 bool isProper(UserSystem const& system) {
@@ -69,6 +76,7 @@ Event threeNumbers(double x, double y, double z) {
 
 void reportSystem(char const* action, UserSystem const& system) {
     if (!eventsWanted()) return;
+    MemoryFaultPause const pause;  // what happened is told in any case
     Event event;
     event["event"] = "ucs";
     event["action"] = action;
@@ -160,9 +168,11 @@ int tzedSetCurrentUCS(TzGeMatrix3d const& system) {
         return Tzad::eInvalidInput;
     }
     TzDbObjectId const space = drawing->activeSpace();
-    tzhost::stack().push_back({drawing->serial(), space, tzhost::systemOf(*drawing, space)});
-    ++tzhost::audit().ucsStack;
+    tzhost::Remembered const before{drawing->serial(), space, tzhost::systemOf(*drawing, space)};
+    tzhost::stack().reserve(tzhost::stack().size() + 1);
     (void)tzhost::setUserSystem(next);  // checked above
+    tzhost::stack().push_back(before);
+    ++tzhost::audit().ucsStack;
     tzhost::reportSystem("set", next);
     return Tzad::eOk;
 }

@@ -1,0 +1,84 @@
+#include <new>
+
+#include "host/base/audit.h"
+#include "host/base/event_sink.h"
+#include "host/faults/fault_plan.h"
+#include "host/faults/memory.h"
+#include "tests/database/drawing_fixture.h"
+#include "tz/ed/ucs.h"
+
+using tzhost::test::DrawingTest;
+
+namespace {
+
+// Gives back on every way out, as a module's holders do.
+struct SystemHolder {
+    bool held = false;
+    ~SystemHolder() {
+        if (held) (void)tzedRestorePreviousUCS();
+    }
+};
+struct TextHolder {
+    TzDbMText* text = nullptr;
+    ~TextHolder() {
+        if (!text) return;
+        (void)text->unhighlight();
+        (void)text->close();
+    }
+};
+
+// A command that adds a text with a field, changes one, and works in a system of its own.
+void work(tzhost::Drawing& drawing, TzDbObjectId id) {
+    SystemHolder system;
+    system.held = tzedSetCurrentUCS(TzGeMatrix3d::rotation(1, TzGeVector3d::kXAxis)) == 0;
+    TextHolder holder;
+    if (tzdbOpenObject(holder.text, id, TzDb::kForWrite) != Tzad::eOk) return;
+    (void)holder.text->highlight();
+    (void)holder.text->setContents(L"%<\\Var LUNITS>% and a text that needs memory");
+    std::unique_ptr<TzDbObject> const copy(holder.text->clone());
+    auto fresh = std::make_unique<TzDbMText>();
+    fresh->setDatabaseDefaults(&drawing);
+    (void)fresh->setContents(L"another text with a %<\\Var LUPREC>%");
+    TzDbBlockTableRecord* space = nullptr;
+    if (tzdbOpenObject(space, drawing.modelSpace(), TzDb::kForWrite) != Tzad::eOk) return;
+    struct Closer {
+        TzDbObject* object;
+        ~Closer() { (void)object->close(); }
+    } const closer{space};
+    TzDbObjectId added;
+    if (space->appendTzDbEntity(added, fresh.get()) == Tzad::eOk) (void)fresh.release()->close();
+}
+
+// Whichever allocation fails, nothing stays lent, and undo brings the drawing back.
+TEST_F(DrawingTest, EveryFailingAllocationIsSurvived) {
+    TzDbObjectId const id = addText(L"abc");
+    auto const before = tzhost::setEventSink([](tzhost::Event const&) {});
+    bool struck = true;
+    int call = 0;
+    while (struck && ++call < 2000) {
+        tzhost::FaultPlan plan;
+        ASSERT_FALSE(plan.add("operator new:" + std::to_string(call)));
+        drawing->undoLog().begin();
+        plan.install();
+        try {
+            tzhost::MemoryFaultScope const scope;
+            work(*drawing, id);
+        } catch (std::bad_alloc const&) {
+            EXPECT_TRUE(plan.hasStruck());
+        }
+        plan.remove();
+        struck = plan.hasStruck();
+        drawing->undoLog().end();
+        ASSERT_TRUE(tzhost::audit().clean()) << call << ": " << tzhost::audit().openObjects;
+        while (drawing->undoLog().takeBack()) {
+        }
+        ASSERT_EQ(list(), "1 MTEXT 0") << call;
+        ASSERT_EQ(at<TzDbMText>(id).contents(), L"abc") << call;
+        ASSERT_EQ(drawing->ucsydir(), TzGeVector3d::kYAxis) << call;
+    }
+    EXPECT_FALSE(struck) << "the sweep came to its end";
+    EXPECT_GT(call, 20) << "the plan reached the allocations";
+    tzhost::setEventSink(before);
+}
+
+}  // namespace
