@@ -4,11 +4,13 @@
 #include <optional>
 #include <string>
 
+#include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/host_commands.h"
 #include "apps/tzdraft/event_file.h"
 #include "apps/tzdraft/function_call.h"
 #include "apps/tzdraft/session.h"
 #include "apps/tzdraft/start.h"
+#include "apps/tzdraft/terminal_source.h"
 #include "host/base/audit.h"
 #include "host/base/settings.h"
 #include "host/base/utf8.h"
@@ -18,6 +20,7 @@
 #include "host/runtime/command_runner.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
+#include "host/selection/entity_list.h"
 
 namespace tzdraft {
 namespace {
@@ -35,12 +38,17 @@ public:
 
 private:
     bool begin();
-    bool openScript();
+    bool openSource();
     bool openDrawing();
     bool planFaults();
     bool loadModule();
     void readCommands();
+    [[nodiscard]] std::vector<std::wstring> commandNames() const;
+    void runCall(std::wstring const& line);
     void runTyped(std::wstring const& line);
+    void runGuarded(std::wstring const& line);
+    void beginCommand(tzhost::Command const& command);
+    void endCommand(tzhost::Command const& command);
     int finish();
     bool writeResults();
     bool saveSettings();
@@ -60,7 +68,11 @@ bool Run::complain(std::string const& error) const {
     return false;
 }
 
-bool Run::openScript() {
+bool Run::openSource() {
+    if (options_.script.empty() && TerminalSource::isThere()) {
+        source_ = std::make_unique<TerminalSource>();
+        return true;
+    }
     std::string error;
     source_ = tzhost::ScriptSource::open(options_.script.empty() ? "-" : options_.script, error);
     return source_ ? true : complain(error);
@@ -97,40 +109,88 @@ bool Run::begin() {
     tzhost::resetWorstAudit();
     std::string error;
     if (!configureHost(options_, settings_, error)) return complain(error);
-    if (!openScript() || !planFaults()) return false;
+    if (!openSource() || !planFaults()) return false;
     line.setSource(source_.get());
     if (!options_.events.empty() && !events_.begin(options_.events, error)) return complain(error);
     registerHostCommands();
-    tzhost::addCommandHooks({[this](tzhost::Command const&) { session_.beginCommand(); },
-                             [this](tzhost::Command const&) { session_.endCommand(); }});
+    tzhost::addCommandHooks({[this](tzhost::Command const& command) { beginCommand(command); },
+                             [this](tzhost::Command const& command) { endCommand(command); }});
+    session_.setModule(modulePath(options_));
     if (!openDrawing()) return false;
     if (!options_.faults.empty()) faults_.install();
     return loadModule();
 }
 
+// Names of commands, for completion.
+std::vector<std::wstring> Run::commandNames() const {
+    std::vector<std::wstring> names;
+    if (tzhost::commandLine().isScripted()) return names;
+    for (tzhost::Command const& each : tzhost::commandStack().commands()) {
+        names.push_back(each.localName.str());
+    }
+    return names;
+}
+
+// A call is taken back as a command is.
+void Run::runCall(std::wstring const& line) {
+    session_.beginCommand();
+    try {
+        callTyped(line);
+    } catch (...) {
+        session_.endCommand();
+        throw;
+    }
+    session_.endCommand();
+}
+
 void Run::runTyped(std::wstring const& line) {
-    if (line.front() == L'(') return callTyped(line);
+    if (line.front() == L'(') return runCall(line);
     tzhost::Command const* const command = tzhost::commandStack().find(TzString(line));
     if (!command) {
         return tzhost::commandLine().say(L"There is no command \"" + line + L"\".");
     }
-    TzString const name = command->globalName;
     auto const answers = tzhost::commandLine().isScripted() ? tzhost::AnswersFrom::script
                                                             : tzhost::AnswersFrom::user;
+    tzhost::runCommand(*command, answers);
+}
+
+void Run::runGuarded(std::wstring const& line) {
     try {
-        tzhost::runCommand(*command, answers);
+        runTyped(line);
+        session_.doPostponed();
     } catch (std::exception const& problem) {
-        tzhost::commandLine().say(name.str() + L" ended early: " +
-                                  tzhost::fromUtf8(problem.what()));
+        tzhost::commandLine().say(line + L" ended early: " + tzhost::fromUtf8(problem.what()));
     }
 }
 
+// Enter alone repeats the line before it at a terminal; in a script it does nothing.
 void Run::readCommands() {
+    std::wstring last;
     while (!session_.wantsToEnd()) {
-        std::optional<std::wstring> const line = tzhost::commandLine().readCommand();
+        std::optional<std::wstring> const line = tzhost::commandLine().readCommand(commandNames());
         if (!line) return;
-        if (!line->empty()) runTyped(*line);
+        if (!line->empty()) last = *line;
+        if (!line->empty() || (!last.empty() && !tzhost::commandLine().isScripted()))
+            runGuarded(last);
     }
+}
+
+// What a command of the program prints is no event, and one that does not look at the selection
+// made before it begins without one.
+void Run::beginCommand(tzhost::Command const& command) {
+    bool const isOwn = command.group == TzString(kHostCommandGroup);
+    tzhost::commandLine().setVoice(isOwn ? tzhost::CommandLine::Voice::host
+                                         : tzhost::CommandLine::Voice::module);
+    if ((command.flags & tzhost::Command::kUsesImpliedSelection) == 0) {
+        tzhost::dropImpliedSelection();
+    }
+    session_.beginCommand();
+}
+
+void Run::endCommand(tzhost::Command const& command) {
+    session_.endCommand();
+    if (command.callback != selectCommand) tzhost::dropImpliedSelection();
+    tzhost::commandLine().setVoice(tzhost::CommandLine::Voice::module);
 }
 
 bool Run::writeResults() {

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
@@ -9,6 +10,7 @@
 #include "host/display/plot.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/runtime/documents.h"
+#include "host/runtime/module_linker.h"
 
 namespace tzdraft {
 namespace {
@@ -24,6 +26,13 @@ constexpr std::array kPlotEndings{
     PlotEnding{".png", tzhost::PlotFormat::png},
     PlotEnding{".pdf", tzhost::PlotFormat::pdf},
 };
+
+// Drawings that undo can bring back.
+constexpr std::size_t kMostReplaced = 8;
+
+void sayError(std::string const& error) {
+    tzhost::commandLine().say(tzhost::fromUtf8(error));
+}
 
 }  // namespace
 
@@ -43,20 +52,36 @@ Session& Session::current() {
     return *running;
 }
 
-void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing) {
-    if (drawing_) tzhost::documents().close();
-    if (isInCommand_) drawing->undoLog().begin();
+// There is a drawing whatever fails on the way.
+void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
+                        std::function<void()> const& setVariables) {
+    if (drawing_) {
+        // What the command has done so far to the drawing that goes stays one step of its undo.
+        if (isInCommand_) drawing_->undoLog().end();
+        tzhost::documents().close();
+    }
     std::swap(drawing_, drawing);
-    // The command that replaced a drawing may still hold something of it.
-    if (drawing) retired_.push_back(std::move(drawing));
     tzhost::setWorkingDrawing(drawing_.get());
+    if (drawing) retired_.push_back(std::move(drawing));
+    setVariables();
+    if (isInCommand_) drawing_->undoLog().begin();
     tzhost::noteUserSystem();
     tzhost::documents().open(drawing_.get());
 }
 
+void Session::replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
+                             std::function<void()> const& setVariables) {
+    bool const hadDrawing = drawing_ != nullptr;
+    tzhost::Variables::Snapshot variables = tzhost::Variables::instance().snapshot();
+    replaceBy(std::move(drawing), setVariables);
+    if (!hadDrawing) return;
+    replaced_.push_back({nullptr, std::move(variables)});
+    replaced_.back().drawing = std::move(retired_.back());
+    retired_.pop_back();
+}
+
 void Session::makeNew() {
-    tzhost::setKeptVariables({});
-    replaceBy(tzhost::Drawing::create());
+    replaceForUndo(tzhost::Drawing::create(), [] { tzhost::setKeptVariables({}); });
 }
 
 bool Session::open(std::filesystem::path const& file, std::string& error) {
@@ -68,8 +93,17 @@ bool Session::open(std::filesystem::path const& file, std::string& error) {
     for (std::string const& warning : read.warnings) {
         tzhost::commandLine().say(tzhost::fromUtf8(warning));
     }
-    tzhost::setKeptVariables(read.variables);
-    replaceBy(std::move(read.drawing));
+    replaceForUndo(std::move(read.drawing), [&] { tzhost::setKeptVariables(read.variables); });
+    return true;
+}
+
+bool Session::undo() {
+    if (drawing_->undoLog().takeBack()) return true;
+    if (replaced_.empty()) return false;
+    Replaced before = std::move(replaced_.back());
+    replaced_.pop_back();
+    replaceBy(std::move(before.drawing),
+              [&] { tzhost::Variables::instance().restore(before.variables); });
     return true;
 }
 
@@ -98,6 +132,33 @@ bool Session::plotAs(tzhost::PlotFormat format,
     return !problem;
 }
 
+TzString Session::moduleName() const {
+    return TzString::fromUtf8(module_.filename().string());
+}
+
+void Session::loadLater(std::filesystem::path file) {
+    if (!file.has_parent_path() && !std::filesystem::exists(file))
+        file = module_.parent_path() / file;
+    postponed_.emplace_back([file = std::filesystem::absolute(file)] {
+        std::string error;
+        if (!tzhost::dynamicLinker().load(file, error)) sayError(error);
+    });
+}
+
+void Session::unloadLater() {
+    postponed_.emplace_back([] {
+        auto const& modules = tzhost::dynamicLinker().modules();
+        std::string error = "No module is loaded.";
+        if (modules.empty() || !tzhost::dynamicLinker().unload(modules.back()->file, error))
+            sayError(error);
+    });
+}
+
+void Session::doPostponed() {
+    for (auto const& action : std::exchange(postponed_, {}))
+        action();
+}
+
 void Session::beginCommand() {
     isInCommand_ = true;
     drawing_->undoLog().begin();
@@ -106,6 +167,7 @@ void Session::beginCommand() {
 void Session::endCommand() {
     drawing_->undoLog().end();
     retired_.clear();
+    if (replaced_.size() > kMostReplaced) replaced_.pop_front();
     isInCommand_ = false;
 }
 

@@ -1,10 +1,13 @@
 #pragma once
 
+#include <deque>
 #include <filesystem>
+#include <functional>
 #include <memory>
 #include <string>
 #include <vector>
 
+#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/display/plot.h"
 
@@ -40,16 +43,44 @@ public:
     void quit() { wantsToEnd_ = true; }
     [[nodiscard]] bool wantsToEnd() const { return wantsToEnd_; }
 
-    // Begin and end of a command, for undo.
+    // Takes the last command back; one that replaced the drawing, too, by bringing the drawing
+    // before it back. False when there is nothing to take back.
+    [[nodiscard]] bool undo();
+
+    // The file name of the module that LOAD proposes.
+    void setModule(std::filesystem::path module) { module_ = std::move(module); }
+    [[nodiscard]] TzString moduleName() const;
+    // Modules come and go between commands, since the one that asks for it may be a module's. A
+    // name without a folder that is not in the working folder is looked for beside the proposed
+    // module.
+    void loadLater(std::filesystem::path file);
+    void unloadLater();
+
+    // Begin and end of a command, or of a call of a function.
     void beginCommand();
     void endCommand();
+    // Does what was asked for the time behind the command.
+    void doPostponed();
 
 private:
-    void replaceBy(std::unique_ptr<tzhost::Drawing> drawing);
+    // A drawing that another took the place of, with its variables.
+    struct Replaced {
+        std::unique_ptr<tzhost::Drawing> drawing;
+        tzhost::Variables::Snapshot variables;
+    };
+
+    void replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
+                   std::function<void()> const& setVariables);
+    // The same, and undo can bring the present drawing back.
+    void replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
+                        std::function<void()> const& setVariables);
 
     std::unique_ptr<tzhost::Drawing> drawing_;
-    // Drawings that a command has replaced live until that command has ended.
+    std::deque<Replaced> replaced_;  // for undo, the newest last
+    // Drawings that a command has done away with live until that command has ended.
     std::vector<std::unique_ptr<tzhost::Drawing>> retired_;
+    std::vector<std::function<void()>> postponed_;
+    std::filesystem::path module_;
     bool isInCommand_ = false;
     bool wantsToEnd_ = false;
 };

@@ -57,11 +57,16 @@ private:
     _exit(127);
 }
 
+// A program that stops itself goes on at once: its session waits for it, and so does the terminal.
 int waitFor(pid_t child) {
     int status = 0;
-    while (waitpid(child, &status, 0) < 0 && errno == EINTR) {
+    for (;;) {
+        pid_t const changed = waitpid(child, &status, WUNTRACED);
+        if (changed < 0 && errno != EINTR) return status;
+        if (changed < 0) continue;
+        if (!WIFSTOPPED(status)) return status;
+        kill(-child, SIGCONT);
     }
-    return status;
 }
 
 std::string problemOf(int status) {

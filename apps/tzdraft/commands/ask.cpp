@@ -10,15 +10,19 @@ namespace {
 constexpr int kDecimal = 2;
 constexpr int kShownDecimals = 4;
 
+// Bits of tzedInitGet.
+constexpr int kNoZero = 2;
+constexpr int kNoNegative = 4;
+
 TzString withDefault(wchar_t const* question, TzString const& shown) {
     return TzString::formatted(L"\n%ls <%ls>: ", question, shown.kwszPtr());
 }
 
 // Asks until the host gives a value, an empty answer or a cancel.
 template <class Ask>
-Asked askUntilDecided(wchar_t const* keywords, Ask ask) {
+Asked askUntilDecided(wchar_t const* keywords, Ask ask, int flags = 0) {
     for (;;) {
-        (void)tzedInitGet(0, keywords);  // the lists of this program are well-formed
+        (void)tzedInitGet(flags, keywords);  // the lists of this program are well-formed
         switch (ask()) {
         case Tzad::ePromptNormal:
         case Tzad::ePromptKeyword: return Asked::given;
@@ -60,6 +64,20 @@ Answer<double> askReal(wchar_t const* question, double defaultValue) {
     Answer<double> answer;
     answer.asked = askUntilDecided(nullptr, [&] { return tzedGetReal(prompt, &answer.value); });
     if (answer.asked == Asked::empty) answer = {Asked::given, defaultValue};
+    return answer;
+}
+
+Answer<double> askLength(wchar_t const* question, TzGePoint3d const* base, double defaultValue) {
+    TzString shown;
+    (void)tzdbRToS(defaultValue, kDecimal, kShownDecimals, shown);
+    TzString const prompt =
+        defaultValue > 0 ? withDefault(question, shown) : TzString::formatted(L"\n%ls: ", question);
+    double const from[3] = {base ? base->x : 0, base ? base->y : 0, base ? base->z : 0};
+    Answer<double> answer;
+    answer.asked = askUntilDecided(
+        nullptr, [&] { return tzedGetDist(base ? from : nullptr, prompt, &answer.value); },
+        kNoZero | kNoNegative);
+    if (answer.asked == Asked::empty && defaultValue > 0) answer = {Asked::given, defaultValue};
     return answer;
 }
 

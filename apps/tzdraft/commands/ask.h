@@ -23,6 +23,10 @@ struct Answer {
 [[nodiscard]] Answer<TzString>
 askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defaultWord = nullptr);
 [[nodiscard]] Answer<double> askReal(wchar_t const* question, double defaultValue);
+// A length above 0, also by a point from `base`, which may be null; without a default (0) an empty
+// answer is `empty`.
+[[nodiscard]] Answer<double>
+askLength(wchar_t const* question, TzGePoint3d const* base, double defaultValue = 0);
 // Radians.
 [[nodiscard]] Answer<double> askAngle(wchar_t const* question, double defaultRadians);
 [[nodiscard]] Answer<bool> askYesNo(wchar_t const* question, bool defaultYes);

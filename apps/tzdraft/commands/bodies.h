@@ -15,5 +15,16 @@ void styleCommand();
 void layerCommand();
 void ucsCommand();
 void lineCommand();
+void selectCommand();
+void eraseCommand();
+void textCommand();
+void circleCommand();
+void attdefCommand();
+void blockCommand();
+void insertCommand();
+void undoCommand();
+void loadCommand();
+void unloadCommand();
+void helpCommand();
 
 }  // namespace tzdraft

@@ -3,6 +3,7 @@
 #include <array>
 
 #include "apps/tzdraft/commands/bodies.h"
+#include "host/runtime/command_stack.h"
 #include "tz/ed/command_stack.h"
 #include "tz/rx/registry.h"
 #include "tz/rx/resource.h"
@@ -10,26 +11,47 @@
 namespace tzdraft {
 namespace {
 
-// A command of the program sees the selection made before it.
-constexpr int kFlags = 2;
+// Flags: whether the command sees the selection made before it.
+constexpr int kAlone = 0;
+constexpr int kSeesSelection = tzhost::Command::kUsesImpliedSelection;
 
-// name, body, help
+// name, body, flags, help
 constexpr std::array kCommands{
-    HostCommand{L"LAYER",  layerCommand,
+    HostCommand{L"ATTDEF", attdefCommand, kAlone,
+                L"Makes the definition of an attribute, of one line or of several, for a block."                },
+    HostCommand{L"BLOCK",  blockCommand,  kSeesSelection,
+                L"Makes a block of entities, which leave the drawing; INSERT places it."                        },
+    HostCommand{L"CIRCLE", circleCommand, kAlone,         L"Draws a circle from its center and radius."         },
+    HostCommand{L"ERASE",  eraseCommand,  kSeesSelection,
+                L"Erases what is selected, but for what lies on locked layers."                                 },
+    HostCommand{L"HELP",   helpCommand,   kAlone,         L"Lists all commands, or tells about one."            },
+    HostCommand{L"INSERT", insertCommand, kAlone,
+                L"Places a block, and asks for the values of its attributes."                                   },
+    HostCommand{L"LAYER",  layerCommand,  kAlone,
                 L"Makes layers, sets the current one, colours, locks and unlocks them."                         },
-    HostCommand{L"LINE",   lineCommand,   L"Draws lines from point to point; Enter ends."                       },
-    HostCommand{L"LIST",   listCommand,
+    HostCommand{L"LINE",   lineCommand,   kAlone,         L"Draws lines from point to point; Enter ends."       },
+    HostCommand{L"LIST",   listCommand,   kSeesSelection,
                 L"Tells what objects are, where they lie and how large they are."                               },
-    HostCommand{L"NEW",    newCommand,    L"Begins a new drawing; it asks nothing."                             },
-    HostCommand{L"OPEN",   openCommand,   L"Opens a drawing in place of this one."                              },
+    HostCommand{L"LOAD",   loadCommand,   kAlone,         L"Loads a module, once this command has ended."       },
+    HostCommand{L"NEW",    newCommand,    kAlone,
+                L"Begins a new drawing; it asks nothing, and U brings the drawing before it back."              },
+    HostCommand{L"OPEN",   openCommand,   kAlone,         L"Opens a drawing in place of this one."              },
     HostCommand{
-                L"PLOT",   plotCommand,
+                L"PLOT",   plotCommand,   kAlone,
                 L"Plots the active space, fitted to its extents; the file's ending (.svg, .png, .pdf) says how."},
-    HostCommand{L"QUIT",   quitCommand,   L"Ends the session."                                                  },
-    HostCommand{L"SAVE",   saveCommand,   L"Writes the drawing to a file."                                      },
-    HostCommand{L"SETVAR", setvarCommand, L"Shows and sets a system variable; ? lists them."                    },
-    HostCommand{L"STYLE",  styleCommand,  L"Makes or changes a text style and makes it current."                },
-    HostCommand{L"UCS",    ucsCommand,    L"Moves and turns the user coordinate system."                        },
+    HostCommand{L"QUIT",   quitCommand,   kAlone,         L"Ends the session."                                  },
+    HostCommand{L"SAVE",   saveCommand,   kAlone,         L"Writes the drawing to a file."                      },
+    HostCommand{L"SELECT", selectCommand, kAlone,         L"Selects entities for the next command."             },
+    HostCommand{L"SETVAR", setvarCommand, kAlone,
+                L"Shows and sets a system variable; ? lists them."                                              },
+    HostCommand{L"STYLE",  styleCommand,  kAlone,
+                L"Makes or changes a text style and makes it current."                                          },
+    HostCommand{L"TEXT",   textCommand,   kAlone,         L"Writes a single line of text."                      },
+    HostCommand{L"U",      undoCommand,   kAlone,         L"Takes the last command back; it asks nothing."      },
+    HostCommand{L"UCS",    ucsCommand,    kAlone,         L"Moves and turns the user coordinate system."        },
+    HostCommand{
+                L"UNLOAD", unloadCommand, kAlone,
+                L"Unloads the module that was loaded last, once this command has ended; it asks nothing."       },
 };
 
 }  // namespace
@@ -43,8 +65,8 @@ void registerHostCommands() {
         static_cast<TzEdCommandStack*>(tzrxSysRegistry()->at(L"TZAD_REGISTERED_COMMANDS"));
     for (HostCommand const& each : kCommands) {
         // The names are fixed and differ, so nothing can be refused but by a fault plan.
-        (void)stack->addCommand(kHostCommandGroup, each.name, each.name, kFlags, each.body, nullptr,
-                                -1, TzRxResourceInstance::empty, nullptr);
+        (void)stack->addCommand(kHostCommandGroup, each.name, each.name, each.flags, each.body,
+                                nullptr, -1, TzRxResourceInstance::empty, nullptr);
         (void)tzedSetFunHelp(each.name, nullptr, each.help, 0);
     }
 }

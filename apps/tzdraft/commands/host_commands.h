@@ -11,6 +11,7 @@ inline constexpr wchar_t kHostCommandGroup[] = L"TZDRAFT";
 struct HostCommand {
     wchar_t const* name;
     void (*body)();
+    int flags;            // as the command stack takes them
     wchar_t const* help;  // one sentence, or several apart by line feeds
 };
 

@@ -3,11 +3,11 @@
 
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/commands/selected.h"
 #include "host/base/variables.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"
-#include "tz/ed/selection.h"
 #include "tz/ed/units.h"
 #include "tz/rx/class.h"
 
@@ -102,23 +102,12 @@ void listEntity(TzDbEntity const& entity) {
 }  // namespace
 
 void listCommand() {
-    long long set[2] = {0, 0};
-    int count = 0;
-    if (tzedSSGet(nullptr, nullptr, nullptr, nullptr, set) == Tzad::ePromptNormal &&
-        tzedSSLength(set, &count) == Tzad::ePromptNormal) {
-        for (int index = 0; index < count; ++index) {
-            long long name[2];
-            TzDbObjectId id;
-            if (tzedSSName(set, index, name) != Tzad::ePromptNormal ||
-                tzdbGetObjectId(id, name) != Tzad::eOk) {
-                continue;
-            }
-            Opened<TzDbEntity> const entity(id, TzDb::kForRead);
-            if (entity) listEntity(*entity.get());
-        }
-        tzutPrintf(L"\n");
+    std::vector<TzDbObjectId> const ids = selectEntities(OnLockedLayers::included);
+    for (TzDbObjectId const id : ids) {
+        Opened<TzDbEntity> const entity(id, TzDb::kForRead);
+        if (entity) listEntity(*entity.get());
     }
-    (void)tzedSSFree(set);  // also when nothing was selected
+    if (!ids.empty()) tzutPrintf(L"\n");
 }
 
 }  // namespace tzdraft

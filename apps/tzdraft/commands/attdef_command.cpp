@@ -1,0 +1,57 @@
+#include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/text_command.h"
+#include "host/database/geometry.h"
+#include "tz/ed/print.h"
+
+namespace tzdraft {
+namespace {
+
+constexpr wchar_t kKinds[] = L"Single Multiple";
+
+bool isTag(TzString const& text) {
+    return !text.isEmpty() && text.findOneOf(L" \t") < 0;
+}
+
+// The lines that a multi-line definition holds. `contents` is markup.
+std::unique_ptr<TzDbMText> linesOf(TextPlace const& place, TzString const& contents) {
+    auto lines = newEntity<TzDbMText>();
+    (void)lines->setLocation(place.position);  // as of the definition, which has taken them
+    (void)lines->setNormal(place.normal);
+    (void)lines->setDirection(tzhost::directionAt(place.normal, place.rotation));
+    (void)lines->setTextHeight(place.height);
+    (void)lines->setContents(contents);
+    return lines;
+}
+
+}  // namespace
+
+void attdefCommand() {
+    Answer<TzString> const kind =
+        askKeyword(L"Lines of the attribute [Single/Multiple]", kKinds, L"Single");
+    if (kind.isCancelled()) return;
+    Answer<TzString> const tag = askText(L"Attribute tag");
+    if (tag.asked != Asked::given) return;
+    if (!isTag(tag.value)) {
+        tzutPrintf(L"\nA tag has no blanks.\n");
+        return;
+    }
+    Answer<TzString> const prompt = askText(L"Prompt for its value", tag.value);
+    if (prompt.isCancelled()) return;
+    Answer<TzString> const value = askText(L"Default value");
+    if (value.isCancelled()) return;
+    std::optional<TextPlace> const place = askTextPlace();
+    if (!place) return;
+    auto definition = newEntity<TzDbAttributeDefinition>();
+    placeText(*definition, *place);
+    (void)definition->setTag(tag.value);
+    (void)definition->setPrompt(prompt.value);
+    (void)definition->setTextString(value.value);
+    if (kind.value == L"Multiple") {
+        auto lines = linesOf(*place, value.value);
+        if (definition->setMTextAttributeDefinition(lines.get()) == Tzad::eOk)
+            (void)lines.release();
+    }
+    post(std::move(definition));
+}
+
+}  // namespace tzdraft

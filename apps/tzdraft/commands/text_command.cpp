@@ -1,0 +1,74 @@
+#include "apps/tzdraft/commands/text_command.h"
+
+#include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/session.h"
+#include "host/base/variables.h"
+#include "tz/db/host_services.h"
+#include "tz/db/symbol_table.h"
+
+namespace tzdraft {
+namespace {
+
+// The height of a style that has one of its own, else 0.
+double heightOfStyle() {
+    Opened<TzDbTextStyleTableRecord> const style(Session::current().drawing().textstyle(),
+                                                 TzDb::kForRead);
+    return style ? style->textSize() : 0;
+}
+
+void followStyle(TzDbText& text) {
+    Opened<TzDbTextStyleTableRecord> const style(text.textStyle(), TzDb::kForRead);
+    if (!style) return;
+    (void)text.setWidthFactor(style->xScale());  // a style holds what a text takes
+    (void)text.setOblique(style->obliquingAngle());
+}
+
+bool askHeight(TzGePoint3d const& start, double& height) {
+    height = heightOfStyle();
+    if (height > 0) return true;
+    tzhost::Variables& variables = tzhost::Variables::instance();
+    Answer<double> const answer = askLength(L"Text height", &start, variables.number(L"TEXTSIZE"));
+    if (answer.asked != Asked::given) return false;
+    height = answer.value;
+    // A length above 0 is within the limits.
+    (void)variables.set(L"TEXTSIZE", tzhost::VariableValue(height), tzhost::Writer::user);
+    return true;
+}
+
+}  // namespace
+
+std::optional<TextPlace> askTextPlace() {
+    PointAnswer const start = askPoint(L"Start point", nullptr);
+    TextPlace place;
+    if (start.asked != Asked::given || !askHeight(start.point, place.height)) return std::nullopt;
+    Answer<double> const angle = askAngle(L"Rotation angle", 0);
+    if (angle.isCancelled()) return std::nullopt;
+    UserPlane const plane = userPlane();
+    place.position = toWorld(start.point);
+    place.normal = plane.normal;
+    place.rotation = plane.rotation(angle.value);
+    return place;
+}
+
+void placeText(TzDbText& text, TextPlace const& place) {
+    TzTextSetLayer::setTextLayer(&text);
+    (void)text.setPosition(place.position);  // the host gives only values that a text takes
+    (void)text.setNormal(place.normal);
+    (void)text.setRotation(place.rotation);
+    (void)text.setHeight(place.height);
+    followStyle(text);
+}
+
+void textCommand() {
+    std::optional<TextPlace> const place = askTextPlace();
+    if (!place) return;
+    Answer<TzString> const contents = askText(L"Text");
+    if (contents.asked != Asked::given) return;
+    auto text = newEntity<TzDbText>();
+    placeText(*text, *place);
+    (void)text->setTextString(contents.value);
+    post(std::move(text));
+}
+
+}  // namespace tzdraft

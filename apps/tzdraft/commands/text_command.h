@@ -1,0 +1,27 @@
+#pragma once
+
+#include <optional>
+
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/commands/placing.h"
+#include "tz/db/text.h"
+
+// What the commands that make single-line texts have in common.
+namespace tzdraft {
+
+// World coordinates; the rotation as entities count it.
+struct TextPlace {
+    TzGePoint3d position;
+    TzGeVector3d normal;
+    double rotation = 0;
+    double height = 0;
+};
+
+// Asks for start point, height (unless the style has one, kept in TEXTSIZE) and angle; nothing
+// after a cancel.
+[[nodiscard]] std::optional<TextPlace> askTextPlace();
+
+// Puts a new text there, on the layer for texts, with the proportions of its style.
+void placeText(TzDbText& text, TextPlace const& place);
+
+}  // namespace tzdraft

@@ -1,0 +1,24 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+// What the Tab key makes of a line that is being typed. Nothing here looks at the terminal.
+namespace tzdraft {
+
+struct Completion {
+    std::wstring insert;                // goes in at the cursor
+    std::vector<std::wstring> choices;  // what it could become, when that is not decided yet
+};
+
+// Of the word in front of the cursor, by words that compare without regard to case, and in lower
+// case behind a small letter; a "_" ahead of it stays.
+[[nodiscard]] Completion completeWord(std::wstring_view typed,
+                                      std::vector<std::wstring> const& words);
+
+// Of the whole text as the name of a file, relative to the working folder; a folder gets a slash.
+// Names that begin with a dot are offered when the dot is typed.
+[[nodiscard]] Completion completeFile(std::wstring_view typed);
+
+}  // namespace tzdraft

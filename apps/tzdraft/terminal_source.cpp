@@ -1,0 +1,187 @@
+#include "apps/tzdraft/terminal_source.h"
+
+#include <clocale>
+#include <csignal>
+#include <cstdio>
+#include <filesystem>
+#include <histedit.h>
+#include <unistd.h>
+
+#include "apps/tzdraft/completion.h"
+#include "host/base/install_paths.h"
+#include "host/base/utf8.h"
+
+namespace tzdraft {
+namespace {
+
+constexpr int kKeptLines = 1000;
+constexpr char kHistoryName[] = "history";
+
+std::filesystem::path historyFile() {
+    return std::filesystem::path(tzhost::configurationFolder()) / kHistoryName;
+}
+
+// The editor reads characters as the locale of the environment says, and UTF-8 without one. Numbers
+// stay as they are.
+void useTerminalCharacters() {
+    char const* const chosen = std::setlocale(LC_CTYPE, "");
+    if (!chosen || std::string_view(chosen) == "C") std::setlocale(LC_CTYPE, "C.UTF-8");
+}
+
+}  // namespace
+
+// The line editor with its history. Its functions get it back as the editor's client data.
+class TerminalSource::Editor {
+public:
+    Editor();
+    Editor(Editor const&) = delete;
+    Editor& operator=(Editor const&) = delete;
+    ~Editor();
+
+    tzhost::Answer read(tzhost::AnswerRequest const& request);
+
+private:
+    static Editor& of(EditLine* line);
+    static wchar_t* prompt(EditLine* line) { return of(line).prompt_.data(); }
+    static unsigned char cancel(EditLine* line, wint_t key);
+    static unsigned char suspend(EditLine* line, wint_t key);
+    static unsigned char complete(EditLine* line, wint_t key);
+    void bindKeys();
+    void remember(std::wstring const& text);
+    void show(std::vector<std::wstring> const& choices) const;
+
+    EditLine* line_;
+    HistoryW* history_;
+    struct sigaction interruptBefore_ {};
+    tzhost::AnswerRequest const* request_ = nullptr;  // while one is read
+    std::wstring prompt_;
+    bool isCancelled_ = false;
+    bool hasEnded_ = false;
+};
+
+TerminalSource::Editor::Editor() {
+    useTerminalCharacters();
+    struct sigaction ignore {};
+    ignore.sa_handler = SIG_IGN;
+    sigaction(SIGINT, &ignore, &interruptBefore_);
+    history_ = history_winit();
+    HistEventW event;
+    history_w(history_, &event, H_SETSIZE, kKeptLines);
+    history_w(history_, &event, H_SETUNIQUE, 1);
+    history_w(history_, &event, H_LOAD, historyFile().c_str());  // none at the first session
+    line_ = el_init("tzdraft", stdin, stdout, stderr);
+    el_wset(line_, EL_CLIENTDATA, this);
+    el_wset(line_, EL_PROMPT, &Editor::prompt);
+    el_wset(line_, EL_HIST, history_w, history_);
+    bindKeys();
+}
+
+void TerminalSource::Editor::bindKeys() {
+    el_wset(line_, EL_EDITOR, L"emacs");
+    el_wset(line_, EL_SIGNAL, 1);  // follows the size of the window
+    // Ctrl-C and Ctrl-Z come as keys while a line is edited.
+    el_wset(line_, EL_SETTY, L"-d", L"-isig", nullptr);
+    el_wset(line_, EL_ADDFN, L"tz-cancel", L"cancel the question", &Editor::cancel);
+    el_wset(line_, EL_ADDFN, L"tz-complete", L"complete the word", &Editor::complete);
+    el_wset(line_, EL_ADDFN, L"tz-suspend", L"suspend the program", &Editor::suspend);
+    el_wset(line_, EL_BIND, L"^C", L"tz-cancel", nullptr);
+    el_wset(line_, EL_BIND, L"^Z", L"tz-suspend", nullptr);
+    el_wset(line_, EL_BIND, L"\t", L"tz-complete", nullptr);
+    el_wset(line_, EL_BIND, L"^R", L"em-inc-search-prev", nullptr);
+}
+
+TerminalSource::Editor::~Editor() {
+    std::error_code problem;  // a session without a history is no failure
+    std::filesystem::create_directories(historyFile().parent_path(), problem);
+    HistEventW event;
+    history_w(history_, &event, H_SAVE, historyFile().c_str());
+    el_end(line_);
+    history_wend(history_);
+    sigaction(SIGINT, &interruptBefore_, nullptr);
+}
+
+TerminalSource::Editor& TerminalSource::Editor::of(EditLine* line) {
+    void* data = nullptr;
+    el_wget(line, EL_CLIENTDATA, &data);
+    return *static_cast<Editor*>(data);
+}
+
+unsigned char TerminalSource::Editor::cancel(EditLine* line, wint_t /*key*/) {
+    of(line).isCancelled_ = true;
+    return CC_EOF;
+}
+
+// The editor's own handling of the signal gives the terminal back and takes it again.
+unsigned char TerminalSource::Editor::suspend(EditLine* /*line*/, wint_t /*key*/) {
+    (void)std::raise(SIGTSTP);  // an unknown signal alone is refused
+    return CC_NORM;
+}
+
+unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {
+    Editor const& editor = of(line);
+    LineInfoW const* const info = el_wline(line);
+    std::wstring_view const typed(info->buffer,
+                                  static_cast<std::size_t>(info->cursor - info->buffer));
+    bool const isText = editor.request_->kind == tzhost::QuestionKind::string;
+    Completion const completion =
+        isText ? completeFile(typed) : completeWord(typed, editor.request_->words);
+    if (!completion.insert.empty()) {
+        el_winsertstr(line, completion.insert.c_str());
+        return CC_REFRESH;
+    }
+    if (completion.choices.empty()) return CC_REFRESH_BEEP;
+    editor.show(completion.choices);
+    return CC_REDISPLAY;
+}
+
+// Below the line that is edited, which then is shown anew.
+void TerminalSource::Editor::show(std::vector<std::wstring> const& choices) const {
+    std::string text = "\n";
+    for (std::wstring const& each : choices)
+        text += tzhost::toUtf8(each) + "  ";
+    text += "\n";
+    std::fwrite(text.data(), 1, text.size(), stdout);
+    std::fflush(stdout);
+}
+
+void TerminalSource::Editor::remember(std::wstring const& text) {
+    if (text.find_first_not_of(L" \t") == std::wstring::npos) return;
+    HistEventW event;
+    history_w(history_, &event, H_ENTER, text.c_str());
+}
+
+tzhost::Answer TerminalSource::Editor::read(tzhost::AnswerRequest const& request) {
+    using Kind = tzhost::Answer::Kind;
+    if (hasEnded_) return {};
+    request_ = &request;
+    prompt_ = request.prompt;
+    isCancelled_ = false;
+    int length = 0;
+    wchar_t const* const typed = el_wgets(line_, &length);
+    if (!typed || length <= 0) {
+        std::fputs(isCancelled_ ? "^C\n" : "\n", stdout);
+        std::fflush(stdout);
+        hasEnded_ = !isCancelled_;
+        return {isCancelled_ ? Kind::cancel : Kind::end, {}};
+    }
+    std::wstring text(typed, static_cast<std::size_t>(length));
+    while (text.ends_with(L'\n') || text.ends_with(L'\r'))
+        text.pop_back();
+    if (text.size() > tzhost::kLongestAnswer) return {Kind::tooLong, {}};
+    remember(text);
+    return {Kind::line, std::move(text)};
+}
+
+TerminalSource::TerminalSource() : editor_(std::make_unique<Editor>()) {}
+
+TerminalSource::~TerminalSource() = default;
+
+bool TerminalSource::isThere() {
+    return isatty(STDIN_FILENO) == 1;
+}
+
+tzhost::Answer TerminalSource::next(tzhost::AnswerRequest const& request) {
+    return editor_->read(request);
+}
+
+}  // namespace tzdraft
