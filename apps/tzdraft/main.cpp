@@ -1,4 +1,5 @@
 #include <cstdio>
+#include <utility>
 
 #include "apps/tzdraft/options.h"
 #include "apps/tzdraft/program.h"
@@ -20,5 +21,5 @@ int main(int count, char** arguments) {
     tzdraft::Screens screens;
     screens.output = [](std::string_view text) { write(stdout, text); };
     screens.errors = [](std::string_view text) { write(stderr, text); };
-    return tzdraft::runProgram(parsed.options, screens);
+    return tzdraft::runProgram(parsed.options, std::move(screens));
 }

@@ -29,7 +29,8 @@ namespace {
 // drawing, the drawing before the screens.
 class Run {
 public:
-    Run(Options const& options, Screens const& screens) : options_(options), screens_(screens) {}
+    Run(Options const& options, Screens screens)
+        : options_(options), screens_(std::move(screens)), source_(std::move(screens_.source)) {}
     Run(Run const&) = delete;
     Run& operator=(Run const&) = delete;
     ~Run();
@@ -55,7 +56,7 @@ private:
     bool complain(std::string const& error) const;
 
     Options const& options_;
-    Screens const& screens_;
+    Screens screens_;
     std::unique_ptr<tzhost::AnswerSource> source_;
     EventFile events_;
     Session session_;
@@ -69,6 +70,7 @@ bool Run::complain(std::string const& error) const {
 }
 
 bool Run::openSource() {
+    if (source_) return true;
     if (options_.script.empty() && TerminalSource::isThere()) {
         source_ = std::make_unique<TerminalSource>();
         return true;
@@ -248,8 +250,8 @@ Run::~Run() {
 
 }  // namespace
 
-int runProgram(Options const& options, Screens const& screens) {
-    return Run(options, screens).toItsEnd();
+int runProgram(Options const& options, Screens screens) {
+    return Run(options, std::move(screens)).toItsEnd();
 }
 
 }  // namespace tzdraft

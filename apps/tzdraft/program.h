@@ -1,9 +1,11 @@
 #pragma once
 
 #include <functional>
+#include <memory>
 #include <string_view>
 
 #include "apps/tzdraft/options.h"
+#include "host/command_line/answer_source.h"
 
 // The program from its options to its exit status, also for tests, which run it in their own
 // process: each run begins with everything at its start and leaves nothing behind.
@@ -12,8 +14,9 @@ namespace tzdraft {
 struct Screens {
     std::function<void(std::string_view)> output;  // the transcript, UTF-8
     std::function<void(std::string_view)> errors;  // lines about what could not be done
+    std::unique_ptr<tzhost::AnswerSource> source;  // answers in place of the script; null for none
 };
 
-[[nodiscard]] int runProgram(Options const& options, Screens const& screens);
+[[nodiscard]] int runProgram(Options const& options, Screens screens);
 
 }  // namespace tzdraft

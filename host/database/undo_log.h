@@ -32,6 +32,8 @@ public:
     // is not noted.
     bool takeBack();
     [[nodiscard]] bool isEmpty() const { return steps_.empty(); }
+    // Finished steps that can be taken back.
+    [[nodiscard]] std::size_t steps() const { return steps_.size(); }
 
     // The object is about to change; it also covers erasing.
     void noteChange(TzDbObjectRecord& record);
