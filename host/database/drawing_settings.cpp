@@ -1,6 +1,7 @@
 #include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/database/symbol_imp.h"
+#include "host/faults/memory.h"
 #include "tz/ge/matrix3d.h"
 
 // What a drawing holds beside its objects: current style and layer, user systems, the working set.
@@ -66,6 +67,7 @@ bool Drawing::orthomode() const {
 }
 
 Tzad::ErrorStatus Drawing::setOrthomode(bool on) {
+    tzhost::MemoryFaultPause const givesBack;
     if (auto const fault = faultStatus("TzDbDatabase::setOrthomode")) return fault;
     VariableValue const value = static_cast<short>(on ? 1 : 0);
     bool const done = Variables::instance().set(L"ORTHOMODE", value, Writer::host).isDone();

@@ -109,6 +109,7 @@ Tzad::ErrorStatus TzDbEntity::highlight(TzDbFullSubentPath const& /*path*/, bool
 }
 
 Tzad::ErrorStatus TzDbEntity::unhighlight(TzDbFullSubentPath const& /*path*/, bool /*all*/) const {
+    tzhost::MemoryFaultPause const givesBack;
     Tzad::ErrorStatus const fault = faultStatus("TzDbEntity::unhighlight");
     TzDbObjectRecord* const record = tzhost::openRecordOf(*this);
     if (!record) return Tzad::eNoDatabase;

@@ -96,6 +96,7 @@ bool TzDbObject::isWriteEnabled() const {
 
 // Closes even when the fault plan makes it report a failure, like everything that gives back.
 Tzad::ErrorStatus TzDbObject::close() {
+    tzhost::MemoryFaultPause const givesBack;
     Tzad::ErrorStatus const fault = faultStatus("TzDbObject::close");
     TzDbObjectRecord* const record = imp_ ? imp_->record : nullptr;
     if (!record) return Tzad::eNoDatabase;
@@ -128,6 +129,7 @@ Tzad::ErrorStatus TzDbObject::upgradeOpen() {
 }
 
 Tzad::ErrorStatus TzDbObject::downgradeOpen() {
+    tzhost::MemoryFaultPause const givesBack;
     Tzad::ErrorStatus const fault = faultStatus("TzDbObject::downgradeOpen");
     TzDbObjectRecord* const record = openRecordOf(*this);
     if (!record) return Tzad::eNoDatabase;

@@ -179,6 +179,7 @@ int tzedSetCurrentUCS(TzGeMatrix3d const& system) {
 
 // Restores even when the fault plan makes it report a failure.
 int tzedRestorePreviousUCS() {
+    tzhost::MemoryFaultPause const givesBack;
     auto const fault = tzhost::faultStatus("tzedRestorePreviousUCS");
     if (tzhost::stack().empty()) return Tzad::eNotApplicable;
     tzhost::Remembered const last = tzhost::stack().back();

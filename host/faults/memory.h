@@ -13,6 +13,8 @@ public:
     ~MemoryFaultScope();
 };
 
+// What gives something back or puts it as it was runs in a pause: it happens in destructors, also
+// while an exception for want of memory passes.
 class MemoryFaultPause {
 public:
     MemoryFaultPause() noexcept;

@@ -5,6 +5,7 @@
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
+#include "host/faults/memory.h"
 #include "host/runtime/module_linker.h"
 #include "tz/rx/status.h"
 
@@ -20,6 +21,7 @@ bool GestureProcessor::addOverruleHandler(Handler* handler) {
 }
 
 bool GestureProcessor::removeOverruleHandler(Handler* handler) {
+    tzhost::MemoryFaultPause const givesBack;
     bool const removed = std::erase(handlers_, handler) > 0;
     if (removed) --audit().gestureHandlers;
     return removed && !faultAt("GestureProcessor::removeOverruleHandler");

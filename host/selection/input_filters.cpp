@@ -141,6 +141,7 @@ bool addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* 
 
 // Takes the filter back even when the plan makes it report a failure.
 bool removeSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter) {
+    tzhost::MemoryFaultPause const givesBack;
     bool const isFaulty = tzhost::faultAt("removeSSgetFilterInputContextReactor").has_value();
     tzhost::MemoryFaultPause const pause;  // destructors call this
     tzhost::Document* const open = tzhost::asOpen(document);

@@ -5,6 +5,7 @@
 
 #include "host/base/audit.h"
 #include "host/base/fault_point.h"
+#include "host/faults/memory.h"
 #include "tz/ed/selection.h"
 #include "tz/rx/status.h"
 
@@ -72,6 +73,7 @@ int tzedSSName(long long const* set, int index, long long* name) {
 
 // Frees the set even when the plan makes it report a failure.
 int tzedSSFree(long long const* set) {
+    tzhost::MemoryFaultPause const givesBack;
     auto const fault = tzhost::faultAt("tzedSSFree");
     bool const wasSet = tzhost::isNameOfSet(set);
     if (wasSet && tzhost::sets().byNumber.erase(set[0]) > 0) --tzhost::audit().selectionSets;

@@ -5,6 +5,7 @@
 #include "host/base/audit.h"
 #include "host/base/fault_point.h"
 #include "host/command_line/question.h"
+#include "host/faults/memory.h"
 #include "host/selection/pick.h"
 #include "host/selection/selecting.h"
 #include "host/selection/selection_sets.h"
@@ -157,6 +158,7 @@ int tzedSSGetKwordCallbackPtr(TzedSSKeywordCallback* callback) {
 
 // Taking a callback back happens even when the plan makes it report a failure.
 int tzedSSSetKwordCallbackPtr(TzedSSKeywordCallback callback) {
+    tzhost::MemoryFaultPause const givesBack;
     auto const fault = tzhost::faultAt("tzedSSSetKwordCallbackPtr");
     if (fault && callback != nullptr) return *fault;
     tzhost::keywordCallback() = callback;
