@@ -56,7 +56,8 @@ std::vector<std::string> runSession(SessionCase const& session) {
     tzdraft::Options const options = optionsOf(session);
     std::string errors;
     int const status = tzdraft::runProgram(
-        options, {[](std::string_view) {}, [&errors](std::string_view text) { errors += text; }});
+        options,
+        {[](std::string_view) {}, [&errors](std::string_view text) { errors += text; }, nullptr});
 
     EventLines events(session.from,
                       session.showsFrames ? EventLines::Frames::shown : EventLines::Frames::left);
