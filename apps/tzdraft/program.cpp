@@ -98,7 +98,9 @@ bool Run::planFaults() {
 
 bool Run::loadModule() {
     std::string error;
-    return tzhost::dynamicLinker().load(modulePath(options_), error) || complain(error);
+    if (tzhost::dynamicLinker().load(modulePath(options_), error)) return true;
+    if (!hasModuleResources()) error += "; its resource library is missing or damaged";
+    return complain(error);
 }
 
 bool Run::begin() {

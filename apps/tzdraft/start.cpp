@@ -2,6 +2,7 @@
 
 #include <cstdlib>
 
+#include "host/base/file_bytes.h"
 #include "host/base/font_map_path.h"
 #include "host/base/install_paths.h"
 #include "host/base/resource_search.h"
@@ -16,6 +17,7 @@ namespace tzdraft {
 namespace {
 
 constexpr char kModuleName[] = "tzmted.tzx";
+constexpr wchar_t kResourceName[] = L"TzmtedRes.dll";
 
 // The first that says something.
 std::string firstOf(std::initializer_list<std::string> candidates) {
@@ -77,6 +79,14 @@ void findResources(Options const& options) {
     tzhost::setResourceSearch(search);
 }
 
+// The module makes do without a font map, so that a wrong name would go unnoticed.
+bool findFontMap(Options const& options, std::string& error) {
+    tzhost::setFontMapFile(options.fontMap.string());
+    if (options.fontMap.empty() || tzhost::readFile(options.fontMap.string())) return true;
+    error = options.fontMap.string() + ": the font map file cannot be read";
+    return false;
+}
+
 void chooseEditors(Options const& options) {
     tzhost::Settings const& settings = tzhost::settings();
     tzhost::EditorConfiguration& editors = tzhost::editorConfiguration();
@@ -106,12 +116,16 @@ std::string settingsFile(Options const& options) {
     return options.settings.empty() ? tzhost::defaultSettingsFile() : options.settings.string();
 }
 
+bool hasModuleResources() {
+    return tzhost::openResourceFile(kResourceName).has_value();
+}
+
 bool configureHost(Options const& options, SettingsState& settings, std::string& error) {
     tzhost::Variables::instance().reset();
     watchViewOnce();
     if (!loadSettings(options, settings, error) || !setVariables(options, error)) return false;
+    if (!findFontMap(options, error)) return false;
     findResources(options);
-    tzhost::setFontMapFile(options.fontMap.string());
     chooseEditors(options);
     return true;
 }

@@ -11,6 +11,9 @@ namespace tzdraft {
 // The module to load: the one that was named, else that beside the host's library.
 [[nodiscard]] std::filesystem::path modulePath(Options const& options);
 
+// Whether the module's resource library is there and whole.
+[[nodiscard]] bool hasModuleResources();
+
 // The settings file of this run: the one that was named, else the user's.
 [[nodiscard]] std::string settingsFile(Options const& options);
 

@@ -46,7 +46,7 @@ struct Answer {
         cancel,   // the user cancelled
         tooLong,  // a line beyond kLongestAnswer, which was dropped
         fault,    // something in the script that is no answer: `text` says where and what
-        end,      // nothing comes any more
+        end,      // nothing comes any more; `text` says where, "file:line: ", or is empty
     };
     Kind kind = Kind::end;
     std::wstring text;

@@ -68,6 +68,12 @@ void CommandLine::complain(std::wstring const& text) {
     if (errors_) errors_(text + L"\n");
 }
 
+// Said once, however many questions still wait.
+void CommandLine::endedInCommand(std::wstring const& where) {
+    if (!hasFailed_ && !where.empty()) complain(where + L"the input ends inside a command");
+    hasFailed_ = true;
+}
+
 Answer CommandLine::readFromSource(AnswerRequest const& request) {
     while (source_ != nullptr) {
         Answer answer = source_->next(request);
@@ -97,7 +103,7 @@ Answer CommandLine::ask(AnswerRequest const& request) {
         transcript_.answer(answer.kind == Answer::Kind::line ? answer.text : kCancelEcho);
     }
     if (answer.kind == Answer::Kind::end && request.kind != QuestionKind::command)
-        hasFailed_ = true;
+        endedInCommand(answer.text);
     return answer;
 }
 

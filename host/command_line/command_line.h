@@ -92,6 +92,7 @@ public:
 private:
     [[nodiscard]] Answer readFromSource(AnswerRequest const& request);
     void complain(std::wstring const& text);
+    void endedInCommand(std::wstring const& where);
 
     AnswerSource* source_ = nullptr;
     Transcript transcript_;

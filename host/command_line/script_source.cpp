@@ -1,6 +1,7 @@
 #include "host/command_line/script_source.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <fstream>
 #include <iostream>
 #include <sstream>
@@ -59,7 +60,8 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
     }
     std::ifstream input(file, std::ios::binary);
     std::ostringstream whole;
-    if (!input || (input.peek() != Traits::eof() && !(whole << input.rdbuf()))) {
+    if (!input || std::filesystem::is_directory(file) ||
+        (input.peek() != Traits::eof() && !(whole << input.rdbuf()))) {
         error = file + ": the script cannot be read";
         return nullptr;
     }
@@ -140,7 +142,7 @@ std::optional<EditorBlock> ScriptSource::takeBlock() {
 }
 
 Answer ScriptSource::last() {
-    if (fault_.empty()) return {};
+    if (fault_.empty()) return {Answer::Kind::end, place(lines_)};
     return {Answer::Kind::fault, std::exchange(fault_, {})};
 }
 
