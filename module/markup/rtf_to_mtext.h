@@ -55,6 +55,9 @@ public:
     // The whole markup.
     [[nodiscard]] CStdStrW Parse(wchar_t const* text);
 
+    // Whether the text held a `\S`, which stacks begin with.
+    [[nodiscard]] bool StackSeen() const { return m_bStackSeen; }
+
     // The control word behind a backslash and its number, kNoValue without one; a view of the text.
     [[nodiscard]] static std::wstring_view GetToken(wchar_t const*& cursor, int& value);
     // Does what a word says, with the cursor behind it. False for an unknown word.

@@ -1,0 +1,106 @@
+#include "apps/tzconvert/batch.h"
+
+#include <cstdio>
+#include <filesystem>
+#include <set>
+
+#include "apps/tzconvert/conversion.h"
+#include "apps/tzconvert/report.h"
+#include "apps/tzconvert/streams.h"
+#include "host/base/file_bytes.h"
+#include "host/base/font_map_path.h"
+#include "host/base/variables.h"
+
+namespace tzconvert {
+namespace {
+
+namespace fs = std::filesystem;
+
+void complain(std::string const& what) {
+    std::fprintf(stderr, "tzconvert: %s\n", what.c_str());
+}
+
+// Puts the machine's settings in place; false when one cannot be used.
+bool prepare(Options const& options) {
+    auto const page = L"ANSI_" + std::to_wstring(options.codePage);
+    if (auto const written = tzhost::Variables::instance().overrideFromText(L"SYSCODEPAGE", page);
+        !written.isDone()) {
+        complain("--code-page cannot be set");
+        return false;
+    }
+    if (options.fontMap.empty()) return true;
+    if (!tzhost::readFile(options.fontMap)) {
+        complain(options.fontMap + ": cannot be read: " + tzhost::systemReason());
+        return false;
+    }
+    tzhost::setFontMapFile(options.fontMap);
+    return true;
+}
+
+// Where a file's result goes: under its own name with the ending of the result.
+fs::path targetOf(Options const& options, std::string const& file) {
+    fs::path name = file == "-" ? fs::path("stdin") : fs::path(file).filename();
+    name.replace_extension(options.direction == Direction::toRtf ? ".rtf" : ".mtext");
+    return fs::path(options.outputDir) / name;
+}
+
+class Batch {
+public:
+    explicit Batch(Options const& options) : options_(options) {}
+
+    [[nodiscard]] Failure convertFile(std::string const& file) {
+        std::string target = options_.output;
+        if (!options_.outputDir.empty()) {
+            target = targetOf(options_, file).string();
+            if (Failure failure = checkTarget(file, target)) return failure;
+        }
+        std::wstring text;
+        if (Failure failure = readText(file, text)) return failure;
+        Converted const converted = convert(options_, std::move(text));
+        if (Failure failure = writeText(target, converted.text)) return failure;
+        reports_.push_back({file, converted.results});
+        return {};
+    }
+
+    [[nodiscard]] Failure writeReport() const {
+        if (options_.report.empty() || (reports_.empty() && options_.outputDir.empty())) return {};
+        return writeBytes(options_.report, reportText(options_, reports_));
+    }
+
+private:
+    // A result takes the place of no input and of no other result.
+    [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) {
+        std::error_code missing;
+        if (fs::equivalent(file, target, missing))
+            return file + ": its result would take its place";
+        if (!targets_.insert(target).second)
+            return file + ": " + target + " is another file's result already";
+        return {};
+    }
+
+    Options const& options_;
+    std::vector<FileReport> reports_;
+    std::set<std::string> targets_;
+};
+
+}  // namespace
+
+int run(Options const& options) {
+    if (!prepare(options)) return kUnusable;
+    Batch batch(options);
+    int status = kDone;
+    std::vector<std::string> const standardInput{"-"};
+    for (std::string const& file : options.files.empty() ? standardInput : options.files) {
+        if (Failure const failure = batch.convertFile(file)) {
+            complain(*failure);
+            status = kUnusable;
+        }
+    }
+    if (Failure const failure = batch.writeReport()) {
+        complain(*failure);
+        status = kUnusable;
+    }
+    return status;
+}
+
+}  // namespace tzconvert

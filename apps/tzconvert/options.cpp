@@ -1,0 +1,135 @@
+#include "apps/tzconvert/options.h"
+
+#include <CLI/CLI.hpp>
+#include <cstdio>
+
+namespace tzconvert {
+namespace {
+
+constexpr char kPurpose[] = "Converts MTEXT markup to RTF and RTF to MTEXT markup.";
+constexpr char kFooter[] =
+    "Without FILE, or with \"-\", standard input is read; input is UTF-8 and taken byte for byte.\n"
+    "Exit status: 0 done; 2 wrong usage, an unusable file, or input that is not UTF-8 or holds a zero\n"
+    "character, of which nothing is written.";
+
+struct DirectionRow {
+    char const* name;
+    Direction direction;
+    char const* help;
+};
+constexpr DirectionRow kDirections[] = {
+    {"to-rtf",     Direction::toRtf,     "markup to RTF"                             },
+    {"to-mtext",   Direction::toMtext,   "RTF to markup"                             },
+    {"round-trip", Direction::roundTrip, "markup to RTF to markup within one session"},
+};
+
+constexpr char kHexDigits[] = "0123456789abcdefABCDEF";
+
+// RRGGBB as 0x00BBGGRR; nothing when it is not six hex digits.
+std::optional<unsigned int> colorOf(std::string const& text) {
+    if (text.size() != 6 || text.find_first_not_of(kHexDigits) != std::string::npos) return {};
+    unsigned long const rgb = std::stoul(text, nullptr, 16);
+    return static_cast<unsigned int>(((rgb & 0xFF) << 16) | (rgb & 0xFF00) | (rgb >> 16));
+}
+
+template <class Color>
+void declareColor(CLI::App& app, char const* name, Color& color, char const* help) {
+    app.add_option_function<std::string>(
+           name,
+           [name, &color](std::string const& text) {
+               std::optional<unsigned int> const read = colorOf(text);
+               if (!read) throw CLI::ValidationError(name, "\"" + text + "\" is not RRGGBB");
+               color = *read;
+           },
+           help)
+        ->type_name("RRGGBB");
+}
+
+void declareFont(CLI::App& app, Options& options) {
+    auto* const face =
+        app.add_option("--font", options.face, "the style's font, by face")->type_name("FACE");
+    app.add_flag("--bold", options.bold, "the face is bold")->needs(face);
+    app.add_flag("--italic", options.italic, "the face is italic")->needs(face);
+    app.add_option("--charset", options.charset, "its character set (0)")
+        ->type_name("N")
+        ->needs(face);
+    app.add_option("--pitch", options.pitch, "its pitch and family (0)")
+        ->type_name("N")
+        ->needs(face);
+    app.add_option("--font-file", options.fontFile, "the style's font, by file (txt.shx)")
+        ->type_name("FILE")
+        ->excludes(face);
+}
+
+void declareText(CLI::App& app, Options& options) {
+    app.add_option("--size", options.size, "the style's size in drawing units (0.2)")
+        ->type_name("UNITS");
+    app.add_option("--twips", options.twips, "the same size in twips of the document (320)")
+        ->type_name("N");
+    declareColor(app, "--color", options.color, "the initial colour (000000)");
+    declareColor(app, "--by-layer", options.byLayer, "the colour of ByLayer (not set)");
+    declareColor(app, "--by-block", options.byBlock, "the colour of ByBlock (not set)");
+    app.add_option("--tracking", options.tracking, "tracking of the markup written (1)")
+        ->type_name("R");
+    app.add_option("--width-factor", options.widthFactor, "its width factor (1)")->type_name("R");
+    app.add_option("--oblique", options.oblique, "its oblique angle (0)")->type_name("R");
+    app.add_option("--base-alignment", options.baseAlignment,
+                   "its stack alignment: 0 bottom, 1 middle, 2 top (0)")
+        ->type_name("N")
+        ->check(CLI::Range(0, 2));
+    app.add_flag("--keep-trailing-paragraphs", options.keepsTrailingParagraphs,
+                 "keep paragraph marks at the end of the markup");
+    app.add_option("--code-page", options.codePage, "the system's code page (1252)")
+        ->type_name("N")
+        ->check(CLI::Range(1, 65535));
+}
+
+void declareFiles(CLI::App& app, Options& options) {
+    app.add_option("FILE", options.files, "what to convert")->type_name("");
+    app.add_option("--font-map", options.fontMap, "a font map file in place of the shipped one")
+        ->type_name("FILE");
+    auto* const output =
+        app.add_option("--output", options.output, "write there")->type_name("FILE");
+    app.add_option("--output-dir", options.outputDir, "write each FILE's result into that folder")
+        ->type_name("DIR")
+        ->excludes(output);
+    app.add_option("--report", options.report, "write what the conversion found as JSON")
+        ->type_name("FILE");
+}
+
+void declare(CLI::App& app, Options& options) {
+    app.require_subcommand(1);
+    for (DirectionRow const& row : kDirections) {
+        CLI::App& command = *app.add_subcommand(row.name, row.help);
+        Direction const direction = row.direction;
+        command.callback([&options, direction] { options.direction = direction; });
+        declareFont(command, options);
+        declareText(command, options);
+        declareFiles(command, options);
+        command.footer(kFooter);
+    }
+}
+
+}  // namespace
+
+ParsedOptions parseOptions(int count, char const* const* arguments) {
+    CLI::App app(kPurpose, "tzconvert");
+    app.footer(kFooter);
+    app.set_version_flag("--version", "tzconvert 1.0");
+    ParsedOptions parsed;
+    declare(app, parsed.options);
+    try {
+        app.parse(count, arguments);
+        if (parsed.options.files.size() > 1 && parsed.options.outputDir.empty())
+            throw CLI::ValidationError("FILE", "several of them need --output-dir");
+    } catch (CLI::Success const&) {  // --help, --version; CLI11 finds the command asked about
+        app.exit(CLI::CallForHelp());
+        parsed.exit = kDone;
+    } catch (CLI::ParseError const& wrong) {
+        std::fprintf(stderr, "tzconvert: %s; try --help\n", wrong.what());
+        parsed.exit = kUnusable;
+    }
+    return parsed;
+}
+
+}  // namespace tzconvert

@@ -1,0 +1,21 @@
+#pragma once
+
+// What conversions found, as JSON for other programs.
+
+#include <string>
+#include <vector>
+
+#include "apps/tzconvert/conversion.h"
+
+namespace tzconvert {
+
+struct FileReport {
+    std::string file;
+    Results results;
+};
+
+// One object; a list of them, each with its file's name, when results go into a folder.
+[[nodiscard]] std::string reportText(Options const& options,
+                                     std::vector<FileReport> const& reports);
+
+}  // namespace tzconvert

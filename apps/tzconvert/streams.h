@@ -1,0 +1,24 @@
+#pragma once
+
+// Input and output of the program: files by name, or its standard streams.
+
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace tzconvert {
+
+// What is read or written failed: one line saying what and why.
+using Failure = std::optional<std::string>;
+
+// Takes a whole file, or standard input for "-", as text. A file that cannot be read, is no UTF-8
+// or holds a zero character is refused.
+[[nodiscard]] Failure readText(std::string const& file, std::wstring& text);
+
+// Writes all of a text as UTF-8, to standard output for an empty name. A file is the old or the new
+// one, whatever happens.
+[[nodiscard]] Failure writeText(std::string const& file, std::wstring_view text);
+// The same with bytes.
+[[nodiscard]] Failure writeBytes(std::string const& file, std::string_view bytes);
+
+}  // namespace tzconvert

@@ -1,0 +1,167 @@
+// The program as a script meets it: what it prints, writes and refuses.
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+#include <string>
+
+#include <sys/wait.h>
+
+#include <gtest/gtest.h>
+
+#include "apps/tzconvert/text_codec.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+std::string contentsOf(fs::path const& file) {
+    std::ostringstream bytes;
+    bytes << std::ifstream(file, std::ios::binary).rdbuf();
+    return bytes.str();
+}
+
+void write(fs::path const& file, std::string const& bytes) {
+    std::ofstream(file, std::ios::binary) << bytes;
+}
+
+struct Outcome {
+    int status;
+    std::string out;
+    std::string err;
+};
+
+Outcome run(std::string const& arguments, std::string const& input) {
+    write("in", input);
+    std::string const command = std::string("'") + std::getenv("TZ_TEST_BIN") + "/tzconvert' " +
+                                arguments + " <in >out 2>err";
+    int const status = std::system(command.c_str());
+    return {WEXITSTATUS(status), contentsOf("out"), contentsOf("err")};
+}
+
+struct RunCase {
+    char const* name;
+    char const* arguments;
+    std::string_view input;
+    int status;
+    char const* out;  // all of it, or a part behind a "~"
+    char const* err;  // a part
+};
+using std::string_view_literals::operator""sv;
+constexpr RunCase kRuns[] = {
+    {"ToRtf",          "to-rtf",                                                                  "A{\\H2x;B}"sv,       0, "~A{\\fs64 B}\\par }",          ""                                 },
+    {"ToMtext",        "to-mtext",                                                                "{\\rtf1 a\\ul b}"sv, 0, "a{\\Lb}",                      ""                                 },
+    {"NothingAdded",   "to-mtext",                                                                "a\xC3\xA9\n"sv,      0, "a\xC3\xA9",                    ""                                 },
+    {"NewlineIsInput", "to-rtf",                                                                  "a\n"sv,              0, "~a\\line \\par }",             ""                                 },
+    {"RoundTrip",      "round-trip",                                                              "\\T1.5;{\\Lx}\\P"sv, 0, "\\T1.5;{\\Lx}",                ""                                 },
+    {"KeepsMarks",     "round-trip --keep-trailing-paragraphs",                                   "x"sv,                0, "x\\P",                         ""                                 },
+    {"Values",         "to-mtext --tracking 2 --width-factor .5 --oblique 15 --base-alignment 1", "\\\\S"sv,
+     0,                                                                                                                    "\\T2;\\W0.5;\\Q15;\\A1;\\\\S", ""                                 },
+    {"Face",           "to-rtf --font Some --bold --italic --charset 204 --pitch 18",             "x"sv,                0,
+     "~{\\f0\\froman\\fprq2\\fcharset204 Some;}",                                                                                                          ""                                 },
+    {"FaceStyle",      "to-rtf --font Some --bold",                                               "x"sv,                0, "~\\fs32\\b \\deftab0 x",       ""                                 },
+    {"Size",           "to-mtext --size 2.5 --twips 280",                                         "\\fs56 x"sv,         0, "{\\H2x;x}",                    ""                                 },
+    {"Color",          "to-rtf --color 112233",                                                   "x"sv,                0, "~\\red17\\green34\\blue51;",   ""                                 },
+    {"ByLayer",        "to-mtext --by-layer FF0000 --by-block ff0000",
+     "{\\colortbl\\red255\\green0\\blue0;\\red254\\green0\\blue0;}\\cf0 a\\cf1 b"sv,                                    0,
+     "{\\C256;a\\C0;b}",                                                                                                                                   ""                                 },
+    {"CodePage",       "to-mtext --code-page 1251",                                               "\\'c0"sv,            0, "\xD0\x90",                     ""                                 },
+    {"Dash",           "to-mtext -",                                                              "a"sv,                0, "a",                            ""                                 },
+    {"Empty",          "to-mtext",                                                                ""sv,                 0, "",                             ""                                 },
+    {"NotUtf8",        "to-rtf",                                                                  "ab\xE9x"sv,          2, "",                             "standard input: byte 2: not UTF-8"},
+    {"CutOffUtf8",     "round-trip",                                                              "ab\xE4\xB8"sv,       2, "",                             "byte 2: not UTF-8"                },
+    {"ZeroCharacter",  "to-mtext",                                                                "a\0b"sv,             2, "",                             "byte 1: a zero character"         },
+    {"NoFile",         "to-rtf none.txt",                                                         ""sv,                 2, "",                             "none.txt: cannot be read"         },
+    {"NoFontMap",      "to-rtf --font-map none.ini",                                              "a"sv,                2, "",                             "none.ini: cannot be read"         },
+    {"NoFolder",       "to-rtf --output none/x.rtf",                                              "a"sv,                2, "",                             "none/x.rtf: cannot be written"    },
+    {"NoCommand",      "",                                                                        ""sv,                 2, "",                             "--help"                           },
+    {"UnknownCommand", "to-html",                                                                 ""sv,                 2, "",                             "--help"                           },
+    {"UnknownOption",  "to-rtf --loud",                                                           "a"sv,                2, "",                             "--loud"                           },
+    {"BadColor",       "to-rtf --color red",                                                      "a"sv,                2, "",                             "\"red\" is not RRGGBB"            },
+    {"BadNumber",      "to-rtf --twips many",                                                     "a"sv,                2, "",                             "--twips"                          },
+    {"BadAlignment",   "to-mtext --base-alignment 3",                                             "a"sv,                2, "",                             "--base-alignment"                 },
+    {"BoldNeedsFace",  "to-rtf --bold",                                                           "a"sv,                2, "",                             "--font"                           },
+    {"TwoFiles",       "to-rtf in in",                                                            "a"sv,                2, "",                             "--output-dir"                     },
+    {"Help",           "to-rtf --help",                                                           ""sv,                 0, "~--output-dir",                ""                                 },
+    {"HelpOfAll",      "--help",                                                                  ""sv,                 0, "~round-trip",                  ""                                 },
+};
+
+class Runs : public testing::TestWithParam<RunCase> {};
+TEST_P(Runs, EndAs) {
+    RunCase const& row = GetParam();
+    Outcome const result = run(row.arguments, std::string(row.input));
+    EXPECT_EQ(result.status, row.status) << result.err;
+    if (row.out[0] == '~')
+        EXPECT_NE(result.out.find(row.out + 1), std::string::npos) << result.out;
+    else
+        EXPECT_EQ(result.out, row.out);
+    EXPECT_NE(result.err.find(row.err), std::string::npos) << result.err;
+    EXPECT_EQ(result.err.empty(), row.status == 0) << result.err;
+}
+INSTANTIATE_TEST_SUITE_P(Commands, Runs, testing::ValuesIn(kRuns), [](auto const& row) {
+    return row.param.name;
+});
+
+TEST(Files, AreWrittenWholeOrNotAtAll) {
+    write("kept.rtf", "old");
+    EXPECT_EQ(run("to-rtf --output kept.rtf", "a\xFF").status, 2);
+    EXPECT_EQ(contentsOf("kept.rtf"), "old");
+    EXPECT_EQ(run("to-mtext --output kept.rtf", "new").status, 0);
+    EXPECT_EQ(contentsOf("kept.rtf"), "new");
+}
+
+TEST(Files, OfABatchAreConvertedThoughOneFails) {
+    fs::remove_all("batch");
+    fs::create_directories("batch");
+    write("one.txt", "1");
+    write("bad.txt", "\xFF");
+    write("two.txt", "{\\L2}");
+    Outcome const result =
+        run("to-rtf --output-dir batch --report batch.json one.txt bad.txt two.txt one.txt", "");
+    EXPECT_EQ(result.status, 2);
+    EXPECT_NE(result.err.find("bad.txt: byte 0"), std::string::npos) << result.err;
+    EXPECT_NE(result.err.find("another file's result"), std::string::npos) << result.err;
+    EXPECT_NE(contentsOf("batch/one.rtf").find("1\\par }"), std::string::npos);
+    EXPECT_NE(contentsOf("batch/two.rtf").find("{\\ul 2}\\par }"), std::string::npos);
+    EXPECT_FALSE(fs::exists("batch/bad.rtf"));
+    std::string const report = contentsOf("batch.json");
+    EXPECT_NE(report.find("\"file\": \"two.txt\""), std::string::npos) << report;
+    EXPECT_EQ(report.find("bad.txt"), std::string::npos) << report;
+}
+
+TEST(Files, DoNotOverwriteTheirInput) {
+    write("trip.mtext", "x");
+    EXPECT_EQ(run("round-trip --output-dir . trip.mtext", "").status, 2);
+    EXPECT_EQ(contentsOf("trip.mtext"), "x");
+}
+
+TEST(Reports, NameWhatWasFound) {
+    EXPECT_EQ(run("to-rtf --report r.json", "a\\T2;\\K\\A1;\\S1/2;\\H0.4;x").status, 0);
+    std::string const report = contentsOf("r.json");
+    for (char const* part :
+         {"\"incidents\": 1073741825", "\"tracking\": 2.0", "\"baseAlignment\": 1",
+          "\"minFontSize\": 28", "\"maxFontSize\": 64", "\"initialFontSize\": 32",
+          "\"currentFontSize\": 64", "\"stacksSeen\": true"}) {
+        EXPECT_NE(report.find(part), std::string::npos) << part << report;
+    }
+}
+
+TEST(Codec, ReadsAndWritesAnyMixture) {
+    for (std::size_t plain : {0U, 1U, 63U, 64U, 65U, 200U}) {
+        std::string const bytes = std::string(plain, 'a') + "\xC3\xA9\xF0\x9F\x98\x80" +
+                                  std::string(plain, 'b') + "\xE4\xB8\xAD";
+        std::wstring text;
+        EXPECT_FALSE(tzconvert::decodeText(bytes, text));
+        EXPECT_EQ(text.size(), 2 * plain + 3);
+        std::string back;
+        tzconvert::encodeText(text, back);
+        EXPECT_EQ(back, bytes);
+        std::wstring cut;
+        auto const bad = tzconvert::decodeText(bytes + "\xC0\x80", cut);
+        ASSERT_TRUE(bad);
+        EXPECT_EQ(bad->offset, bytes.size());
+    }
+}
+
+}  // namespace
