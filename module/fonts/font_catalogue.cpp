@@ -3,16 +3,13 @@
 #include <system_error>
 
 #include "module/access/resources.h"
+#include "module/access/string_table.h"
 #include "tz/ed/print.h"
 
 namespace {
 
 constexpr unsigned kLoadingElsewhere = 169;
 constexpr unsigned kLoadedElsewhere = 170;
-
-void printResource(unsigned id) {
-    tzutPrintf(loadResourceString(static_cast<int>(id)).kwszPtr());
-}
 
 // The entry under the lower-cased key as what the read operations expect, or null.
 template <class Entry, class Table>
@@ -48,11 +45,11 @@ bool CTzadFontMapDatabase::IsDatabaseLoaded() {
 void CTzadFontMapDatabase::LoadContents(signed char /*flag*/) {
     if (m_eDatabaseStatus == kLoaded) return;
     bool const isLoadedElsewhere = m_eDatabaseStatus == kLoading;
-    if (isLoadedElsewhere) printResource(kLoadingElsewhere);
+    if (isLoadedElsewhere) tzutPrintf(gStringTable[kLoadingElsewhere]);
     try {
         std::lock_guard const lock(m_mutexLoading);
         if (isLoadedElsewhere) {
-            printResource(kLoadedElsewhere);
+            tzutPrintf(gStringTable[kLoadedElsewhere]);
         } else {
             m_eDatabaseStatus = kLoaded;
         }

@@ -1,4 +1,5 @@
 #include <memory>
+#include <utility>
 
 #include "module/access/attachment_ids.h"
 #include "module/access/style_rules.h"
@@ -26,12 +27,9 @@ void copyOptions(TzDbMText const& text, TzxMtextCommand& command) {
 }
 
 // Attaches the field that a session left; one that the text does not take is deleted.
-void attachField(TzDbMText& text, TzDbField* field) {
+void attachField(TzDbMText& text, std::unique_ptr<TzDbField> field) {
     TzDbObjectId dropped;
-    if (text.setField(L"TEXT", field, dropped) == Tzad::eOk)
-        field->close();
-    else
-        delete field;
+    if (text.setField(L"TEXT", field.get(), dropped) == Tzad::eOk) field.release()->close();
 }
 
 }  // namespace
@@ -65,6 +63,7 @@ int TzadEditMTextEntity(
     if (!text) return kNoEditorRan;
     EasyObject<TzDbMText> held(text, EasyFlags::kNone);
     int const result = InvokeEditorOn(held, tab, flags, interactive, view, false, false, false);
-    if (result == kAccepted && held.field) attachField(*text, held.field);
+    std::unique_ptr<TzDbField> field(std::exchange(held.field, nullptr));
+    if (result == kAccepted && field) attachField(*text, std::move(field));
     return result;
 }

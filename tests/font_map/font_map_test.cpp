@@ -6,6 +6,8 @@
 #include <string>
 
 #include "host/base/font_map_path.h"
+#include "host/base/output.h"
+#include "module/access/string_table.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
 
@@ -225,6 +227,14 @@ TEST_F(FontMap, OffersFacesToAList) {
     List list;
     fonts.FixupFontBox(&list);
     EXPECT_EQ(list.text, L"shx A\nshx B\nmisc M\nproxy P1 for n.shx\nfree P2\nfree P3\n");
+    // Running out counts too, so that none is offered behind the end of the list.
+    for (wchar_t const* file : {L"o.shx", L"p.shx", L"q.shx"})
+        (void)byFile(fonts, file);
+    EXPECT_TRUE(fonts.ProxiesExhausted());
+    list.text.clear();
+    fonts.FixupFontBox(&list);
+    EXPECT_EQ(list.text, L"shx A\nshx B\nmisc M\nproxy P1 for n.shx\nproxy P2 for o.shx\n"
+                         L"proxy P3 for p.shx\n");
 }
 
 TEST_F(FontMap, StatusFollowsLoadAndReset) {
@@ -233,10 +243,18 @@ TEST_F(FontMap, StatusFollowsLoadAndReset) {
     EXPECT_TRUE(fonts.IsDatabaseLoaded());
     fonts.ResetContents();
     EXPECT_FALSE(fonts.IsDatabaseLoaded());
-    // A loader in another place is waited for and leaves its status alone.
+    // A loader in another place is waited for, which the user is told, and leaves its status alone.
+    struct Prints : tzhost::PrintSink {
+        void print(std::wstring_view text) override { printed += text; }
+        std::wstring printed;
+    } prints;
+    auto* const before = tzhost::setPrintSink(&prints);
     Fonts::m_eDatabaseStatus = Fonts::kLoading;
     fonts.LoadContents(0);
+    tzhost::setPrintSink(before);
     EXPECT_EQ(Fonts::m_eDatabaseStatus, Fonts::kLoading);
+    EXPECT_EQ(prints.printed, gStringTable[169].str() + gStringTable[170].str());
+    EXPECT_NE(prints.printed, L"");
 }
 
 }  // namespace

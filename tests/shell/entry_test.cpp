@@ -3,6 +3,7 @@
 
 #include <dlfcn.h>
 #include <gtest/gtest.h>
+#include <malloc.h>
 
 #include <cstdlib>
 #include <filesystem>
@@ -62,8 +63,10 @@ protected:
         return *static_cast<T*>(dlsym(tzhost::dynamicLinker().modules().front()->library, name));
     }
 
-    // Registrations as "what name", with "-" ahead of those taken back.
+    // Registrations as "what name", with "-" ahead of those taken back; a line of the debug output
+    // as "debug".
     std::string registered_;
+    std::string debug_;  // those lines themselves
     std::string error_;
     Prints prints_;
     std::unique_ptr<tzhost::Drawing> drawing_ = tzhost::Drawing::create();
@@ -71,6 +74,10 @@ protected:
 
 private:
     void note(tzhost::Event const& event) {
+        if (event.at("event") == "debug") {
+            registered_ += "debug\n";
+            debug_ += event.at("text").get<std::string>();
+        }
         if (event.at("event") != "register") return;
         registered_ += (event.at("on").get<bool>() ? "" : "-") +
                        event.at("what").get<std::string>() + " " +
@@ -83,15 +90,17 @@ TEST_F(Module, RegistersAndTakesBackInItsOrder) {
     EXPECT_EQ(registered_,
               "class TzxEditMtext\nclass TzxMtextCommand\nclass TzApHostRawEditorParamsFrameless\n"
               "class TzApHostOldEditorParamsFrameless\nservice TzMTextService_TZC\n"
-              "command MTEDIT\nhelp MTEDIT\nhelp MTEDIT\n"
-              "command -MTEDIT\nhelp -MTEDIT\nhelp -MTEDIT\n"
-              "command TEXTALIGN\nhelp TEXTALIGN\nhelp TEXTALIGN\n"
-              "command MTEXT\nhelp MTEXT\nhelp MTEXT\n"
-              "command -MTEXT\nhelp -MTEXT\nhelp -MTEXT\n"
-              "command MTPROP\nhelp MTPROP\nhelp MTPROP\n"
+              "command MTEDIT\ndebug\nhelp MTEDIT\nhelp MTEDIT\n"
+              "command -MTEDIT\ndebug\nhelp -MTEDIT\nhelp -MTEDIT\n"
+              "command TEXTALIGN\ndebug\nhelp TEXTALIGN\nhelp TEXTALIGN\n"
+              "command MTEXT\ndebug\nhelp MTEXT\nhelp MTEXT\n"
+              "command -MTEXT\ndebug\nhelp -MTEXT\nhelp -MTEXT\n"
+              "command MTPROP\ndebug\nhelp MTPROP\nhelp MTPROP\n"
               "command MTEXTPROPERTIES\n"
               "function MTEDIT\nfunction TEXTALIGN\nfunction MTPROP\n"
               "help MTEDIT\nhelp MTEDIT\nhelp TEXTALIGN\nhelp TEXTALIGN\n");
+    EXPECT_EQ(debug_.substr(0, debug_.find('\n') + 1),
+              "  Registered command under the global name 'MTEDIT' and local name 'MTEDIT'\r\n");
     EXPECT_EQ(tzhost::commandStack().find(L"MTEDIT")->flags, 0x2);
     EXPECT_EQ(tzhost::commandStack().find(L"MTEXTPROPERTIES")->flags, 0x800002);
     EXPECT_EQ(tzhost::findHelp(L"MTEXTPROPERTIES"), nullptr);
@@ -123,6 +132,20 @@ TEST_F(Module, IsNotLoadedWithoutItsTexts) {
     EXPECT_EQ(registered_, "");
     tzhost::setResourceSearch({});
     EXPECT_TRUE(load()) << "its texts are looked for anew: " << error_;
+}
+
+TEST_F(Module, IsLoadedWhateverTheHostRefuses) {
+    tzhost::setFaultHook([](std::string_view operation, int&) {
+        return operation == "newTzRxClass" || operation == "TzEdCommandStack::addCommand" ||
+               operation == "tzedSetFunHelp";
+    });
+    ASSERT_TRUE(load()) << error_;
+    EXPECT_EQ(tzhost::commandStack().find(L"MTEDIT"), nullptr);
+    tzhost::setFaultHook(nullptr);
+    registered_.clear();
+    ASSERT_TRUE(unload()) << error_;
+    EXPECT_EQ(registered_, "-function MTEDIT\n-function TEXTALIGN\n-function MTPROP\n"
+                           "-service TzMTextService_TZC\n");
 }
 
 TEST_F(Module, StopsDefiningAtTheFirstRefusal) {
@@ -185,7 +208,13 @@ bool isInProcess(fs::path const& file) {
 }
 
 TEST_F(Module, LeavesTheProcessAndComesBackFresh) {
-    for (int round = 0; round < 3; ++round) {
+    constexpr int kRounds = 1000;
+    constexpr int kWarmUp = 10;
+    constexpr std::size_t kSlack = 4096;
+    tzhost::setEventSink({});
+    std::size_t before = 0;
+    for (int round = 0; round < kRounds; ++round) {
+        if (round == kWarmUp) before = mallinfo2().uordblks;
         ASSERT_TRUE(load()) << error_;
         EXPECT_TRUE(isInProcess(file_));
         EXPECT_EQ(exported<double>("gdJigBoundBoxHeight"), 0);
@@ -193,6 +222,7 @@ TEST_F(Module, LeavesTheProcessAndComesBackFresh) {
         ASSERT_TRUE(unload()) << error_;
         EXPECT_FALSE(isInProcess(file_));
     }
+    EXPECT_LT(mallinfo2().uordblks, before + kSlack);
 }
 
 }  // namespace

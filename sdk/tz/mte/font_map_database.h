@@ -14,8 +14,8 @@
 //   CMTextFontMapDatabase::MapType type;
 //   bool bold, italic; Charset charset; int pitch;
 //   CStdStrW face = fonts.MapFileToFont(type, L"romans.shx", bold, italic, charset, pitch);
-//   CStdStrW file = fonts.MapFontToFile(type, face, bold, italic, charset, pitch);   //
-//   "romans.shx"
+//   CStdStrW file = fonts.MapFontToFile(type, face, bold, italic, charset, pitch);
+//   // "romans.shx" again
 //
 // The tables are shared by the process; the count of proxies belongs to one object. The end of any
 // object takes the proxies of all of them out of the tables. No failure is reported: without a

@@ -11,9 +11,8 @@
 // and live from its load to its unload; the module alone writes them, on the host's one thread.
 // First values stand behind each.
 
-// The module's texts by their ids, with variables expanded: "{NAME}" stands for a system variable's
-// value,
-// "{(}" and "{)}" for braces. An id without a text gives the empty text. [any]
+// The module's texts by their ids, with variables expanded: "{NAME}" stands for the value of a
+// system variable, "{(}" and "{)}" for braces. An id without a text gives the empty text. [any]
 class TZ_API TzStringTable {
 public:
     [[nodiscard]] TzString operator[](unsigned int id) const;
