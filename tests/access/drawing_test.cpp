@@ -101,12 +101,16 @@ class TextSizes : public InDrawing, public testing::WithParamInterface<SizeRow> 
 TEST_P(TextSizes, FollowStyleScaleAndVariable) {
     SizeRow const& row = GetParam();
     TzDbObjectId const style = addStyle(L"Notes", row.height, row.annotative);
-    if (row.current) ASSERT_EQ(drawing_->setTextstyle(style), Tzad::eOk);
+    if (row.current) {
+        ASSERT_EQ(drawing_->setTextstyle(style), Tzad::eOk);
+    }
     give(L"CANNOSCALEVALUE", row.scale);
     give(L"TEXTSIZE", row.textSize);
     EXPECT_EQ(StyleIsAnnotative(style), row.annotative);
     EXPECT_EQ(ComputeTextSize(style), row.size);
-    if (row.current) EXPECT_EQ(ComputeTextSize(), row.size);
+    if (row.current) {
+        EXPECT_EQ(ComputeTextSize(), row.size);
+    }
 }
 INSTANTIATE_TEST_SUITE_P(Rows, TextSizes, testing::ValuesIn(kSizes), [](auto const& row) {
     return row.param.name;
