@@ -174,7 +174,9 @@ TEST_P(Inputs, AskAndRead) {
     }
     tzhost::setWorkingDrawing(nullptr);
     EXPECT_EQ(result, row.result);
-    if (row.shown[0] != L'\0') EXPECT_EQ(transcript, row.shown);
+    if (row.shown[0] != L'\0') {
+        EXPECT_EQ(transcript, row.shown);
+    }
 }
 INSTANTIATE_TEST_SUITE_P(Rows, Inputs, testing::ValuesIn(kAsks), [](auto const& row) {
     return row.param.name;
