@@ -5,8 +5,10 @@
 #include <cstdlib>
 #include <filesystem>
 #include <memory>
+#include <new>
 #include <vector>
 
+#include "host/base/fault_point.h"
 #include "host/database/drawing.h"
 #include "host/runtime/command_runner.h"
 #include "host/runtime/command_stack.h"
@@ -94,6 +96,28 @@ TEST_P(WaysOfText, AreChosenByDialogsScriptAndMacro) {
 INSTANTIATE_TEST_SUITE_P(Rows, WaysOfText, testing::ValuesIn(kWays), [](auto const& row) {
     return row.param.name;
 });
+
+// Memory fails from the first drag on.
+bool dragged = false;
+bool failMemoryAfterDrag(std::string_view operation, int&) {
+    dragged = dragged || operation == "TzEdJig::drag";
+    return dragged && operation == "operator new";
+}
+
+// The mark that the command runs is set back by its last step alone, which the next run reaches.
+TEST_F(Commands, LeaveTheirMarkWhenAnExceptionPasses) {
+    auto const& variables = tzhost::Variables::instance();
+    tzhost::Command const& command = *tzhost::commandStack().find(L"-MTEXT");
+    Session const session("0,0\n^C\n");
+    dragged = false;
+    tzhost::setFaultHook(failMemoryAfterDrag);
+    EXPECT_THROW((void)tzhost::runCommand(command, AnswersFrom::script), std::bad_alloc);
+    tzhost::setFaultHook(nullptr);
+    EXPECT_EQ(variables.number(L"MTEXTCOMMANDACTIVE"), 1);
+    EXPECT_EQ(texts(), "");
+    EXPECT_TRUE(tzhost::runCommand(command, AnswersFrom::script).clean());
+    EXPECT_EQ(variables.number(L"MTEXTCOMMANDACTIVE"), 0);
+}
 
 TEST_F(Commands, LeaveNothingWhenCancelled) {
     for (char const* script : {"^C\n", "0,0\n^C\n", "0,0\n5,5\n^C\n", "0,0\n5,5\ntyped\n^C\n"}) {

