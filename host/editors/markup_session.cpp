@@ -71,7 +71,10 @@ std::optional<TzString> editMarkup(TzString const& contents, std::string const& 
         if (!block->accepted) return std::nullopt;
         return TzString(linesToMarkup(block->text + L"\n"));
     }
-    if (program.empty()) return std::nullopt;
+    if (program.empty()) {
+        commandLine().say(L"No editor is named: --text-editor, the settings or $EDITOR name one.");
+        return std::nullopt;
+    }
     return editWithProgram(contents, program);
 }
 
