@@ -3,6 +3,7 @@
 #include <memory>
 #include <string_view>
 
+#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/runtime/documents.h"
 #include "tests/command_line/session.h"
@@ -17,6 +18,8 @@ class OpenDrawing {
 public:
     explicit OpenDrawing(std::string_view script = {})
         : session_(script), drawing_(tzhost::Drawing::create()) {
+        // An earlier test may have run the program with variables of its own.
+        tzhost::Variables::instance().reset();
         tzhost::setWorkingDrawing(drawing_.get());
         tzhost::documents().open(drawing_.get());
     }
