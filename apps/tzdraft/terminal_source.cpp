@@ -111,10 +111,11 @@ unsigned char TerminalSource::Editor::cancel(EditLine* line, wint_t /*key*/) {
     return CC_EOF;
 }
 
-// The editor's own handling of the signal gives the terminal back and takes it again.
+// The line editor's handling of the signal gives the terminal back and takes it again; the line is
+// shown anew.
 unsigned char TerminalSource::Editor::suspend(EditLine* /*line*/, wint_t /*key*/) {
     (void)std::raise(SIGTSTP);  // an unknown signal alone is refused
-    return CC_NORM;
+    return CC_REDISPLAY;
 }
 
 unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {

@@ -29,6 +29,8 @@ public:
         tcsetpgrp(STDIN_FILENO, getpgrp());
         tcsetattr(STDIN_FILENO, TCSADRAIN, &settings_);
         sigaction(SIGTTOU, &before_, nullptr);
+        // Wherever the program left the cursor, what follows begins a line.
+        if (isatty(STDOUT_FILENO) == 1) (void)!write(STDOUT_FILENO, "\r", 1);
     }
     [[nodiscard]] bool isTerminal() const { return isTerminal_; }
     void giveTo(pid_t program) const {

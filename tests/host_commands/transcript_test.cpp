@@ -1,0 +1,58 @@
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+
+#include "apps/tzdraft/program.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+struct TranscriptCase {
+    char const* name;
+    char const* script;
+    char const* expected;  // a part of the transcript
+};
+
+TranscriptCase const kCases[] = {
+    {"HelpOnOne",                    "HELP\nU\n",                                        "Takes the last command back; it asks nothing.\n"              },
+    {"HelpOnAModulesCommand",        "HELP\n_mtext\n",                                   "Writes a multi-line text between two corners, in"             },
+    {"HelpWithoutRegistration",      "HELP\nMTEXTPROPERTIES\n",                          "Changes properties of all selected"                           },
+    {"HelpOnNothing",                "HELP\nDANCE\n",                                    "There is no help on \"DANCE\".\n"                             },
+    {"HelpLists",                    "HELP\n\n",                                         "CIRCLE           Draws a circle from its center and radius.\n"},
+    {"ListTells",                    "CIRCLE\n1,2\n3\nLIST\nlast\n\n",
+     "Circle  #1, layer \"0\"\n  center           1.0000, 2"                                                                                            },
+    {"SelectedIsListed",             "CIRCLE\n0,0\n1\nSELECT\nlast\n\nLIST\n",           "Command: LIST\nCircle  #1"                                    },
+    {"SelectedIsForOneCommand",      "CIRCLE\n0,0\n1\nSELECT\nlast\n\nLIST\nLIST\n^C\n",
+     "Command: LIST\nSelect objects: ^C"                                                                                                                },
+    {"NothingToTakeBack",            "U\n",                                              "There is nothing to take back.\n"                             },
+    {"NoModuleLeft",                 "UNLOAD\nUNLOAD\n",                                 "Command: UNLOAD\nNo module is loaded.\n"                      },
+    {"GoneWithItsModule",            "UNLOAD\nMTEXT\n",                                  "There is no command \"MTEXT\".\n"                             },
+    {"LoadedTwice",                  "LOAD\n\n",                                         "tzmted.tzx: this module is loaded already\n"                  },
+    {"NoSuchModule",                 "LOAD\nmissing.tzx\n",                              "missing.tzx: the module cannot be loaded: "                   },
+    {"EnterRepeatsNothingInAScript", "U\n\nHELP\nU\n",                                   "back.\nCommand: \nCommand: HELP\n"                            },
+};
+
+class Transcripts : public testing::TestWithParam<TranscriptCase> {};
+
+TEST_P(Transcripts, Show) {
+    tzdraft::Options options;
+    fs::path const folder(testing::TempDir());
+    options.script = (folder / "transcript.scr").string();
+    options.settings = folder / "transcript-settings.json";
+    options.module = fs::path(std::getenv("TZ_TEST_LIB")) / "tzmted.tzx";
+    std::ofstream(options.script) << GetParam().script;
+    std::ofstream(options.settings) << "{}";
+    std::string seen;
+    auto const note = [&](std::string_view text) { seen += text; };
+    EXPECT_EQ(tzdraft::kDone, tzdraft::runProgram(options, {note, note}));
+    EXPECT_NE(std::string::npos, seen.find(GetParam().expected)) << seen;
+}
+
+INSTANTIATE_TEST_SUITE_P(Scripts, Transcripts, testing::ValuesIn(kCases), [](auto const& row) {
+    return row.param.name;
+});
+
+}  // namespace
