@@ -16,11 +16,13 @@ crashes=$root/build/fuzz/crashes
 seeds=$root/fuzz/corpus/$name
 mkdir -p "$found" "$crashes"
 [ -d "$seeds" ] || seeds=
+dictionary=$root/fuzz/dictionaries/$name.dict
+[ -f "$dictionary" ] || dictionary=
 export LC_ALL=C.UTF-8 FONTCONFIG_FILE="$root/build/fuzz/tests/fonts/fonts.conf"
 export TZ_TEST_LIB="$root/build/fuzz/lib" TZ_TEST_BIN="$root/build/fuzz/bin" TZ_TEST_SOURCE="$root"
 log=$crashes/$name.log
 if "$program" -max_total_time="$seconds" -timeout=20 -rss_limit_mb=2500 -print_final_stats=1 \
-    -artifact_prefix="$crashes/$name-" "$found" ${seeds:+"$seeds"} >"$log" 2>&1; then
+    -artifact_prefix="$crashes/$name-" ${dictionary:+"-dict=$dictionary"} "$found" ${seeds:+"$seeds"} >"$log" 2>&1; then
     runs=$(sed -n 's/^stat::number_of_executed_units: *//p' "$log")
     echo "fuzz_$name: $runs inputs, no crash"
 else

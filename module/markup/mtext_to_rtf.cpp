@@ -3,6 +3,7 @@
 #include "module/markup/mtext_to_rtf.h"
 
 #include <algorithm>
+#include <cwchar>
 
 #include "module/markup/number_text.h"
 #include "module/markup/scale_correction.h"
@@ -78,6 +79,9 @@ CStdStrW CMTextToRichTextContext::Parse(wchar_t const* text) {
     updateSizes(m_nInitialFontSize);
     // Only an empty text keeps the system's stack alignment.
     if (*text != 0) m_eBaseAlignment = kAlignBottom;
+    // Memory that is not written to costs nothing, a copy of what was written does.
+    std::size_t const length = std::wcslen(text);
+    reserve(length + length / 2);
     convert(text);
     CStdStrW const head = documentHead();
     CStdStrW& body = Close();

@@ -53,7 +53,9 @@ void CRichTextToMTextContext::SetInitialColor(unsigned int rgb) {
 
 CStdStrW CRichTextToMTextContext::Parse(wchar_t const* text) {
     m_bStackSeen = false;
-    reserve(std::wcslen(text));
+    // Memory that is not written to costs nothing, a copy of what was written does.
+    std::size_t const length = std::wcslen(text);
+    reserve(length + length / 2);
     Convert(text);
     CStdStrW markup = std::move(Close());
     if (CStdStrW const defaults = InitialDefaults(); !defaults.empty()) markup.insert(0, defaults);
