@@ -34,7 +34,7 @@ fs::path scratch(std::string const& name) {
 }
 
 fs::path scratch(std::string const& name, std::string const& bytes) {
-    fs::path const file = scratch(name);
+    fs::path file = scratch(name);
     std::ofstream(file, std::ios::binary) << bytes;
     return file;
 }
