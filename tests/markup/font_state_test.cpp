@@ -1,0 +1,147 @@
+// The codes between looks, and which typefaces count as the same.
+
+#include <gtest/gtest.h>
+
+#include "host/base/variables.h"
+#include "module/markup/font_state.h"
+#include "tests/markup/conversions.h"
+#include "tz/gi/color.h"
+
+namespace {
+
+// The system's page, and with it the system's set, for the life of the object.
+class SystemPage {
+public:
+    explicit SystemPage(wchar_t const* page) {
+        (void)tzhost::Variables::instance().overrideFromText(L"SYSCODEPAGE", page);
+    }
+    ~SystemPage() {
+        (void)tzhost::Variables::instance().overrideFromText(L"SYSCODEPAGE", L"ANSI_1252");
+    }
+    SystemPage(SystemPage const&) = delete;
+    SystemPage& operator=(SystemPage const&) = delete;
+};
+
+class FontState : public testing::Test {
+protected:
+    FontState() {
+        state.InitializeFontName(L"Base", false, false, kAnsiCharset, 34);
+        state.InitializeFontSize(2.5);
+        state.InitializeColor(256, 0xFFFFFF);
+    }
+    std::wstring emitted() {
+        std::wstring const codes = state.EmitStateInMText();
+        state.Reset();
+        return codes;
+    }
+    markuptest::OwnFontMap map;
+    CMTextFontMapDatabase fonts{0};
+    CFontState state{&fonts};
+};
+
+TEST_F(FontState, OpensOneBraceAndReturnsWithOne) {
+    EXPECT_FALSE(state.IsEmissionPending());
+    state.SetUnderline(false);
+    EXPECT_TRUE(state.IsEmissionPending());
+    EXPECT_EQ(emitted(), L"");
+    EXPECT_FALSE(state.IsEmissionPending());
+    state.SetFontSize(3.0);
+    EXPECT_EQ(emitted(), L"{\\H1.2x;");
+    state.SetUnderline(true);
+    EXPECT_EQ(emitted(), L"\\L");
+    state.SetUnderline(false);
+    state.SetFontSize(2.5);
+    EXPECT_EQ(emitted(), L"}");
+    EXPECT_EQ(state.EmitTerminatingStateInMText(), L"");
+    state.SetStrikethrough(true);
+    EXPECT_EQ(emitted(), L"{\\O");
+    EXPECT_EQ(state.EmitTerminatingStateInMText(), L"}");
+    EXPECT_EQ(state.EmitTerminatingStateInMText(), L"");
+}
+
+TEST_F(FontState, WritesATrueColorWithoutABrace) {
+    state.SetColor(256, 0x123456);
+    EXPECT_EQ(emitted(), L"\\C256;");
+    state.SetColor(1, tzedGetRGB(1));
+    EXPECT_EQ(emitted(), L"{\\C1;");
+    state.SetColor(1, 0x0000FE);
+    EXPECT_EQ(emitted(), L"\\C1;\\c254;");
+    state.SetColor(0, 0x0000FE);
+    EXPECT_EQ(emitted(), L"\\C0;");
+}
+
+TEST_F(FontState, WritesNoSizeBehindAnUnknownOne) {
+    CFontState unset(&fonts);
+    unset.SetFontSize(3.0);
+    EXPECT_STREQ(unset.EmitStateInMText().c_str(), L"{");
+}
+
+TEST_F(FontState, NamesFacesAndFiles) {
+    state.SetFontName(L"Plotter");
+    state.SetPitchAndFamily(49);
+    EXPECT_EQ(emitted(), L"{\\Ftxt.shx|c0;");
+    state.SetCharSet(kDefaultCharset);
+    EXPECT_EQ(emitted(), L"\\fPlotter|b0|i0|c0|p49;");  // no file has that set
+    state.SetFontName(L"PAIRED");
+    EXPECT_EQ(emitted(), L"\\F|c1;");  // no pair is lent yet; the file form keeps the set 1
+    SystemPage const chinese(L"ANSI_936");
+    state.SetFontName(L"Other");
+    EXPECT_EQ(emitted(), L"\\fOther|b0|i0|c134|p49;");
+}
+
+TEST_F(FontState, GivesALookBack) {
+    {
+        CFontState saved(&state);
+        state.SetUnderline(true);
+        EXPECT_EQ(emitted(), L"{\\L");
+    }
+    EXPECT_TRUE(state.IsEmissionPending());
+    EXPECT_EQ(emitted(), L"}");
+    CFontState other(&fonts);
+    other.SetValuesFrom(&state);
+    EXPECT_TRUE(other.IsEmissionPending());
+    other.SetBaseAlignment(kAlignTop, 1);
+    EXPECT_EQ(other.GetBaseAlignment(0), kAlignTop);
+    EXPECT_EQ(other.GetBaseAlignment(1), kAlignBottom);
+}
+
+TEST_F(FontState, TellsTypefacesApart) {
+    SystemPage const chinese(L"ANSI_936");
+    struct Row {
+        char const* name;
+        wchar_t const* face;
+        int charset;
+        wchar_t const* otherFace;
+        int otherCharset;
+        bool isSame;
+    };
+    constexpr Row kRows[] = {
+        {"Same",              L"A",    204, L"A",    204, true },
+        {"CaseDoesNotCount",  L"a",    204, L"A",    204, true },
+        {"OtherName",         L"A",    0,   L"B",    0,   false},
+        {"OtherSet",          L"A",    204, L"A",    0,   false},
+        {"SystemAgainstNone", L"A",    134, L"A",    0,   true },
+        {"NoneAgainstSystem", L"A",    0,   L"A",    134, false},
+        {"OfTheStyle",        L"Base", 0,   L"Base", 134, true },
+        {"OfTheStyleExactly", L"Base", 0,   L"BASE", 134, false},
+    };
+    for (Row const& row : kRows) {
+        CFontAttributes one;
+        one.m_sFontName = row.face;
+        one.m_nCharset = static_cast<Charset>(row.charset);
+        CFontAttributes other;
+        other.m_sFontName = row.otherFace;
+        other.m_nCharset = static_cast<Charset>(row.otherCharset);
+        EXPECT_EQ(one.IsSameTypeface(other), row.isSame) << row.name;
+        EXPECT_EQ(one == other, row.isSame) << row.name;
+    }
+    CFontAttributes bold;
+    bold.m_bBold = true;
+    EXPECT_FALSE(bold.IsSameTypeface(CFontAttributes()));
+    CFontAttributes colored;
+    colored.m_nRGB = 0;
+    colored.m_eBaseAlignment = kAlignTop;
+    EXPECT_TRUE(colored == CFontAttributes());
+}
+
+}  // namespace
