@@ -143,7 +143,7 @@ TEST_P(Keys, Show) {
         terminal.type(dialogue[at + 1]);
     }
     ASSERT_TRUE(terminal.shows(GetParam().last)) << terminal.rest();
-    terminal.type("\x03\x04");
+    if (GetParam().status == 0) terminal.type("\x03\x04");  // else it has ended by itself
     EXPECT_EQ(GetParam().status, terminal.exitStatus());
 }
 
