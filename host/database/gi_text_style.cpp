@@ -29,6 +29,7 @@ TzGePoint2d TzGiTextStyle::extents(
                    pitchAndFamily_, xScale_,
                    obliquingAngle_, vertical_,
                    backward_,       upsideDown_};
+    tzhost::dropVerticalMark(input.style);
     tzhost::LayoutBox const box = tzhost::layOutLine(input).box;
     return {box.width(), box.height()};
 }

@@ -49,11 +49,6 @@ LineLayoutInput layoutInputOf(DrawnText const& text) {
     input.style.fontFile = style.fileName().str();
     input.style.bigFontFile = style.bigFontFileName().str();
     input.style.typeface = style.typeface().str();
-    // A leading "@" asks a whole text to run downwards, but what is drawn as horizontal has been
-    // placed already, letter by letter.
-    if (!style.isVertical() && input.style.typeface.starts_with(L'@')) {
-        input.style.typeface.erase(0, 1);
-    }
     input.style.bold = style.isBold();
     input.style.italic = style.isItalic();
     input.style.charset = style.charset();
@@ -63,6 +58,7 @@ LineLayoutInput layoutInputOf(DrawnText const& text) {
     input.style.vertical = style.isVertical();
     input.style.backward = style.isBackward();
     input.style.upsideDown = style.isUpsideDown();
+    dropVerticalMark(input.style);
     return input;
 }
 

@@ -98,4 +98,8 @@ bool isVerticalStyle(LayoutStyle const& style) {
     return style.vertical || (!style.typeface.empty() && style.typeface.front() == L'@');
 }
 
+void dropVerticalMark(LayoutStyle& style) {
+    if (!style.vertical && style.typeface.starts_with(L'@')) style.typeface.erase(0, 1);
+}
+
 }  // namespace tzhost

@@ -23,4 +23,8 @@ namespace tzhost {
 // Whether a style writes from top to bottom: by its flag, or by a typeface with a leading "@".
 [[nodiscard]] bool isVerticalStyle(LayoutStyle const& style);
 
+// Takes the "@" off the typeface of a style without the vertical flag. The mark asks whole entities
+// to run downwards; a text that is drawn as strokes runs along its direction all the same.
+void dropVerticalMark(LayoutStyle& style);
+
 }  // namespace tzhost

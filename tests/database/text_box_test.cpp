@@ -68,6 +68,12 @@ TEST_F(DrawingTest, BoxOfALineStandsInItsOwnFrame) {
     ASSERT_EQ(fromTzDbTextStyle(style, drawing->textstyle()), Tzad::eOk);
     style.setTextSize(2);
     EXPECT_NEAR(style.extents(L"abcdef", true, 3, true).x, box.high[0], 1e-9);
+    // The mark of a vertical face once gave the width of a stack of letters.
+    TzGiTextStyle plain = style;
+    plain.setFont(L"DejaVu Sans", false, false, 0, 0);
+    style.setFont(L"@DejaVu Sans", false, false, 0, 0);
+    EXPECT_DOUBLE_EQ(style.extents(L"abc", true, 3, true).x,
+                     plain.extents(L"abc", true, 3, true).x);
 }
 
 TEST_F(DrawingTest, BoxOfADefinitionHoldsItsLines) {
