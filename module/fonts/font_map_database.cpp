@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "module/fonts/table_key.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/ini_file.h"
 #include "tz/text/font_info.h"
@@ -24,7 +25,7 @@ CStdStrW normalised(CStdStrW file) {
     } else {
         file = withoutFolder(std::move(file));
     }
-    file.MakeLower();
+    lowerKey(file);
     return file;
 }
 
@@ -129,7 +130,7 @@ CStdStrW CMTextFontMapDatabase::MapFileToFont(
 CStdStrW CMTextFontMapDatabase::MapFontToFile(
     MapType& type, CStdStrW face, bool bold, bool italic, Charset charset, int pitch) {
     if (m_mapFontToFile.empty()) BuildDatabase();
-    auto const at = m_mapFontToFile.find(BuildFontDescription(face, bold, italic, charset, pitch));
+    auto const at = m_mapFontToFile.find(descriptionKey(face, bold, italic, charset, pitch).view());
     if (at != m_mapFontToFile.end()) {
         auto const& entry = static_cast<CMTextFontToFileMapEntry const&>(*at->second);
         type = entry.m_eMapType;

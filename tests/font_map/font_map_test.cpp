@@ -137,6 +137,21 @@ TEST_F(FontMap, FacesMapBackByTheWholeDescription) {
     EXPECT_EQ(byFace(fonts, L"DejaVu Sans", 77, 5, true), L"DejaVuSans-Bold.ttf|0");
 }
 
+TEST_F(FontMap, FacesOfAnyLengthAndScriptMapBack) {
+    Fonts fonts(0);
+    std::wstring const longFaces[] = {std::wstring(79, L'F'), std::wstring(80, L'F'),
+                                      std::wstring(500, L'F'), L"\u00C4\u0416 Face"};
+    for (std::wstring const& face : longFaces) {
+        fonts.AddFontSubstitute(face + L".shx", face, true, false, kAnsiCharset, -7,
+                                Fonts::MapTypeShx, 0);
+        CStdStrW lower(face);
+        lower.MakeLower();
+        EXPECT_EQ(byFace(fonts, lower.c_str(), 0, -7, true), lower + L".shx|1");
+        EXPECT_EQ(BuildFontDescription(face, true, false, kAnsiCharset, -7),
+                  lower + L"|b1|i0|c0|p-7");
+    }
+}
+
 TEST_F(FontMap, ProxiesRunOutAndTheEmergencyFaceHasNoWayBack) {
     Fonts fonts(0);
     EXPECT_FALSE(fonts.ProxiesAssigned());
