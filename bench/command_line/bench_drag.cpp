@@ -1,58 +1,87 @@
-// A drag of 100 cursor places over drawings of growing size: the time must not follow the size.
+// A drag of the text box over 100 cursor places, in a drawing with 10,000 entities. The floor is
+// the same drag in a drawing with 10: a sample, which is an update and a redraw of the preview,
+// must not follow the size of the drawing.
 #include <benchmark/benchmark.h>
 
+#include <memory>
+#include <string>
+
+#include "bench/support/against_floor.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/script_source.h"
 #include "host/database/drawing.h"
+#include "module/mtext/rectangle_jig.h"
+#include "module/prompt/jig_input.h"
 #include "tz/db/block_table.h"
+#include "tz/db/mtext.h"
 #include "tz/db/shapes.h"
-#include "tz/ed/jig.h"
 
 namespace {
 
-class RubberLine : public TzEdJig {
-public:
-    DragStatus sampler() override {
-        TzGePoint3d point;
-        DragStatus const status = acquirePoint(point);
-        (void)line_.setEndPoint(point);
-        return status;
-    }
-    bool update() override { return true; }
-    [[nodiscard]] TzDbEntity* entity() const override { return &line_; }
+constexpr double kMost = 1.2;
+constexpr int kSmall = 10;
+constexpr int kLarge = 10000;
+constexpr int kPlaces = 100;
 
-private:
-    mutable TzDbLine line_;
-};
-
-void fill(tzhost::Drawing& drawing, std::int64_t count) {
-    TzDbBlockTableRecord* space = nullptr;
-    if (tzdbOpenObject(space, drawing.modelSpace(), TzDb::kForWrite) != Tzad::eOk) return;
-    for (std::int64_t i = 0; i < count; ++i) {
-        auto* const line = new TzDbLine;
-        TzDbObjectId id;
-        if (space->appendTzDbEntity(id, line) == Tzad::eOk) line->close();
+std::unique_ptr<TzDbEntity> entityAt(int index) {
+    TzGePoint3d const place(index % 100, index / 100, 0);
+    if (index % 2 == 0) {
+        auto line = std::make_unique<TzDbLine>();
+        (void)line->setStartPoint(place);
+        return line;
     }
-    space->close();
+    auto text = std::make_unique<TzDbMText>();
+    text->setDatabaseDefaults();
+    (void)text->setLocation(place);
+    (void)text->setContents(L"A note");
+    return text;
 }
 
-void drag(benchmark::State& state) {
-    auto const drawing = tzhost::Drawing::create();
+std::unique_ptr<tzhost::Drawing> drawingWith(int count) {
+    auto drawing = tzhost::Drawing::create();
     tzhost::setWorkingDrawing(drawing.get());
-    fill(*drawing, state.range(0));
-    std::string script;
-    for (int i = 0; i < 100; ++i)
-        script += "~" + std::to_string(i) + ",1\n";
-    RubberLine jig;
-    while (state.KeepRunning()) {
-        tzhost::ScriptSource source(script + "\n");
-        tzhost::commandLine().setSource(&source);
-        benchmark::DoNotOptimize(jig.drag());
+    TzDbBlockTableRecord* space = nullptr;
+    if (tzdbOpenObject(space, drawing->modelSpace(), TzDb::kForWrite) != Tzad::eOk) return drawing;
+    for (int i = 0; i < count; ++i) {
+        auto entity = entityAt(i);
+        TzDbObjectId id;
+        if (space->appendTzDbEntity(id, entity.get()) == Tzad::eOk) entity.release()->close();
     }
+    space->close();
+    return drawing;
+}
+
+std::string cursorPlaces() {
+    std::string script;
+    for (int i = 1; i <= kPlaces; ++i)
+        script += "~" + std::to_string(i) + ",1\n";
+    return script + "200,1\n";
+}
+
+int dragIn(tzhost::Drawing* drawing, std::string const& script) {
+    tzhost::setWorkingDrawing(drawing);
+    tzhost::ScriptSource source(script);
+    tzhost::commandLine().setSource(&source);
+    CTzsMtextJig preview(TzGePoint3d::kOrigin);
+    CKeywordTable none;
+    CTzsJigInput input(TzEdJig::kGovernedByOrthoMode, none, &preview, TzString(L"Corner"));
+    int const status = input.Prompt();
+    tzhost::commandLine().setSource(nullptr);
+    return status;
+}
+
+void dragBox(benchmark::State& state) {
+    auto const small = drawingWith(kSmall);
+    auto const large = drawingWith(kLarge);
+    std::string const script = cursorPlaces();
+    if (dragIn(large.get(), script) != statusNormal) state.SkipWithError("the drag was refused");
+    tzbench::AgainstFloor against(state, kMost);
+    while (state.KeepRunning())
+        against.turn([&] { return dragIn(large.get(), script); },
+                     [&] { return dragIn(small.get(), script); });
     tzhost::commandLine().reset();
     tzhost::setWorkingDrawing(nullptr);
 }
-
-BENCHMARK(drag)->Arg(0)->Arg(1000)->Arg(100000)->Unit(benchmark::kMicrosecond);
+BENCHMARK(dragBox)->UseManualTime()->Unit(benchmark::kMicrosecond);
 
 }  // namespace

@@ -1,52 +1,69 @@
-// Lengths as text and back in each unit. The floor is what the C library takes for the same number;
-// five times that is the most.
+// Lengths as text and back in each unit. The floor is what the C library takes for the same number.
 #include <benchmark/benchmark.h>
 
 #include <cstdio>
 #include <cstdlib>
 
+#include "bench/support/against_floor.h"
 #include "tz/ed/units.h"
+#include "tz/rx/status.h"
 
 namespace {
 
-constexpr int kScientific = 1;
+constexpr double kMost = 5.0;
+constexpr int kCalls = 1000;
+constexpr int kPrecision = 4;
 constexpr double kStep = 0.37;
-constexpr wchar_t const* kTexts[] = {L"1.2345E+03", L"1234.5000", L"102'-10.5000\"",
-                                     L"102'-10 1/2\"", L"1234 1/2"};
 
-void writeByLibrary(benchmark::State& state) {
-    char const* const format = state.range(0) == kScientific ? "%.4E" : "%.4f";
-    char text[64];
-    double value = 0.1;
-    while (state.KeepRunning())
-        benchmark::DoNotOptimize(std::snprintf(text, sizeof text, format, value += kStep));
-}
+// The linear units from 1, with the number 1234.5 as each writes it.
+struct Unit {
+    char const* name;
+    char const* libraryFormat;
+    char const* libraryText;
+    wchar_t const* text;
+};
+constexpr Unit kUnits[] = {
+    {"scientific",    "%.4E", "1.2345E+03", L"1.2345E+03"    },
+    {"decimal",       "%.4f", "1234.5000",  L"1234.5000"     },
+    {"feetDecimals",  "%.4f", "1234.5000",  L"102'-10.5000\""},
+    {"feetFractions", "%.4f", "1234.5000",  L"102'-10 1/2\"" },
+    {"fractions",     "%.4f", "1234.5000",  L"1234 1/2"      },
+};
 
 void writeLength(benchmark::State& state) {
+    auto const unit = static_cast<int>(state.range(0));
+    Unit const& row = kUnits[unit - 1];
+    state.SetLabel(row.name);
     TzString text;
-    double value = 0.1;
+    char digits[64];
+    double ours = 0.1;
+    double theirs = 0.1;
+    tzbench::AgainstFloor against(state, kMost, kCalls);
     while (state.KeepRunning())
-        benchmark::DoNotOptimize(
-            tzdbRToS(value += kStep, static_cast<int>(state.range(0)), 4, text));
-}
-
-void readByLibrary(benchmark::State& state) {
-    char const* const text = state.range(0) == kScientific ? "1.2345E+03" : "1234.5000";
-    while (state.KeepRunning())
-        benchmark::DoNotOptimize(std::strtod(text, nullptr));
+        against.turn([&] { return tzdbRToS(ours += kStep, unit, kPrecision, text); },
+                     [&] {
+                         return std::snprintf(digits, sizeof digits, row.libraryFormat,
+                                              theirs += kStep);
+                     });
 }
 
 void readLength(benchmark::State& state) {
+    auto const unit = static_cast<int>(state.range(0));
+    Unit const& row = kUnits[unit - 1];
+    state.SetLabel(row.name);
     double value = 0;
-    while (state.KeepRunning()) {
-        benchmark::DoNotOptimize(tzdbDisToF(kTexts[state.range(0) - 1], 2, &value));
-        benchmark::DoNotOptimize(value);
-    }
+    tzbench::AgainstFloor against(state, kMost, kCalls);
+    while (state.KeepRunning())
+        against.turn(
+            [&] {
+                if (tzdbDisToF(row.text, unit, &value) != Tzad::ePromptNormal)
+                    state.SkipWithError("a length is not read");
+                return value;
+            },
+            [&] { return std::strtod(row.libraryText, nullptr); });
 }
 
-BENCHMARK(writeByLibrary)->DenseRange(1, 5);
-BENCHMARK(writeLength)->DenseRange(1, 5);
-BENCHMARK(readByLibrary)->DenseRange(1, 5);
-BENCHMARK(readLength)->DenseRange(1, 5);
+BENCHMARK(writeLength)->DenseRange(1, 5)->UseManualTime();
+BENCHMARK(readLength)->DenseRange(1, 5)->UseManualTime();
 
 }  // namespace

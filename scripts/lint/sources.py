@@ -8,8 +8,9 @@ import sys
 import tree
 
 FOLDERS = ("module/", "host/", "apps/", "tests/", "fuzz/", "bench/", "examples/")
-# Built by the rules of the programs and of the fuzzers themselves.
-EXEMPT = re.compile(r"apps/\w+/main\.cpp|fuzz/support/replay_main\.cpp")
+# Built by the rules of the programs, of the fuzzers and of the benchmarks themselves.
+EXEMPT = re.compile(
+    r"apps/\w+/main\.cpp|fuzz/support/replay_main\.cpp|bench/support/against_floor\.cpp")
 
 
 def is_built(name):

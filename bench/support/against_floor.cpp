@@ -1,0 +1,30 @@
+#include "bench/support/against_floor.h"
+
+#include <algorithm>
+
+namespace tzbench {
+
+namespace {
+
+double medianOf(std::vector<double>& values) {
+    if (values.empty()) return 0;
+    auto const middle = values.begin() + static_cast<std::ptrdiff_t>(values.size() / 2);
+    std::nth_element(values.begin(), middle, values.end());
+    return *middle;
+}
+
+}  // namespace
+
+AgainstFloor::AgainstFloor(benchmark::State& state, double bound, int calls)
+    : state_(state), bound_(bound), calls_(calls) {}
+
+AgainstFloor::~AgainstFloor() {
+    double const work = medianOf(works_) / calls_;
+    double const floor = medianOf(floors_) / calls_;
+    state_.counters["work"] = work;
+    state_.counters["floor"] = floor;
+    state_.counters["ratio"] = floor > 0 ? work / floor : 0;
+    state_.counters["bound"] = bound_;
+}
+
+}  // namespace tzbench
