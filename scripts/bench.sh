@@ -2,16 +2,14 @@
 # Builds the benchmarks in release and prints one line for each ratio with its bound; exit status 1
 # when one is over. What they measure stands in docs/benchmarks.md.
 #
-#   scripts/bench.sh [NAME...]    bench/NAME alone; all without
+#   scripts/bench.sh [NAME...]    those of add_bench(NAME ...) alone; all without
 set -euo pipefail
 root=$(cd "$(dirname "$0")/.." && pwd)
 source "$root/scripts/build.sh"
 
 names=("$@")
 if ((${#names[@]} == 0)); then
-    for list in "$root"/bench/*/CMakeLists.txt; do
-        names+=("$(basename "$(dirname "$list")")")
-    done
+    mapfile -t names < <(sed -n 's/^add_bench(\([a-z_]*\).*/\1/p' "$root"/bench/*/CMakeLists.txt)
 fi
 reports=$root/build/release/reports/bench
 for name in "${names[@]}"; do
