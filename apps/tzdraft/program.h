@@ -14,7 +14,8 @@ namespace tzdraft {
 struct Screens {
     std::function<void(std::string_view)> output;  // the transcript, UTF-8
     std::function<void(std::string_view)> errors;  // lines about what could not be done
-    std::unique_ptr<tzhost::AnswerSource> source;  // answers in place of the script; null for none
+    // Answers in place of the script; null for none.
+    std::unique_ptr<tzhost::AnswerSource> source = nullptr;
 };
 
 [[nodiscard]] int runProgram(Options const& options, Screens screens);
