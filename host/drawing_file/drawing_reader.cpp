@@ -192,7 +192,7 @@ bool DrawingReader::beginBlock(int line) {
 }
 
 bool DrawingReader::blockMember(std::string const& name, JsonValue value) {
-    blockValue_.members.emplace_back(name, std::move(value));
+    blockValue_.members.push_back({name, std::move(value)});
     return true;
 }
 

@@ -23,7 +23,7 @@ constexpr char const* kTwice = "stands twice, expected each member once";
 
 // The second value of a name that an object has twice, and that name; null when there is none.
 JsonValue const* secondOfName(JsonValue const& object, std::string& name) {
-    using Member = std::pair<std::string, JsonValue> const*;
+    using Member = JsonMember const*;
     std::vector<Member> sorted;
     sorted.reserve(object.members.size());
     for (auto const& member : object.members)
@@ -152,7 +152,7 @@ bool StreamParser::deliver(JsonValue value) {
         if (outer.kind == JsonKind::array) {
             outer.items.push_back(std::move(value));
         } else {
-            outer.members.emplace_back(key_, std::move(value));
+            outer.members.push_back({key_, std::move(value)});
         }
         return true;
     }

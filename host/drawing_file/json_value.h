@@ -2,7 +2,6 @@
 
 #include <string>
 #include <string_view>
-#include <utility>
 #include <vector>
 
 // A JSON value that knows its line, and the one form in which this host writes JSON: without
@@ -11,6 +10,8 @@ namespace tzhost::drawingfile {
 
 enum class JsonKind { null, flag, number, text, array, object };
 
+struct JsonMember;
+
 struct JsonValue {
     JsonKind kind = JsonKind::null;
     int line = 1;
@@ -18,10 +19,15 @@ struct JsonValue {
     double number = 0.0;
     std::string text;  // of a text its UTF-8, of a number its digits as they stood in the file
     std::vector<JsonValue> items;
-    std::vector<std::pair<std::string, JsonValue>> members;  // in file order, each name once
+    std::vector<JsonMember> members;  // in file order, each name once
 
     // The member of that name, or null.
     [[nodiscard]] JsonValue const* find(std::string_view name) const;
+};
+
+struct JsonMember {
+    std::string first;  // the name
+    JsonValue second;
 };
 
 // What a kind is called in a message: "a number".
