@@ -2,8 +2,13 @@
 
 #include "apps/tzconvert/batch.h"
 #include "apps/tzconvert/options.h"
+#include "tz/mte/font_catalogue.h"
 
 int main(int count, char** arguments) {
     tzconvert::ParsedOptions const parsed = tzconvert::parseOptions(count, arguments);
-    return parsed.exit ? *parsed.exit : tzconvert::run(parsed.options);
+    int const status = parsed.exit ? *parsed.exit : tzconvert::run(parsed.options);
+    // The font tables are the process's and free their entries only when they are told to.
+    CTzadFontMapDatabase::RemoveAllFileToFontMapEntries();
+    CTzadFontMapDatabase::RemoveAllFontToFileMapEntries();
+    return status;
 }
