@@ -39,10 +39,11 @@ void CFontState::appendState(CStdStrW& codes) {
     appendColor(codes);
 }
 
-// True when the closing brace says it all.
+// True when the closing brace says it all. Looks are not compared symmetrically, so a look may
+// return to the outermost one with no brace open: none is closed then.
 bool CFontState::appendBrace(CStdStrW& codes) {
     if (m_current == m_emitted) return false;
-    if (m_current == m_base) {
+    if (m_nBraceDepth > 0 && m_current == m_base) {
         codes += L'}';
         --m_nBraceDepth;
         return true;

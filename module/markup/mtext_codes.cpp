@@ -34,11 +34,11 @@ void CMTextToRichTextContext::onHeight(wchar_t const*& cursor) {
     signed char isRelative = 0;
     double const number = GetRealNumber(cursor, &isRelative, true);
     lastFactor_ = isRelative ? number : 1.0;
-    double const size = isRelative ? top().effectiveSize * number : number;
+    double const size = isRelative ? EffectiveSize() * number : number;
     int const halfPoints = MulDiv(m_pFontScale->ScaleUnitsToTwips(size), 1, kTwipsPerHalfPoint);
     updateSizes(halfPoints);
     m_nPendingFontSize = halfPoints;
-    top().effectiveSize = size;
+    SetEffectiveSize(size);
     if (m_nState == 0) flushSize();
 }
 

@@ -57,9 +57,13 @@ void CMTextToRichTextContext::onFontFile(wchar_t const*& cursor) {
     }
     if (*cursor == L';') ++cursor;
     std::wstring_view const code(start, static_cast<std::size_t>(cursor - start));
-    auto known = fontCodes_.find(code);
-    if (known == fontCodes_.end()) known = fontCodes_.emplace(code, resolveFile(fields)).first;
-    takeFont(known->second);
+    if (auto const known = fontCodes_.find(code); known != fontCodes_.end())
+        return takeFont(known->second);
+    ResolvedFont const font = resolveFile(fields);
+    takeFont(font);
+    // A file that no face was left for asks for one again each time.
+    bool const isLent = (font.incidents & kFontByProxy) != 0;
+    if (!isLent || !m_pFontMap->ProxiesExhausted()) fontCodes_.emplace(code, font);
 }
 
 // Without fields the ";" is not consumed and comes out as text, unlike that of a font file.
@@ -122,8 +126,7 @@ void CMTextToRichTextContext::takeFont(ResolvedFont const& font) {
     AppendToken(L"f", font.slot);
     AppendToken(L"b", font.bold ? 1 : 0);
     AppendToken(L"i", font.italic ? 1 : 0);
-    top().font = font.font;
-    top().pitchAndFamily = font.pitchAndFamily;
-    top().charset = font.charset;
-    fontChanged();
+    SetFont(font.font);
+    SetPitchAndFamily(font.pitchAndFamily);
+    SetCharSet(font.charset);
 }

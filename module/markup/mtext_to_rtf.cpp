@@ -37,13 +37,13 @@ void CMTextToRichTextContext::SetInitialFontName(
         m_pFontMap->MapFontToFile(type, name, bold, italic, kAnsiCharset, pitchAndFamily);
     if (type != CMTextFontMapDatabase::MapTypeSystem && !file.empty()) {
         g_sInitialFont = name;
-        top().font = names().intern(name);
-        top().pitchAndFamily = pitchAndFamily;
-        top().charset = charset;
+        SetFont(names().intern(name));
+        SetPitchAndFamily(pitchAndFamily);
+        SetCharSet(charset);
     } else {
         g_sInitialFont.setEmpty();
+        fontChanged();
     }
-    fontChanged();
     AddFont(name, charset, pitchAndFamily);
     m_bBold = bold;
     m_bItalic = italic;
@@ -56,9 +56,9 @@ void CMTextToRichTextContext::SetInitialFontFileName(wchar_t const* file) {
     Charset charset = kAnsiCharset;
     int pitch = 0;
     CStdStrW const face = m_pFontMap->MapFileToFont(type, file, bold, italic, charset, pitch);
-    top().font = names().intern(file);
-    top().pitchAndFamily = pitch;
-    top().charset = charset;
+    SetFont(names().intern(file));
+    SetPitchAndFamily(pitch);
+    SetCharSet(charset);
     g_sInitialFont = file;
     if (type == CMTextFontMapDatabase::MapTypeProxy) ReportIncident(kFontByProxy);
     SetInitialFontName(face.c_str(), bold, italic, charset, pitch);
@@ -68,7 +68,17 @@ void CMTextToRichTextContext::SetInitialFontSize(double size, int twips) {
     m_nInitialFontSize = twips / kTwipsPerHalfPoint;
     if (size == 0.0) size = kSizeInPlaceOfZero;
     m_dCurrentSize = size;
-    top().effectiveSize = size;
+    SetEffectiveSize(size);
+}
+
+void CMTextToRichTextContext::SetFont(FontName const& font) {
+    top().font = font;
+    fontChanged();
+}
+
+void CMTextToRichTextContext::SetCharSet(Charset charset) {
+    top().charset = charset;
+    fontChanged();
 }
 
 void CMTextToRichTextContext::SetInitialFontColor(unsigned int rgb) {

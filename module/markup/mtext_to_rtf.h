@@ -89,12 +89,16 @@ public:
 
     // The innermost state.
     [[nodiscard]] CStdStrW const& Font() const { return top().font.text(); }
+    void SetFont(FontName const& font);
     [[nodiscard]] Charset CharSet() const { return top().charset; }
+    void SetCharSet(Charset charset);
     [[nodiscard]] int PitchAndFamily() const { return top().pitchAndFamily; }
+    void SetPitchAndFamily(int pitchAndFamily) { top().pitchAndFamily = pitchAndFamily; }
     [[nodiscard]] double EffectiveSize() const { return top().effectiveSize; }
+    void SetEffectiveSize(double size) { top().effectiveSize = size; }
     // How many states there are.
     [[nodiscard]] int States() const { return m_nState + 1; }
-    void ResetState() { top().effectiveSize = 1.0; }
+    void ResetState() { SetEffectiveSize(1.0); }
 
 private:
     friend struct MarkupCodes;

@@ -77,4 +77,8 @@ std::wstring bodyOf(std::wstring const& document) {
     return document.substr(first, document.size() - end.size() - first);
 }
 
+std::string shown(std::wstring const& text) {
+    return TzString(text).toUtf8();
+}
+
 }  // namespace markuptest

@@ -50,11 +50,25 @@ private:
     CScaleCorrection marginScale_{0};
 };
 
+// A session with one conversion in it, which is not set up yet.
+struct RtfWriter : Session {
+    CMTextToRichTextContext context{&fonts(), &fontScale(), &marginScale()};
+};
+struct MtextWriter : Session {
+    CRichTextToMTextContext context{&fonts(), &fontScale(), &marginScale()};
+};
+
 // A context set up as a session does.
 void setUp(CMTextToRichTextContext& context);
 void setUp(CRichTextToMTextContext& context);
 
 // What stands between the head of a document, "\deftab0 " included, and the last "\par }".
 [[nodiscard]] std::wstring bodyOf(std::wstring const& document);
+
+// A text as a failed row prints it.
+[[nodiscard]] std::string shown(std::wstring const& text);
+
+// Names a test by its row.
+inline constexpr auto kRowName = [](auto const& row) { return row.param.name; };
 
 }  // namespace markuptest

@@ -13,6 +13,7 @@
 namespace {
 
 namespace fs = std::filesystem;
+using markuptest::shown;
 
 std::wstring contentsOf(fs::path const& file) {
     std::ostringstream bytes;
@@ -54,8 +55,7 @@ TEST(Documents, OfOtherProgramsKeepTheirText) {
         markuptest::Session session;
         std::wstring const markup = session.toMtext(contentsOf(entry.path()));
         fs::path const expected = fs::path(entry.path()).replace_extension(".txt");
-        EXPECT_EQ(TzString(visibleText(markup)).toUtf8(), TzString(contentsOf(expected)).toUtf8())
-            << entry.path();
+        EXPECT_EQ(shown(visibleText(markup)), shown(contentsOf(expected))) << entry.path();
         EXPECT_EQ(std::count(markup.begin(), markup.end(), L'{') -
                       std::count(markup.begin(), markup.end(), L'}'),
                   0)

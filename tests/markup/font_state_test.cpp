@@ -84,9 +84,29 @@ TEST_F(FontState, NamesFacesAndFiles) {
     EXPECT_EQ(emitted(), L"\\fPlotter|b0|i0|c0|p49;");  // no file has that set
     state.SetFontName(L"PAIRED");
     EXPECT_EQ(emitted(), L"\\F|c1;");  // no pair is lent yet; the file form keeps the set 1
+    fonts.AddFontSubstitute(L"folder\\", L"Nameless", false, false, kAnsiCharset, 49,
+                            CMTextFontMapDatabase::MapTypeMisc, 0);
+    state.SetFontName(L"Nameless");
+    state.SetCharSet(kAnsiCharset);
+    EXPECT_EQ(emitted(), L"\\fNameless|b0|i0|c0|p49;");  // mapped, but to no file
     SystemPage const chinese(L"ANSI_936");
     state.SetFontName(L"Other");
+    state.SetCharSet(kDefaultCharset);
     EXPECT_EQ(emitted(), L"\\fOther|b0|i0|c134|p49;");
+}
+
+// The first two steps count as the style's own font, the third counts as that font alone.
+TEST_F(FontState, ClosesNoBraceThatIsNotOpen) {
+    SystemPage const chinese(L"ANSI_936");
+    state.InitializeFontName(L"Base", false, false, kGb2312Charset, 34);
+    state.SetFontName(L"BASE");
+    state.SetCharSet(kAnsiCharset);
+    EXPECT_EQ(emitted(), L"");
+    state.SetCharSet(kGb2312Charset);
+    EXPECT_EQ(emitted(), L"");
+    state.SetCharSet(kAnsiCharset);
+    EXPECT_EQ(emitted(), L"{\\fBASE|b0|i0|c0|p34;");  // was "}", and then a length error
+    EXPECT_EQ(state.EmitTerminatingStateInMText(), L"}");
 }
 
 TEST_F(FontState, GivesALookBack) {
@@ -135,13 +155,32 @@ TEST_F(FontState, TellsTypefacesApart) {
         EXPECT_EQ(one.IsSameTypeface(other), row.isSame) << row.name;
         EXPECT_EQ(one == other, row.isSame) << row.name;
     }
-    CFontAttributes bold;
-    bold.m_bBold = true;
-    EXPECT_FALSE(bold.IsSameTypeface(CFontAttributes()));
-    CFontAttributes colored;
-    colored.m_nRGB = 0;
-    colored.m_eBaseAlignment = kAlignTop;
-    EXPECT_TRUE(colored == CFontAttributes());
+}
+
+TEST(Looks, DifferByAllButTrueColorAndAlignment) {
+    struct Row {
+        char const* name;
+        void (*change)(CFontAttributes&);
+        bool isSameTypeface;
+        bool isEqual;
+    };
+    constexpr Row kRows[] = {
+        {"Pitch",      [](CFontAttributes& look) { look.m_nPitchAndFamily = 1; },        false, false},
+        {"Bold",       [](CFontAttributes& look) { look.m_bBold = true; },               false, false},
+        {"Italic",     [](CFontAttributes& look) { look.m_bItalic = true; },             false, false},
+        {"Underline",  [](CFontAttributes& look) { look.m_bUnderline = true; },          true,  false},
+        {"Strike",     [](CFontAttributes& look) { look.m_bStrikethrough = true; },      true,  false},
+        {"ColorIndex", [](CFontAttributes& look) { look.m_nColorIndex = 1; },            true,  false},
+        {"Size",       [](CFontAttributes& look) { look.m_dSize = 1e-300; },             true,  false},
+        {"TrueColor",  [](CFontAttributes& look) { look.m_nRGB = 0; },                   true,  true },
+        {"Alignment",  [](CFontAttributes& look) { look.m_eBaseAlignment = kAlignTop; }, true,  true },
+    };
+    for (Row const& row : kRows) {
+        CFontAttributes look;
+        row.change(look);
+        EXPECT_EQ(look.IsSameTypeface(CFontAttributes()), row.isSameTypeface) << row.name;
+        EXPECT_EQ(look == CFontAttributes(), row.isEqual) << row.name;
+    }
 }
 
 }  // namespace

@@ -10,6 +10,7 @@
 
 namespace {
 
+using markuptest::kRowName;
 using markuptest::Session;
 
 struct HostileCase {
@@ -98,9 +99,8 @@ TEST_P(HostileMarkup, IsReadToItsEnd) {
     EXPECT_LE(session.toRtf(text).size(), most);
 }
 
-constexpr auto kName = [](auto const& row) { return row.param.name; };
-INSTANTIATE_TEST_SUITE_P(Texts, HostileRtf, testing::ValuesIn(kRtf), kName);
-INSTANTIATE_TEST_SUITE_P(Texts, HostileMarkup, testing::ValuesIn(kMarkup), kName);
+INSTANTIATE_TEST_SUITE_P(Texts, HostileRtf, testing::ValuesIn(kRtf), kRowName);
+INSTANTIATE_TEST_SUITE_P(Texts, HostileMarkup, testing::ValuesIn(kMarkup), kRowName);
 
 // Each toggle compares and keeps names, whose length must not count.
 TEST(LongNames, CostOnceEach) {

@@ -7,7 +7,10 @@
 namespace {
 
 using markuptest::bodyOf;
+using markuptest::kRowName;
+using markuptest::RtfWriter;
 using markuptest::Session;
+using markuptest::shown;
 
 struct MarkupCase {
     char const* name;
@@ -48,6 +51,7 @@ constexpr MarkupCase kCharacters[] = {
     {"Paragraph",        L"a\\Pb",            L"a\\par b",                  0           },
     {"Underline",        L"\\La\\l",          L"\\ul a\\ul0 ",              0           },
     {"Overline",         L"\\Oa\\o",          L"\\strike a\\strike0 ",      0           },
+    {"UnknownAboveBits", L"\\\U00010041",     L"\\\\\U00010041",            kUnknownCode},
 };
 
 constexpr MarkupCase kLooks[] = {
@@ -66,6 +70,8 @@ constexpr MarkupCase kLooks[] = {
     {"HeightForEscape",  L"{\\H0.4;\\\\}",                     L"{\\fs56 \\\\}",                                 0               },
     {"HeightForUnicode", L"{\\H0.4;\\U+0041}",                 L"{\\fs56 \\u65?}",                               0               },
     {"HeightForUnknown", L"{\\H0.4;\\K}",                      L"{\\fs56 \\\\K}",                                kUnknownCode    },
+    {"HeightForBytes",   L"{\\H0.4;\\M+182A0}",                L"{\\fs56 \\\\M+182A0}",                          0               },
+    {"HeightWaits",      L"{\\H0.4;\\P\\C0;a}",                L"{\\par \\cf1 \\fs56 a}",                        0               },
     {"HeightForBrace",   L"{\\H0.4;}a",                        L"{\\fs56 }a",                                    0               },
     {"HeightForFeed",    L"{\\H0.4;\n}",                       L"{\\fs56 \\line }",                              0               },
     {"HeightOfAState",   L"{\\H2x;a}\\H2x;b",                  L"{\\fs56 a}\\fs56 b",                            0               },
@@ -79,10 +85,17 @@ constexpr MarkupCase kLooks[] = {
     {"FaceCutOff",       L"\\fA|b1",                           L"\\f1 \\b1 \\i0 ",                               kFaceWithoutFile},
     {"FaceTwice",        L"\\fA|c1;\\fa|c1;\\fA|c2;",          L"\\f1 \\b0 \\i0 \\f1 \\b0 \\i0 \\f2 \\b0 \\i0 ",
      kFaceWithoutFile                                                                                                            },
+    {"FaceOfTheMachine", L"\\fLiberation Sans|c204|p34;x",     L"\\f0 \\b0 \\i0 x",                              0               },
+    {"FaceDigits",       L"\\fA|c1;\\fA|c00000000000000010;",  L"\\f1 \\b0 \\i0 \\f1 \\b0 \\i0 ",
+     kFaceWithoutFile                                                                                                            },
     {"FaceMapped",       L"\\fPlotter|b0|i0|c0|p49;x",         L"\\f1 \\b0 \\i0 x",                              0               },
     {"File",             L"\\Fromans;x\\FROMANS.SHX|c0;y",     L"\\f1 \\b0 \\i0 x\\f2 \\b0 \\i0 y",              0               },
     {"FileFolder",       L"\\Fc:\\fonts\\slanted.shx;x",       L"\\f1 \\b1 \\i1 x",                              0               },
     {"FileLent",         L"\\Fnone;x",                         L"\\f1 \\b0 \\i0 x",                              kFontByProxy    },
+    {"FileLentAgain",    L"\\Fn|c0;\\Fo;\\Fn;",                L"\\f1 \\b0 \\i0 \\f2 \\b0 \\i0 \\f1 \\b0 \\i0 ",
+     kFontByProxy                                                                                                                },
+    {"FileBehindTheGap", L"\\Fn;\\Fo;\\Fp;\\Fp;",
+     L"\\f1 \\b0 \\i0 \\f2 \\b0 \\i0 \\f3 \\b0 \\i0 \\f4 \\b0 \\i0 ",                                            kFontByProxy    },
     {"FilePair",         L"\\Ftxt,big;x",                      L"\\f1 \\b0 \\i0 x",                              kFontByProxy    },
     {"FileOdd",          L"\\Ftxt|xc204y;z",                   L"\\f1 \\b0 \\i0 z",                              0               },
     {"FileCutOff",       L"a\\Ftxt",                           L"a\\f1 \\b0 \\i0 ",                              0               },
@@ -98,6 +111,7 @@ constexpr MarkupCase kParagraphs[] = {
     {"TabsSame",         L"\\pt4;\\pt4;x", L"\\pard \\fi0 \\li0 \\tx4032 x",                        0},
     {"TabsCleared",      L"\\pt4;\\ptz;x", L"\\pard \\fi0 \\li0 \\tx4032 \\pard \\fi0 \\li0 x",     0},
     {"TabsClearedEmpty", L"\\pt4;\\pt;x",  L"\\pard \\fi0 \\li0 \\tx4032 \\pard \\fi0 \\li0 x",     0},
+    {"TabsClearedFirst", L"\\ptz,i2;x",    L",i2;x",                                                0},
     {"TabsNone",         L"\\ptz;x",       L"x",                                                    0},
     {"TabsBelowOne",     L"\\pt0,-3,1;x",  L"\\pard \\fi0 \\li0 \\tx1008 x",                        0},
     {"TabsThenIndent",   L"\\pt1,i2;x",    L"\\pard \\fi2016 \\li0 \\tx1008 x",                     0},
@@ -143,23 +157,21 @@ constexpr MarkupCase kStacks[] = {
 class Markup : public testing::TestWithParam<MarkupCase> {};
 
 TEST_P(Markup, IsWrittenAs) {
-    Session session;
-    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
+    RtfWriter writer;
+    CMTextToRichTextContext& context = writer.context;
     markuptest::setUp(context);
-    EXPECT_EQ(TzString(bodyOf(context.Parse(GetParam().markup))).toUtf8(),
-              TzString(GetParam().body).toUtf8());
+    EXPECT_EQ(shown(bodyOf(context.Parse(GetParam().markup))), shown(GetParam().body));
     EXPECT_EQ(context.GetIncidents(), GetParam().incidents);
 }
 
-constexpr auto kName = [](auto const& row) { return row.param.name; };
-INSTANTIATE_TEST_SUITE_P(Characters, Markup, testing::ValuesIn(kCharacters), kName);
-INSTANTIATE_TEST_SUITE_P(Looks, Markup, testing::ValuesIn(kLooks), kName);
-INSTANTIATE_TEST_SUITE_P(Paragraphs, Markup, testing::ValuesIn(kParagraphs), kName);
-INSTANTIATE_TEST_SUITE_P(Stacks, Markup, testing::ValuesIn(kStacks), kName);
+INSTANTIATE_TEST_SUITE_P(Characters, Markup, testing::ValuesIn(kCharacters), kRowName);
+INSTANTIATE_TEST_SUITE_P(Looks, Markup, testing::ValuesIn(kLooks), kRowName);
+INSTANTIATE_TEST_SUITE_P(Paragraphs, Markup, testing::ValuesIn(kParagraphs), kRowName);
+INSTANTIATE_TEST_SUITE_P(Stacks, Markup, testing::ValuesIn(kStacks), kRowName);
 
 TEST(Document, HasItsTablesAndHead) {
     Session session;
-    EXPECT_EQ(TzString(session.toRtf(L"{\\C1;\\Fslanted|c2;\u00E9}")).toUtf8(),
+    EXPECT_EQ(shown(session.toRtf(L"{\\C1;\\Fslanted|c2;\u00E9}")),
               "{\\rtf1\\ansi{\\fonttbl{\\f0\\fswiss\\fprq2\\fcharset0 Liberation Sans;}"
               "{\\f1\\froman\\fprq2\\fcharset2 Slanted;}}\r\n"
               "{\\colortbl\\red255\\green255\\blue255;\\red255\\green0\\blue0;}\r\n"
@@ -167,19 +179,20 @@ TEST(Document, HasItsTablesAndHead) {
 }
 
 TEST(Document, BeginsWithTheInitialFont) {
-    Session session;
-    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
+    RtfWriter writer;
+    CMTextToRichTextContext& context = writer.context;
     context.SetInitialFontFileName(L"slanted");
     context.SetInitialFontSize(0.0, 319);
     context.SetInitialFontColor(0);
     EXPECT_EQ(context.EffectiveSize(), 2.0);
-    EXPECT_EQ(TzString(context.Parse(L"x")).toUtf8(),
+    EXPECT_EQ(shown(context.Parse(L"x")),
               "{\\rtf1\\ansi{\\fonttbl{\\f0\\froman\\fprq2\\fcharset0 Slanted;}}\r\n"
               "{\\colortbl\\red0\\green0\\blue0;}\r\n"
               "\\pard\\plain\\f0\\cf0\\fs31\\b\\i \\deftab0 x\\par }");
     EXPECT_STREQ(context.Font().c_str(), L"Slanted");  // the face, once it has a file
     EXPECT_EQ(context.PitchAndFamily(), 18);
-    CMTextToRichTextContext lent(&session.fonts(), &session.fontScale(), &session.marginScale());
+    RtfWriter other;
+    CMTextToRichTextContext& lent = other.context;
     lent.SetInitialFontFileName(L"none");
     EXPECT_TRUE(lent.IsIncident(kFontByProxy));
     EXPECT_STREQ(lent.Font().c_str(), L"Lent One");
@@ -207,9 +220,8 @@ constexpr WholeTextCase kWholeTexts[] = {
 
 TEST(WholeTextValues, CountOnce) {
     for (WholeTextCase const& row : kWholeTexts) {
-        Session session;
-        CMTextToRichTextContext context(&session.fonts(), &session.fontScale(),
-                                        &session.marginScale());
+        RtfWriter writer;
+        CMTextToRichTextContext& context = writer.context;
         markuptest::setUp(context);
         (void)context.Parse(row.markup);
         EXPECT_EQ(context.GetTracking(), row.tracking) << row.name;
@@ -231,9 +243,8 @@ TEST(Sizes, AreTracked) {
         {L"{\\H.4;}a",     320, 32, 56, 28, 56},
     };
     for (Row const& row : kRows) {
-        Session session;
-        CMTextToRichTextContext context(&session.fonts(), &session.fontScale(),
-                                        &session.marginScale());
+        RtfWriter writer;
+        CMTextToRichTextContext& context = writer.context;
         context.SetInitialFontSize(0.2, row.twips);
         (void)context.Parse(row.markup);
         EXPECT_EQ(context.GetInitialFontSize(), row.initial) << row.markup;
@@ -244,14 +255,14 @@ TEST(Sizes, AreTracked) {
 }
 
 TEST(States, AreThirtyTwoAtMost) {
-    Session session;
-    CMTextToRichTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
+    RtfWriter writer;
+    CMTextToRichTextContext& context = writer.context;
     markuptest::setUp(context);
     // 33 groups open, 31 of them push; after 31 braces the outermost state is in force, so that the
     // height of the 32nd is written at once.
     std::wstring const text =
         std::wstring(33, L'{') + std::wstring(31, L'}') + L"\\H.4;" + std::wstring(2, L'}');
-    EXPECT_EQ(TzString(bodyOf(context.Parse(text.c_str()))).toUtf8(),
+    EXPECT_EQ(shown(bodyOf(context.Parse(text.c_str()))),
               std::string(33, '{') + std::string(31, '}') + "\\fs56 }}");
     EXPECT_EQ(context.States(), 1);
     context.ResetState();
@@ -269,7 +280,7 @@ TEST(Tabs, KeepTheFirstThirtyTwo) {
         markup += std::to_wstring(i) + (i > 1 ? L"," : L";");
     for (int i = 9; i <= 40; ++i)
         body += "\\tx" + std::to_string(scale.ScaleUnitsToTwips(i * 0.72)) + " ";
-    EXPECT_EQ(TzString(bodyOf(session.toRtf(markup))).toUtf8(), body);
+    EXPECT_EQ(shown(bodyOf(session.toRtf(markup))), body);
 }
 
 TEST(Text, EndsAtAZeroCharacter) {
@@ -278,13 +289,12 @@ TEST(Text, EndsAtAZeroCharacter) {
 }
 
 TEST(Alignment, OfTheSystemIsKeptByAnEmptyTextAlone) {
-    Session session;
-    CMTextToRichTextContext empty(&session.fonts(), &session.fontScale(), &session.marginScale());
-    (void)empty.Parse(L"");
-    EXPECT_EQ(empty.GetBaseAlignment(), kAlignMiddle);
-    CMTextToRichTextContext full(&session.fonts(), &session.fontScale(), &session.marginScale());
-    (void)full.Parse(L"x");
-    EXPECT_EQ(full.GetBaseAlignment(), kAlignBottom);
+    RtfWriter empty;
+    (void)empty.context.Parse(L"");
+    EXPECT_EQ(empty.context.GetBaseAlignment(), kAlignMiddle);
+    RtfWriter full;
+    (void)full.context.Parse(L"x");
+    EXPECT_EQ(full.context.GetBaseAlignment(), kAlignBottom);
 }
 
 }  // namespace

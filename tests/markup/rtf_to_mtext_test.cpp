@@ -7,7 +7,10 @@
 
 namespace {
 
+using markuptest::kRowName;
+using markuptest::MtextWriter;
 using markuptest::Session;
+using markuptest::shown;
 
 struct WordCase {
     wchar_t const* text;  // behind the backslash
@@ -251,21 +254,20 @@ TEST_P(Rtf, IsReadAs) {
     std::wstring text = session.toMtext(GetParam().rtf);
     std::wstring const expected = GetParam().markup;
     if (text.size() == expected.size() + 1 && text.back() == L'}') text.pop_back();
-    EXPECT_EQ(TzString(text).toUtf8(), TzString(expected).toUtf8());
+    EXPECT_EQ(shown(text), shown(expected));
 }
 
-constexpr auto kName = [](auto const& row) { return row.param.name; };
-INSTANTIATE_TEST_SUITE_P(Text, Rtf, testing::ValuesIn(kText), kName);
-INSTANTIATE_TEST_SUITE_P(Groups, Rtf, testing::ValuesIn(kGroups), kName);
-INSTANTIATE_TEST_SUITE_P(Looks, Rtf, testing::ValuesIn(kLooks), kName);
-INSTANTIATE_TEST_SUITE_P(Fonts, Rtf, testing::ValuesIn(kFonts), kName);
-INSTANTIATE_TEST_SUITE_P(Paragraphs, Rtf, testing::ValuesIn(kParagraphs), kName);
-INSTANTIATE_TEST_SUITE_P(Stacks, Rtf, testing::ValuesIn(kStacks), kName);
-INSTANTIATE_TEST_SUITE_P(Lists, Rtf, testing::ValuesIn(kLists), kName);
+INSTANTIATE_TEST_SUITE_P(Text, Rtf, testing::ValuesIn(kText), kRowName);
+INSTANTIATE_TEST_SUITE_P(Groups, Rtf, testing::ValuesIn(kGroups), kRowName);
+INSTANTIATE_TEST_SUITE_P(Looks, Rtf, testing::ValuesIn(kLooks), kRowName);
+INSTANTIATE_TEST_SUITE_P(Fonts, Rtf, testing::ValuesIn(kFonts), kRowName);
+INSTANTIATE_TEST_SUITE_P(Paragraphs, Rtf, testing::ValuesIn(kParagraphs), kRowName);
+INSTANTIATE_TEST_SUITE_P(Stacks, Rtf, testing::ValuesIn(kStacks), kRowName);
+INSTANTIATE_TEST_SUITE_P(Lists, Rtf, testing::ValuesIn(kLists), kRowName);
 
 TEST(Defaults, StandAheadOfTheText) {
-    Session session;
-    CRichTextToMTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
+    MtextWriter writer;
+    CRichTextToMTextContext& context = writer.context;
     markuptest::setUp(context);
     context.SetTracking(1.5);
     context.SetCharWidth(0.8);
@@ -274,7 +276,8 @@ TEST(Defaults, StandAheadOfTheText) {
     context.SetOptions(CRichTextToMTextContext::kKeepTrailingParagraphs);
     EXPECT_STREQ(context.Parse(L"{\\rtf1\\ul\\\\S\\par\\par}").c_str(),
                  L"\\T1.5;\\W0.8;\\Q-15;\\A1;{\\L\\\\S}");
-    CRichTextToMTextContext kept(&session.fonts(), &session.fontScale(), &session.marginScale());
+    MtextWriter other;
+    CRichTextToMTextContext& kept = other.context;
     markuptest::setUp(kept);
     kept.SetBaseAlignment(kAlignMiddle, 0);
     kept.SetOptions(CRichTextToMTextContext::kKeepTrailingParagraphs);
@@ -283,15 +286,14 @@ TEST(Defaults, StandAheadOfTheText) {
 
 TEST(Replacements, ComeFromTheResources) {
     Session session;
-    EXPECT_EQ(TzString(session.toMtext(L"a\\emdash b\\endash c\\lquote d\\rquote "
-                                       L"e\\ldblquote f\\rdblquote"))
-                  .toUtf8(),
+    EXPECT_EQ(shown(session.toMtext(L"a\\emdash b\\endash c\\lquote d\\rquote "
+                                    L"e\\ldblquote f\\rdblquote")),
               "a\u2014b\u2013c\u2018d\u2019e\u201Cf\u201D");
 }
 
 TEST(InitialFont, MayBeAFile) {
-    Session session;
-    CRichTextToMTextContext context(&session.fonts(), &session.fontScale(), &session.marginScale());
+    MtextWriter writer;
+    CRichTextToMTextContext& context = writer.context;
     context.SetInitialFontFileName(L"slanted");
     EXPECT_STREQ(context.Parse(L"a\\b0 b\\i0\\f7 c").c_str(), L"a{\\fSlanted|b0|i1|c0|p18;b}c");
 }
