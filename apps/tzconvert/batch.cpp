@@ -2,7 +2,9 @@
 
 #include <cstdio>
 #include <filesystem>
+#include <new>
 #include <set>
+#include <stdexcept>
 
 #include "apps/tzconvert/conversion.h"
 #include "apps/tzconvert/report.h"
@@ -49,6 +51,21 @@ public:
     explicit Batch(Options const& options) : options_(options) {}
 
     [[nodiscard]] Failure convertFile(std::string const& file) {
+        try {
+            return convertUnguarded(file);
+        } catch (std::bad_alloc const&) {
+        } catch (std::length_error const&) {
+        }
+        return (file == "-" ? "standard input" : file) + ": memory cannot hold its conversion";
+    }
+
+    [[nodiscard]] Failure writeReport() const {
+        if (options_.report.empty() || (reports_.empty() && options_.outputDir.empty())) return {};
+        return writeBytes(options_.report, reportText(options_, reports_));
+    }
+
+private:
+    [[nodiscard]] Failure convertUnguarded(std::string const& file) {
         std::string target = options_.output;
         if (!options_.outputDir.empty()) {
             target = targetOf(options_, file).string();
@@ -62,12 +79,6 @@ public:
         return {};
     }
 
-    [[nodiscard]] Failure writeReport() const {
-        if (options_.report.empty() || (reports_.empty() && options_.outputDir.empty())) return {};
-        return writeBytes(options_.report, reportText(options_, reports_));
-    }
-
-private:
     // A result takes the place of no input and of no other result.
     [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) {
         std::error_code missing;

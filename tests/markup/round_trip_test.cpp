@@ -71,7 +71,7 @@ constexpr TripCase kTrips[] = {
     {"Fields",                           L"%<\\\\Date>% \\U+0025<",    L"%<\\\\Date>% \\U+0025<"},
 };
 
-constexpr std::size_t kLongestMarker = 8;  // what a trip puts behind a stack's "\\S": <2,100>
+constexpr std::size_t kLongestMarker = 7;  // what a trip puts behind a stack's "\\S": <2,100>
 
 // The first two trips are as expected, and each of a few more adds at most a marker a stack.
 void expectTrips(std::wstring const& markup,

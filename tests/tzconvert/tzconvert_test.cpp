@@ -32,10 +32,11 @@ struct Outcome {
     std::string err;
 };
 
-Outcome run(std::string const& arguments, std::string const& input) {
+// Behind `first`, which may limit what the program gets.
+Outcome run(std::string const& arguments, std::string const& input, std::string const& first = "") {
     write("in", input);
-    std::string const command = std::string("'") + std::getenv("TZ_TEST_BIN") + "/tzconvert' " +
-                                arguments + " <in >out 2>err";
+    std::string const command =
+        first + "'" + std::getenv("TZ_TEST_BIN") + "/tzconvert' " + arguments + " <in >out 2>err";
     int const status = std::system(command.c_str());
     return {WEXITSTATUS(status), contentsOf("out"), contentsOf("err")};
 }
@@ -67,12 +68,18 @@ constexpr RunCase kRuns[] = {
      "{\\colortbl\\red255\\green0\\blue0;\\red254\\green0\\blue0;}\\cf0 a\\cf1 b"sv,                                    0,
      "{\\C256;a\\C0;b}",                                                                                                                                   ""                                 },
     {"CodePage",       "to-mtext --code-page 1251",                                               "\\'c0"sv,            0, "\xD0\x90",                     ""                                 },
+    {"SystemSet",      "to-mtext --code-page 936 --font Base --charset 134",
+     "{\\fonttbl{\\f0\\fcharset0 BASE;}{\\f1\\fcharset134 BASE;}}\\f0 a\\f1 b\\f0 c"sv,                                 0,
+     "ab{\\fBASE|b0|i0|c0|p0;c}",                                                                                                                          ""                                 },
     {"Dash",           "to-mtext -",                                                              "a"sv,                0, "a",                            ""                                 },
     {"Empty",          "to-mtext",                                                                ""sv,                 0, "",                             ""                                 },
     {"NotUtf8",        "to-rtf",                                                                  "ab\xE9x"sv,          2, "",                             "standard input: byte 2: not UTF-8"},
     {"CutOffUtf8",     "round-trip",                                                              "ab\xE4\xB8"sv,       2, "",                             "byte 2: not UTF-8"                },
     {"ZeroCharacter",  "to-mtext",                                                                "a\0b"sv,             2, "",                             "byte 1: a zero character"         },
     {"NoFile",         "to-rtf none.txt",                                                         ""sv,                 2, "",                             "none.txt: cannot be read"         },
+    {"FolderAsFile",   "to-rtf .",                                                                ""sv,                 2, "",                             ".: cannot be read"                },
+    {"FolderAsMap",    "to-rtf --font-map .",                                                     "a"sv,                2, "",                             ".: cannot be read"                },
+    {"NoSuchPage",     "to-rtf --code-page 0",                                                    "a"sv,                2, "",                             "--code-page"                      },
     {"NoFontMap",      "to-rtf --font-map none.ini",                                              "a"sv,                2, "",                             "none.ini: cannot be read"         },
     {"NoFolder",       "to-rtf --output none/x.rtf",                                              "a"sv,                2, "",                             "none/x.rtf: cannot be written"    },
     {"NoCommand",      "",                                                                        ""sv,                 2, "",                             "--help"                           },
@@ -128,6 +135,22 @@ TEST(Files, OfABatchAreConvertedThoughOneFails) {
     std::string const report = contentsOf("batch.json");
     EXPECT_NE(report.find("\"file\": \"two.txt\""), std::string::npos) << report;
     EXPECT_EQ(report.find("bad.txt"), std::string::npos) << report;
+}
+
+TEST(Files, ThatMemoryCannotHoldAreNamed) {
+#ifdef __SANITIZE_ADDRESS__
+    GTEST_SKIP() << "the sanitizer needs the memory that is left out here";
+#endif
+    fs::create_directories("batch");
+    write("big.txt", std::string(30000000, 'a'));
+    write("one.txt", "1");
+    Outcome const result =
+        run("to-mtext --output-dir batch big.txt one.txt", "", "ulimit -v 200000; ");
+    EXPECT_EQ(result.status, 2);
+    EXPECT_EQ(result.err, "tzconvert: big.txt: memory cannot hold its conversion\n");
+    fs::remove("big.txt");
+    EXPECT_FALSE(fs::exists("batch/big.mtext"));
+    EXPECT_EQ(contentsOf("batch/one.mtext"), "1");
 }
 
 TEST(Files, DoNotOverwriteTheirInput) {
