@@ -1,31 +1,41 @@
 #include "apps/tzconvert/streams.h"
 
-#include <array>
+#include <algorithm>
 #include <cstdio>
 
 #include "apps/tzconvert/text_codec.h"
 #include "host/base/file_bytes.h"
+#include "host/base/file_reader.h"
 
 namespace tzconvert {
 namespace {
 
 constexpr std::size_t kPiece = 1 << 16;
 
-std::optional<std::string> readStandardInput() {
-    std::string bytes;
-    std::size_t read = 0;
-    do {
-        std::size_t const start = bytes.size();
-        bytes.resize(start + kPiece);
-        read = std::fread(bytes.data() + start, 1, kPiece, stdin);
-        bytes.resize(start + read);
-    } while (read == kPiece);
-    if (std::ferror(stdin)) return {};
-    return bytes;
-}
-
 std::string shownName(std::string const& file) {
     return file == "-" ? "standard input" : file;
+}
+
+std::string faultAt(std::size_t offset, char const* reason) {
+    return "byte " + std::to_string(offset) + ": " + reason;
+}
+
+// What is wrong with what the reader gives, if anything. The bytes are never there as a whole.
+Failure decodeAll(tzhost::FileReader& reader, std::wstring& text) {
+    std::string piece(kPiece, '\0');
+    text.reserve(reader.expectedSize());
+    std::size_t kept = 0;  // bytes of a character that the last piece cut in two
+    std::size_t offset = 0;
+    while (std::size_t const count = reader.read(piece.data() + kept, kPiece - kept)) {
+        std::string_view const bytes(piece.data(), kept + count);
+        Decoded const decoded = decodeText(bytes, text);
+        offset += decoded.size;
+        if (decoded.fault) return faultAt(offset, decoded.fault);
+        kept = bytes.size() - decoded.size;
+        std::copy(bytes.end() - static_cast<std::ptrdiff_t>(kept), bytes.end(), piece.begin());
+    }
+    if (reader.hasFailed()) return "cannot be read: " + tzhost::systemReason();
+    return kept > 0 ? Failure(faultAt(offset, "not UTF-8")) : Failure();
 }
 
 Failure writeStandardOutput(std::string_view bytes) {
@@ -39,11 +49,15 @@ Failure writeStandardOutput(std::string_view bytes) {
 }  // namespace
 
 Failure readText(std::string const& file, std::wstring& text) {
-    std::optional<std::string> const bytes =
-        file == "-" ? readStandardInput() : tzhost::readFile(file);
-    if (!bytes) return shownName(file) + ": cannot be read: " + tzhost::systemReason();
-    if (std::optional<BadByte> const bad = decodeText(*bytes, text))
-        return shownName(file) + ": byte " + std::to_string(bad->offset) + ": " + bad->reason;
+    Failure fault;
+    if (file == "-") {
+        tzhost::FileReader standardInput;
+        fault = decodeAll(standardInput, text);
+    } else {
+        tzhost::FileReader reader(file);
+        fault = decodeAll(reader, text);
+    }
+    if (fault) return shownName(file) + ": " + *fault;
     return {};
 }
 
@@ -58,7 +72,7 @@ Failure writeText(std::string const& file, std::wstring_view text) {
     while (!text.empty()) {
         bytes.clear();
         encodeText(text.substr(0, kPiece), bytes);
-        text.remove_prefix(text.size() < kPiece ? text.size() : kPiece);
+        text.remove_prefix(std::min(text.size(), kPiece));
         if (Failure const failure = writeStandardOutput(bytes)) return failure;
     }
     return {};

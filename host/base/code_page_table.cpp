@@ -76,7 +76,8 @@ constexpr int kLastIsoPage = 28606;
 }  // namespace
 
 int systemCodePage() {
-    std::wstring const name = Variables::instance().text(L"SYSCODEPAGE");
+    // Asked at every change of a font, so its text is not copied.
+    auto const& name = std::get<std::wstring>(*Variables::instance().get(L"SYSCODEPAGE"));
     std::size_t const underscore = name.rfind(L'_');
     int page = 0;
     for (std::size_t i = underscore == name.npos ? 0 : underscore + 1; i < name.size(); ++i) {

@@ -8,11 +8,11 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include "host/base/file_reader.h"
+
 namespace tzhost {
 
 namespace {
-
-constexpr off_t kLargestFile = off_t{1} << 30;
 
 // An open file, closed on every way out.
 class Descriptor {
@@ -67,21 +67,15 @@ void flushFolder(std::string const& target) {
 }  // namespace
 
 std::optional<std::string> readFile(std::string const& path) {
-    Descriptor const file(::open(path.c_str(), O_RDONLY | O_CLOEXEC));
-    if (!file.isOpen()) return std::nullopt;
+    constexpr std::size_t kPiece = 1 << 16;
+    FileReader reader(path);
     std::string bytes;
-    for (;;) {
-        constexpr std::size_t kStep = 1 << 16;
+    for (std::size_t room = reader.expectedSize() + 1;; room = kPiece) {
         std::size_t const before = bytes.size();
-        bytes.resize(before + kStep);
-        ssize_t const count = ::read(file.number(), bytes.data() + before, kStep);
-        if (count < 0 && errno != EINTR) return std::nullopt;
-        bytes.resize(before + static_cast<std::size_t>(count < 0 ? 0 : count));
-        if (count == 0) return bytes;
-        if (static_cast<off_t>(bytes.size()) > kLargestFile) {
-            errno = EFBIG;
-            return std::nullopt;
-        }
+        bytes.resize(before + room);
+        bytes.resize(before + reader.read(bytes.data() + before, room));
+        if (reader.hasFailed()) return std::nullopt;
+        if (bytes.size() < before + room) return bytes;
     }
 }
 

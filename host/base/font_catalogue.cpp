@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstdlib>
 #include <tuple>
+#include <unordered_map>
 
 #include "host/base/ini_data.h"
 #include "host/base/utf8.h"
@@ -128,14 +129,22 @@ void FontCatalogue::add(FcPattern* pattern) {
 // the face and back ends at the same file: a condensed cut may also stand under its family's plain
 // name.
 void FontCatalogue::nameForms() {
-    for (FontForm& form : forms_) {
-        for (auto const& [key, row] : byName_) {
-            if (lowered(row.english) != key) continue;
-            if (std::find(row.forms.begin(), row.forms.end(), &form) == row.forms.end()) continue;
-            bool const leadsBack = &row.nearest(form.isBold(), form.isItalic()) == &form;
-            if (form.english.empty() || leadsBack) form.english = row.english;
-            if (leadsBack) break;
+    struct Name {
+        std::wstring const* english = nullptr;
+        bool leadsBack = false;
+    };
+    std::unordered_map<FontForm const*, Name> names;
+    for (FontFamilyRow const* const row : families()) {
+        for (FontForm const* const form : row->forms) {
+            Name& name = names[form];
+            if (name.leadsBack) continue;
+            name.leadsBack = &row->nearest(form->isBold(), form->isItalic()) == form;
+            if (!name.english || name.leadsBack) name.english = &row->english;
         }
+    }
+    for (FontForm& form : forms_) {
+        if (auto const at = names.find(&form); at != names.end())
+            form.english = *at->second.english;
     }
 }
 

@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "module/fonts/font_entry.h"
 #include "module/fonts/table_key.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/ini_file.h"
@@ -129,17 +130,26 @@ CStdStrW CMTextFontMapDatabase::MapFileToFont(
 
 CStdStrW CMTextFontMapDatabase::MapFontToFile(
     MapType& type, CStdStrW face, bool bold, bool italic, Charset charset, int pitch) {
-    if (m_mapFontToFile.empty()) BuildDatabase();
-    auto const at = m_mapFontToFile.find(descriptionKey(face, bold, italic, charset, pitch).view());
-    if (at != m_mapFontToFile.end()) {
-        auto const& entry = static_cast<CMTextFontToFileMapEntry const&>(*at->second);
-        type = entry.m_eMapType;
-        return entry.m_sFileName;
+    if (auto const* const entry = fontEntry(*this, face, bold, italic, charset, pitch)) {
+        type = entry->m_eMapType;
+        return entry->m_sFileName;
     }
     type = MapTypeSystem;
     CStdStrW file;
     tzFontInfo().FontNameToFile(face, bold, italic, file);
     return file;
+}
+
+CMTextFontToFileMapEntry const* fontEntry(CMTextFontMapDatabase& fonts,
+                                          CStdStrW const& face,
+                                          bool bold,
+                                          bool italic,
+                                          Charset charset,
+                                          int pitch) {
+    auto const& table = CMTextFontMapDatabase::m_mapFontToFile;
+    if (table.empty()) fonts.BuildDatabase();
+    auto const at = table.find(descriptionKey(face, bold, italic, charset, pitch).view());
+    return at == table.end() ? nullptr : static_cast<CMTextFontToFileMapEntry const*>(at->second);
 }
 
 void CMTextFontMapDatabase::RemoveFileToFontMapEntries(MapType type) {

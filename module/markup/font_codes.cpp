@@ -1,5 +1,6 @@
 // What the difference between two looks is in MTEXT codes.
 
+#include "module/fonts/font_entry.h"
 #include "module/markup/font_state.h"
 #include "module/markup/number_text.h"
 #include "tz/gi/color.h"
@@ -70,29 +71,34 @@ CStdStrW const& CFontState::faceCode() {
     return at->second.code;
 }
 
+CStdStrW CFontState::fileCode(CStdStrW const& file) const {
+    CStdStrW code = L"\\F" + file;
+    appendNumberCode(code, L"|c", m_current.m_nCharset);
+    return code;
+}
+
 // A file when the font map has one, else a face; the file form keeps the set 1, which the face form
-// replaces by the system's.
+// replaces by the system's. The files that the machine has of a face do not count, but for a pair.
 CStdStrW CFontState::newFaceCode() const {
     CStdStrW const& name = m_current.m_sFontName.text();
-    bool const isPair = m_pFontMap->IsBigfontProxyFont(name);
+    bool const bold = m_current.m_bBold;
+    bool const italic = m_current.m_bItalic;
+    int const pitch = m_current.m_nPitchAndFamily;
     Charset const system = TzCodePage::SysCharset();
-    auto type = CMTextFontMapDatabase::MapTypeSystem;
-    CStdStrW const file = m_pFontMap->MapFontToFile(
-        type, name, m_current.m_bBold, m_current.m_bItalic, isPair ? system : m_current.m_nCharset,
-        m_current.m_nPitchAndFamily);
-    CStdStrW code;
-    if (isPair || (type != CMTextFontMapDatabase::MapTypeSystem && !file.empty())) {
-        code = L"\\F" + file;
-        appendNumberCode(code, L"|c", m_current.m_nCharset);
-        return code;
+    if (m_pFontMap->IsBigfontProxyFont(name)) {
+        auto type = CMTextFontMapDatabase::MapTypeSystem;
+        return fileCode(m_pFontMap->MapFontToFile(type, name, bold, italic, system, pitch));
     }
-    bool const isMapped = type != CMTextFontMapDatabase::MapTypeSystem;
-    code = L"\\f" + (isMapped ? name : tzFontInfo().TypefaceNativeToEnglish(name));
-    code += m_current.m_bBold ? L"|b1" : L"|b0";
-    code += m_current.m_bItalic ? L"|i1" : L"|i0";
+    auto const* const entry =
+        fontEntry(*m_pFontMap, name, bold, italic, m_current.m_nCharset, pitch);
+    bool const isMapped = entry && entry->m_eMapType != CMTextFontMapDatabase::MapTypeSystem;
+    if (isMapped && !entry->m_sFileName.empty()) return fileCode(entry->m_sFileName);
+    CStdStrW code = L"\\f" + (isMapped ? name : tzFontInfo().TypefaceNativeToEnglish(name));
+    code += bold ? L"|b1" : L"|b0";
+    code += italic ? L"|i1" : L"|i0";
     code += L"|c";
     appendDecimal(code, m_current.m_nCharset == kDefaultCharset ? system : m_current.m_nCharset);
-    appendNumberCode(code, L"|p", m_current.m_nPitchAndFamily);
+    appendNumberCode(code, L"|p", pitch);
     return code;
 }
 

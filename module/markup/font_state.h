@@ -91,6 +91,7 @@ private:
     [[nodiscard]] bool appendBrace(CStdStrW& codes);
     [[nodiscard]] CStdStrW const& faceCode();
     [[nodiscard]] CStdStrW newFaceCode() const;
+    [[nodiscard]] CStdStrW fileCode(CStdStrW const& file) const;
     void appendSize(CStdStrW& codes) const;
     void appendColor(CStdStrW& codes) const;
 

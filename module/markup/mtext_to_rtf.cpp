@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cwchar>
 
+#include "module/fonts/font_entry.h"
 #include "module/markup/number_text.h"
 #include "module/markup/scale_correction.h"
 #include "module/markup/stack_look_ahead.h"
@@ -32,10 +33,10 @@ CMTextToRichTextContext::~CMTextToRichTextContext() = default;
 
 void CMTextToRichTextContext::SetInitialFontName(
     wchar_t const* name, bool bold, bool italic, Charset charset, int pitchAndFamily) {
-    auto type = CMTextFontMapDatabase::MapTypeSystem;
-    CStdStrW const file =
-        m_pFontMap->MapFontToFile(type, name, bold, italic, kAnsiCharset, pitchAndFamily);
-    if (type != CMTextFontMapDatabase::MapTypeSystem && !file.empty()) {
+    auto const* const entry =
+        fontEntry(*m_pFontMap, name, bold, italic, kAnsiCharset, pitchAndFamily);
+    if (entry && entry->m_eMapType != CMTextFontMapDatabase::MapTypeSystem &&
+        !entry->m_sFileName.empty()) {
         g_sInitialFont = name;
         SetFont(names().intern(name));
         SetPitchAndFamily(pitchAndFamily);

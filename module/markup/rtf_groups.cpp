@@ -1,13 +1,28 @@
 // Groups, escaped characters and plain text.
 
+#include <array>
+
 #include "module/markup/rtf_reading.h"
 #include "module/markup/rtf_to_mtext.h"
 #include "module/markup/rtf_tokens.h"
 
 namespace {
 
-constexpr bool isText(wchar_t c) {
-    return c != 0 && c != L'\\' && c != L'{' && c != L'}' && c != L'\n' && c != L'\r';
+// The characters that are no plain text, all of them below kEndOfSigns.
+constexpr std::wstring_view kSigns(L"\0\n\r\\{}", 6);
+constexpr std::size_t kEndOfSigns = 128;
+
+constexpr auto textTable() {
+    std::array<bool, kEndOfSigns> table{};
+    for (std::size_t c = 0; c < kEndOfSigns; ++c)
+        table[c] = kSigns.find(static_cast<wchar_t>(c)) == kSigns.npos;
+    return table;
+}
+
+bool isText(wchar_t c) {
+    static constexpr auto kTable = textTable();
+    auto const code = static_cast<std::size_t>(c);
+    return code >= kEndOfSigns || kTable[code];
 }
 
 }  // namespace

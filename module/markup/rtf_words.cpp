@@ -82,18 +82,42 @@ enum ReplacementPlace : std::size_t {
     kRightDoubleQuote,
 };
 
+constexpr std::size_t kLetters = L'z' - L'a' + 1;
+
+constexpr std::size_t letterOf(std::wstring_view word) {
+    return static_cast<std::size_t>(word.front() - L'a');
+}
+
+// The first row of each letter or behind it, and one place more for the end of all.
+constexpr auto firstsByLetter() {
+    std::array<RtfWords::Row const*, kLetters + 1> firsts{};
+    for (std::size_t letter = 0; letter <= kLetters; ++letter) {
+        firsts[letter] =
+            std::find_if(std::begin(RtfWords::kRows), std::end(RtfWords::kRows),
+                         [=](RtfWords::Row const& row) { return letterOf(row.word) >= letter; });
+    }
+    return firsts;
+}
+
+// Null for an unknown word.
+RtfWords::Row const* rowOf(std::wstring_view word) {
+    static constexpr auto kFirsts = firstsByLetter();
+    if (word.empty() || word.front() < L'a' || word.front() > L'z') return nullptr;
+    std::size_t const letter = letterOf(word);
+    auto const* const end = kFirsts[letter + 1];
+    auto const* const row = std::find_if(
+        kFirsts[letter], end, [=](RtfWords::Row const& each) { return each.word == word; });
+    return row == end ? nullptr : row;
+}
+
 }  // namespace
 
 bool CRichTextToMTextContext::HandleToken(wchar_t const*& cursor,
                                           std::wstring_view word,
                                           int value) {
-    auto const* const end = std::end(RtfWords::kRows);
-    auto const* const row = std::lower_bound(
-        std::begin(RtfWords::kRows), end, word,
-        [](RtfWords::Row const& each, std::wstring_view sought) { return each.word < sought; });
-    if (row == end || row->word != word) return false;
-    if (!m_bSwallowTokens) (this->*row->handler)(cursor, value);
-    return true;
+    RtfWords::Row const* const row = rowOf(word);
+    if (row && !m_bSwallowTokens) (this->*row->handler)(cursor, value);
+    return row != nullptr;
 }
 
 void CRichTextToMTextContext::OnNothing(wchar_t const*&, int) {}

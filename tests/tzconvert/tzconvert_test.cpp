@@ -170,20 +170,52 @@ TEST(Reports, NameWhatWasFound) {
     }
 }
 
-TEST(Codec, ReadsAndWritesAnyMixture) {
-    for (std::size_t plain : {0U, 1U, 63U, 64U, 65U, 200U}) {
+TEST(Codec, ReadsAndWritesAnyMixtureInAnyPieces) {
+    for (std::size_t plain : {0U, 1U, 63U, 64U, 65U, 2000U}) {
         std::string const bytes = std::string(plain, 'a') + "\xC3\xA9\xF0\x9F\x98\x80" +
                                   std::string(plain, 'b') + "\xE4\xB8\xAD";
+        for (std::size_t piece : {4U, 5U, 7U, 64U, 9000U}) {
+            std::wstring text;
+            std::size_t read = 0;
+            for (std::size_t step = 1; read < bytes.size() && step > 0; read += step) {
+                auto const decoded = tzconvert::decodeText(bytes.substr(read, piece), text);
+                EXPECT_EQ(decoded.fault, nullptr);
+                step = decoded.size;
+            }
+            std::string back;
+            tzconvert::encodeText(text, back);
+            EXPECT_EQ(back, bytes);
+        }
         std::wstring text;
-        EXPECT_FALSE(tzconvert::decodeText(bytes, text));
+        auto const bad = tzconvert::decodeText(bytes + "\xC0\x80", text);
+        EXPECT_STREQ(bad.fault, "not UTF-8");
+        EXPECT_EQ(bad.size, bytes.size());
         EXPECT_EQ(text.size(), 2 * plain + 3);
-        std::string back;
-        tzconvert::encodeText(text, back);
-        EXPECT_EQ(back, bytes);
-        std::wstring cut;
-        auto const bad = tzconvert::decodeText(bytes + "\xC0\x80", cut);
-        ASSERT_TRUE(bad);
-        EXPECT_EQ(bad->offset, bytes.size());
+    }
+}
+
+// Only the end of all tells a character that a piece cuts off from one that the text cuts off.
+TEST(Codec, LeavesACharacterThatIsCutOff) {
+    struct Row {
+        char const* bytes;
+        std::size_t size;
+        bool isOpen;
+    };
+    constexpr Row kRows[] = {
+        {"a\xE4\xB8",     1, true },
+        {"a\xF0\x9F\x98", 1, true },
+        {"\xC3",          0, true },
+        {"a\xE4\xB8z",    1, false},
+        {"a\xE4z",        1, false},
+        {"a\xC1",         1, false},
+        {"a\xB8",         1, false},
+        {"a\xC3\xA9\xF5", 3, false},
+    };
+    for (Row const& row : kRows) {
+        std::wstring text;
+        auto const decoded = tzconvert::decodeText(row.bytes, text);
+        EXPECT_EQ(decoded.size, row.size) << row.bytes;
+        EXPECT_EQ(decoded.fault == nullptr, row.isOpen) << row.bytes;
     }
 }
 
