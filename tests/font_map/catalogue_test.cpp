@@ -29,6 +29,7 @@ protected:
         CTzadFontMapDatabase::m_mapFontToFile[L"some face"] = face;
     }
     ~Catalogue() override {
+        CTzadFontMapDatabase::m_sRegistryLocation.setEmpty();
         database_.ResetContents();
         tzhost::settings() = tzhost::Settings();
     }
@@ -66,14 +67,35 @@ TEST_F(Catalogue, DumpsItsTables) {
     std::wstring const name = file.wstring();
     database_.WriteFontToFileMapToDisk(name.c_str(), 1);
     database_.WriteFileToFontMapToDisk(name.c_str(), 0);
-    std::ifstream in(file);
-    std::string const text{std::istreambuf_iterator<char>(in), {}};
+    auto const contents = [&file] {
+        std::ifstream in(file);
+        return std::string{std::istreambuf_iterator<char>(in), {}};
+    };
+    std::string const text = contents();
     auto const has = [&](char const* line) { return text.find(line) != std::string::npos; };
     EXPECT_TRUE(has("some face")) << text;
     EXPECT_TRUE(has("some.ttf,someb.ttf,,")) << text;
     EXPECT_TRUE(has("Some Face [B0 I1 F34 C204]")) << text;
     EXPECT_EQ(text.find("old"), text.rfind("old"))
         << text;  // the section that was not appended to is new
+    database_.WriteDatabaseToDisk(name.c_str(), 0);
+    EXPECT_EQ(contents().find("old"), std::string::npos);
+    EXPECT_LT(contents().find("some.ttf,"), contents().find("[B0 I1"));
+}
+
+TEST_F(Catalogue, LearnsTheFontFolderOnce) {
+    auto& folders = tzhost::settings().registry[L"hkey_current_user\\software\\microsoft\\windows\\"
+                                                L"currentversion\\explorer\\shell folders"];
+    folders = {
+        {L"Fonts", L"C:\\Windows\\Fonts"}
+    };
+    CTzadFontMapDatabase::InitSystemLocations();
+    EXPECT_EQ(CTzadFontMapDatabase::GetSystemFontPath(), L"C:\\Windows\\Fonts");
+    folders = {
+        {L"Fonts", L"D:\\Fonts"}
+    };
+    CTzadFontMapDatabase::PopulateDatabaseFromRegistry();
+    EXPECT_EQ(CTzadFontMapDatabase::GetSystemFontPath(), L"C:\\Windows\\Fonts");
 }
 
 TEST_F(Catalogue, FindsFilesInTheRegistry) {
@@ -85,6 +107,8 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
         {L"Alone One (All)",                        L"alone.ttc"    },
         {L"First & Second Face & Third (TrueType)", L"set.ttc"      },
         {L"Short",                                  L".fot"         },
+        {L"Five",                                   L"X.FOT"        },
+        {L"Numbers & Letters",                      std::uint32_t{5}},
     };
     tzhost::settings().registry[L"hkey_local_machine\\software\\product\\altfontnames"] = {
         {L"Alternate", L"alternate.ttf"}
@@ -110,6 +134,8 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
              Row{L"Alone One",         L""             },
              Row{L"Number",            L""             },
              Row{L"Short",             L".fot"         },
+             Row{L"Five",              L"X.ttf"        },
+             Row{L"Letters",           L""             },
              Row{L"Missing",           L""             }
     }) {
         EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(row.face), row.file) << row.face;

@@ -59,6 +59,7 @@ misc.shx=Shx Says,0,0,0,0
 [Postscript Map]
 OneWaySubstitution=1
 oneway.pfb=One Way,0,0,0,0
+other.pfb=Roman S,0,0,0,2
 
 [Misc Map]
 OneWaySubstitution=256
@@ -110,6 +111,7 @@ constexpr FileCase kFiles[] = {
     {"PairThatEndsInTheComma",           L"a.shx,",                 L"Big Proxy|0|0|0|0|2"   },
     {"FolderInSlashesIsKept",            L"fonts/romans.shx",       L"Proxy A|0|0|0|0|2"     },
     {"SystemFont",                       L"DejaVuSans-Bold.ttf",    L"DejaVu Sans|1|0|0|34|0"},
+    {"MarkIsNoFile",                     L"OneWaySubstitution",     L"Proxy A|0|0|0|0|2"     },
     {"Unknown",                          L"unknown.shx",            L"Proxy A|0|0|0|0|2"     },
     {"Empty",                            L"",                       L"Proxy A|0|0|0|0|2"     },
 };
@@ -126,6 +128,8 @@ INSTANTIATE_TEST_SUITE_P(Names, FontFiles, testing::ValuesIn(kFiles), [](auto co
 TEST_F(FontMap, FacesMapBackByTheWholeDescription) {
     Fonts fonts(0);
     EXPECT_EQ(byFace(fonts, L"ROMAN S", 0, 2), L"romans.shx|1");
+    EXPECT_EQ(byFile(fonts, L"other.pfb"), L"Roman S|0|0|0|2|3");  // one way: takes no face over
+    EXPECT_EQ(byFace(fonts, L"Roman S", 0, 2), L"romans.shx|1");
     EXPECT_EQ(byFace(fonts, L"Roman S", 0, 3), L"|0");  // another pitch
     EXPECT_EQ(byFace(fonts, L"Roman S", 1, 2), L"|0");  // another charset
     EXPECT_EQ(byFace(fonts, L"Many Sets", 0, 2), L"multi.shx|1");
@@ -209,6 +213,31 @@ TEST_F(FontMap, AFileThatAppearsLaterIsReadAtTheNextLookUp) {
     EXPECT_TRUE(Fonts(0).IsBigfontProxyFont(L"Big Proxy"));
 }
 
+// A pair that was lent a face fills the tables, so that nothing is read while it is in them.
+TEST_F(FontMap, AFileThatAppearsBehindAPairWaitsForItsEnd) {
+    std::filesystem::remove(file());
+    {
+        Fonts fonts(0);
+        EXPECT_EQ(byFile(fonts, L"a,b"), L"System|0|0|0|0|2");
+        write(kMap);
+        EXPECT_EQ(byFile(fonts, L"romans.shx"), L"Proxy A|0|0|0|0|2");
+        EXPECT_EQ(byFace(fonts, L"Roman S", 0, 2), L"|0");
+    }
+    Fonts fonts(0);
+    EXPECT_EQ(byFace(fonts, L"Roman S", 0, 2), L"romans.shx|1");
+    EXPECT_EQ(byFile(fonts, L"romans.shx"), L"Roman S|0|0|0|2|1");
+}
+
+// The mark of a section counts in any case, but only as it is spelled is it no line too.
+TEST_F(FontMap, AMarkInAnotherCaseIsALineAsWell) {
+    write("[SHX Map]\noneWAYsubstitution=1\na.shx=A,0,0,0,0\n");
+    Fonts fonts(0);
+    EXPECT_EQ(byFace(fonts, L"A"), L"|0");
+    EXPECT_EQ(byFile(fonts, L"a"), L"A|0|0|0|0|1");
+    EXPECT_EQ(byFile(fonts, L"onewaysubstitution"), L"1|0|0|0|0|1");
+    EXPECT_EQ(byFace(fonts, L"A"), L"|0");
+}
+
 TEST_F(FontMap, RemovesByKind) {
     Fonts fonts(0);
     (void)byFile(fonts, L"u1.shx");
@@ -216,7 +245,7 @@ TEST_F(FontMap, RemovesByKind) {
     fonts.RemoveFileToFontMapEntries(Fonts::MapTypeMisc);
     EXPECT_EQ(Fonts::m_mapFileToFont.size(), all - 1);
     fonts.RemoveFileToFontMapEntries(Fonts::MapTypePostscript);
-    EXPECT_EQ(Fonts::m_mapFileToFont.size(), all - 2);
+    EXPECT_EQ(Fonts::m_mapFileToFont.size(), all - 3);
     fonts.RemoveFileToFontMapEntries(Fonts::MapTypeSystem);
     EXPECT_TRUE(Fonts::m_mapFileToFont.empty());
     fonts.RemoveFontToFileMapEntries(Fonts::MapTypeAll);
