@@ -8,6 +8,7 @@
 #include "host/base/font_map_path.h"
 #include "host/base/output.h"
 #include "module/access/string_table.h"
+#include "module/shell/font_database.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
 
@@ -279,6 +280,19 @@ TEST_F(FontMap, OffersFacesToAList) {
     fonts.FixupFontBox(&list);
     EXPECT_EQ(list.text, L"shx A\nshx B\nmisc M\nproxy P1 for n.shx\nproxy P2 for o.shx\n"
                          L"proxy P3 for p.shx\n");
+}
+
+TEST_F(FontMap, TheModulesUnloadForgetsTheFile) {
+    EXPECT_EQ(FontDatabaseLoader(nullptr), 0);
+    EXPECT_EQ(Fonts::m_eDatabaseStatus, Fonts::kLoaded);
+    Fonts fonts(0);
+    EXPECT_EQ(byFile(fonts, L"romans"), L"Roman S|0|0|0|2|1");
+    write("[SHX Map]\nromans.shx=Another,0,0,0,2\n");
+    LoadFontDatabase();
+    EXPECT_EQ(byFile(fonts, L"romans"), L"Roman S|0|0|0|2|1");
+    UnloadFontDatabase();
+    EXPECT_EQ(Fonts::m_eDatabaseStatus, Fonts::kNotLoaded);
+    EXPECT_EQ(byFile(fonts, L"romans"), L"Another|0|0|0|2|1");
 }
 
 TEST_F(FontMap, StatusFollowsLoadAndReset) {
