@@ -40,47 +40,65 @@ std::wstring lowered(std::wstring_view text) {
 
 std::string withEqualsSigns(std::string_view bytes) {
     std::string whole;
-    whole.reserve(bytes.size());
-    while (!bytes.empty()) {
-        std::size_t const end = std::min(bytes.find_first_of("\r\n"), bytes.size());
-        std::string_view const line = bytes.substr(0, end);
+    whole.reserve(bytes.size() + 1);
+    std::size_t feed = 0;  // where the next line feed stands, looked for once
+    for (std::size_t at = 0; at < bytes.size();) {
+        if (feed <= at) feed = std::min(bytes.find('\n', at), bytes.size());
+        std::string_view line = bytes.substr(at, feed - at);
+        line = line.substr(0, line.find('\r'));
         std::size_t const start = line.find_first_not_of(" \t");
         bool const isKey =
             start != line.npos && std::string_view("[;#").find(line[start]) == line.npos;
         whole += line;
         if (isKey && line.find('=') == line.npos) whole += '=';
-        if (end < bytes.size()) whole += bytes[end];
-        bytes.remove_prefix(std::min(end + 1, bytes.size()));
+        at += line.size();
+        if (at < bytes.size()) whole += bytes[at++];
     }
     return whole;
 }
 
+struct IniData::Source {
+    CSimpleIniA reader{true, true, false};  // UTF-8, keys more than once, values on one line
+};
+
 IniData IniData::fromBytes(std::string_view bytes) {
-    CSimpleIniA reader(true, true, false);  // UTF-8, keys more than once, values on one line
+    auto source = std::make_shared<Source>();
+    if (source->reader.LoadData(withEqualsSigns(bytes)) < 0) source->reader.Reset();
     IniData data;
-    if (reader.LoadData(withEqualsSigns(bytes)) < 0) return data;
-    CSimpleIniA::TNamesDepend sections;
-    reader.GetAllSections(sections);
-    sections.sort(CSimpleIniA::Entry::LoadOrder());
-    for (CSimpleIniA::Entry const& each : sections) {
-        auto const* const read = reader.GetSection(each.pItem);
-        std::vector<std::pair<CSimpleIniA::Entry, char const*>> entries(read->begin(), read->end());
-        std::sort(entries.begin(), entries.end(), [](auto const& a, auto const& b) {
-            return CSimpleIniA::Entry::LoadOrder()(a.first, b.first);
-        });
-        // Sections whose names differ in case, beyond what the reader merges, are one.
-        Section& section = data.sections_[lowered(fromUtf8(each.pItem))];
-        for (auto const& [key, value] : entries) {
-            section.rows.emplace_back(fromUtf8(key.pItem), fromUtf8(value ? value : ""));
-            section.values[lowered(section.rows.back().first)] = section.rows.back().second;
-        }
-    }
+    data.source_ = std::move(source);
     return data;
 }
 
+namespace {
+
+// Adds what the reader has under one spelling of a section's name.
+void addRows(IniData::Section& section, CSimpleIniA::TKeyVal const& read) {
+    std::vector<std::pair<CSimpleIniA::Entry, char const*>> entries(read.begin(), read.end());
+    std::sort(entries.begin(), entries.end(), [](auto const& a, auto const& b) {
+        return CSimpleIniA::Entry::LoadOrder()(a.first, b.first);
+    });
+    for (auto const& [key, value] : entries) {
+        section.rows.emplace_back(fromUtf8(key.pItem), fromUtf8(value ? value : ""));
+        section.values[lowered(section.rows.back().first)] = section.rows.back().second;
+    }
+}
+
+}  // namespace
+
 IniData::Section const* IniData::section(std::wstring_view name) const {
-    auto const at = sections_.find(lowered(name));
-    return at == sections_.end() ? nullptr : &at->second;
+    std::wstring const key = lowered(name);
+    if (auto const at = sections_.find(key); at != sections_.end()) return &at->second;
+    CSimpleIniA::TNamesDepend names;
+    source_->reader.GetAllSections(names);
+    names.sort(CSimpleIniA::Entry::LoadOrder());
+    Section* section = nullptr;
+    // Sections whose names differ in case, beyond what the reader merges, are one.
+    for (CSimpleIniA::Entry const& each : names) {
+        if (lowered(fromUtf8(each.pItem)) != key) continue;
+        section = &sections_[key];
+        addRows(*section, *source_->reader.GetSection(each.pItem));
+    }
+    return section;
 }
 
 std::shared_ptr<IniData const> openIni(std::string const& path) {

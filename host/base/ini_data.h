@@ -24,11 +24,14 @@ public:
     // Of a file's bytes.
     [[nodiscard]] static IniData fromBytes(std::string_view bytes);
 
-    // Null when there is no such section. Valid as long as this object.
+    // Null when there is no such section. Valid as long as this object. A section is made ready
+    // when it is first asked for: most of a long file may never be. Not thread-safe.
     [[nodiscard]] Section const* section(std::wstring_view name) const;
 
 private:
-    std::map<std::wstring, Section> sections_;  // by name in lower case
+    struct Source;
+    std::shared_ptr<Source const> source_;              // the file as its reader has it; never null
+    mutable std::map<std::wstring, Section> sections_;  // by name in lower case
 };
 
 // The file's data, read anew when the file has changed since; empty for one that cannot be read.
