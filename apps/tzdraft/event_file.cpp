@@ -2,6 +2,7 @@
 
 #include <system_error>
 
+#include "apps/tzdraft/local_text.h"
 #include "host/base/event_sink.h"
 
 namespace tzdraft {
@@ -11,7 +12,7 @@ bool EventFile::begin(std::filesystem::path const& file, std::string& error) {
     part_ = file.string() + ".part";
     out_.open(part_, std::ios::binary | std::ios::trunc);
     if (!out_) {
-        error = file.string() + ": the events cannot be written";
+        error = file.string() + ": " + localText("the events cannot be written");
         part_.clear();
         return false;
     }
@@ -32,7 +33,7 @@ bool EventFile::finish(std::string& error) {
     if (written) {
         part_.clear();
     } else {
-        error = file_.string() + ": the events cannot be written";
+        error = file_.string() + ": " + localText("the events cannot be written");
     }
     return written;
 }

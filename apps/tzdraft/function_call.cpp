@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
@@ -62,7 +63,8 @@ void complain(std::wstring_view call, wchar_t const* what) {
 
 void callTyped(std::wstring_view line) {
     std::wstring_view const whole = trimmed(line);
-    if (whole.size() < 2 || whole.back() != L')') return complain(whole, L"a call ends in \")\"");
+    if (whole.size() < 2 || whole.back() != L')')
+        return complain(whole, localText(L"a call ends in \")\""));
     std::wstring_view const inside = trimmed(whole.substr(1, whole.size() - 2));
     std::size_t const blank = inside.find_first_of(kBlanks);
     std::wstring const name(inside.substr(0, blank));
@@ -70,11 +72,12 @@ void callTyped(std::wstring_view line) {
     if (blank != std::wstring_view::npos) {
         arguments = readArgument(trimmed(inside.substr(blank)));
         if (!arguments)
-            return complain(whole, L"the argument is neither an entity (#2A) nor a text (\"...\")");
+            return complain(
+                whole, localText(L"the argument is neither an entity (#2A) nor a text (\"...\")"));
     }
     int const status = tzhost::callFunction(TzString(name), arguments.get());
-    if (status == -1) return complain(whole, L"no module defines this function");
-    if (status != TzRx::kRetOK) complain(whole, L"the function failed");
+    if (status == -1) return complain(whole, localText(L"no module defines this function"));
+    if (status != TzRx::kRetOK) complain(whole, localText(L"the function failed"));
 }
 
 }  // namespace tzdraft

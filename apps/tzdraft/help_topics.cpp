@@ -2,7 +2,10 @@
 
 #include <fstream>
 #include <optional>
+#include <vector>
 
+#include "host/base/language.h"
+#include "host/base/resource_search.h"
 #include "host/base/utf8.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
@@ -24,15 +27,25 @@ std::optional<std::wstring> topicIn(std::filesystem::path const& file, std::stri
     return tzhost::fromUtf8(text);
 }
 
+// The help beside a module: in the language of the session, then in English.
+std::vector<std::filesystem::path> helpFilesOf(std::filesystem::path const& module) {
+    std::string const name = module.stem().string() + ".help";
+    std::filesystem::path const folder = module.parent_path();
+    std::vector<std::filesystem::path> files{folder / name};
+    auto local = tzhost::translatedFile(folder, tzhost::resourceSearch().locale, name);
+    if (local) files.insert(files.begin(), *std::move(local));
+    return files;
+}
+
 }  // namespace
 
 std::wstring helpFor(TzString const& name) {
     tzhost::HelpTopic const* const help = tzhost::findHelp(name);
     TzString const& topic = help ? help->topic : name;
     for (auto const& module : tzhost::dynamicLinker().modules()) {
-        std::filesystem::path file = module->file;
-        auto const text = topicIn(file.replace_extension(".help"), topic.toUtf8());
-        if (text) return *text;
+        for (std::filesystem::path const& file : helpFilesOf(module->file)) {
+            if (auto const text = topicIn(file, topic.toUtf8())) return *text;
+        }
     }
     return help ? topic.str() : std::wstring();
 }

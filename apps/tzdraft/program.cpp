@@ -8,6 +8,7 @@
 #include "apps/tzdraft/commands/host_commands.h"
 #include "apps/tzdraft/event_file.h"
 #include "apps/tzdraft/function_call.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
@@ -99,7 +100,8 @@ bool Run::planFaults() {
 bool Run::loadModule() {
     std::string error;
     if (tzhost::dynamicLinker().load(modulePath(options_), error)) return true;
-    if (!hasModuleResources()) error += "; its resource library is missing or damaged";
+    if (!hasModuleResources())
+        error += "; " + localText("its resource library is missing or damaged");
     return complain(error);
 }
 
@@ -151,7 +153,8 @@ void Run::runTyped(std::wstring const& line) {
     if (line.front() == L'(') return runCall(line);
     tzhost::Command const* const command = tzhost::commandStack().find(TzString(line));
     if (!command) {
-        return tzhost::commandLine().say(L"There is no command \"" + line + L"\".");
+        return tzhost::commandLine().say(
+            TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str()).str());
     }
     auto const answers = tzhost::commandLine().isScripted() ? tzhost::AnswersFrom::script
                                                             : tzhost::AnswersFrom::user;
@@ -163,7 +166,8 @@ void Run::runGuarded(std::wstring const& line) {
         runTyped(line);
         session_.doPostponed();
     } catch (std::exception const& problem) {
-        tzhost::commandLine().say(line + L" ended early: " + tzhost::fromUtf8(problem.what()));
+        tzhost::commandLine().say(line + localText(L" ended early: ") +
+                                  tzhost::fromUtf8(problem.what()));
     }
 }
 

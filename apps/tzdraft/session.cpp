@@ -4,6 +4,7 @@
 #include <array>
 #include <utility>
 
+#include "apps/tzdraft/local_text.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/database/user_system.h"
@@ -118,7 +119,7 @@ bool Session::plot(std::filesystem::path const& file, std::string& error) const 
         std::find_if(kPlotEndings.begin(), kPlotEndings.end(),
                      [&](PlotEnding const& each) { return file.extension() == each.ending; });
     if (at == kPlotEndings.end()) {
-        error = file.string() + ": a plot's name ends in .svg, .png or .pdf";
+        error = file.string() + ": " + localText("a plot's name ends in .svg, .png or .pdf");
         return false;
     }
     return plotAs(at->format, file, error);
@@ -148,7 +149,7 @@ void Session::loadLater(std::filesystem::path file) {
 void Session::unloadLater() {
     postponed_.emplace_back([] {
         auto const& modules = tzhost::dynamicLinker().modules();
-        std::string error = "No module is loaded.";
+        std::string error = localText("No module is loaded.");
         if (modules.empty() || !tzhost::dynamicLinker().unload(modules.back()->file, error))
             sayError(error);
     });

@@ -2,9 +2,11 @@
 
 #include <cstdlib>
 
+#include "apps/tzdraft/local_text.h"
 #include "host/base/file_bytes.h"
 #include "host/base/font_map_path.h"
 #include "host/base/install_paths.h"
+#include "host/base/language.h"
 #include "host/base/resource_search.h"
 #include "host/base/settings.h"
 #include "host/base/utf8.h"
@@ -18,6 +20,7 @@ namespace {
 
 constexpr char kModuleName[] = "tzmted.tzx";
 constexpr wchar_t kResourceName[] = L"TzmtedRes.dll";
+constexpr char kTextsName[] = "tzdraft.texts";
 
 // The first that says something.
 std::string firstOf(std::initializer_list<std::string> candidates) {
@@ -50,7 +53,7 @@ bool setVariables(Options const& options, std::string& error) {
     for (std::string const& each : options.variables) {
         std::size_t const equals = each.find('=');
         if (equals == std::string::npos) {
-            error = "--var " + each + ": expected NAME=VALUE";
+            error = "--var " + each + ": " + localText("expected NAME=VALUE");
             return false;
         }
         tzhost::WriteResult const written = variables.overrideFromText(
@@ -62,28 +65,51 @@ bool setVariables(Options const& options, std::string& error) {
     return true;
 }
 
-// The language's name out of a locale's: "de" of "de_AT.UTF-8"; empty for English and for none.
-std::string languageOf(std::string const& locale) {
-    std::string const language = locale.substr(0, locale.find_first_of("_.@"));
-    return language == "C" || language == "POSIX" || language == "en" ? "" : language;
+// Of the environment: the first of the three that says something decides.
+std::string localeOfUser() {
+    return firstOf({environment("LC_ALL"), environment("LC_MESSAGES"), environment("LANG")});
 }
 
-void findResources(Options const& options) {
+// A language that was asked for has the module's texts; one of the environment may be unknown.
+bool isLanguageThere(Options const& options, std::string& error) {
+    std::filesystem::path const folder = modulePath(options).parent_path();
+    std::string const library = TzString(kResourceName).toUtf8();
+    bool const isThere = !options.resources.empty() || tzhost::localeName(options.locale).empty() ||
+                         tzhost::translatedFile(folder, options.locale, library);
+    if (isThere) return true;
+    error = "--locale " + options.locale + ": " +
+            localText("no texts of this language; there are") + " en";
+    for (std::string const& each : tzhost::languagesWith(folder, library))
+        error += ", " + each;
+    return false;
+}
+
+// The host's own texts. What such a table lacks is shown in English.
+void useLocalTexts(std::string const& locale) {
+    auto const file = tzhost::translatedFile(tzhost::libraryFolder(), locale, kTextsName);
+    auto const bytes = file ? tzhost::readFile(file->string()) : std::nullopt;
+    std::vector<std::string> faults;  // shown where the table is made
+    tzhost::setLocalTexts(bytes ? tzhost::readLocalTexts(*bytes, faults)
+                                : std::vector<tzhost::LocalTextRow>());
+}
+
+bool findTexts(Options const& options, std::string& error) {
+    std::string const locale = options.locale.empty() ? localeOfUser() : options.locale;
+    useLocalTexts(locale);
+    if (!isLanguageThere(options, error)) return false;
     tzhost::ResourceSearch search;
     search.folder = modulePath(options).parent_path().string();
-    search.locale = !options.locale.empty()
-                        ? languageOf(options.locale)
-                        : languageOf(firstOf({environment("LC_ALL"), environment("LC_MESSAGES"),
-                                              environment("LANG")}));
+    search.locale = locale;
     search.file = options.resources.string();
     tzhost::setResourceSearch(search);
+    return true;
 }
 
 // The module makes do without a font map, so that a wrong name would go unnoticed.
 bool findFontMap(Options const& options, std::string& error) {
     tzhost::setFontMapFile(options.fontMap.string());
     if (options.fontMap.empty() || tzhost::readFile(options.fontMap.string())) return true;
-    error = options.fontMap.string() + ": the font map file cannot be read";
+    error = options.fontMap.string() + ": " + localText("the font map file cannot be read");
     return false;
 }
 
@@ -123,9 +149,9 @@ bool hasModuleResources() {
 bool configureHost(Options const& options, SettingsState& settings, std::string& error) {
     tzhost::Variables::instance().reset();
     watchViewOnce();
+    if (!findTexts(options, error)) return false;
     if (!loadSettings(options, settings, error) || !setVariables(options, error)) return false;
     if (!findFontMap(options, error)) return false;
-    findResources(options);
     chooseEditors(options);
     return true;
 }

@@ -9,6 +9,7 @@
 #include <unistd.h>
 
 #include "host/base/file_reader.h"
+#include "host/base/local_text.h"
 
 namespace tzhost {
 
@@ -96,7 +97,7 @@ bool writeFileSafely(std::string const& path, std::string_view bytes) {
 }
 
 std::string systemReason() {
-    return std::strerror(errno);
+    return localText(std::strerror(errno));
 }
 
 }  // namespace tzhost

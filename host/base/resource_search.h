@@ -17,6 +17,8 @@ struct ResourceSearch {
 
 // Replaces the search and returns the one before.
 ResourceSearch setResourceSearch(ResourceSearch search);
+// The one in force.
+[[nodiscard]] ResourceSearch const& resourceSearch();
 
 // The first library of that name that is there: in the folder of the locale, of its language, then
 // in the folder itself, where the English one lies. Nothing when it is missing or damaged; a

@@ -5,6 +5,7 @@
 #include <iterator>
 #include <optional>
 
+#include "host/base/format_conversions.h"
 #include "host/base/text_escapes.h"
 #include "host/base/utf8.h"
 
@@ -91,29 +92,6 @@ private:
     ResourceRules rules_ = ResourceRules::texts;
     int number_ = 0;
 };
-
-// The conversions of a format in order, without flags, width and precision, "%ls" as "%s"; nothing
-// when a percent sign opens none. Doubled percent signs are listed too.
-std::optional<std::vector<std::wstring>> conversionsOf(std::wstring_view text) {
-    std::vector<std::wstring> found;
-    for (;;) {
-        std::size_t const percent = text.find(L'%');
-        if (percent == text.npos) return found;
-        text.remove_prefix(percent + 1);
-        std::size_t const flags = text.find_first_not_of(L"-+#0123456789.*");
-        if (flags == text.npos) return std::nullopt;
-        text.remove_prefix(flags);
-        std::size_t const length = std::min(text.find_first_not_of(L"hljztL"), text.size());
-        if (length == text.size()) return std::nullopt;
-        wchar_t const letter = text[length];
-        if (std::wstring_view(L"diouxXeEfFgGaAcs%").find(letter) == std::wstring_view::npos) {
-            return std::nullopt;
-        }
-        std::wstring conversion(letter == L's' ? L"" : text.substr(0, length));
-        found.push_back(conversion += letter);
-        text.remove_prefix(length + 1);
-    }
-}
 
 std::wstring_view globalPartOf(std::wstring_view keyword) {
     std::size_t const separator = keyword.find(kSeparator);

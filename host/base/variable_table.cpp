@@ -4,6 +4,7 @@
 #include <array>
 
 #include "host/base/case_table.h"
+#include "host/base/local_text.h"
 
 namespace tzhost {
 
@@ -66,14 +67,14 @@ constexpr bool isSorted() {
 }
 static_assert(isSorted());
 
-std::wstring_view nounOf(VariableType type) {
+wchar_t const* nounOf(VariableType type) {
     switch (type) {
-    case VariableType::shortInteger: return L"a whole number";
-    case VariableType::real: return L"a number";
-    case VariableType::text: return L"a text";
+    case VariableType::shortInteger: return localText(L"a whole number");
+    case VariableType::real: return localText(L"a number");
+    case VariableType::text: return localText(L"a text");
     case VariableType::point: break;
     }
-    return L"a point x,y,z";
+    return localText(L"a point x,y,z");
 }
 
 double numberOf(VariableValue const& value) {
@@ -127,17 +128,18 @@ std::wstring VariableDefinition::takes() const {
     std::wstring const noun(nounOf(type));
     switch (limit) {
     case Limit::none: return noun;
-    case Limit::between: return noun + L" from " + writeReal(low) + L" to " + writeReal(high);
-    case Limit::above: return noun + L" above " + writeReal(low);
-    case Limit::least: return noun + L", " + writeReal(low) + L" or more";
+    case Limit::between:
+        return noun + localText(L" from ") + writeReal(low) + localText(L" to ") + writeReal(high);
+    case Limit::above: return noun + localText(L" above ") + writeReal(low);
+    case Limit::least: return noun + L", " + writeReal(low) + localText(L" or more");
     case Limit::nonZero: break;
     }
-    return noun + L" other than 0,0,0";
+    return noun + localText(L" other than 0,0,0");
 }
 
 std::optional<std::wstring> VariableDefinition::complaintAbout(VariableValue const& value) const {
     if (typeOf(value) == type && isFinite(value) && isWithin(*this, value)) return std::nullopt;
-    return L"takes " + takes();
+    return localText(L"takes ") + takes();
 }
 
 std::span<VariableDefinition const> variableTable() {

@@ -1,6 +1,8 @@
 #include "host/base/variables.h"
 
+#include "host/base/local_text.h"
 #include "tz/rx/status.h"
+#include "tz/text/string.h"
 
 namespace tzhost {
 
@@ -15,7 +17,9 @@ WriteResult done() {
 }
 
 WriteResult unknown(std::wstring_view name) {
-    return refused(L"There is no system variable \"" + std::wstring(name) + L"\".");
+    return refused(TzString::formatted(localText(L"There is no system variable \"%ls\"."),
+                                       std::wstring(name).c_str())
+                       .str());
 }
 
 std::wstring sentence(VariableDefinition const& row, std::wstring_view rest) {
@@ -76,7 +80,7 @@ std::wstring Variables::text(std::wstring_view name) const {
 WriteResult Variables::set(std::wstring_view name, VariableValue const& value, Writer writer) {
     VariableDefinition const* const row = findVariable(name);
     if (row == nullptr) return unknown(name);
-    if (isRefused(*row, writer)) return refused(sentence(*row, L"is read-only"));
+    if (isRefused(*row, writer)) return refused(sentence(*row, localText(L"is read-only")));
     WriteResult result = checked(*row, value);
     if (!result.isDone()) return result;
     Slot& slot = slotOf(*row);
@@ -92,9 +96,9 @@ WriteResult Variables::set(std::wstring_view name, VariableValue const& value, W
 WriteResult Variables::setFromText(std::wstring_view name, std::wstring_view text, Writer writer) {
     VariableDefinition const* const row = findVariable(name);
     if (row == nullptr) return unknown(name);
-    if (isRefused(*row, writer)) return refused(sentence(*row, L"is read-only"));
+    if (isRefused(*row, writer)) return refused(sentence(*row, localText(L"is read-only")));
     auto const value = readValue(row->type, text);
-    if (!value) return refused(sentence(*row, L"takes " + row->takes()));
+    if (!value) return refused(sentence(*row, localText(L"takes ") + row->takes()));
     return set(name, *value, writer);
 }
 
@@ -102,7 +106,7 @@ WriteResult Variables::overrideFromText(std::wstring_view name, std::wstring_vie
     VariableDefinition const* const row = findVariable(name);
     if (row == nullptr) return unknown(name);
     auto const value = readValue(row->type, text);
-    if (!value) return refused(sentence(*row, L"takes " + row->takes()));
+    if (!value) return refused(sentence(*row, localText(L"takes ") + row->takes()));
     WriteResult result = checked(*row, *value);
     if (result.isDone()) slotOf(*row).override_ = *value;
     return result;

@@ -3,6 +3,7 @@
 #include <utility>
 
 #include "host/base/event_sink.h"
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/command_line/jig_driver.h"
 #include "host/runtime/documents.h"
@@ -13,7 +14,7 @@ namespace tzhost {
 namespace {
 
 constexpr int kMostFailures = 100;
-constexpr std::wstring_view kIdlePrompt = L"Command: ";
+constexpr wchar_t const* kIdlePrompt = forLocalText(L"Command: ");
 constexpr std::wstring_view kCancelEcho = L"^C";
 
 }  // namespace
@@ -70,7 +71,8 @@ void CommandLine::complain(std::wstring const& text) {
 
 // Said once, however many questions still wait.
 void CommandLine::endedInCommand(std::wstring const& where) {
-    if (!hasFailed_ && !where.empty()) complain(where + L"the input ends inside a command");
+    if (!hasFailed_ && !where.empty())
+        complain(where + localText(L"the input ends inside a command"));
     hasFailed_ = true;
 }
 
@@ -113,12 +115,12 @@ std::optional<std::wstring> CommandLine::readCommand(std::vector<std::wstring> w
             sent_.push(text.str());
         document->typed.clear();
     }
-    AnswerRequest const request{QuestionKind::command, kIdlePrompt, std::move(words)};
+    AnswerRequest const request{QuestionKind::command, localText(kIdlePrompt), std::move(words)};
     while (true) {
         Answer answer = ask(request);
         if (answer.kind == Answer::Kind::line) return std::move(answer.text);
         if (answer.kind == Answer::Kind::end) return std::nullopt;
-        if (answer.kind == Answer::Kind::tooLong) say(L"That line is too long.");
+        if (answer.kind == Answer::Kind::tooLong) say(localText(L"That line is too long."));
     }
 }
 

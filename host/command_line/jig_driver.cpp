@@ -3,6 +3,7 @@
 #include <cmath>
 #include <utility>
 
+#include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
 #include "host/database/drawing.h"
 #include "host/database/user_system.h"
@@ -118,7 +119,9 @@ Reply TzEdJigDriver::take(std::wstring_view answer) {
     bool const isMove = answer.starts_with(kMoveMark);
     if (isMove) answer.remove_prefix(1);
     auto point = tzhost::readPoint(answer, tzhost::lastPoint());
-    if (!point) return Reply::refused(L"A point is needed, or ~ and a point to move the cursor.");
+    if (!point)
+        return Reply::refused(
+            tzhost::localText(L"A point is needed, or ~ and a point to move the cursor."));
     if (!has(TzEdJig::kAccept3dCoordinates)) point->z = 0;
     return isMove ? moveTo(*point) : pick(*point);
 }

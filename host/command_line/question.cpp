@@ -4,6 +4,7 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 
 namespace tzhost {
@@ -59,7 +60,7 @@ int Question::ask(Reader const& read) {
         case Answer::Kind::line:
             if (auto const status = take(answer.text, read)) return *status;
             break;
-        case Answer::Kind::tooLong: line_.say(L"That line is too long."); break;
+        case Answer::Kind::tooLong: line_.say(localText(L"That line is too long.")); break;
         case Answer::Kind::cancel: return line_.answered(L"^C", cancelStatus_);
         default: return line_.answered(L"", cancelStatus_);
         }
@@ -77,7 +78,8 @@ std::optional<int> Question::take(std::wstring const& line, Reader const& read) 
 
 Reply Question::replyTo(std::wstring_view answer, Reader const& read) {
     if (answer.empty()) {
-        if (armed_.has(Armed::kNoEmptyAnswer)) return Reply::refused(L"An answer is needed.");
+        if (armed_.has(Armed::kNoEmptyAnswer))
+            return Reply::refused(localText(L"An answer is needed."));
         return Reply::done(emptyStatus_);
     }
     if (auto const index = armed_.words.match(answer)) {
@@ -94,10 +96,10 @@ Reply Question::replyTo(std::wstring_view answer, Reader const& read) {
 
 std::optional<Reply> refusalOf(double value, Armed const& armed) {
     if (value == 0 && armed.has(Armed::kNoZero)) {
-        return Reply::refused(L"The value must not be zero.");
+        return Reply::refused(localText(L"The value must not be zero."));
     }
     if (value < 0 && armed.has(Armed::kNoNegative)) {
-        return Reply::refused(L"The value must not be negative.");
+        return Reply::refused(localText(L"The value must not be negative."));
     }
     return std::nullopt;
 }

@@ -7,6 +7,7 @@
 #include <sstream>
 #include <utility>
 
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 
 namespace tzhost {
@@ -22,7 +23,7 @@ constexpr std::wstring_view kBlockEscape = L">>>>";
 
 constexpr std::size_t kMostBytes = 4 * (kLongestAnswer + 1);
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
-constexpr wchar_t const* kNotUtf8 = L"this line is not UTF-8";
+constexpr wchar_t const* kNotUtf8 = forLocalText(L"this line is not UTF-8");
 
 using Traits = std::istream::traits_type;
 
@@ -55,14 +56,14 @@ ScriptSource::ScriptSource(std::string_view text, std::string name)
 
 std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::string& error) {
     if (file == "-") {
-        return std::make_unique<ScriptSource>("standard input",
+        return std::make_unique<ScriptSource>(localText("standard input"),
                                               std::make_unique<std::istream>(std::cin.rdbuf()));
     }
     std::ifstream input(file, std::ios::binary);
     std::ostringstream whole;
     if (!input || std::filesystem::is_directory(file) ||
         (input.peek() != Traits::eof() && !(whole << input.rdbuf()))) {
-        error = file + ": the script cannot be read";
+        error = file + ": " + localText("the script cannot be read");
         return nullptr;
     }
     std::string const text = whole.str();
@@ -70,7 +71,7 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
     if (bad != kAllUtf8) {
         auto const at = text.begin() + static_cast<std::ptrdiff_t>(bad);
         error = file + ":" + std::to_string(1 + std::count(text.begin(), at, '\n')) + ": " +
-                toUtf8(kNotUtf8);
+                toUtf8(localText(kNotUtf8));
         return nullptr;
     }
     return std::make_unique<ScriptSource>(text, file);
@@ -81,7 +82,7 @@ std::wstring ScriptSource::place(int line) const {
 }
 
 void ScriptSource::fail(int line, wchar_t const* what) {
-    fault_ = place(line) + what;
+    fault_ = place(line) + localText(what);
     text_.reset();
     peeked_.reset();
 }
@@ -131,7 +132,8 @@ std::optional<EditorBlock> ScriptSource::readBlock() {
         if (!std::exchange(isFirst, false)) block.text += L'\n';
         block.text += line->text == kBlockEscape ? kBlockEnd : std::wstring_view(line->text);
     }
-    if (fault_.empty()) fail(start, L"this block has no end, a line >>> or >>>cancel");
+    if (fault_.empty())
+        fail(start, forLocalText(L"this block has no end, a line >>> or >>>cancel"));
     return std::nullopt;
 }
 
@@ -159,7 +161,7 @@ Answer ScriptSource::next(AnswerRequest const& request) {
     if (!isString && word == kBlockStart) {
         int const start = line->number;
         if (!readBlock()) return last();
-        return {Answer::Kind::fault, place(start) + L"no editor takes this block"};
+        return {Answer::Kind::fault, place(start) + localText(L"no editor takes this block")};
     }
     if (word == kCancel) {
         peeked_.reset();

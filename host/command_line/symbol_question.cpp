@@ -1,6 +1,7 @@
 // The question for the name of a style, a layer or a block.
 
 #include "host/base/fault_point.h"
+#include "host/base/local_text.h"
 #include "host/command_line/question.h"
 #include "tz/ed/prompts.h"
 #include "tz/rx/resbuf.h"
@@ -41,8 +42,8 @@ public:
         tzhost::Question question(tzhost::QuestionKind::symbol, prompt);
         return question.ask([&](std::wstring_view answer) {
             if (!isNameOrPattern(answer)) {
-                return tzhost::Reply::unreadable(L"That is no name: it is too long or holds one of "
-                                                 L"< > / \\ \" : ; = `");
+                return tzhost::Reply::unreadable(tzhost::localText(
+                    L"That is no name: it is too long or holds one of < > / \\ \" : ; = `"));
             }
             result = tzutNewString(std::wstring(answer).c_str());
             return tzhost::Reply::done(Tzad::ePromptNormal);

@@ -4,6 +4,7 @@
 #include <cmath>
 #include <numbers>
 
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
@@ -17,7 +18,8 @@ using tzhost::Reply;
 
 namespace {
 
-constexpr wchar_t const* kNoPoint = L"A point is needed: x,y or x,y,z, or one from the last point.";
+constexpr wchar_t const* kNoPoint =
+    tzhost::forLocalText(L"A point is needed: x,y or x,y,z, or one from the last point.");
 
 // A point as an answer: it becomes the last point.
 std::optional<TzGePoint3d> takePoint(std::wstring_view answer) {
@@ -62,11 +64,11 @@ double angleBetween(TzGePoint3d const& from, TzGePoint3d const& to) {
 }
 
 constexpr Measure kDistance{QuestionKind::distance, tzhost::readDistance, distanceBetween,
-                            L"A length is needed, or a point."};
+                            tzhost::forLocalText(L"A length is needed, or a point.")};
 constexpr Measure kAngle{QuestionKind::angle, tzhost::readAngle, angleBetween,
-                         L"An angle is needed, or a point."};
+                         tzhost::forLocalText(L"An angle is needed, or a point.")};
 constexpr Measure kOrientation{QuestionKind::orientation, tzhost::readAngle, angleBetween,
-                               L"An angle is needed, or a point."};
+                               tzhost::forLocalText(L"An angle is needed, or a point.")};
 
 Reply giveNumber(double value, Armed const& armed, double* result) {
     if (auto refusal = tzhost::refusalOf(value, armed)) return std::move(*refusal);
@@ -83,10 +85,10 @@ int askMeasure(Measure const& measure, double const* base, wchar_t const* prompt
             return giveNumber(*number, question.armed(), result);
         }
         auto const point = takePoint(answer);
-        if (!point) return Reply::unreadable(measure.complaint);
+        if (!point) return Reply::unreadable(tzhost::localText(measure.complaint));
         if (from) return giveNumber(measure.between(*from, *point), question.armed(), result);
         from = point;
-        question.setPrompt(L"Second point: ");
+        question.setPrompt(tzhost::localText(L"Second point: "));
         return Reply::goOn(Tzad::ePromptNormal);
     });
 }
@@ -98,7 +100,7 @@ int tzedGetPoint(double const* /*base*/, wchar_t const* prompt, double* result) 
     Question question(QuestionKind::point, prompt);
     return question.ask([&](std::wstring_view answer) {
         auto const point = takePoint(answer);
-        if (!point) return Reply::unreadable(kNoPoint);
+        if (!point) return Reply::unreadable(tzhost::localText(kNoPoint));
         for (int i = 0; i < 3; ++i)
             result[i] = (*point)[i];
         return Reply::done(Tzad::ePromptNormal);
@@ -110,7 +112,7 @@ int tzedGetReal(wchar_t const* prompt, double* result) {
     Question question(QuestionKind::real, prompt);
     return question.ask([&](std::wstring_view answer) {
         auto const number = readPlainNumber(answer);
-        if (!number) return Reply::unreadable(L"A number is needed.");
+        if (!number) return Reply::unreadable(tzhost::localText(L"A number is needed."));
         return giveNumber(*number, question.armed(), result);
     });
 }
@@ -120,10 +122,12 @@ int tzedGetInt(wchar_t const* prompt, int* result, int low, int high) {
     Question question(QuestionKind::integer, prompt);
     return question.ask([&](std::wstring_view answer) {
         auto const number = readInteger(answer);
-        if (!number) return Reply::unreadable(L"A whole number is needed.");
+        if (!number) return Reply::unreadable(tzhost::localText(L"A whole number is needed."));
         if (*number < low || *number > high) {
-            return Reply::refused(L"A number from " + std::to_wstring(low) + L" to " +
-                                  std::to_wstring(high) + L" is needed.");
+            return Reply::refused(
+                TzString::formatted(tzhost::localText(L"A number from %d to %d is needed."), low,
+                                    high)
+                    .str());
         }
         if (auto refusal = tzhost::refusalOf(*number, question.armed())) return std::move(*refusal);
         *result = *number;

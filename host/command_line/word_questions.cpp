@@ -1,6 +1,7 @@
 // The questions for words and texts, and what arms and follows a question.
 
 #include "host/base/fault_point.h"
+#include "host/base/local_text.h"
 #include "host/base/variables.h"
 #include "host/command_line/question.h"
 #include "tz/ed/prompts.h"
@@ -36,7 +37,7 @@ int tzedGetKword(wchar_t const* prompt, TzString& result) {
         return Reply::done(Tzad::ePromptNormal);
     });
     return question.ask([](std::wstring_view) {
-        return Reply::unreadable(L"That is none of the words in question.");
+        return Reply::unreadable(tzhost::localText(L"That is none of the words in question."));
     });
 }
 

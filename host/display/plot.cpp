@@ -2,6 +2,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/base/file_bytes.h"
+#include "host/base/local_text.h"
 #include "host/database/drawing.h"
 #include "host/display/draw_pass.h"
 #include "host/display/record_access.h"
@@ -23,11 +24,12 @@ DrawList strokesOfActiveSpace(TzDbDatabase& database) {
 
 std::optional<std::string>
 plotDrawing(TzDbDatabase& database, PlotFormat format, std::string const& file) {
-    if (faultAt("plotDrawing")) return file + ": cannot be plotted";
+    if (faultAt("plotDrawing")) return file + ": " + localText("cannot be plotted");
     PlotScene const scene = makeScene(strokesOfActiveSpace(database), viewAxes(activeSpace()));
     std::string const bytes = paintPlot(scene, format);
-    if (bytes.empty()) return file + ": the picture could not be made";
-    if (!writeFileSafely(file, bytes)) return file + ": cannot be written: " + systemReason();
+    if (bytes.empty()) return file + ": " + localText("the picture could not be made");
+    if (!writeFileSafely(file, bytes))
+        return file + ": " + localText("cannot be written") + ": " + systemReason();
     return std::nullopt;
 }
 

@@ -3,6 +3,7 @@
 #include <set>
 
 #include "host/base/file_bytes.h"
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/drawing_file/entity_reader.h"
@@ -277,7 +278,7 @@ DrawingRead readDrawing(std::filesystem::path const& file) {
     using namespace drawingfile;
     DrawingRead result;
     if (faultStatus("readDrawing", Tzad::eFileError)) {
-        result.error = file.string() + ": cannot be read";
+        result.error = file.string() + ": " + localText("cannot be read");
         return result;
     }
     std::error_code ignored;
@@ -286,7 +287,7 @@ DrawingRead readDrawing(std::filesystem::path const& file) {
     std::unique_ptr<std::FILE, FileCloser> const stream(isFolder ? nullptr
                                                                  : std::fopen(file.c_str(), "rb"));
     if (!stream) {
-        result.error = file.string() + ": cannot be read: " + systemReason();
+        result.error = file.string() + ": " + localText("cannot be read") + ": " + systemReason();
         return result;
     }
     auto drawing = Drawing::create();

@@ -1,6 +1,7 @@
 #include <cerrno>
 
 #include "host/base/file_bytes.h"
+#include "host/base/local_text.h"
 #include "host/database/field_imp.h"
 #include "host/database/open_state.h"
 #include "host/drawing_file/drawing_file.h"
@@ -286,10 +287,11 @@ bool DrawingWriter::write() {
 
 std::string writeDrawing(Drawing& drawing, std::filesystem::path const& file) {
     using namespace drawingfile;
-    if (faultStatus("writeDrawing", Tzad::eFileError)) return file.string() + ": cannot be written";
+    if (faultStatus("writeDrawing", Tzad::eFileError))
+        return file.string() + ": " + localText("cannot be written");
     SafeFile target(file);
     if (target.isOpen() && DrawingWriter(drawing, target).write() && target.commit()) return {};
-    return file.string() + ": cannot be written: " + target.reason();
+    return file.string() + ": " + localText("cannot be written") + ": " + target.reason();
 }
 
 }  // namespace tzhost

@@ -1,5 +1,6 @@
 #include "host/editors/markup_session.h"
 
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/editors/markup_lines.h"
@@ -16,13 +17,13 @@ void refuse(std::string const& program,
             std::string const& problem,
             PrivateFile& file,
             std::string const& before) {
-    TzString message = TzString::formatted(L"The editor \"%ls\" %ls; the text stays as it was.",
-                                           TzString::fromUtf8(program).kwszPtr(),
-                                           TzString::fromUtf8(problem).kwszPtr());
+    TzString message = TzString::formatted(
+        localText(L"The editor \"%ls\" %ls; the text stays as it was."),
+        TzString::fromUtf8(program).kwszPtr(), TzString::fromUtf8(problem).kwszPtr());
     std::optional<std::string> const now = file.read();
     if (now && !now->empty() && *now != before) {
         file.keep();
-        message += TzString::formatted(L" What was edited is kept in %ls",
+        message += TzString::formatted(localText(L" What was edited is kept in %ls"),
                                        TzString::fromUtf8(file.path().string()).kwszPtr());
     }
     commandLine().say(message.str());
@@ -30,10 +31,11 @@ void refuse(std::string const& program,
 
 // What is wrong with the bytes that an editor left; empty when they can be taken.
 std::string problemOf(std::optional<std::string> const& bytes) {
-    if (!bytes) return "left a file that cannot be read";
-    if (bytes->empty()) return "left an empty file";
-    if (firstBadByte(*bytes) != kAllUtf8) return "left a file that is no UTF-8";
-    if (bytes->find('\0') != std::string::npos) return "left a file with a zero character";
+    if (!bytes) return localText("left a file that cannot be read");
+    if (bytes->empty()) return localText("left an empty file");
+    if (firstBadByte(*bytes) != kAllUtf8) return localText("left a file that is no UTF-8");
+    if (bytes->find('\0') != std::string::npos)
+        return localText("left a file with a zero character");
     return "";
 }
 
@@ -42,7 +44,8 @@ std::optional<TzString> editWithProgram(TzString const& contents, std::string co
     std::string const before = TzString(markupToLines(contents.str())).toUtf8() + "\n";
     PrivateFile file(kFileName, before);
     if (!file.made()) {
-        commandLine().say(L"No file can be made for the editor; the text stays as it was.");
+        commandLine().say(
+            localText(L"No file can be made for the editor; the text stays as it was."));
         return std::nullopt;
     }
     ProgramResult const result = runProgram(program, file.path());
@@ -55,7 +58,7 @@ std::optional<TzString> editWithProgram(TzString const& contents, std::string co
     if (*now != before) return TzString(linesToMarkup(TzString::fromUtf8(*now).str()));
     if (!contents.isEmpty()) return contents;
     // A new text of which nothing was written is no text.
-    commandLine().say(L"Nothing was written in the editor.");
+    commandLine().say(localText(L"Nothing was written in the editor."));
     return std::nullopt;
 }
 
@@ -72,7 +75,8 @@ std::optional<TzString> editMarkup(TzString const& contents, std::string const& 
         return TzString(linesToMarkup(block->text + L"\n"));
     }
     if (program.empty()) {
-        commandLine().say(L"No editor is named: --text-editor, the settings or $EDITOR name one.");
+        commandLine().say(
+            localText(L"No editor is named: --text-editor, the settings or $EDITOR name one."));
         return std::nullopt;
     }
     return editWithProgram(contents, program);

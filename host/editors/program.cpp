@@ -8,6 +8,9 @@
 #include <termios.h>
 #include <unistd.h>
 
+#include "host/base/local_text.h"
+#include "tz/text/string.h"
+
 namespace tzhost {
 namespace {
 
@@ -71,9 +74,16 @@ int waitFor(pid_t child) {
     }
 }
 
+std::string notRun(int reason) {
+    return localText("cannot be run") + ": " + localText(std::strerror(reason));
+}
+
 std::string problemOf(int status) {
-    if (WIFSIGNALED(status)) return "was killed by signal " + std::to_string(WTERMSIG(status));
-    return "ended with exit status " + std::to_string(WEXITSTATUS(status));
+    TzString const problem =
+        WIFSIGNALED(status)
+            ? TzString::formatted(localText(L"was killed by signal %d"), WTERMSIG(status))
+            : TzString::formatted(localText(L"ended with exit status %d"), WEXITSTATUS(status));
+    return problem.toUtf8();
 }
 
 }  // namespace
@@ -100,17 +110,18 @@ std::vector<std::string> splitCommand(std::string_view command) {
 
 ProgramResult runProgram(std::string_view command, std::filesystem::path const& file) {
     std::vector<std::string> words = splitCommand(command);
-    if (words.empty()) return {false, "is no command"};
+    if (words.empty()) return {false, localText("is no command")};
     words.push_back(file.string());
     int report[2];
-    if (pipe2(report, O_CLOEXEC) != 0) return {false, std::strerror(errno)};
+    if (pipe2(report, O_CLOEXEC) != 0) return {false, notRun(errno)};
     Terminal const terminal;
     pid_t const child = fork();
     if (child == 0) become(words, terminal, report[1]);
     close(report[1]);
     if (child < 0) {
+        int const reason = errno;
         close(report[0]);
-        return {false, std::strerror(errno)};
+        return {false, notRun(reason)};
     }
     setpgid(child, child);
     terminal.giveTo(child);
@@ -118,7 +129,7 @@ ProgramResult runProgram(std::string_view command, std::filesystem::path const& 
     bool const missing = read(report[0], &reason, sizeof reason) == sizeof reason;
     close(report[0]);
     int const status = waitFor(child);
-    if (missing) return {false, std::string("cannot be run: ") + std::strerror(reason)};
+    if (missing) return {false, notRun(reason)};
     if (WIFEXITED(status) && WEXITSTATUS(status) == 0) return {true, ""};
     return {false, problemOf(status)};
 }

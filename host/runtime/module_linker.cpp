@@ -6,6 +6,7 @@
 #include <utility>
 
 #include "host/base/fault_point.h"
+#include "host/base/local_text.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/documents.h"
 
@@ -28,7 +29,7 @@ private:
 
 std::string loaderError() {
     char const* const text = dlerror();
-    return text ? text : "the dynamic loader gives no reason";
+    return text ? text : localText("the dynamic loader gives no reason");
 }
 
 }  // namespace
@@ -67,19 +68,21 @@ bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) 
         return module->file.filename() == file.filename();
     };
     if (std::any_of(modules_.begin(), modules_.end(), sameFile)) {
-        error = file.string() + ": this module is loaded already";
+        error = file.string() + ": " + localText("this module is loaded already");
         return false;
     }
     auto module = std::make_unique<LoadedModule>();
     module->file = file;
     module->library = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
     if (!module->library) {
-        error = file.string() + ": the module cannot be loaded: " + loaderError();
+        error =
+            file.string() + ": " + localText("the module cannot be loaded") + ": " + loaderError();
         return false;
     }
     module->entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module->library, "tzrxEntryPoint"));
     if (!module->entry) {
-        error = file.string() + ": this is no module of the host: it has no tzrxEntryPoint";
+        error = file.string() + ": " +
+                localText("this is no module of the host: it has no tzrxEntryPoint");
         dlclose(module->library);
         return false;
     }
@@ -87,8 +90,9 @@ bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) 
     LoadedModule& loaded = *modules_.back();
     int const status = deliver(loaded, TzRx::kInitAppMsg, &loaded);
     if (status != TzRx::kRetOK) {
-        error =
-            file.string() + ": the module refused to start (status " + std::to_string(status) + ")";
+        error = file.string() + ": " +
+                TzString::formatted(localText(L"the module refused to start (status %d)"), status)
+                    .toUtf8();
         (void)deliver(loaded, TzRx::kUnloadAppMsg, nullptr);  // safe whatever load reached
         dlclose(loaded.library);
         modules_.pop_back();
@@ -104,12 +108,12 @@ bool DynamicLinker::unload(std::filesystem::path const& file, std::string& error
         return module->file.filename() == file.filename();
     });
     if (at == modules_.end()) {
-        error = file.string() + ": no module of that name is loaded";
+        error = file.string() + ": " + localText("no module of that name is loaded");
         return false;
     }
     LoadedModule const& module = **at;
     if (!module.mayUnload) {
-        error = file.string() + ": this module does not allow to be unloaded";
+        error = file.string() + ": " + localText("this module does not allow to be unloaded");
         return false;
     }
     if (documents().curDocument()) (void)send(module, TzRx::kUnloadDwgMsg);

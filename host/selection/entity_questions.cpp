@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
 #include "host/selection/pick.h"
@@ -12,7 +13,7 @@ namespace tzhost {
 
 namespace {
 
-constexpr wchar_t const* kUsualPrompt = L"Select object: ";
+constexpr wchar_t const* kUsualPrompt = forLocalText(L"Select object: ");
 
 // A pick with the point where it was made; a handle is picked at the last point.
 struct PickedAt {
@@ -38,10 +39,11 @@ using Taker = std::function<int(PickedAt const& pick)>;
 // Enter gives 5000; a pick at nothing ends the question with -5001.
 int askForEntity(wchar_t const* prompt, Depth depth, Taker const& take) {
     Question question(QuestionKind::entity, prompt);
-    if (prompt == nullptr) question.setPrompt(kUsualPrompt);
+    if (prompt == nullptr) question.setPrompt(localText(kUsualPrompt));
     return question.ask([&](std::wstring_view answer) {
         auto const pick = readPick(answer, depth);
-        if (!pick) return Reply::unreadable(L"A point is needed, or the handle of an entity.");
+        if (!pick)
+            return Reply::unreadable(localText(L"A point is needed, or the handle of an entity."));
         return Reply::done(pick->picked ? take(*pick) : Tzad::ePromptError);
     });
 }

@@ -2,15 +2,17 @@
 
 #include <utility>
 
+#include "host/base/local_text.h"
 #include "host/selection/input_filters.h"
 #include "tz/rx/status.h"
+#include "tz/text/string.h"
 
 namespace tzhost {
 
 namespace {
 
-std::wstring counted(int count, std::wstring_view what) {
-    return count > 0 ? L", " + std::to_wstring(count) + std::wstring(what) : std::wstring();
+std::wstring counted(int count, wchar_t const* format) {
+    return TzString::formatted(format, count).str();
 }
 
 }  // namespace
@@ -35,8 +37,10 @@ std::wstring Selecting::add(EntityIds const& ids) {
         members_.insert(id);
     int const leftOut = static_cast<int>(seen.size()) - locked - fresh.length();
     entities_.append(fresh);
-    return std::to_wstring(fresh.length()) + L" found" + counted(locked, L" on a locked layer") +
-           counted(leftOut, L" left out");
+    std::wstring report = counted(fresh.length(), localText(L"%d found"));
+    if (locked > 0) report += counted(locked, localText(L", %d on a locked layer"));
+    if (leftOut > 0) report += counted(leftOut, localText(L", %d left out"));
+    return report;
 }
 
 std::wstring Selecting::remove(EntityIds const& ids) {
@@ -53,7 +57,7 @@ std::wstring Selecting::remove(EntityIds const& ids) {
         if (members_.count(id) > 0) staying.append(id);
     }
     entities_ = std::move(staying);
-    return std::to_wstring(going.length()) + L" removed";
+    return counted(going.length(), localText(L"%d removed"));
 }
 
 int Selecting::finish(int status) {

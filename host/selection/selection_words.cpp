@@ -1,8 +1,10 @@
 #include "host/selection/selection_words.h"
 
+#include <algorithm>
 #include <string>
 #include <vector>
 
+#include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
 #include "host/selection/pick.h"
 #include "tz/text/string.h"
@@ -74,21 +76,50 @@ Answered readRemove(Words const&) {
 }
 
 struct WordRow {
-    wchar_t const* word;
-    wchar_t const* letter;
+    wchar_t const* words;  // the whole one, a blank, and the short one
     Answered (*read)(Words const& words);
     std::size_t count;  // of words on the line
 };
 
 constexpr WordRow kWords[] = {
-    {L"window",   L"w",   readWindow,   3},
-    {L"crossing", L"c",   readCrossing, 3},
-    {L"all",      L"all", readAll,      1},
-    {L"last",     L"l",   readLast,     1},
-    {L"previous", L"p",   readPrevious, 1},
-    {L"add",      L"a",   readAdd,      1},
-    {L"remove",   L"r",   readRemove,   1},
+    {forLocalText(L"window w"),   readWindow,   3},
+    {forLocalText(L"crossing c"), readCrossing, 3},
+    {forLocalText(L"all all"),    readAll,      1},
+    {forLocalText(L"last l"),     readLast,     1},
+    {forLocalText(L"previous p"), readPrevious, 1},
+    {forLocalText(L"add a"),      readAdd,      1},
+    {forLocalText(L"remove r"),   readRemove,   1},
 };
+
+bool isSame(std::wstring_view a, std::wstring_view b) {
+    return a.size() == b.size() &&
+           std::equal(a.begin(), a.end(), b.begin(),
+                      [](wchar_t x, wchar_t y) { return tzToLower(x) == tzToLower(y); });
+}
+
+// The row of a word that stands on a line of `count` words.
+WordRow const*
+rowOf(std::wstring_view word, std::size_t count, wchar_t const* (*shown)(wchar_t const*)) {
+    for (WordRow const& row : kWords) {
+        Words const names = splitWords(shown(row.words));
+        bool const isWord = std::any_of(names.begin(), names.end(),
+                                        [&](std::wstring_view name) { return isSame(word, name); });
+        if (isWord && row.count == count) return &row;
+    }
+    return nullptr;
+}
+
+wchar_t const* asGlobal(wchar_t const* words) {
+    return words;
+}
+
+// The row that a line means: local words go ahead of global ones, and "_word" is only global.
+WordRow const* rowMeant(Words const& words) {
+    std::wstring_view word = words.front();
+    if (word.starts_with(L'_')) return rowOf(word.substr(1), words.size(), asGlobal);
+    WordRow const* const local = rowOf(word, words.size(), localText);
+    return local ? local : rowOf(word, words.size(), asGlobal);
+}
 
 Answered readHandles(Words const& words) {
     EntityIds ids;
@@ -117,13 +148,7 @@ std::optional<SelectionAnswer> readSelection(std::wstring_view text) {
     Words const words = splitWords(text);
     if (words.empty()) return std::nullopt;
     if (isHandles(words.front())) return readHandles(words);
-    std::wstring first(words.front());
-    if (first.starts_with(L'_')) first.erase(0, 1);
-    for (WordRow const& row : kWords) {
-        bool const isWord = tzCompareNoCase(first.c_str(), row.word) == 0 ||
-                            tzCompareNoCase(first.c_str(), row.letter) == 0;
-        if (isWord && words.size() == row.count) return row.read(words);
-    }
+    if (WordRow const* const row = rowMeant(words)) return row->read(words);
     auto const point = takePoint(text);
     if (!point) return std::nullopt;
     EntityIds ids;

@@ -4,6 +4,7 @@
 
 #include "host/base/audit.h"
 #include "host/base/fault_point.h"
+#include "host/base/local_text.h"
 #include "host/command_line/question.h"
 #include "host/faults/memory.h"
 #include "host/selection/pick.h"
@@ -16,8 +17,8 @@ namespace tzhost {
 
 namespace {
 
-constexpr wchar_t const* kAddPrompt = L"Select objects: ";
-constexpr wchar_t const* kRemovePrompt = L"Remove objects: ";
+constexpr wchar_t const* kAddPrompt = forLocalText(L"Select objects: ");
+constexpr wchar_t const* kRemovePrompt = forLocalText(L"Remove objects: ");
 
 TzedSSKeywordCallback& keywordCallback() {
     static TzedSSKeywordCallback callback = nullptr;
@@ -35,7 +36,7 @@ struct Prompts {
         return {pair[0], pair[1]};
     }
     static wchar_t const* shown(wchar_t const* own, wchar_t const* usual) {
-        return own != nullptr && *own != 0 ? own : usual;
+        return own != nullptr && *own != 0 ? own : localText(usual);
     }
 };
 
@@ -68,7 +69,7 @@ private:
 
     Reply take(std::wstring_view text) {
         auto const answer = readSelection(text);
-        if (!answer) return Reply::refused(L"That selects nothing here.");
+        if (!answer) return Reply::refused(localText(L"That selects nothing here."));
         switch (answer->kind) {
         case SelectionAnswer::Kind::entities:
             commandLine().say(isRemoving_ ? selecting_.remove(answer->ids)

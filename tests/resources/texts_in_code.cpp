@@ -7,6 +7,9 @@
 #include <map>
 #include <regex>
 
+#include "host/base/text_escapes.h"
+#include "host/base/utf8.h"
+
 namespace {
 
 namespace fs = std::filesystem;
@@ -53,7 +56,34 @@ void addIds(fs::path const& file, std::vector<UsedText>& used) {
     }
 }
 
+// What a text in the code stands for, its parts put together.
+std::wstring meantBy(std::string const& literals) {
+    static std::regex const kLiteral(R"re(L?"((?:[^"\\]|\\.)*)")re");
+    std::string text;
+    for (Words part(literals.begin(), literals.end(), kLiteral), end; part != end; ++part)
+        text += (*part)[1].str();
+    for (std::size_t at = text.find("\\\""); at != text.npos; at = text.find("\\\"", at + 1))
+        text.erase(at, 1);
+    return tzhost::unescaped(tzhost::fromUtf8(text)).value_or(L"");
+}
+
+void addHostTexts(std::string const& source, std::set<std::wstring>& texts) {
+    static std::regex const kMarked(
+        R"re(\b(?:localText|forLocalText)\(\s*((?:L?"(?:[^"\\]|\\.)*"\s*)+)\))re");
+    for (Words use(source.begin(), source.end(), kMarked), end; use != end; ++use)
+        texts.insert(meantBy((*use)[1]));
+}
+
 }  // namespace
+
+std::set<std::wstring> hostTextsInCode() {
+    std::set<std::wstring> texts;
+    fs::path const source(std::getenv("TZ_TEST_SOURCE"));
+    for (char const* const folder : {"apps/tzdraft", "host"})
+        for (fs::directory_entry const& entry : fs::recursive_directory_iterator(source / folder))
+            if (entry.path().extension() == ".cpp") addHostTexts(contentsOf(entry.path()), texts);
+    return texts;
+}
 
 std::vector<UsedText> textsInCode() {
     std::vector<UsedText> used;

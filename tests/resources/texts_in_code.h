@@ -1,7 +1,8 @@
 #pragma once
 
-// Which texts the module's source asks for.
+// Which texts the module's source and the host's ask for.
 
+#include <set>
 #include <string>
 #include <vector>
 
@@ -14,3 +15,6 @@ struct UsedText {
 // The ids that are written into the module's source: those between the brackets of gStringTable and
 // loadResourceString, and those of keyword lists, as numbers or as constants of the same file.
 [[nodiscard]] std::vector<UsedText> textsInCode();
+
+// The texts that the source of the host and of its program marks for translation.
+[[nodiscard]] std::set<std::wstring> hostTextsInCode();

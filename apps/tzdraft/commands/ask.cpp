@@ -1,5 +1,10 @@
 #include "apps/tzdraft/commands/ask.h"
 
+#include <algorithm>
+#include <optional>
+
+#include "apps/tzdraft/local_text.h"
+#include "host/command_line/keyword_list.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/units.h"
 #include "tz/rx/status.h"
@@ -16,6 +21,43 @@ constexpr int kNoNegative = 4;
 
 TzString withDefault(wchar_t const* question, TzString const& shown) {
     return TzString::formatted(L"\n%ls <%ls>: ", question, shown.kwszPtr());
+}
+
+// The words of a question in both languages.
+class Words {
+public:
+    explicit Words(wchar_t const* globals) : globals_(globals), locals_(localText(globals)) {}
+
+    // As tzedInitGet takes them.
+    [[nodiscard]] TzString list() const {
+        return globals_ == locals_ ? globals_ : locals_ + L" _" + globals_;
+    }
+    // "Question [Local/Words] <Word>: " on a line of its own; no default when it is null.
+    [[nodiscard]] TzString prompt(wchar_t const* question, wchar_t const* defaultWord) const;
+
+private:
+    [[nodiscard]] TzString localOf(TzString const& global) const;
+
+    TzString globals_;
+    TzString locals_;
+};
+
+// The word at the same place of the local list.
+TzString Words::localOf(TzString const& global) const {
+    auto const words = tzhost::KeywordList::parse(list().str());
+    for (int index = 0; words && index < words->count(); ++index) {
+        if (words->global(index) == global.str()) return TzString(words->local(index));
+    }
+    return global;
+}
+
+TzString Words::prompt(wchar_t const* question, wchar_t const* defaultWord) const {
+    std::wstring bracket = locals_.str();
+    std::replace(bracket.begin(), bracket.end(), L' ', L'/');
+    TzString text =
+        TzString::formatted(*question ? L"\n%ls [%ls]" : L"\n%ls[%ls]", question, bracket.c_str());
+    if (defaultWord) text += TzString::formatted(L" <%ls>", localOf(defaultWord).kwszPtr());
+    return text + L": ";
 }
 
 // Asks until the host gives a value, an empty answer or a cancel.
@@ -49,10 +91,11 @@ Answer<TzString> askText(wchar_t const* question, TzString const& defaultText) {
 
 Answer<TzString>
 askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defaultWord) {
-    TzString const prompt = defaultWord ? withDefault(question, defaultWord)
-                                        : TzString::formatted(L"\n%ls: ", question);
+    Words const words(keywords);
+    TzString const prompt = words.prompt(question, defaultWord);
     Answer<TzString> answer;
-    answer.asked = askUntilDecided(keywords, [&] { return tzedGetKword(prompt, answer.value); });
+    answer.asked =
+        askUntilDecided(words.list(), [&] { return tzedGetKword(prompt, answer.value); });
     if (answer.asked == Asked::empty && defaultWord) answer = {Asked::given, defaultWord};
     return answer;
 }
@@ -93,18 +136,24 @@ Answer<double> askAngle(wchar_t const* question, double defaultRadians) {
 }
 
 Answer<bool> askYesNo(wchar_t const* question, bool defaultYes) {
-    Answer<TzString> const word = askKeyword(TzString::formatted(L"%ls [Yes/No]", question),
-                                             L"Yes No", defaultYes ? L"Yes" : L"No");
+    Answer<TzString> const word =
+        askKeyword(question, forLocalText(L"Yes No"), defaultYes ? L"Yes" : L"No");
     return {word.asked, word.value == L"Yes"};
 }
 
-PointAnswer askPoint(wchar_t const* question, TzGePoint3d const* base, wchar_t const* keywords) {
-    TzString const prompt = TzString::formatted(L"\n%ls: ", question);
+PointAnswer askPoint(wchar_t const* question,
+                     TzGePoint3d const* base,
+                     wchar_t const* keywords,
+                     wchar_t const* defaultWord) {
+    std::optional<Words> const words = keywords ? std::optional<Words>(keywords) : std::nullopt;
+    TzString const prompt =
+        words ? words->prompt(question, defaultWord) : TzString::formatted(L"\n%ls: ", question);
+    TzString const list = words ? words->list() : TzString();
     double const from[3] = {base ? base->x : 0, base ? base->y : 0, base ? base->z : 0};
     double point[3] = {0, 0, 0};
     PointAnswer answer;
     bool isWord = false;
-    answer.asked = askUntilDecided(keywords, [&] {
+    answer.asked = askUntilDecided(list, [&] {
         int const status = tzedGetPoint(base ? from : nullptr, prompt, point);
         isWord = status == Tzad::ePromptKeyword;
         return status;

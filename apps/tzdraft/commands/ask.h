@@ -19,7 +19,8 @@ struct Answer {
 // Without a default an empty answer is `empty`; with one it gives the default.
 [[nodiscard]] Answer<TzString> askText(wchar_t const* question,
                                        TzString const& defaultText = TzString());
-// The global word of the keyword; the default is one of the words.
+// The global word of the keyword; the default is one of the words. `keywords` are the global words,
+// blanks between them; their local text has the local ones in the same order, and those are shown.
 [[nodiscard]] Answer<TzString>
 askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defaultWord = nullptr);
 [[nodiscard]] Answer<double> askReal(wchar_t const* question, double defaultValue);
@@ -31,13 +32,16 @@ askLength(wchar_t const* question, TzGePoint3d const* base, double defaultValue 
 [[nodiscard]] Answer<double> askAngle(wchar_t const* question, double defaultRadians);
 [[nodiscard]] Answer<bool> askYesNo(wchar_t const* question, bool defaultYes);
 
-// A point in user coordinates or, with `keywords` not null, a keyword in `word`.
+// A point in user coordinates or, with `keywords` as askKeyword takes them, a global word in
+// `word`. The default word is what the caller takes an empty answer for.
 struct PointAnswer {
     Asked asked = Asked::cancelled;
     TzGePoint3d point;
     TzString word;
 };
-[[nodiscard]] PointAnswer
-askPoint(wchar_t const* question, TzGePoint3d const* base, wchar_t const* keywords = nullptr);
+[[nodiscard]] PointAnswer askPoint(wchar_t const* question,
+                                   TzGePoint3d const* base,
+                                   wchar_t const* keywords = nullptr,
+                                   wchar_t const* defaultWord = nullptr);
 
 }  // namespace tzdraft

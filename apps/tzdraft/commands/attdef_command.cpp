@@ -1,12 +1,13 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/text_command.h"
+#include "apps/tzdraft/local_text.h"
 #include "host/database/geometry.h"
 #include "tz/ed/print.h"
 
 namespace tzdraft {
 namespace {
 
-constexpr wchar_t kKinds[] = L"Single Multiple";
+constexpr wchar_t const* kKinds = forLocalText(L"Single Multiple");
 
 bool isTag(TzString const& text) {
     return !text.isEmpty() && text.findOneOf(L" \t") < 0;
@@ -27,17 +28,17 @@ std::unique_ptr<TzDbMText> linesOf(TextPlace const& place, TzString const& conte
 
 void attdefCommand() {
     Answer<TzString> const kind =
-        askKeyword(L"Lines of the attribute [Single/Multiple]", kKinds, L"Single");
+        askKeyword(localText(L"Lines of the attribute"), kKinds, L"Single");
     if (kind.isCancelled()) return;
-    Answer<TzString> const tag = askText(L"Attribute tag");
+    Answer<TzString> const tag = askText(localText(L"Attribute tag"));
     if (tag.asked != Asked::given) return;
     if (!isTag(tag.value)) {
-        tzutPrintf(L"\nA tag has no blanks.\n");
+        tzutPrintf(localText(L"\nA tag has no blanks.\n"));
         return;
     }
-    Answer<TzString> const prompt = askText(L"Prompt for its value", tag.value);
+    Answer<TzString> const prompt = askText(localText(L"Prompt for its value"), tag.value);
     if (prompt.isCancelled()) return;
-    Answer<TzString> const value = askText(L"Default value");
+    Answer<TzString> const value = askText(localText(L"Default value"));
     if (value.isCancelled()) return;
     std::optional<TextPlace> const place = askTextPlace();
     if (!place) return;

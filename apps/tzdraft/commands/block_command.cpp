@@ -3,6 +3,7 @@
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "host/database/user_system.h"
 #include "tz/db/block_table.h"
@@ -89,15 +90,16 @@ void moveInto(TzDbObjectId id, std::vector<TzDbObjectId> const& entities, TzGePo
 }  // namespace
 
 void blockCommand() {
-    Answer<TzString> const name = askText(L"Name of the new block");
+    Answer<TzString> const name = askText(localText(L"Name of the new block"));
     if (name.asked != Asked::given) return;
-    PointAnswer const base = askPoint(L"Base point", nullptr);
+    PointAnswer const base = askPoint(localText(L"Base point"), nullptr);
     if (base.asked != Asked::given) return;
     std::vector<TzDbObjectId> const entities = selectEntities(OnLockedLayers::leftOut);
     if (entities.empty()) return;
     TzDbObjectId const block = newBlock(name.value);
     if (block.isNull()) {
-        tzutPrintf(L"\n\"%ls\" cannot be the name of a new block.\n", name.value.kwszPtr());
+        tzutPrintf(localText(L"\n\"%ls\" cannot be the name of a new block.\n"),
+                   name.value.kwszPtr());
         return;
     }
     moveInto(block, entities, base.point);

@@ -1,14 +1,15 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/placing.h"
+#include "apps/tzdraft/local_text.h"
 #include "tz/db/shapes.h"
 
 namespace tzdraft {
 
 void circleCommand() {
-    PointAnswer const center = askPoint(L"Center point", nullptr);
+    PointAnswer const center = askPoint(localText(L"Center point"), nullptr);
     if (center.asked != Asked::given) return;
-    Answer<double> const radius = askLength(L"Radius", &center.point);
+    Answer<double> const radius = askLength(localText(L"Radius"), &center.point);
     if (radius.asked != Asked::given) return;
     auto circle = newEntity<TzDbCircle>();
     (void)circle->setCenter(toWorld(center.point));  // the host takes only finite points

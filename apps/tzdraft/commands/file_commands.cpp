@@ -2,6 +2,7 @@
 
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "tz/ed/print.h"
 
@@ -28,7 +29,7 @@ void newCommand() {
 }
 
 void openCommand() {
-    withFile(L"Drawing to open", TzString(),
+    withFile(localText(L"Drawing to open"), TzString(),
              [](std::filesystem::path const& file, std::string& error) {
                  return Session::current().open(file, error);
              });
@@ -36,14 +37,14 @@ void openCommand() {
 
 void saveCommand() {
     TzString const present = TzString::fromUtf8(Session::current().drawing().file().string());
-    withFile(L"Save drawing as", present,
+    withFile(localText(L"Save drawing as"), present,
              [](std::filesystem::path const& file, std::string& error) {
                  return Session::current().save(file, error);
              });
 }
 
 void plotCommand() {
-    withFile(L"File to plot to", TzString(),
+    withFile(localText(L"File to plot to"), TzString(),
              [](std::filesystem::path const& file, std::string& error) {
                  return Session::current().plot(file, error);
              });

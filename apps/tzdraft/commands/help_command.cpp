@@ -1,23 +1,32 @@
+#include <algorithm>
 #include <map>
 
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/help_topics.h"
+#include "apps/tzdraft/local_text.h"
 #include "host/runtime/command_stack.h"
 #include "tz/ed/print.h"
 
 namespace tzdraft {
 namespace {
 
+constexpr std::size_t kNameWidth = 16;
+
+// By the name as it is shown: the local one, and the global one where that is another.
 void listCommands() {
-    std::map<std::wstring, std::wstring> byName;
+    std::map<std::wstring, std::wstring> helpByName;
+    std::size_t width = kNameWidth;
     for (tzhost::Command const& each : tzhost::commandStack().commands()) {
-        byName[each.globalName.str()] = each.localName.str();
+        std::wstring name = each.localName.str();
+        if (each.localName != each.globalName) name += L" (_" + each.globalName.str() + L")";
+        width = std::max(width, name.size());
+        std::wstring const text = helpFor(each.globalName);
+        helpByName[name] = text.substr(0, text.find(L'\n'));
     }
-    for (auto const& [global, local] : byName) {
-        std::wstring const text = helpFor(global);
-        std::wstring const name = local == global ? global : local + L" (_" + global + L")";
-        tzutPrintf(L"\n%-16ls %ls", name.c_str(), text.substr(0, text.find(L'\n')).c_str());
+    for (auto const& [name, text] : helpByName) {
+        std::wstring const blanks(width - name.size(), L' ');
+        tzutPrintf(L"\n%ls%ls %ls", name.c_str(), blanks.c_str(), text.c_str());
     }
     tzutPrintf(L"\n");
 }
@@ -25,13 +34,13 @@ void listCommands() {
 }  // namespace
 
 void helpCommand() {
-    Answer<TzString> const name = askText(L"Command, or Enter for the list");
+    Answer<TzString> const name = askText(localText(L"Command, or Enter for the list"));
     if (name.isCancelled()) return;
     if (name.asked == Asked::empty) return listCommands();
     tzhost::Command const* const command = tzhost::commandStack().find(name.value);
     std::wstring const text = helpFor(command ? command->globalName : name.value);
     if (text.empty()) {
-        tzutPrintf(L"\nThere is no help on \"%ls\".\n", name.value.kwszPtr());
+        tzutPrintf(localText(L"\nThere is no help on \"%ls\".\n"), name.value.kwszPtr());
     } else {
         tzutPrintf(L"\n%ls\n", text.c_str());
     }

@@ -9,7 +9,7 @@ inline constexpr wchar_t kHostCommandGroup[] = L"TZDRAFT";
 
 // A command of the program itself, beside those of modules.
 struct HostCommand {
-    wchar_t const* name;
+    wchar_t const* name;  // the global one; its local text is the local one
     void (*body)();
     int flags;            // as the command stack takes them
     wchar_t const* help;  // one sentence, or several apart by line feeds

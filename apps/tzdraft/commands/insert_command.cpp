@@ -4,6 +4,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "tz/db/block_table.h"
 #include "tz/db/shapes.h"
@@ -75,11 +76,11 @@ TzDbObjectId blockNamed(TzString const& name) {
 
 // Asks where it stands; null after a cancel.
 std::unique_ptr<TzDbBlockReference> askReference(TzDbObjectId block) {
-    PointAnswer const point = askPoint(L"Insertion point", nullptr);
+    PointAnswer const point = askPoint(localText(L"Insertion point"), nullptr);
     if (point.asked != Asked::given) return nullptr;
-    Answer<double> const scale = askLength(L"Scale", nullptr, 1);
+    Answer<double> const scale = askLength(localText(L"Scale"), nullptr, 1);
     if (scale.asked != Asked::given) return nullptr;
-    Answer<double> const angle = askAngle(L"Rotation angle", 0);
+    Answer<double> const angle = askAngle(localText(L"Rotation angle"), 0);
     if (angle.isCancelled()) return nullptr;
     UserPlane const plane = userPlane();
     auto reference = newEntity<TzDbBlockReference>();
@@ -109,11 +110,11 @@ void postWith(std::unique_ptr<TzDbBlockReference> reference, std::vector<Wanted>
 }  // namespace
 
 void insertCommand() {
-    Answer<TzString> const name = askText(L"Block to insert");
+    Answer<TzString> const name = askText(localText(L"Block to insert"));
     if (name.asked != Asked::given) return;
     TzDbObjectId const block = blockNamed(name.value);
     if (block.isNull()) {
-        tzutPrintf(L"\nThere is no block \"%ls\".\n", name.value.kwszPtr());
+        tzutPrintf(localText(L"\nThere is no block \"%ls\".\n"), name.value.kwszPtr());
         return;
     }
     std::unique_ptr<TzDbBlockReference> reference = askReference(block);

@@ -2,6 +2,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/color_text.h"
 #include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "tz/ed/print.h"
 
@@ -14,7 +15,7 @@ TzDbObjectId layerNamed(TzString const& name) {
     if (Session::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk) return id;
     Opened<TzDbLayerTable> const opened(table);
     if (table->getIdAt(name, id) != Tzad::eOk) {
-        tzutPrintf(L"\nThere is no layer \"%ls\".\n", name.kwszPtr());
+        tzutPrintf(localText(L"\nThere is no layer \"%ls\".\n"), name.kwszPtr());
     }
     return id;
 }
@@ -30,7 +31,8 @@ void makeCurrent(TzDbObjectId layer) {
 }
 
 bool make() {
-    Answer<TzString> const name = askText(L"Name of the new layer, which becomes current");
+    Answer<TzString> const name =
+        askText(localText(L"Name of the new layer, which becomes current"));
     if (name.asked != Asked::given) return !name.isCancelled();
     TzDbLayerTable* table = nullptr;
     if (Session::current().drawing().getLayerTable(table, TzDb::kForWrite) != Tzad::eOk)
@@ -38,13 +40,13 @@ bool make() {
     Opened<TzDbLayerTable> const opened(table);
     TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name.value);
     if (id.isNull())
-        tzutPrintf(L"\n\"%ls\" cannot be the name of a layer.\n", name.value.kwszPtr());
+        tzutPrintf(localText(L"\n\"%ls\" cannot be the name of a layer.\n"), name.value.kwszPtr());
     makeCurrent(id);
     return true;
 }
 
 bool set() {
-    Answer<TzString> const name = askText(L"Layer to make current", currentLayerName());
+    Answer<TzString> const name = askText(localText(L"Layer to make current"), currentLayerName());
     if (name.asked == Asked::given) makeCurrent(layerNamed(name.value));
     return !name.isCancelled();
 }
@@ -61,24 +63,24 @@ bool changeNamed(wchar_t const* question, Change change) {
 }
 
 bool color() {
-    Answer<TzString> const text = askText(L"Colour, 1 to 255 or #RRGGBB", L"7");
+    Answer<TzString> const text = askText(localText(L"Colour, 1 to 255 or #RRGGBB"), L"7");
     if (text.asked != Asked::given) return !text.isCancelled();
     std::optional<TzCmColor> const chosen = readColor(text.value.str());
     if (!chosen) {
-        tzutPrintf(L"\n\"%ls\" is no colour.\n", text.value.kwszPtr());
+        tzutPrintf(localText(L"\n\"%ls\" is no colour.\n"), text.value.kwszPtr());
         return true;
     }
-    return changeNamed(L"Layer to colour",
+    return changeNamed(localText(L"Layer to colour"),
                        [&](TzDbLayerTableRecord& layer) { (void)layer.setColor(*chosen); });
 }
 
 bool lock() {
-    return changeNamed(L"Layer to lock",
+    return changeNamed(localText(L"Layer to lock"),
                        [](TzDbLayerTableRecord& layer) { (void)layer.setIsLocked(true); });
 }
 
 bool unlock() {
-    return changeNamed(L"Layer to unlock",
+    return changeNamed(localText(L"Layer to unlock"),
                        [](TzDbLayerTableRecord& layer) { (void)layer.setIsLocked(false); });
 }
 
@@ -92,10 +94,11 @@ bool list() {
     for (walk->start(); !walk->done(); walk->step()) {
         Opened<TzDbLayerTableRecord> const layer(walk->getRecordId(), TzDb::kForRead);
         if (!layer) continue;
-        tzutPrintf(L"\n\"%ls\", colour %ls%ls", layer->getName(),
-                   writeColor(layer->color()).c_str(), layer->isLocked() ? L", locked" : L"");
+        tzutPrintf(localText(L"\n\"%ls\", colour %ls%ls"), layer->getName(),
+                   writeColor(layer->color()).c_str(),
+                   layer->isLocked() ? localText(L", locked") : L"");
     }
-    tzutPrintf(L"\nCurrent layer: \"%ls\".\n", currentLayerName().kwszPtr());
+    tzutPrintf(localText(L"\nCurrent layer: \"%ls\".\n"), currentLayerName().kwszPtr());
     return true;
 }
 
@@ -105,7 +108,7 @@ struct Choice {
     bool (*action)();
 };
 
-constexpr wchar_t kWords[] = L"Make Set Color LOck Unlock ?";
+constexpr wchar_t const* kWords = forLocalText(L"Make Set Color LOck Unlock ?");
 constexpr Choice kChoices[] = {
     {L"Make",   make  },
     {L"Set",    set   },
@@ -126,7 +129,7 @@ bool act(TzString const& word) {
 
 void layerCommand() {
     for (;;) {
-        Answer<TzString> const word = askKeyword(L"[Make/Set/Color/LOck/Unlock/?]", kWords);
+        Answer<TzString> const word = askKeyword(L"", kWords);
         if (word.asked != Asked::given || !act(word.value)) return;
     }
 }

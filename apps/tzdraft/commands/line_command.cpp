@@ -1,13 +1,14 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/placing.h"
+#include "apps/tzdraft/local_text.h"
 #include "tz/db/shapes.h"
 
 namespace tzdraft {
 void lineCommand() {
-    PointAnswer from = askPoint(L"First point", nullptr);
+    PointAnswer from = askPoint(localText(L"First point"), nullptr);
     while (from.asked == Asked::given) {
-        PointAnswer const to = askPoint(L"Next point", &from.point);
+        PointAnswer const to = askPoint(localText(L"Next point"), &from.point);
         if (to.asked != Asked::given) return;
         auto line = newEntity<TzDbLine>();
         (void)line->setStartPoint(toWorld(from.point));  // the host takes only finite points

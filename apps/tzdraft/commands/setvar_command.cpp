@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/local_text.h"
 #include "host/base/variable_table.h"
 #include "host/base/variables.h"
 #include "tz/ed/print.h"
@@ -14,7 +15,7 @@ void listVariables() {
         if (!value) continue;
         tzutPrintf(L"\n%-22ls %ls%ls", std::wstring(each.name).c_str(),
                    tzhost::writeValue(*value).c_str(),
-                   each.access == tzhost::Access::readOnly ? L" (read only)" : L"");
+                   each.access == tzhost::Access::readOnly ? localText(L" (read only)") : L"");
     }
     tzutPrintf(L"\n");
 }
@@ -22,18 +23,19 @@ void listVariables() {
 }  // namespace
 
 void setvarCommand() {
-    Answer<TzString> const name = askText(L"Variable name or [?]");
+    Answer<TzString> const name = askText(localText(L"Variable name or [?]"));
     if (name.asked != Asked::given) return;
     if (name.value == L"?") return listVariables();
     tzhost::Variables& variables = tzhost::Variables::instance();
     tzhost::VariableValue const* const present = variables.get(name.value.str());
     if (!present) {
-        tzutPrintf(L"\nThere is no system variable \"%ls\"; ? lists them.\n", name.value.kwszPtr());
+        tzutPrintf(localText(L"\nThere is no system variable \"%ls\"; ? lists them.\n"),
+                   name.value.kwszPtr());
         return;
     }
     TzString const shown(tzhost::writeValue(*present));
-    Answer<TzString> const value = askText(
-        TzString::formatted(L"New value for %ls <%ls>", name.value.kwszPtr(), shown.kwszPtr()));
+    Answer<TzString> const value = askText(TzString::formatted(
+        localText(L"New value for %ls <%ls>"), name.value.kwszPtr(), shown.kwszPtr()));
     if (value.asked != Asked::given) return;
     // "." stands for the empty text, which Enter cannot give.
     std::wstring const text = value.value == L"." ? std::wstring() : value.value.str();

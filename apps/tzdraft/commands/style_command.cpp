@@ -1,6 +1,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "tz/db/extensions.h"
 #include "tz/ed/print.h"
@@ -64,25 +65,25 @@ bool askFont(StyleAnswers& values) {
     TzString shown = values.font;
     if (isFontFile(shown) && !values.bigFont.isEmpty()) shown += L"," + values.bigFont;
     TzString answer;
-    if (!take(askText(L"Font file or typeface", shown), answer)) return false;
+    if (!take(askText(localText(L"Font file or typeface"), shown), answer)) return false;
     int const comma = answer.find(L',');
     bool const isPair = comma >= 0 && isFontFile(answer.left(comma));
     values.font = isPair ? answer.left(comma) : answer;
     values.bigFont = isPair ? answer.mid(comma + 1) : TzString();
     if (isFontFile(values.font)) return true;
-    return take(askYesNo(L"Bold?", values.bold), values.bold) &&
-           take(askYesNo(L"Italic?", values.italic), values.italic);
+    return take(askYesNo(localText(L"Bold?"), values.bold), values.bold) &&
+           take(askYesNo(localText(L"Italic?"), values.italic), values.italic);
 }
 
 bool askAll(StyleAnswers& values) {
     return askFont(values) &&
-           take(askReal(L"Text height, 0 for any", values.height), values.height) &&
-           take(askReal(L"Width factor", values.widthFactor), values.widthFactor) &&
-           take(askAngle(L"Obliquing angle", values.oblique), values.oblique) &&
-           take(askYesNo(L"Backward?", values.backward), values.backward) &&
-           take(askYesNo(L"Upside-down?", values.upsideDown), values.upsideDown) &&
-           take(askYesNo(L"Vertical?", values.vertical), values.vertical) &&
-           take(askYesNo(L"Annotative?", values.annotative), values.annotative);
+           take(askReal(localText(L"Text height, 0 for any"), values.height), values.height) &&
+           take(askReal(localText(L"Width factor"), values.widthFactor), values.widthFactor) &&
+           take(askAngle(localText(L"Obliquing angle"), values.oblique), values.oblique) &&
+           take(askYesNo(localText(L"Backward?"), values.backward), values.backward) &&
+           take(askYesNo(localText(L"Upside-down?"), values.upsideDown), values.upsideDown) &&
+           take(askYesNo(localText(L"Vertical?"), values.vertical), values.vertical) &&
+           take(askYesNo(localText(L"Annotative?"), values.annotative), values.annotative);
 }
 
 // The first refusal, or eOk.
@@ -138,20 +139,20 @@ void styleCommand() {
                                                        TzDb::kForRead);
         if (present) name = present->getName();
     }
-    if (!take(askText(L"Text style name", name), name)) return;
+    if (!take(askText(localText(L"Text style name"), name), name)) return;
     StyleAnswers values = startingValues(name);
     if (!askAll(values)) return;
     TzDbObjectId const id = styleNamed(name);
     Opened<TzDbTextStyleTableRecord> const style(id, TzDb::kForWrite);
     if (!style) {
-        tzutPrintf(L"\n\"%ls\" cannot be the name of a text style.\n", name.kwszPtr());
+        tzutPrintf(localText(L"\n\"%ls\" cannot be the name of a text style.\n"), name.kwszPtr());
         return;
     }
     if (write(*style.get(), values) != Tzad::eOk) {
-        tzutPrintf(L"\nOne of these values cannot be kept; the others are.\n");
+        tzutPrintf(localText(L"\nOne of these values cannot be kept; the others are.\n"));
     }
     if (Session::current().drawing().setTextstyle(id) == Tzad::eOk) {
-        tzutPrintf(L"\n\"%ls\" is now the current text style.\n", name.kwszPtr());
+        tzutPrintf(localText(L"\n\"%ls\" is now the current text style.\n"), name.kwszPtr());
     }
 }
 

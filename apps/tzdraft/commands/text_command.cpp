@@ -2,6 +2,7 @@
 
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/record.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "host/base/variables.h"
 #include "tz/db/host_services.h"
@@ -28,7 +29,8 @@ bool askHeight(TzGePoint3d const& start, double& height) {
     height = heightOfStyle();
     if (height > 0) return true;
     tzhost::Variables& variables = tzhost::Variables::instance();
-    Answer<double> const answer = askLength(L"Text height", &start, variables.number(L"TEXTSIZE"));
+    Answer<double> const answer =
+        askLength(localText(L"Text height"), &start, variables.number(L"TEXTSIZE"));
     if (answer.asked != Asked::given) return false;
     height = answer.value;
     // A length above 0 is within the limits.
@@ -39,10 +41,10 @@ bool askHeight(TzGePoint3d const& start, double& height) {
 }  // namespace
 
 std::optional<TextPlace> askTextPlace() {
-    PointAnswer const start = askPoint(L"Start point", nullptr);
+    PointAnswer const start = askPoint(localText(L"Start point"), nullptr);
     TextPlace place;
     if (start.asked != Asked::given || !askHeight(start.point, place.height)) return std::nullopt;
-    Answer<double> const angle = askAngle(L"Rotation angle", 0);
+    Answer<double> const angle = askAngle(localText(L"Rotation angle"), 0);
     if (angle.isCancelled()) return std::nullopt;
     UserPlane const plane = userPlane();
     place.position = toWorld(start.point);
@@ -63,7 +65,7 @@ void placeText(TzDbText& text, TextPlace const& place) {
 void textCommand() {
     std::optional<TextPlace> const place = askTextPlace();
     if (!place) return;
-    Answer<TzString> const contents = askText(L"Text");
+    Answer<TzString> const contents = askText(localText(L"Text"));
     if (contents.asked != Asked::given) return;
     auto text = newEntity<TzDbText>();
     placeText(*text, *place);

@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "host/database/user_system.h"
 #include "tz/ed/print.h"
@@ -19,7 +20,7 @@ void makeCurrent(TzGeMatrix3d const& system) {
     tzhost::UserSystem user;
     TzGeVector3d zAxis;
     system.getCoordSystem(user.origin, user.xAxis, user.yAxis, zAxis);
-    if (!tzhost::setUserSystem(user)) tzutPrintf(L"\nThat is no coordinate system.\n");
+    if (!tzhost::setUserSystem(user)) tzutPrintf(localText(L"\nThat is no coordinate system.\n"));
 }
 
 // Makes a system that is given in the present one current, for good.
@@ -28,7 +29,7 @@ void use(TzGeMatrix3d const& inPresent) {
 }
 
 void turn(TzGeVector3d const& axis) {
-    Answer<double> const angle = askAngle(L"Rotation angle", 0);
+    Answer<double> const angle = askAngle(localText(L"Rotation angle"), 0);
     if (angle.asked == Asked::given)
         use(TzGeMatrix3d::rotation(angle.value, axis, TzGePoint3d::kOrigin));
 }
@@ -48,17 +49,17 @@ void world() {
 }
 
 void threePoints() {
-    PointAnswer const origin = askPoint(L"New origin", nullptr);
+    PointAnswer const origin = askPoint(localText(L"New origin"), nullptr);
     if (origin.asked != Asked::given) return;
-    PointAnswer const onX = askPoint(L"Point on the positive X axis", &origin.point);
+    PointAnswer const onX = askPoint(localText(L"Point on the positive X axis"), &origin.point);
     if (onX.asked != Asked::given) return;
     PointAnswer const towardsY =
-        askPoint(L"Point on the side of the positive Y axis", &origin.point);
+        askPoint(localText(L"Point on the side of the positive Y axis"), &origin.point);
     if (towardsY.asked != Asked::given) return;
     TzGeVector3d x = onX.point - origin.point;
     TzGeVector3d z = x.crossProduct(towardsY.point - origin.point);
     if (x.isZeroLength() || z.isZeroLength()) {
-        tzutPrintf(L"\nThe three points lie on one line.\n");
+        tzutPrintf(localText(L"\nThe three points lie on one line.\n"));
         return;
     }
     x.normalize();
@@ -73,7 +74,7 @@ struct Choice {
     void (*action)();
 };
 
-constexpr wchar_t kWords[] = L"World X Y Z 3point";
+constexpr wchar_t const* kWords = forLocalText(L"World X Y Z 3point");
 constexpr Choice kChoices[] = {
     {L"World",  world      },
     {L"X",      turnX      },
@@ -86,7 +87,7 @@ constexpr Choice kChoices[] = {
 
 void ucsCommand() {
     PointAnswer const answer =
-        askPoint(L"Origin of the user system or [World/X/Y/Z/3point] <World>", nullptr, kWords);
+        askPoint(localText(L"Origin of the user system or"), nullptr, kWords, L"World");
     if (answer.asked == Asked::cancelled) return;
     if (answer.asked == Asked::empty) return world();
     if (answer.word.isEmpty()) return use(TzGeMatrix3d::translation(answer.point.asVector()));

@@ -1,0 +1,11 @@
+#pragma once
+
+#include "host/base/local_text.h"
+
+// The program's texts are looked up among the host's.
+namespace tzdraft {
+
+using tzhost::forLocalText;
+using tzhost::localText;
+
+}  // namespace tzdraft

@@ -1,0 +1,29 @@
+#pragma once
+
+// Languages beside English: each has a folder, named for a locale such as "de_AT" or for a language
+// such as "de", beside the files that it translates.
+//
+//   lib/tzmted.help      English
+//   lib/de/tzmted.help   the same in German
+
+#include <filesystem>
+#include <optional>
+#include <string>
+#include <vector>
+
+namespace tzhost {
+
+// A locale without code page and modifier, "de_AT" of "de_AT.UTF-8@euro"; empty for English and for
+// the names that stand for no language, "C" and "POSIX".
+[[nodiscard]] std::string localeName(std::string const& locale);
+
+// The file of that name for the locale, else for its language, in their folders under `folder`;
+// nothing when neither has one, and for English.
+[[nodiscard]] std::optional<std::filesystem::path> translatedFile(
+    std::filesystem::path const& folder, std::string const& locale, std::string const& name);
+
+// The names of the folders under `folder` that hold a file of that name, sorted.
+[[nodiscard]] std::vector<std::string> languagesWith(std::filesystem::path const& folder,
+                                                     std::string const& name);
+
+}  // namespace tzhost
