@@ -14,11 +14,12 @@ std::string localeName(std::string const& locale) {
 
 std::optional<fs::path>
 translatedFile(fs::path const& folder, std::string const& locale, std::string const& name) {
+    // A locale is a plain word: one that would lead elsewhere is none.
+    if (locale.find('/') != locale.npos) return std::nullopt;
     std::string const whole = localeName(locale);
     std::string const language = whole.substr(0, whole.find_first_of("_-"));
     for (std::string const& part : {whole, language}) {
-        // A locale is a plain word: one that would lead elsewhere is none.
-        if (part.empty() || part.find('/') != part.npos) continue;
+        if (part.empty()) continue;
         fs::path file = folder / part / name;
         std::error_code unreadable;  // as good as none
         if (fs::exists(file, unreadable)) return file;
