@@ -74,7 +74,7 @@ std::string localeOfUser() {
 bool isLanguageThere(Options const& options, std::string& error) {
     std::filesystem::path const folder = modulePath(options).parent_path();
     std::string const library = TzString(kResourceName).toUtf8();
-    bool const isThere = !options.resources.empty() || tzhost::localeName(options.locale).empty() ||
+    bool const isThere = !options.resources.empty() || tzhost::isEnglish(options.locale) ||
                          tzhost::translatedFile(folder, options.locale, library);
     if (isThere) return true;
     error = "--locale " + options.locale + ": " +

@@ -6,19 +6,31 @@ namespace tzhost {
 
 namespace fs = std::filesystem;
 
-std::string localeName(std::string const& locale) {
-    std::string name = locale.substr(0, locale.find_first_of(".@"));
-    std::string const language = name.substr(0, name.find_first_of("_-"));
-    return language == "C" || language == "POSIX" || language == "en" ? std::string() : name;
+namespace {
+
+// Without code page and modifier: "de_AT" of "de_AT.UTF-8@euro".
+std::string nameOf(std::string const& locale) {
+    return locale.substr(0, locale.find_first_of(".@"));
+}
+
+// The language of a name without them.
+std::string languageOf(std::string const& name) {
+    return name.substr(0, name.find_first_of("_-"));
+}
+
+}  // namespace
+
+bool isEnglish(std::string const& locale) {
+    std::string const language = languageOf(nameOf(locale));
+    return locale.empty() || language == "C" || language == "POSIX" || language == "en";
 }
 
 std::optional<fs::path>
 translatedFile(fs::path const& folder, std::string const& locale, std::string const& name) {
     // A locale is a plain word: one that would lead elsewhere is none.
-    if (locale.find('/') != locale.npos) return std::nullopt;
-    std::string const whole = localeName(locale);
-    std::string const language = whole.substr(0, whole.find_first_of("_-"));
-    for (std::string const& part : {whole, language}) {
+    if (isEnglish(locale) || locale.find('/') != locale.npos) return std::nullopt;
+    std::string const whole = nameOf(locale);
+    for (std::string const& part : {whole, languageOf(whole)}) {
         if (part.empty()) continue;
         fs::path file = folder / part / name;
         std::error_code unreadable;  // as good as none

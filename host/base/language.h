@@ -13,12 +13,13 @@
 
 namespace tzhost {
 
-// A locale without code page and modifier, "de_AT" of "de_AT.UTF-8@euro"; empty for English and for
-// the names that stand for no language, "C" and "POSIX".
-[[nodiscard]] std::string localeName(std::string const& locale);
+// Whether the locale is an English one, empty, or one of the names that stand for no language, "C"
+// and "POSIX".
+[[nodiscard]] bool isEnglish(std::string const& locale);
 
 // The file of that name for the locale, else for its language, in their folders under `folder`;
-// nothing when neither has one, and for English.
+// nothing when neither has one, and for English. Code page and modifier of the locale do not count:
+// "de_AT.UTF-8@euro" is looked for under "de_AT", then under "de".
 [[nodiscard]] std::optional<std::filesystem::path> translatedFile(
     std::filesystem::path const& folder, std::string const& locale, std::string const& name);
 
