@@ -43,7 +43,8 @@ constexpr HostileCase kRtf[] = {
     {"StrayInFonts",          L"{\\fonttbl",      L"\\x y;",                     200000,  1 },
     {"FontsOfOneNumber",      L"{\\fonttbl",      L"{\\f1 A;}",                  100000,  1 },
     {"NamesWithoutEnd",       L"{\\fonttbl",      L"{\\f1 A",                    100000,  1 },
-    {"Colors",                L"{\\colortbl",     L"\\red1;",                    200000,  1 },
+    {"Colors",                L"{\\colortbl",     L"\\red1;",                    500000,  1 },
+    {"StrayInColors",         L"{\\colortbl",     L"\\x y;{z}",                  200000,  1 },
     {"Paragraphs",            L"",                L"\\pard",                     200000,  1 },
     {"ParagraphsWithIndents", L"",                L"\\pard\\li5",                100000,  1 },
     {"ParagraphsWithOneTab",  L"",                L"\\pard\\tx50",               100000,  1 },
@@ -115,10 +116,10 @@ TEST(LongNames, CostOnceEach) {
 TEST(ManyFonts, AreFoundByNumber) {
     Session session;
     std::wstring rtf = L"{\\fonttbl";
-    for (int i = 0; i < 50000; ++i)
+    for (int i = 0; i < 300000; ++i)
         rtf += L"{\\f" + std::to_wstring(2000000000 + i) + L" F" + std::to_wstring(i) + L";}";
-    rtf += L"}\\f2000049999 a";
-    EXPECT_STREQ(session.toMtext(rtf).c_str(), L"{\\fF49999|b0|i0|c0|p0;a}");
+    rtf += L"}\\f2000299999 a";
+    EXPECT_STREQ(session.toMtext(rtf).c_str(), L"{\\fF299999|b0|i0|c0|p0;a}");
 }
 
 // What is worked out at once must be what a search from each place finds.
