@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <iterator>
 
 #include "host/base/case_table.h"
 #include "host/base/utf8.h"
@@ -53,9 +54,13 @@ Completion complete(std::wstring_view start, std::vector<std::wstring> words, Ca
 
 Completion completeWord(std::wstring_view typed, std::vector<std::wstring> const& words) {
     std::size_t const blank = typed.find_last_of(L" \t");
-    std::wstring_view start = blank == std::wstring_view::npos ? typed : typed.substr(blank + 1);
-    if (start.starts_with(L'_')) start.remove_prefix(1);
-    return complete(start, words, Case::ignored);
+    std::wstring_view const start =
+        blank == std::wstring_view::npos ? typed : typed.substr(blank + 1);
+    bool const isGlobal = start.starts_with(L'_');
+    std::vector<std::wstring> offered;
+    std::copy_if(words.begin(), words.end(), std::back_inserter(offered),
+                 [&](std::wstring const& word) { return word.starts_with(L'_') == isGlobal; });
+    return complete(start, std::move(offered), Case::ignored);
 }
 
 Completion completeFile(std::wstring_view typed) {

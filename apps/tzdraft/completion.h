@@ -13,7 +13,7 @@ struct Completion {
 };
 
 // Of the word in front of the cursor, by words that compare without regard to case, and in lower
-// case behind a small letter; a "_" ahead of it stays.
+// case behind a small letter. Words of every language begin with "_" and are offered behind one.
 [[nodiscard]] Completion completeWord(std::wstring_view typed,
                                       std::vector<std::wstring> const& words);
 

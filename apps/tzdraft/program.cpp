@@ -133,6 +133,7 @@ std::vector<std::wstring> Run::commandNames() const {
     if (tzhost::commandLine().isScripted()) return names;
     for (tzhost::Command const& each : tzhost::commandStack().commands()) {
         names.push_back(each.localName.str());
+        names.push_back(L'_' + each.globalName.str());
     }
     return names;
 }

@@ -37,7 +37,7 @@ enum class QuestionKind {
 struct AnswerRequest {
     QuestionKind kind = QuestionKind::command;
     std::wstring_view prompt;         // ahead of the answer; to a terminal, one line that it shows
-    std::vector<std::wstring> words;  // what completion may offer
+    std::vector<std::wstring> words;  // what completion may offer, global words behind "_"
 };
 
 struct Answer {

@@ -19,8 +19,11 @@ std::wstring_view withoutBlanksAround(std::wstring_view text) {
 
 AnswerRequest requestFor(QuestionKind kind, std::wstring_view prompt, KeywordList const& words) {
     AnswerRequest request{kind, prompt, {}};
-    for (int i = 0; i < words.count(); ++i)
+    if (commandLine().isScripted()) return request;  // a script completes nothing
+    for (int i = 0; i < words.count(); ++i) {
         request.words.push_back(words.local(i));
+        request.words.push_back(L'_' + words.global(i));
+    }
     return request;
 }
 

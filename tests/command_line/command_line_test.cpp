@@ -97,7 +97,7 @@ TEST(Terminals, ShowEachLineOnce) {
     EXPECT_EQ(tzedGetReal(L"\nHow much: ", &value), Tzad::ePromptNormal);
     tzutPrintf(L"Done");
     EXPECT_EQ(screen, L"Command: MTEXT\nStarting\nWhich: b\nHow much: 7\nDone");
-    EXPECT_EQ(terminal.words, "230");
+    EXPECT_EQ(terminal.words, "260");
 }
 
 }  // namespace
