@@ -1,55 +1,23 @@
-// A drag of the text box over 100 cursor places, in a drawing with 10,000 entities. The floor is
+// A drag of the text box over 100 cursor places, in a drawing with 100,000 entities. The floor is
 // the same drag in a drawing with 10: a sample, which is an update and a redraw of the preview,
 // must not follow the size of the drawing.
 #include <benchmark/benchmark.h>
 
-#include <memory>
 #include <string>
 
 #include "bench/support/against_floor.h"
+#include "bench/support/filled_drawing.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/script_source.h"
-#include "host/database/drawing.h"
 #include "module/mtext/rectangle_jig.h"
 #include "module/prompt/jig_input.h"
-#include "tz/db/block_table.h"
-#include "tz/db/mtext.h"
-#include "tz/db/shapes.h"
 
 namespace {
 
 constexpr double kMost = 1.2;
 constexpr int kSmall = 10;
-constexpr int kLarge = 10000;
+constexpr int kLarge = 100000;
 constexpr int kPlaces = 100;
-
-std::unique_ptr<TzDbEntity> entityAt(int index) {
-    TzGePoint3d const place(index % 100, index / 100, 0);
-    if (index % 2 == 0) {
-        auto line = std::make_unique<TzDbLine>();
-        (void)line->setStartPoint(place);
-        return line;
-    }
-    auto text = std::make_unique<TzDbMText>();
-    text->setDatabaseDefaults();
-    (void)text->setLocation(place);
-    (void)text->setContents(L"A note");
-    return text;
-}
-
-std::unique_ptr<tzhost::Drawing> drawingWith(int count) {
-    auto drawing = tzhost::Drawing::create();
-    tzhost::setWorkingDrawing(drawing.get());
-    TzDbBlockTableRecord* space = nullptr;
-    if (tzdbOpenObject(space, drawing->modelSpace(), TzDb::kForWrite) != Tzad::eOk) return drawing;
-    for (int i = 0; i < count; ++i) {
-        auto entity = entityAt(i);
-        TzDbObjectId id;
-        if (space->appendTzDbEntity(id, entity.get()) == Tzad::eOk) entity.release()->close();
-    }
-    space->close();
-    return drawing;
-}
 
 std::string cursorPlaces() {
     std::string script;
@@ -71,8 +39,8 @@ int dragIn(tzhost::Drawing* drawing, std::string const& script) {
 }
 
 void dragBox(benchmark::State& state) {
-    auto const small = drawingWith(kSmall);
-    auto const large = drawingWith(kLarge);
+    auto const small = tzbench::drawingWith(kSmall);
+    auto const large = tzbench::drawingWith(kLarge);
     std::string const script = cursorPlaces();
     if (dragIn(large.get(), script) != statusNormal) state.SkipWithError("the drag was refused");
     tzbench::AgainstFloor against(state, kMost);

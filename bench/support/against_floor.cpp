@@ -1,6 +1,7 @@
 #include "bench/support/against_floor.h"
 
 #include <algorithm>
+#include <ctime>
 
 namespace tzbench {
 
@@ -17,6 +18,12 @@ double medianOf(std::vector<double>& values) {
 
 AgainstFloor::AgainstFloor(benchmark::State& state, double bound, int calls)
     : state_(state), bound_(bound), calls_(calls) {}
+
+double AgainstFloor::processorSeconds() {
+    timespec used{};
+    (void)clock_gettime(CLOCK_PROCESS_CPUTIME_ID, &used);  // cannot fail with these arguments
+    return static_cast<double>(used.tv_sec) + static_cast<double>(used.tv_nsec) * 1e-9;
+}
 
 AgainstFloor::~AgainstFloor() {
     double const work = medianOf(works_) / calls_;

@@ -2,12 +2,12 @@
 
 #include <benchmark/benchmark.h>
 
-#include <chrono>
 #include <vector>
 
 // Times work beside its floor, the least that the same job can cost. Both run in turns, so that
-// whatever else the machine does meets both alike; what is read is the ratio of the two medians,
-// which the counters tell beside its bound and the times of one call in seconds.
+// whatever else the machine does meets both alike, and processor time is what counts. What is read
+// is the ratio of the two medians, which the counters tell beside its bound and the times of one
+// call in seconds.
 //
 //   void readNumber(benchmark::State& state) {
 //       tzbench::AgainstFloor against(state, 5.0, 1000);
@@ -38,14 +38,17 @@ public:
     }
 
 private:
+    // What the process has used so far.
+    [[nodiscard]] static double processorSeconds();
+
     template <class Call>
     [[nodiscard]] double secondsOf(Call& call) const {
-        auto const start = std::chrono::steady_clock::now();
+        double const start = processorSeconds();
         for (int left = calls_; left > 1; --left)
             benchmark::DoNotOptimize(call());
         auto last = call();
         benchmark::DoNotOptimize(last);
-        return std::chrono::duration<double>(std::chrono::steady_clock::now() - start).count();
+        return processorSeconds() - start;
     }
 
     benchmark::State& state_;

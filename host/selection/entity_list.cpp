@@ -1,5 +1,6 @@
 #include "host/selection/entity_list.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "host/database/drawing.h"
@@ -56,9 +57,13 @@ EntityIds entitiesOfActiveSpace() {
 }
 
 EntityIds newestEntity() {
-    EntityIds const all = entitiesOfActiveSpace();
     EntityIds newest;
-    if (!all.isEmpty()) newest.append(all.last());
+    Drawing const* const drawing = workingDrawing();
+    ObjectList const* const list = drawing ? listOf(*drawing->activeSpace().record()) : nullptr;
+    if (list == nullptr) return newest;
+    auto const at = std::find_if(list->items.rbegin(), list->items.rend(),
+                                 [](auto const* record) { return !record->erased; });
+    if (at != list->items.rend()) newest.append(TzDbObjectId(*at));
     return newest;
 }
 

@@ -20,22 +20,30 @@ std::wstring counted(int count, wchar_t const* format) {
 Selecting::Selecting(SelectionMode mode, ListFilter filter)
     : mode_(mode), filter_(std::move(filter)) {}
 
+Selecting::Records& Selecting::members() {
+    for (; indexed_ < entities_.length(); ++indexed_)
+        members_.insert(entities_[indexed_].record());
+    return members_;
+}
+
 std::wstring Selecting::add(EntityIds const& ids) {
+    Records const& known = members();
     EntityIds fresh;
-    std::set<TzDbObjectId> seen;
     int locked = 0;
+    int leftOut = 0;
     for (TzDbObjectId const id : ids) {
-        if (members_.count(id) > 0 || !seen.insert(id).second || entityOf(id) == nullptr) continue;
+        if (entityOf(id) == nullptr || (!known.empty() && known.count(id.record()) > 0)) continue;
         if (mode_.leavesOutLocked && isOnLockedLayer(id)) {
             ++locked;
         } else if (filter_.lets(id)) {
             fresh.append(id);
+        } else {
+            ++leftOut;
         }
     }
+    leftOut += fresh.length();
     if (!fresh.isEmpty()) filterAdded(entities_, fresh);
-    for (TzDbObjectId const id : fresh)
-        members_.insert(id);
-    int const leftOut = static_cast<int>(seen.size()) - locked - fresh.length();
+    leftOut -= fresh.length();
     entities_.append(fresh);
     std::wstring report = counted(fresh.length(), localText(L"%d found"));
     if (locked > 0) report += counted(locked, localText(L", %d on a locked layer"));
@@ -44,19 +52,20 @@ std::wstring Selecting::add(EntityIds const& ids) {
 }
 
 std::wstring Selecting::remove(EntityIds const& ids) {
+    Records& known = members();
     EntityIds going;
-    std::set<TzDbObjectId> seen;
     for (TzDbObjectId const id : ids) {
-        if (members_.count(id) > 0 && seen.insert(id).second) going.append(id);
+        if (known.count(id.record()) > 0) going.append(id);
     }
     if (!going.isEmpty()) filterRemoved(entities_, going);
     for (TzDbObjectId const id : going)
-        members_.erase(id);
+        known.erase(id.record());
     EntityIds staying;
     for (TzDbObjectId const id : entities_) {
-        if (members_.count(id) > 0) staying.append(id);
+        if (known.count(id.record()) > 0) staying.append(id);
     }
     entities_ = std::move(staying);
+    indexed_ = entities_.length();
     return counted(going.length(), localText(L"%d removed"));
 }
 

@@ -1,7 +1,7 @@
 #pragma once
 
-#include <set>
 #include <string>
+#include <unordered_set>
 
 #include "host/selection/entity_list.h"
 #include "host/selection/list_filter.h"
@@ -19,7 +19,8 @@ class Selecting {
 public:
     Selecting(SelectionMode mode, ListFilter filter);
 
-    // Adds what is new, or takes out what is there. What the user is told about it: "2 found".
+    // Adds what is new, or takes out what is there, of ids that each stand there once. What the
+    // user is told about it: "2 found".
     std::wstring add(EntityIds const& ids);
     std::wstring remove(EntityIds const& ids);
     // Ends the selection: 5100 when something is selected, else -5001, or the status of a cancel or
@@ -28,10 +29,16 @@ public:
     [[nodiscard]] EntityIds const& entities() const { return entities_; }
 
 private:
+    using Records = std::unordered_set<TzDbObjectRecord const*>;
+
+    // The members as a set, which the first answer does without.
+    [[nodiscard]] Records& members();
+
     SelectionMode mode_;
     ListFilter filter_;
-    EntityIds entities_;              // in the order in which they were added
-    std::set<TzDbObjectId> members_;  // the same
+    EntityIds entities_;  // in the order in which they were added
+    Records members_;     // the first `indexed_` of them
+    int indexed_ = 0;
 };
 
 }  // namespace tzhost

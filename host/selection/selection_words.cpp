@@ -1,6 +1,7 @@
 #include "host/selection/selection_words.h"
 
 #include <algorithm>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -123,10 +124,11 @@ WordRow const* rowMeant(Words const& words) {
 
 Answered readHandles(Words const& words) {
     EntityIds ids;
+    std::set<TzDbObjectId> seen;
     for (std::wstring_view const word : words) {
         auto const picked = pickByHandles(word);
         if (!picked) return std::nullopt;
-        ids.append(picked->top);
+        if (seen.insert(picked->top).second) ids.append(picked->top);
     }
     return answerWith(std::move(ids));
 }
