@@ -1,3 +1,4 @@
+#include <csignal>
 #include <cstdio>
 #include <utility>
 
@@ -16,6 +17,7 @@ void write(std::FILE* stream, std::string_view text) {
 }  // namespace
 
 int main(int count, char** arguments) {
+    std::signal(SIGXFSZ, SIG_IGN);  // a limit on the size of files is an error like any other
     tzdraft::ParsedOptions const parsed = tzdraft::parseOptions(count, arguments);
     if (parsed.exit) return *parsed.exit;
     tzdraft::Screens screens;

@@ -3,6 +3,7 @@
 #include <exception>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/host_commands.h"
@@ -52,8 +53,9 @@ private:
     void beginCommand(tzhost::Command const& command);
     void endCommand(tzhost::Command const& command);
     int finish();
-    bool writeResults();
-    bool saveSettings();
+    void writeResults();
+    void saveSettings();
+    void note(std::filesystem::path const& result, std::string const& problem);
     bool complain(std::string const& error) const;
 
     Options const& options_;
@@ -63,6 +65,8 @@ private:
     Session session_;
     tzhost::FaultPlan faults_;
     SettingsState settings_ = SettingsState::unusable;
+    std::vector<std::string> problems_;  // with results, one line each
+    std::string written_;                // results, apart by commas
 };
 
 bool Run::complain(std::string const& error) const {
@@ -202,41 +206,61 @@ void Run::endCommand(tzhost::Command const& command) {
     tzhost::commandLine().setVoice(tzhost::CommandLine::Voice::module);
 }
 
-bool Run::writeResults() {
+// A result that was written, or why it was not.
+void Run::note(std::filesystem::path const& result, std::string const& problem) {
+    if (!problem.empty()) return problems_.push_back(problem);
+    if (!written_.empty()) written_ += ", ";
+    written_ += result.string();
+}
+
+// One that cannot be written keeps none of the others back.
+void Run::writeResults() {
     struct Plot {
         std::filesystem::path const& file;
         tzhost::PlotFormat format;
     };
-    bool done = true;
-    std::string error;
-    if (!options_.save.empty() && !session_.save(options_.save, error)) done = complain(error);
+    if (!options_.save.empty()) {
+        std::string error;
+        (void)session_.save(options_.save, error);  // the error says it
+        note(options_.save, error);
+    }
     for (Plot const& plot : {
              Plot{options_.svg, tzhost::PlotFormat::svg},
              Plot{options_.png, tzhost::PlotFormat::png},
              Plot{options_.pdf, tzhost::PlotFormat::pdf}
     }) {
-        if (plot.file.empty() || session_.plotAs(plot.format, plot.file, error)) continue;
-        done = complain(error);
+        if (plot.file.empty()) continue;
+        std::string error;
+        (void)session_.plotAs(plot.format, plot.file, error);
+        note(plot.file, error);
     }
-    return done;
 }
 
-bool Run::saveSettings() {
-    if (settings_ == SettingsState::unusable) return true;
-    auto const problem = tzhost::saveUserVariables(settingsFile(options_));
-    return !problem || complain(*problem);
+void Run::saveSettings() {
+    if (settings_ == SettingsState::unusable) return;
+    if (auto const problem = tzhost::saveUserVariables(settingsFile(options_))) {
+        problems_.push_back(*problem);
+    }
 }
 
 int Run::finish() {
     tzhost::commandLine().freshLine();
     faults_.remove();
-    std::string error;
-    bool written = writeResults();
-    if (!saveSettings()) written = false;
+    writeResults();
+    saveSettings();
     bool const leftOver = !tzhost::worstAudit().clean();
     tzhost::dynamicLinker().unloadAll();
-    if (!events_.finish(error)) written = complain(error);
-    if (!written) return kUnusable;
+    if (!options_.events.empty()) {
+        std::string error;
+        (void)events_.finish(error);
+        note(options_.events, error);
+    }
+    if (!problems_.empty()) {
+        if (!written_.empty()) problems_.back() += "; written: " + written_;
+        for (std::string const& problem : problems_)
+            complain(problem);
+        return kUnusable;
+    }
     if (leftOver) return kLeftOver;
     return tzhost::commandLine().hasFailed() ? kInputEnded : kDone;
 }

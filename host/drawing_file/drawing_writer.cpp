@@ -1,12 +1,9 @@
-#include <cerrno>
-
-#include "host/base/file_bytes.h"
 #include "host/base/local_text.h"
+#include "host/base/safe_file.h"
 #include "host/database/field_imp.h"
 #include "host/database/open_state.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/drawing_file/members.h"
-#include "host/drawing_file/safe_file.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 

@@ -50,7 +50,7 @@ private:
 [[noreturn]] void become(std::vector<std::string>& words, Terminal const& terminal, int report) {
     setpgid(0, 0);
     terminal.giveTo(getpid());
-    for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE})
+    for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE, SIGXFSZ})
         std::signal(each, SIG_DFL);
     std::vector<char*> arguments;
     for (std::string& word : words)

@@ -6,6 +6,7 @@
 #include <filesystem>
 #include <string>
 
+#include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -66,6 +67,18 @@ TEST_F(FileBytes, StayOldWhenTheyCannotBeWritten) {
     EXPECT_FALSE(tzhost::writeFileSafely(path("folder"), "new"));
     EXPECT_TRUE(fs::is_directory(path("folder")));
     EXPECT_EQ(filesThere(), 1);  // no temporary file is left
+}
+
+// It used to put a file in the place of the pipe, and of a device.
+TEST_F(FileBytes, GoIntoAPipeAsItIs) {
+    ASSERT_EQ(::mkfifo(path("pipe").c_str(), 0600), 0);
+    int const reader = ::open(path("pipe").c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC);
+    ASSERT_TRUE(tzhost::writeFileSafely(path("pipe"), "abc"));
+    char bytes[8];
+    EXPECT_EQ(::read(reader, bytes, sizeof bytes), 3);
+    EXPECT_TRUE(fs::is_fifo(path("pipe")));
+    EXPECT_EQ(filesThere(), 1);
+    ::close(reader);
 }
 
 TEST(InstallPaths, LeadToTheLibraries) {

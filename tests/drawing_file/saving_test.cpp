@@ -1,6 +1,7 @@
 #include <csignal>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
 #include <unistd.h>
 
 #include <gtest/gtest.h>
@@ -70,6 +71,41 @@ TEST_F(Saving, FailuresAreSaid) {
     EXPECT_EQ(tzhost::writeDrawing(*drawing_, file_), file_.string() + ": cannot be written");
     tzhost::setFaultHook(before);
     EXPECT_EQ(bytesOf(file_), "old");
+}
+
+// A drawing with texts enough that a save takes some milliseconds.
+std::string textsFor(int count) {
+    std::string text = "{\"format\": \"tz-drawing\", \"version\": 1, \"layers\": [],\n"
+                       "\"textStyles\": [], \"entities\": [";
+    for (int i = 0; i < count; ++i) {
+        text += i > 0 ? ",\n" : "\n";
+        text += "{\"type\": \"MTEXT\", \"contents\": \"Note " + std::to_string(i) + "\"}";
+    }
+    return text + "]}\n";
+}
+
+// Temporary files of killed saves stay beside, and are in nobody's way.
+TEST_F(Saving, KilledAtAnyMomentLeavesAWholeFile) {
+    writeBytes(file_, textsFor(300));
+    auto const read = tzhost::readDrawing(file_);
+    ASSERT_TRUE(read.drawing) << read.error;
+    ASSERT_EQ(tzhost::writeDrawing(*read.drawing, file_), "");  // measures the texts too
+    std::string const whole = bytesOf(file_);
+    for (int kills = 0; kills < 30; ++kills) {
+        writeBytes(file_, "old");
+        pid_t const child = fork();
+        if (child == 0) {
+            (void)tzhost::writeDrawing(*read.drawing, file_);
+            _exit(0);
+        }
+        usleep(static_cast<useconds_t>(kills * 300));
+        kill(child, SIGKILL);
+        waitpid(child, nullptr, 0);
+        std::string const left = bytesOf(file_);
+        EXPECT_TRUE(left == "old" || left == whole) << left.substr(0, 200);
+    }
+    EXPECT_EQ(tzhost::writeDrawing(*read.drawing, file_), "");
+    EXPECT_TRUE(bytesOf(file_) == whole);
 }
 
 }  // namespace

@@ -61,11 +61,12 @@ ProgramRun runProgram(std::vector<std::string> const& arguments) {
     return run;
 }
 
-ProgramRun startProgram(std::string const& arguments) {
+ProgramRun startProgram(std::string const& arguments, std::string const& before) {
     fs::path const output = scratch("program.out");
     fs::path const errors = scratch("program.err");
-    std::string const command = (folder("TZ_TEST_BIN") / "tzdraft").string() + " " + arguments +
-                                " </dev/null >" + output.string() + " 2>" + errors.string();
+    std::string const command = before + (folder("TZ_TEST_BIN") / "tzdraft").string() + " " +
+                                arguments + " </dev/null >" + output.string() + " 2>" +
+                                errors.string();
     int const status = std::system(command.c_str());
     return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, bytesOf(output), bytesOf(errors)};
 }

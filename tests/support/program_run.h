@@ -24,8 +24,9 @@ struct ProgramRun {
 
 // Arguments as on a command line, without the program's name; they must be right.
 [[nodiscard]] ProgramRun runProgram(std::vector<std::string> const& arguments);
-// The same in a process of its own, for arguments that may be wrong.
-[[nodiscard]] ProgramRun startProgram(std::string const& arguments);
+// The same in a process of its own, for arguments that may be wrong. `before` stands ahead of the
+// program for the shell, such as "ulimit -f 8; ".
+[[nodiscard]] ProgramRun startProgram(std::string const& arguments, std::string const& before = "");
 
 // Folders of this build and of the source tree.
 [[nodiscard]] std::filesystem::path libraryFolder();

@@ -220,16 +220,4 @@ TEST(LongLine, IsRefusedOnceAndTheQuestionAsksAgain) {
     EXPECT_NE(run.output.find("There is no command \"xxx"), std::string::npos);
 }
 
-TEST(Results, ThatCannotBeWrittenAreNamed) {
-    auto const script = scratch("quit.scr", "QUIT\n");
-    for (char const* const option : {"--save", "--svg", "--png", "--pdf"}) {
-        std::string const file = scratch("nosuch/result").string();
-        tztest::ProgramRun const run =
-            tztest::runProgram({"--script", script.string(), option, file});
-        EXPECT_EQ(run.status, 2) << option;
-        EXPECT_TRUE(run.errors.starts_with("tzdraft: " + file + ": cannot be written"))
-            << run.errors;
-    }
-}
-
 }  // namespace

@@ -1,16 +1,17 @@
-#include "host/drawing_file/safe_file.h"
+#include "host/base/safe_file.h"
 
 #include <cerrno>
 #include <csignal>
 #include <cstdlib>
+#include <cstring>
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
 #include <utility>
 
-#include "host/base/file_bytes.h"
+#include "host/base/local_text.h"
 
-namespace tzhost::drawingfile {
+namespace tzhost {
 namespace {
 
 // A file size limit must give an error, not end the process.
@@ -50,16 +51,25 @@ void flushFolder(std::filesystem::path const& folder) {
 }  // namespace
 
 SafeFile::SafeFile(std::filesystem::path const& target) : target_(target) {
+    namespace fs = std::filesystem;
     std::error_code error;
-    if (std::filesystem::is_symlink(target_, error)) {
-        auto const real = std::filesystem::canonical(target_, error);
+    if (fs::is_symlink(target_, error)) {
+        auto const real = fs::canonical(target_, error);
         if (!error) target_ = real;
     }
-    if (std::filesystem::is_directory(target_, error)) {
+    fs::file_status const old = fs::status(target_, error);
+    if (fs::is_directory(old)) {
         errno = EISDIR;
         (void)fail();
-        return;
+    } else if (fs::exists(old) && !fs::is_regular_file(old)) {
+        file_ = open(target_.c_str(), O_WRONLY | O_CLOEXEC);
+        if (file_ < 0) (void)fail();
+    } else {
+        makeTemporary();
     }
+}
+
+void SafeFile::makeTemporary() {
     temporary_ = (target_.parent_path() / ("." + target_.filename().string() + ".XXXXXX")).string();
     file_ = mkostemp(temporary_.data(), O_CLOEXEC);
     if (file_ < 0) {
@@ -76,13 +86,17 @@ SafeFile::~SafeFile() {
 }
 
 bool SafeFile::fail() {
-    if (reason_.empty()) reason_ = systemReason();
+    if (problem_ == 0) problem_ = errno;
     return false;
+}
+
+std::string SafeFile::reason() const {
+    return localText(std::strerror(problem_));
 }
 
 bool SafeFile::write(std::string_view bytes) {
     NoSizeSignal const quiet;
-    while (reason_.empty() && !bytes.empty()) {
+    while (problem_ == 0 && !bytes.empty()) {
         ssize_t const written = ::write(file_, bytes.data(), bytes.size());
         if (written > 0) {
             bytes.remove_prefix(static_cast<std::size_t>(written));
@@ -90,18 +104,20 @@ bool SafeFile::write(std::string_view bytes) {
             return fail();
         }
     }
-    return reason_.empty();
+    return problem_ == 0;
 }
 
 bool SafeFile::commit() {
-    if (!reason_.empty()) return false;
-    if (fsync(file_) != 0) return fail();
+    if (problem_ != 0) return false;
+    bool const isDevice = temporary_.empty();
+    if (!isDevice && fsync(file_) != 0) return fail();
     int const handle = std::exchange(file_, -1);
     if (close(handle) != 0) return fail();
+    if (isDevice) return true;
     if (rename(temporary_.c_str(), target_.c_str()) != 0) return fail();
     temporary_.clear();
     flushFolder(target_.parent_path());
     return true;
 }
 
-}  // namespace tzhost::drawingfile
+}  // namespace tzhost

@@ -1,0 +1,106 @@
+// Results that cannot be written: one line that says so, and the files that were there before.
+
+#include <gtest/gtest.h>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <algorithm>
+
+#include "tests/support/program_run.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+using tztest::scratch;
+
+constexpr char kOld[] = "as it was";
+
+struct ResultRow {
+    char const* name;
+    char const* option;
+    char const* problem;
+};
+constexpr ResultRow kRows[] = {
+    {"Drawing", "--save",   ": cannot be written: "         },
+    {"Svg",     "--svg",    ": cannot be written: "         },
+    {"Png",     "--png",    ": cannot be written: "         },
+    {"Pdf",     "--pdf",    ": cannot be written: "         },
+    {"Events",  "--events", ": the events cannot be written"},
+};
+
+class Result : public testing::TestWithParam<ResultRow> {
+protected:
+    Result() {
+        fs::remove_all(folder_);
+        fs::create_directories(folder_);
+        script_ = scratch("note.scr", "-MTEXT\n0,0\n40,-20\n{\\fDejaVu Sans;A note}\n\nQUIT\n");
+    }
+
+    [[nodiscard]] fs::path file() const { return folder_ / "result"; }
+    [[nodiscard]] std::string words(fs::path const& file) const {
+        return "--script " + script_.string() + " " + GetParam().option + " " + file.string();
+    }
+    static void expectRefused(tztest::ProgramRun const& run, fs::path const& file) {
+        EXPECT_EQ(run.status, 2) << run.errors;
+        EXPECT_TRUE(run.errors.starts_with("tzdraft: " + file.string() + GetParam().problem))
+            << run.errors;
+        EXPECT_EQ(std::count(run.errors.begin(), run.errors.end(), '\n'), 1) << run.errors;
+    }
+    void expectOnlyTheOldFile() const {
+        EXPECT_EQ(tztest::bytesOf(file()), kOld);
+        EXPECT_EQ(std::distance(fs::directory_iterator(folder_), {}), 1);
+    }
+
+    fs::path const folder_ = scratch("results");
+    fs::path script_;
+};
+
+TEST_P(Result, IntoNoFolderIsSaid) {
+    fs::path const nowhere = folder_ / "nosuch" / "result";
+    expectRefused(tztest::startProgram(words(nowhere)), nowhere);
+}
+
+// Plots and events used to end the program by a signal.
+TEST_P(Result, BeyondTheSizeLimitLeavesTheOldFile) {
+    scratch("results/result", kOld);
+    expectRefused(tztest::startProgram(words(file()), "ulimit -f 1; "), file());
+    expectOnlyTheOldFile();
+}
+
+// The root user may write anywhere, so that another one runs the program then.
+TEST_P(Result, IntoALockedFolderLeavesTheOldFile) {
+    scratch("results/result", kOld);
+    ASSERT_EQ(chmod(folder_.c_str(), 0555), 0);
+    std::string before;
+    if (geteuid() == 0) {
+        before = "setpriv --reuid=65534 --regid=65534 --clear-groups ";
+        if (tztest::startProgram("--version", before).status != 0) {
+            GTEST_SKIP() << "no other user can run the program here";
+        }
+    }
+    expectRefused(tztest::startProgram(words(file()), before), file());
+    ASSERT_EQ(chmod(folder_.c_str(), 0755), 0);
+    expectOnlyTheOldFile();
+}
+
+INSTANTIATE_TEST_SUITE_P(Rows, Result, testing::ValuesIn(kRows), [](auto const& row) {
+    return row.param.name;
+});
+
+TEST(Results, ThatCanBeWrittenAreAndTheLineNamesThem) {
+    auto const script = scratch("quit.scr", "QUIT\n");
+    std::string const saved = scratch("saved.json").string();
+    std::string const plotted = scratch("plotted.svg").string();
+    std::string const nowhere = scratch("nosuch/result").string();
+    tztest::ProgramRun const run = tztest::runProgram(
+        {"--script", script.string(), "--save", saved, "--png", nowhere, "--svg", plotted});
+    EXPECT_EQ(run.status, 2);
+    EXPECT_EQ(run.errors, "tzdraft: " + nowhere +
+                              ": cannot be written: No such file or directory; written: " + saved +
+                              ", " + plotted + "\n");
+    EXPECT_NE(tztest::bytesOf(saved).find("\"tz-drawing\""), std::string::npos);
+    EXPECT_NE(tztest::bytesOf(plotted).find("</svg>"), std::string::npos);
+}
+
+}  // namespace
