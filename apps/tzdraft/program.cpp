@@ -14,6 +14,7 @@
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
 #include "host/base/audit.h"
+#include "host/base/local_text.h"
 #include "host/base/settings.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
@@ -256,7 +257,7 @@ int Run::finish() {
         note(options_.events, error);
     }
     if (!problems_.empty()) {
-        if (!written_.empty()) problems_.back() += "; written: " + written_;
+        if (!written_.empty()) problems_.back() += "; " + tzhost::localText("written: ") + written_;
         for (std::string const& problem : problems_)
             complain(problem);
         return kUnusable;
