@@ -61,17 +61,35 @@ TEST(Documents, OfOtherProgramsKeepTheirText) {
                   0)
             << entry.path();
     }
-    EXPECT_GE(count, 2);
+    EXPECT_GE(count, 9);
 }
 
+struct LookCase {
+    char const* document;
+    wchar_t const* part;  // of its markup
+};
+constexpr LookCase kLooks[] = {
+    {"note",     L"\\fHelvetica|b1|i0|c0|p32;millimetres"                                      },
+    {"note",     L"\\fHelvetica|b0|i1|c0|p32;not"                                              },
+    {"note",     L"\\Onoted\\o"                                                                },
+    {"note",     L"\\fCourier|b0|i0|c0|p48;C:"                                                 },
+    {"note",     L"\\H1.286x;General"                                                          },
+    {"schedule", L"\\pi-0.357143,l0.357143,t0.357143;1.\tFrames: oak.\\P\\pl0.714286;a.\toiled"},
+    {"finishes", L"\\H1.2x;Ground floor\\H0.8333x; "                                           },
+    {"bolts",    L"\\fTimes New Roman|b1|i0|c0|p0;A2"                                          },
+    {"holes",    L"\\fCourier New|b1|i0|c0|p49;\\C250;\\c0;local function"                     },
+    {"holes",    L"\\C44;\\c32432;120"                                                         },
+    {"memo",     L"\\P}Beam B3: {\\fLiberation Sans|b1|i0|c0|p34;HEA 200}, see "               },
+    {"labels",   L"{\\L\u0427\u0435\u0440\u0442\u0451\u0436}; "                                },
+};
+
 TEST(Documents, KeepTheirLooks) {
-    markuptest::Session session;
-    std::wstring const markup = session.toMtext(
-        contentsOf(std::string(std::getenv("TZ_TEST_SOURCE")) + "/tests/documents/note.rtf"));
-    for (wchar_t const* part :
-         {L"\\fHelvetica|b1|i0|c0|p32;millimetres", L"\\fHelvetica|b0|i1|c0|p32;not",
-          L"\\Onoted\\o", L"\\fCourier|b0|i0|c0|p48;C:", L"\\H1.286x;General"}) {
-        EXPECT_NE(markup.find(part), std::wstring::npos) << part;
+    std::string const folder = std::string(std::getenv("TZ_TEST_SOURCE")) + "/tests/documents/";
+    for (LookCase const& row : kLooks) {
+        markuptest::Session session;
+        std::wstring const markup = session.toMtext(contentsOf(folder + row.document + ".rtf"));
+        EXPECT_NE(markup.find(row.part), std::wstring::npos)
+            << row.document << TzString(row.part).toUtf8() << TzString(markup).toUtf8();
     }
 }
 
