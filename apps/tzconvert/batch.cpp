@@ -1,5 +1,7 @@
 #include "apps/tzconvert/batch.h"
 
+#include <iconv.h>
+
 #include <cstdio>
 #include <filesystem>
 #include <new>
@@ -9,6 +11,7 @@
 #include "apps/tzconvert/conversion.h"
 #include "apps/tzconvert/report.h"
 #include "apps/tzconvert/streams.h"
+#include "host/base/code_page_table.h"
 #include "host/base/file_bytes.h"
 #include "host/base/font_map_path.h"
 #include "host/base/variables.h"
@@ -22,8 +25,19 @@ void complain(std::string const& what) {
     std::fprintf(stderr, "tzconvert: %s\n", what.c_str());
 }
 
+bool isKnownPage(int codePage) {
+    iconv_t const page = ::iconv_open("UTF-8", tzhost::iconvNameOf(codePage).c_str());
+    bool const isKnown = page != reinterpret_cast<iconv_t>(-1);
+    if (isKnown) ::iconv_close(page);
+    return isKnown;
+}
+
 // Puts the machine's settings in place; false when one cannot be used.
 bool prepare(Options const& options) {
+    if (!isKnownPage(options.codePage)) {
+        complain("--code-page " + std::to_string(options.codePage) + " is not known");
+        return false;
+    }
     auto const page = L"ANSI_" + std::to_wstring(options.codePage);
     if (auto const written = tzhost::Variables::instance().overrideFromText(L"SYSCODEPAGE", page);
         !written.isDone()) {
@@ -48,7 +62,10 @@ fs::path targetOf(Options const& options, std::string const& file) {
 
 class Batch {
 public:
-    explicit Batch(Options const& options) : options_(options) {}
+    explicit Batch(Options const& options) : options_(options) {
+        for (std::string const& file : options.files)
+            inputs_.insert(placeOf(file));
+    }
 
     [[nodiscard]] Failure convertFile(std::string const& file) {
         try {
@@ -61,7 +78,8 @@ public:
 
     [[nodiscard]] Failure writeReport() const {
         if (options_.report.empty() || (reports_.empty() && options_.outputDir.empty())) return {};
-        return writeBytes(options_.report, reportText(options_, reports_));
+        return writeBytes(options_.report == "-" ? "" : options_.report,
+                          reportText(options_, reports_));
     }
 
 private:
@@ -79,11 +97,16 @@ private:
         return {};
     }
 
+    // The file itself, links followed.
+    [[nodiscard]] static fs::path placeOf(std::string const& file) {
+        std::error_code unreadable;  // will be named when it is read
+        return fs::weakly_canonical(file, unreadable);
+    }
+
     // A result takes the place of no input and of no other result.
     [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) {
-        std::error_code missing;
-        if (fs::equivalent(file, target, missing))
-            return file + ": its result would take its place";
+        if (inputs_.count(placeOf(target)) != 0)
+            return file + ": its result would take the place of " + target;
         if (!targets_.insert(target).second)
             return file + ": " + target + " is another file's result already";
         return {};
@@ -91,6 +114,7 @@ private:
 
     Options const& options_;
     std::vector<FileReport> reports_;
+    std::set<fs::path> inputs_;
     std::set<std::string> targets_;
 };
 

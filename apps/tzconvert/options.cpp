@@ -2,6 +2,7 @@
 
 #include <CLI/CLI.hpp>
 #include <cstdio>
+#include <limits>
 
 namespace tzconvert {
 namespace {
@@ -22,6 +23,8 @@ constexpr DirectionRow kDirections[] = {
     {"to-mtext",   Direction::toMtext,   "RTF to markup"                             },
     {"round-trip", Direction::roundTrip, "markup to RTF to markup within one session"},
 };
+
+constexpr int kMostTwips = 65535;  // what an RTF size can say
 
 constexpr char kHexDigits[] = "0123456789abcdefABCDEF";
 
@@ -45,6 +48,21 @@ void declareColor(CLI::App& app, char const* name, Color& color, char const* hel
         ->type_name("RRGGBB");
 }
 
+CLI::Validator aName() {
+    return {[](std::string& text) { return text.empty() ? "an empty name" : std::string(); }, ""};
+}
+
+// Infinite values and those that are no number fail too.
+CLI::Validator aboveZero() {
+    return {[](std::string& text) {
+                double value = 0;
+                bool const isAbove = CLI::detail::lexical_cast(text, value) && value > 0 &&
+                                     value <= std::numeric_limits<double>::max();
+                return isAbove ? std::string() : text + " is no number above 0";
+            },
+            ""};
+}
+
 void declareFont(CLI::App& app, Options& options) {
     auto* const face =
         app.add_option("--font", options.face, "the style's font, by face")->type_name("FACE");
@@ -52,9 +70,11 @@ void declareFont(CLI::App& app, Options& options) {
     app.add_flag("--italic", options.italic, "the face is italic")->needs(face);
     app.add_option("--charset", options.charset, "its character set (0)")
         ->type_name("N")
+        ->check(CLI::Range(0, 255))
         ->needs(face);
     app.add_option("--pitch", options.pitch, "its pitch and family (0)")
         ->type_name("N")
+        ->check(CLI::Range(0, 255))
         ->needs(face);
     app.add_option("--font-file", options.fontFile, "the style's font, by file (txt.shx)")
         ->type_name("FILE")
@@ -63,9 +83,11 @@ void declareFont(CLI::App& app, Options& options) {
 
 void declareText(CLI::App& app, Options& options) {
     app.add_option("--size", options.size, "the style's size in drawing units (0.2)")
-        ->type_name("UNITS");
+        ->type_name("UNITS")
+        ->check(aboveZero());
     app.add_option("--twips", options.twips, "the same size in twips of the document (320)")
-        ->type_name("N");
+        ->type_name("N")
+        ->check(CLI::Range(1, kMostTwips));
     declareColor(app, "--color", options.color, "the initial colour (000000)");
     declareColor(app, "--by-layer", options.byLayer, "the colour of ByLayer (not set)");
     declareColor(app, "--by-block", options.byBlock, "the colour of ByBlock (not set)");
@@ -87,14 +109,18 @@ void declareText(CLI::App& app, Options& options) {
 void declareFiles(CLI::App& app, Options& options) {
     app.add_option("FILE", options.files, "what to convert")->type_name("");
     app.add_option("--font-map", options.fontMap, "a font map file in place of the shipped one")
-        ->type_name("FILE");
-    auto* const output =
-        app.add_option("--output", options.output, "write there")->type_name("FILE");
+        ->type_name("FILE")
+        ->check(aName());
+    auto* const output = app.add_option("--output", options.output, "write there")
+                             ->type_name("FILE")
+                             ->check(aName());
     app.add_option("--output-dir", options.outputDir, "write each FILE's result into that folder")
         ->type_name("DIR")
+        ->check(aName())
         ->excludes(output);
     app.add_option("--report", options.report, "write what the conversion found as JSON")
-        ->type_name("FILE");
+        ->type_name("FILE")
+        ->check(aName());
 }
 
 void declare(CLI::App& app, Options& options) {
@@ -110,6 +136,26 @@ void declare(CLI::App& app, Options& options) {
     }
 }
 
+// What options say together.
+void checkTogether(Options const& options) {
+    if (options.files.size() > 1 && options.outputDir.empty())
+        throw CLI::ValidationError("FILE", "several of them need --output-dir");
+    bool const isTextOnOutput = options.outputDir.empty() && options.output.empty();
+    if (isTextOnOutput ? options.report == "-"
+                       : options.report == options.output && !options.report.empty())
+        throw CLI::ValidationError("--report", "the result goes there");
+}
+
+// What is wrong, in a line.
+std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
+    if (!app.get_subcommands().empty()) return wrong.what();
+    std::string text = "expected";
+    for (DirectionRow const& row : kDirections)
+        text += std::string(&row == kDirections ? " " : ", ") + row.name;
+    std::vector<std::string> const rest = app.remaining();
+    return rest.empty() ? text : text + ", not \"" + rest.front() + "\"";
+}
+
 }  // namespace
 
 ParsedOptions parseOptions(int count, char const* const* arguments) {
@@ -120,13 +166,16 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     declare(app, parsed.options);
     try {
         app.parse(count, arguments);
-        if (parsed.options.files.size() > 1 && parsed.options.outputDir.empty())
-            throw CLI::ValidationError("FILE", "several of them need --output-dir");
-    } catch (CLI::Success const&) {  // --help, --version; CLI11 finds the command asked about
+        if (parsed.options.output == "-") parsed.options.output.clear();
+        checkTogether(parsed.options);
+    } catch (CLI::CallForVersion const& version) {
+        std::printf("%s\n", version.what());
+        parsed.exit = kDone;
+    } catch (CLI::Success const&) {  // --help; CLI11 finds the command asked about
         app.exit(CLI::CallForHelp());
         parsed.exit = kDone;
     } catch (CLI::ParseError const& wrong) {
-        std::fprintf(stderr, "tzconvert: %s; try --help\n", wrong.what());
+        std::fprintf(stderr, "tzconvert: %s; try --help\n", explain(app, wrong).c_str());
         parsed.exit = kUnusable;
     }
     return parsed;

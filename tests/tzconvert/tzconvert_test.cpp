@@ -51,47 +51,61 @@ struct RunCase {
 };
 using std::string_view_literals::operator""sv;
 constexpr RunCase kRuns[] = {
-    {"ToRtf",          "to-rtf",                                                                  "A{\\H2x;B}"sv,       0, "~A{\\fs64 B}\\par }",          ""                                 },
-    {"ToMtext",        "to-mtext",                                                                "{\\rtf1 a\\ul b}"sv, 0, "a{\\Lb}",                      ""                                 },
-    {"NothingAdded",   "to-mtext",                                                                "a\xC3\xA9\n"sv,      0, "a\xC3\xA9",                    ""                                 },
-    {"NewlineIsInput", "to-rtf",                                                                  "a\n"sv,              0, "~a\\line \\par }",             ""                                 },
-    {"RoundTrip",      "round-trip",                                                              "\\T1.5;{\\Lx}\\P"sv, 0, "\\T1.5;{\\Lx}",                ""                                 },
-    {"KeepsMarks",     "round-trip --keep-trailing-paragraphs",                                   "x"sv,                0, "x\\P",                         ""                                 },
-    {"Values",         "to-mtext --tracking 2 --width-factor .5 --oblique 15 --base-alignment 1", "\\\\S"sv,
-     0,                                                                                                                    "\\T2;\\W0.5;\\Q15;\\A1;\\\\S", ""                                 },
-    {"Face",           "to-rtf --font Some --bold --italic --charset 204 --pitch 18",             "x"sv,                0,
-     "~{\\f0\\froman\\fprq2\\fcharset204 Some;}",                                                                                                          ""                                 },
-    {"FaceStyle",      "to-rtf --font Some --bold",                                               "x"sv,                0, "~\\fs32\\b \\deftab0 x",       ""                                 },
-    {"Size",           "to-mtext --size 2.5 --twips 280",                                         "\\fs56 x"sv,         0, "{\\H2x;x}",                    ""                                 },
-    {"Color",          "to-rtf --color 112233",                                                   "x"sv,                0, "~\\red17\\green34\\blue51;",   ""                                 },
-    {"ByLayer",        "to-mtext --by-layer FF0000 --by-block ff0000",
-     "{\\colortbl\\red255\\green0\\blue0;\\red254\\green0\\blue0;}\\cf0 a\\cf1 b"sv,                                    0,
-     "{\\C256;a\\C0;b}",                                                                                                                                   ""                                 },
-    {"CodePage",       "to-mtext --code-page 1251",                                               "\\'c0"sv,            0, "\xD0\x90",                     ""                                 },
-    {"SystemSet",      "to-mtext --code-page 936 --font Base --charset 134",
-     "{\\fonttbl{\\f0\\fcharset0 BASE;}{\\f1\\fcharset134 BASE;}}\\f0 a\\f1 b\\f0 c"sv,                                 0,
-     "ab{\\fBASE|b0|i0|c0|p0;c}",                                                                                                                          ""                                 },
-    {"Dash",           "to-mtext -",                                                              "a"sv,                0, "a",                            ""                                 },
-    {"Empty",          "to-mtext",                                                                ""sv,                 0, "",                             ""                                 },
-    {"NotUtf8",        "to-rtf",                                                                  "ab\xE9x"sv,          2, "",                             "standard input: byte 2: not UTF-8"},
-    {"CutOffUtf8",     "round-trip",                                                              "ab\xE4\xB8"sv,       2, "",                             "byte 2: not UTF-8"                },
-    {"ZeroCharacter",  "to-mtext",                                                                "a\0b"sv,             2, "",                             "byte 1: a zero character"         },
-    {"NoFile",         "to-rtf none.txt",                                                         ""sv,                 2, "",                             "none.txt: cannot be read"         },
-    {"FolderAsFile",   "to-rtf .",                                                                ""sv,                 2, "",                             ".: cannot be read"                },
-    {"FolderAsMap",    "to-rtf --font-map .",                                                     "a"sv,                2, "",                             ".: cannot be read"                },
-    {"NoSuchPage",     "to-rtf --code-page 0",                                                    "a"sv,                2, "",                             "--code-page"                      },
-    {"NoFontMap",      "to-rtf --font-map none.ini",                                              "a"sv,                2, "",                             "none.ini: cannot be read"         },
-    {"NoFolder",       "to-rtf --output none/x.rtf",                                              "a"sv,                2, "",                             "none/x.rtf: cannot be written"    },
-    {"NoCommand",      "",                                                                        ""sv,                 2, "",                             "--help"                           },
-    {"UnknownCommand", "to-html",                                                                 ""sv,                 2, "",                             "--help"                           },
-    {"UnknownOption",  "to-rtf --loud",                                                           "a"sv,                2, "",                             "--loud"                           },
-    {"BadColor",       "to-rtf --color red",                                                      "a"sv,                2, "",                             "\"red\" is not RRGGBB"            },
-    {"BadNumber",      "to-rtf --twips many",                                                     "a"sv,                2, "",                             "--twips"                          },
-    {"BadAlignment",   "to-mtext --base-alignment 3",                                             "a"sv,                2, "",                             "--base-alignment"                 },
-    {"BoldNeedsFace",  "to-rtf --bold",                                                           "a"sv,                2, "",                             "--font"                           },
-    {"TwoFiles",       "to-rtf in in",                                                            "a"sv,                2, "",                             "--output-dir"                     },
-    {"Help",           "to-rtf --help",                                                           ""sv,                 0, "~--output-dir",                ""                                 },
-    {"HelpOfAll",      "--help",                                                                  ""sv,                 0, "~round-trip",                  ""                                 },
+    {"ToRtf",            "to-rtf",                                                                  "A{\\H2x;B}"sv,       0, "~A{\\fs64 B}\\par }",          ""                                                 },
+    {"ToMtext",          "to-mtext",                                                                "{\\rtf1 a\\ul b}"sv, 0, "a{\\Lb}",                      ""                                                 },
+    {"NothingAdded",     "to-mtext",                                                                "a\xC3\xA9\n"sv,      0, "a\xC3\xA9",                    ""                                                 },
+    {"NewlineIsInput",   "to-rtf",                                                                  "a\n"sv,              0, "~a\\line \\par }",             ""                                                 },
+    {"RoundTrip",        "round-trip",                                                              "\\T1.5;{\\Lx}\\P"sv, 0, "\\T1.5;{\\Lx}",                ""                                                 },
+    {"KeepsMarks",       "round-trip --keep-trailing-paragraphs",                                   "x"sv,                0, "x\\P",                         ""                                                 },
+    {"Values",           "to-mtext --tracking 2 --width-factor .5 --oblique 15 --base-alignment 1", "\\\\S"sv,
+     0,                                                                                                                      "\\T2;\\W0.5;\\Q15;\\A1;\\\\S", ""                                                 },
+    {"Face",             "to-rtf --font Some --bold --italic --charset 204 --pitch 18",             "x"sv,                0,
+     "~{\\f0\\froman\\fprq2\\fcharset204 Some;}",                                                                                                            ""                                                 },
+    {"FaceStyle",        "to-rtf --font Some --bold",                                               "x"sv,                0, "~\\fs32\\b \\deftab0 x",       ""                                                 },
+    {"Size",             "to-mtext --size 2.5 --twips 280",                                         "\\fs56 x"sv,         0, "{\\H2x;x}",                    ""                                                 },
+    {"Color",            "to-rtf --color 112233",                                                   "x"sv,                0, "~\\red17\\green34\\blue51;",   ""                                                 },
+    {"ByLayer",          "to-mtext --by-layer FF0000 --by-block ff0000",
+     "{\\colortbl\\red255\\green0\\blue0;\\red254\\green0\\blue0;}\\cf0 a\\cf1 b"sv,                                      0,
+     "{\\C256;a\\C0;b}",                                                                                                                                     ""                                                 },
+    {"CodePage",         "to-mtext --code-page 1251",                                               "\\'c0"sv,            0, "\xD0\x90",                     ""                                                 },
+    {"SystemSet",        "to-mtext --code-page 936 --font Base --charset 134",
+     "{\\fonttbl{\\f0\\fcharset0 BASE;}{\\f1\\fcharset134 BASE;}}\\f0 a\\f1 b\\f0 c"sv,                                   0,
+     "ab{\\fBASE|b0|i0|c0|p0;c}",                                                                                                                            ""                                                 },
+    {"Dash",             "to-mtext -",                                                              "a"sv,                0, "a",                            ""                                                 },
+    {"Empty",            "to-mtext",                                                                ""sv,                 0, "",                             ""                                                 },
+    {"NotUtf8",          "to-rtf",                                                                  "ab\xE9x"sv,          2, "",                             "standard input: byte 2: not UTF-8"                },
+    {"CutOffUtf8",       "round-trip",                                                              "ab\xE4\xB8"sv,       2, "",                             "byte 2: not UTF-8"                                },
+    {"ZeroCharacter",    "to-mtext",                                                                "a\0b"sv,             2, "",                             "byte 1: a zero character"                         },
+    {"NoFile",           "to-rtf none.txt",                                                         ""sv,                 2, "",                             "none.txt: cannot be read"                         },
+    {"FolderAsFile",     "to-rtf .",                                                                ""sv,                 2, "",                             ".: cannot be read"                                },
+    {"FolderAsMap",      "to-rtf --font-map .",                                                     "a"sv,                2, "",                             ".: cannot be read"                                },
+    {"NoSuchPage",       "to-rtf --code-page 0",                                                    "a"sv,                2, "",                             "--code-page"                                      },
+    {"NoFontMap",        "to-rtf --font-map none.ini",                                              "a"sv,                2, "",                             "none.ini: cannot be read"                         },
+    {"NoFolder",         "to-rtf --output none/x.rtf",                                              "a"sv,                2, "",                             "none/x.rtf: cannot be written"                    },
+    {"NoCommand",        "",                                                                        ""sv,                 2, "",                             "expected to-rtf, to-mtext, round-trip; try --help"},
+    {"UnknownCommand",   "to-html",                                                                 ""sv,                 2, "",
+     "expected to-rtf, to-mtext, round-trip, not \"to-html\""                                                                                                                                                   },
+    {"Version",          "--version",                                                               ""sv,                 0, "~tzconvert 1",                 ""                                                 },
+    {"DashAsOutput",     "to-mtext --output -",                                                     "a"sv,                0, "a",                            ""                                                 },
+    {"ReportOnOutput",   "to-mtext --output text --report - --size 2.5",                            "a"sv,                0,
+     "~\"incidents\": 0",                                                                                                                                    ""                                                 },
+    {"ReportOverOutput", "to-mtext --report -",                                                     "a"sv,                2, "",                             "--report"                                         },
+    {"ReportOverFile",   "to-mtext --output text --report text",                                    "a"sv,                2, "",                             "--report"                                         },
+    {"NoSize",           "to-rtf --size 0",                                                         "a"sv,                2, "",                             "0 is no number above 0"                           },
+    {"SizeWithoutEnd",   "to-rtf --size inf",                                                       "a"sv,                2, "",                             "inf is no number above 0"                         },
+    {"SizeThatIsNone",   "to-rtf --size nan",                                                       "a"sv,                2, "",                             "nan is no number above 0"                         },
+    {"NegativeTwips",    "to-rtf --twips -5",                                                       "a"sv,                2, "",                             "--twips"                                          },
+    {"NoCharset",        "to-rtf --font Some --charset 999",                                        "a"sv,                2, "",                             "--charset"                                        },
+    {"UnknownPage",      "to-rtf --code-page 99",                                                   "a"sv,                2, "",                             "--code-page 99 is not known"                      },
+    {"EmptyName",        "to-rtf --output \"\"",                                                    "a"sv,                2, "",                             "an empty name"                                    },
+    {"UnknownOption",    "to-rtf --loud",                                                           "a"sv,                2, "",                             "--loud"                                           },
+    {"BadColor",         "to-rtf --color red",                                                      "a"sv,                2, "",                             "\"red\" is not RRGGBB"                            },
+    {"BadNumber",        "to-rtf --twips many",                                                     "a"sv,                2, "",                             "--twips"                                          },
+    {"BadAlignment",     "to-mtext --base-alignment 3",                                             "a"sv,                2, "",                             "--base-alignment"                                 },
+    {"BoldNeedsFace",    "to-rtf --bold",                                                           "a"sv,                2, "",                             "--font"                                           },
+    {"TwoFiles",         "to-rtf in in",                                                            "a"sv,                2, "",                             "--output-dir"                                     },
+    {"Help",             "to-rtf --help",                                                           ""sv,                 0, "~--output-dir",                ""                                                 },
+    {"HelpOfAll",        "--help",                                                                  ""sv,                 0, "~round-trip",                  ""                                                 },
 };
 
 class Runs : public testing::TestWithParam<RunCase> {};
@@ -153,10 +167,16 @@ TEST(Files, ThatMemoryCannotHoldAreNamed) {
     EXPECT_EQ(contentsOf("batch/one.mtext"), "1");
 }
 
-TEST(Files, DoNotOverwriteTheirInput) {
+TEST(Files, DoNotOverwriteInputs) {
     write("trip.mtext", "x");
     EXPECT_EQ(run("round-trip --output-dir . trip.mtext", "").status, 2);
     EXPECT_EQ(contentsOf("trip.mtext"), "x");
+    write("trip.rtf", "y");
+    Outcome const result = run("to-rtf --output-dir ../$(basename $PWD) trip.mtext trip.rtf", "");
+    EXPECT_EQ(result.status, 2);
+    EXPECT_NE(result.err.find("trip.mtext: its result would take the place of"), std::string::npos)
+        << result.err;
+    EXPECT_EQ(contentsOf("trip.rtf"), "y");
 }
 
 TEST(Reports, NameWhatWasFound) {
