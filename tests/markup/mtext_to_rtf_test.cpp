@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "tests/markup/conversions.h"
+#include "tz/mte/globals.h"
 
 namespace {
 
@@ -136,6 +137,8 @@ constexpr MarkupCase kStacks[] = {
     {"InAGroup",         L"{\\H.7x;\\S1/2;a}",     L"{{\\dn1234 \\\\S<0,70>}1/2{\\dn1234 \\\\s}\\fs20 a}",    0                },
     {"AbsoluteInAGroup", L"{\\H.7;\\S1/2;}",       L"{{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}\\fs98 }",
      0                                                                                                                         },
+    {"AbsoluteForgets",  L"{\\H3x;\\H.7;\\S1/2;}",
+     L"{{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}\\fs98 }",                                                  0                },
     {"NotInAGroup",      L"\\H.7x;\\S1/2;",        L"\\fs20 {\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}",      0                },
     {"Unicode",          L"\\S\\U+00e9/\\u+00E9;", L"{\\dn1234 \\\\S<0,100>}\\u233?/\\u233?{\\dn1234 \\\\s}",
      0                                                                                                                         },
@@ -191,6 +194,11 @@ TEST(Document, BeginsWithTheInitialFont) {
               "\\pard\\plain\\f0\\cf0\\fs31\\b\\i \\deftab0 x\\par }");
     EXPECT_STREQ(context.Font().c_str(), L"Slanted");  // the face, once it has a file
     EXPECT_EQ(context.PitchAndFamily(), 18);
+    EXPECT_EQ(g_sInitialFont, L"Slanted");
+    RtfWriter ofTheMachine;
+    ofTheMachine.context.SetInitialFontFileName(L"DejaVuSans-Bold.ttf");
+    EXPECT_STREQ(ofTheMachine.context.Font().c_str(), L"DejaVuSans-Bold.ttf");
+    EXPECT_TRUE(g_sInitialFont.isEmpty());  // a font that the map does not know
     RtfWriter other;
     CMTextToRichTextContext& lent = other.context;
     lent.SetInitialFontFileName(L"none");
@@ -258,15 +266,37 @@ TEST(States, AreThirtyTwoAtMost) {
     RtfWriter writer;
     CMTextToRichTextContext& context = writer.context;
     markuptest::setUp(context);
-    // 33 groups open, 31 of them push; after 31 braces the outermost state is in force, so that the
-    // height of the 32nd is written at once.
+    // 33 groups open, 31 of them push; after 31 braces, not after 30, the outermost state is in
+    // force, so that a height is written at once.
     std::wstring const text =
-        std::wstring(33, L'{') + std::wstring(31, L'}') + L"\\H.4;" + std::wstring(2, L'}');
+        std::wstring(33, L'{') + std::wstring(30, L'}') + L"\\H.4;\\L}\\H.2;\\L}}";
     EXPECT_EQ(shown(bodyOf(context.Parse(text.c_str()))),
-              std::string(33, '{') + std::string(31, '}') + "\\fs56 }}");
+              std::string(33, '{') + std::string(30, '}') + "\\ul \\fs56 }\\fs28 \\ul }}");
     EXPECT_EQ(context.States(), 1);
     context.ResetState();
     EXPECT_EQ(context.EffectiveSize(), 1.0);
+}
+
+TEST(States, TakeTheFontOfACode) {
+    struct Row {
+        wchar_t const* markup;
+        wchar_t const* font;
+        int charset, pitch;
+    };
+    constexpr Row kRows[] = {
+        {L"\\Fslanted.shx|c2;", L"Slanted", 2,   18},
+        {L"\\fA\\b|c204|p2;",   L"A\\\\b",  204, 2 }, // as the document has it
+        {L"\\fA|p2;",           L"A",       1,   2 },
+        {L"{\\fA|c204|p2;}\\L", L"",        0,   0 },
+    };
+    for (Row const& row : kRows) {
+        RtfWriter writer;
+        markuptest::setUp(writer.context);
+        (void)writer.context.Parse(row.markup);
+        EXPECT_STREQ(writer.context.Font().c_str(), row.font) << row.markup;
+        EXPECT_EQ(writer.context.CharSet(), row.charset) << row.markup;
+        EXPECT_EQ(writer.context.PitchAndFamily(), row.pitch) << row.markup;
+    }
 }
 
 TEST(Tabs, KeepTheFirstThirtyTwo) {

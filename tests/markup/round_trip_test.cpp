@@ -38,6 +38,7 @@ constexpr TripCase kTrips[] = {
     {"FontLent",                       L"{\\Fnone.shx|c0;a}b",            L"{\\Fnone.shx|c0;a}b"         },
     {"FontPair",                       L"{\\Ftxt,big|c0;a}b",             L"{\\Ftxt.shx,big.shx|c0;a}b"  },
     {"FaceFont",                       L"{\\fOther|b1|i0|c238|p18;a}b",   L"{\\fOther|b1|i0|c238|p18;a}b"},
+    {"FaceWithBackslash",              L"{\\fA\\b|b0|i0|c0|p0;a}b",       L"{\\fA\\b|b0|i0|c0|p0;a}b"    },
     {"FaceFontWithoutFields",          L"{\\fOther;a}b",                  L"{\\fOther|b0|i0|c0|p0;;a}b"  },
     {"Color",                          L"{\\C5;a}{\\C256;b}{\\C0;c}",     L"{\\C5;a\\C256;b\\C0;c}"      },
     {"TrueColor",                      L"{\\c13107713;a}b",               L"{\\C172;\\c13107713;a}b"     },
