@@ -86,10 +86,7 @@ void CRichTextToMTextContext::onBackslash(wchar_t const*& cursor,
     if (!word.empty()) {
         if (HandleToken(cursor, word, value)) return;
         bool const isOpening = !isBehindFirst && !m_bCharEmitted;
-        if (skipsDestination || isOpening)
-            IgnoreToMatchingBrace(cursor);
-        else
-            skipsDestination = false;
+        if (skipsDestination || isOpening) IgnoreToMatchingBrace(cursor);
     } else if (*cursor == L'*') {
         ++cursor;
         skipsDestination = true;

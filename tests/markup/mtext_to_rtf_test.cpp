@@ -139,6 +139,8 @@ constexpr MarkupCase kStacks[] = {
      0                                                                                                                         },
     {"AbsoluteForgets",  L"{\\H3x;\\H.7;\\S1/2;}",
      L"{{\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}\\fs98 }",                                                  0                },
+    {"PercentTruncates", L"{\\H.58x;\\S1/2;a}",
+     L"{{\\dn1234 \\\\S<0,57>}1/2{\\dn1234 \\\\s}\\fs17 a}",                                                  0                },
     {"NotInAGroup",      L"\\H.7x;\\S1/2;",        L"\\fs20 {\\dn1234 \\\\S<0,100>}1/2{\\dn1234 \\\\s}",      0                },
     {"Unicode",          L"\\S\\U+00e9/\\u+00E9;", L"{\\dn1234 \\\\S<0,100>}\\u233?/\\u233?{\\dn1234 \\\\s}",
      0                                                                                                                         },
