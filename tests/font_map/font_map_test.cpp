@@ -24,8 +24,8 @@ std::filesystem::path scratch() {
 // What a look-up by file gives, as one text: face|bold|italic|charset|pitch|type.
 std::wstring byFile(Fonts& fonts, wchar_t const* file) {
     Fonts::MapType type = Fonts::MapTypeAll;
-    bool bold = false;
-    bool italic = false;
+    bool bold = true;
+    bool italic = true;
     Charset charset = kAnsiCharset;
     int pitch = 0;
     CStdStrW const face = fonts.MapFileToFont(type, file, bold, italic, charset, pitch);
@@ -157,6 +157,13 @@ TEST_F(FontMap, FacesOfAnyLengthAndScriptMapBack) {
     }
 }
 
+TEST_F(FontMap, TheExtensionOfStrokeFontsIsLowered) {
+    gsExtensionSHX = L".SHX";
+    Fonts fonts(0);
+    EXPECT_EQ(gsExtensionSHX, L".shx");
+    EXPECT_EQ(byFile(fonts, L"romans"), L"Roman S|0|0|0|2|1");
+}
+
 TEST_F(FontMap, ProxiesRunOutAndTheEmergencyFaceHasNoWayBack) {
     Fonts fonts(0);
     EXPECT_FALSE(fonts.ProxiesAssigned());
@@ -176,6 +183,7 @@ TEST_F(FontMap, ProxiesRunOutAndTheEmergencyFaceHasNoWayBack) {
 TEST_F(FontMap, PairsShareOneFaceThatLeadsToTheLast) {
     Fonts fonts(0);
     fonts.SetBigfont(L"A.SHX", L"b");
+    EXPECT_EQ(byFace(fonts, L"Big Proxy"), L"a.shx,b.shx|2");
     fonts.SetBigfont(L"c,d.shx");
     fonts.SetBigfont(L"no pair");
     EXPECT_EQ(byFace(fonts, L"Big Proxy"), L"c.shx,d.shx|2");
