@@ -108,7 +108,8 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
         {L"First & Second Face & Third (TrueType)", L"set.ttc"      },
         {L"Short",                                  L".fot"         },
         {L"Five",                                   L"X.FOT"        },
-        {L"Numbers & Letters",                      std::uint32_t{5}},
+        {L"Numbers & Letters (TrueType)",           std::uint32_t{5}},
+        {L"Others & Letters (TrueType)",            L"letters.ttc"  },
     };
     tzhost::settings().registry[L"hkey_local_machine\\software\\product\\altfontnames"] = {
         {L"Alternate", L"alternate.ttf"}
@@ -135,7 +136,7 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
              Row{L"Number",            L""             },
              Row{L"Short",             L".fot"         },
              Row{L"Five",              L"X.ttf"        },
-             Row{L"Letters",           L""             },
+             Row{L"Letters",           L"letters.ttc"  },
              Row{L"Missing",           L""             }
     }) {
         EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(row.face), row.file) << row.face;
