@@ -6,6 +6,7 @@
 #include <memory>
 #include <string>
 #include <string_view>
+#include <unordered_map>
 #include <utility>
 #include <vector>
 
@@ -18,7 +19,8 @@ public:
 
     struct Section {
         Rows rows;
-        std::map<std::wstring, std::wstring> values;  // by key in lower case, the last of each
+        std::unordered_map<std::wstring, std::wstring>
+            values;  // by key in lower case, the last of each
     };
 
     // Of a file's bytes.

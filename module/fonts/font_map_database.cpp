@@ -1,8 +1,10 @@
 #include "tz/mte/font_map_database.h"
 
 #include <memory>
+#include <utility>
 
 #include "module/fonts/font_entry.h"
+#include "module/fonts/font_map_sections.h"
 #include "module/fonts/table_key.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/ini_file.h"
@@ -31,9 +33,9 @@ CStdStrW normalised(CStdStrW file) {
 }
 
 // Puts an entry in the place of what stands under the key.
-template <class Table, class Entry>
-void store(Table& table, CStdStrW const& key, std::unique_ptr<Entry> entry) {
-    auto& place = table[key];
+template <class Table, class Key, class Entry>
+void store(Table& table, Key&& key, std::unique_ptr<Entry> entry) {
+    auto& place = table[std::forward<Key>(key)];
     delete place;
     place = entry.release();
 }
@@ -56,6 +58,14 @@ bool meansAll(CMTextFontMapDatabase::MapType type) {
 }
 
 }  // namespace
+
+void leadBack(TableKey const& face, CStdStrW const& file, CMTextFontMapDatabase::MapType type) {
+    auto toFile = std::make_unique<CMTextFontToFileMapEntry>();
+    toFile->m_sFileName = withoutFolder(file);
+    lowerKey(toFile->m_sFileName);
+    toFile->m_eMapType = type;
+    store(CMTextFontMapDatabase::m_mapFontToFile, CStdStrW(face.view()), std::move(toFile));
+}
 
 CMTextFontMapDatabase::CMTextFontMapDatabase(signed char flag) : CTzadFontMapDatabase(flag) {
     gsIniFileDatabase = GetMTextMapFilename();
@@ -85,14 +95,9 @@ bool CMTextFontMapDatabase::AddFontSubstitute(CStdStrW file,
     toFont->m_sFaceName = face;
     toFont->m_eMapType = type;
     file = withoutFolder(std::move(file));
-    file.MakeLower();
+    lowerKey(file);
     store(m_mapFileToFont, file, std::move(toFont));
-    if (oneWay) return true;
-    auto toFile = std::make_unique<CMTextFontToFileMapEntry>();
-    toFile->m_sFileName = file;
-    toFile->m_eMapType = type;
-    store(m_mapFontToFile, BuildFontDescription(std::move(face), bold, italic, charset, pitch),
-          std::move(toFile));
+    if (!oneWay) leadBack(descriptionKey(face, bold, italic, charset, pitch), file, type);
     return true;
 }
 

@@ -35,11 +35,12 @@ bool CEnumerateMappedFonts::EnumeratedKey(TzString const& key) {
     bool const italic = numberField(rest) != 0;
     auto charset = static_cast<Charset>(numberField(rest));
     int const pitch = numberField(rest);
-    m_pDatabase->AddFontSubstitute(key, face, bold, italic, charset, pitch, m_eType, m_bOneWay);
+    // The last charset is the file's own; the others only lead back to it.
     while (!rest.empty()) {
+        if (!m_bOneWay) leadBack(descriptionKey(face, bold, italic, charset, pitch), key, m_eType);
         charset = static_cast<Charset>(numberField(rest));
-        m_pDatabase->AddFontSubstitute(key, face, bold, italic, charset, pitch, m_eType, m_bOneWay);
     }
+    m_pDatabase->AddFontSubstitute(key, face, bold, italic, charset, pitch, m_eType, m_bOneWay);
     return true;
 }
 

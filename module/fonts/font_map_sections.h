@@ -1,5 +1,6 @@
 #pragma once
 
+#include "module/fonts/table_key.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/pal/ini_file.h"
 
@@ -20,6 +21,10 @@ private:
     CMTextFontMapDatabase::MapType m_eType;
     signed char m_bOneWay;  // the low eight bits of the key's number: 256 reads as 0
 };
+
+// Lets a described face lead to a file, in the place of the one that it led to; a folder ahead of
+// the file does not count.
+void leadBack(TableKey const& face, CStdStrW const& file, CMTextFontMapDatabase::MapType type);
 
 // Cuts the first field, up to a comma, off `rest`; without a comma all of it.
 [[nodiscard]] CStdStrW ParseField(CStdStrW& rest);
