@@ -14,13 +14,14 @@ void TzGiTextStyle::setFont(
 }
 
 TzGePoint2d TzGiTextStyle::extents(
-    wchar_t const* text, bool /*penUps*/, int length, bool /*raw*/, TzGiWorldDraw* /*draw*/) const {
+    wchar_t const* text, bool /*penUps*/, int length, bool raw, TzGiWorldDraw* /*draw*/) const {
     if (tzhost::faultStatus("TzGiTextStyle::extents")) return {};
     tzhost::LineLayoutInput input;
     input.text = text ? text : L"";
     if (length >= 0 && static_cast<std::size_t>(length) < input.text.size()) {
         input.text.resize(static_cast<std::size_t>(length));
     }
+    if (!raw) input.text = tzhost::decodeLineText(input.text);
     input.textHeight = textSize_;
     input.tracking = tracking_;
     input.style = {fileName_.str(), bigFontFileName_.str(),

@@ -109,7 +109,7 @@ tzhost::LayoutBox measure(resbuf const* list) {
     if (auto const* const definition = linesIn(list)) return definition->box();
     tzhost::LineLayoutInput input;
     resbuf const* const text = findRecord(list, kText);
-    input.text = text && text->resval.rstring ? text->resval.rstring : L"";
+    if (text && text->resval.rstring) input.text = tzhost::decodeLineText(text->resval.rstring);
     input.textHeight = realIn(list, kHeight, input.textHeight);
     TzDbObjectId style;
     resbuf const* const name = findRecord(list, kStyle);

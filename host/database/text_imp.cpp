@@ -22,7 +22,7 @@ bool TextImp::showFieldText(std::wstring const& shown) {
 
 LineLayout TextImp::layout() const {
     LineLayoutInput input;
-    input.text = shownText();
+    input.text = decodeLineText(shownText());
     input.textHeight = height;
     input.style = lookOfStyle(style);
     input.style.widthFactor = widthFactor;

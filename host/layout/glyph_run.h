@@ -8,7 +8,7 @@
 namespace tzhost {
 
 // From one letter of a vertical text to the next, in text heights.
-inline constexpr double kVerticalStep = 4.0 / 3.0;
+inline constexpr double kVerticalStep = 3.0 / 2.0;
 
 // A factor that letters can be drawn with: the given one, or 1 when it is not above 0 and finite.
 [[nodiscard]] double usableFactor(double factor);

@@ -94,12 +94,16 @@ std::wstring decodeLineText(std::wstring const& text) {
     return result;
 }
 
+bool hasVerticalMark(LayoutStyle const& style) {
+    return style.typeface.starts_with(L'@');
+}
+
 bool isVerticalStyle(LayoutStyle const& style) {
-    return style.vertical || (!style.typeface.empty() && style.typeface.front() == L'@');
+    return style.vertical || hasVerticalMark(style);
 }
 
 void dropVerticalMark(LayoutStyle& style) {
-    if (!style.vertical && style.typeface.starts_with(L'@')) style.typeface.erase(0, 1);
+    if (!style.vertical && hasVerticalMark(style)) style.typeface.erase(0, 1);
 }
 
 }  // namespace tzhost

@@ -191,7 +191,7 @@ TEST(Plots, PlaceTextsByTheirStyle) {
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setObliquingAngle(std::atan(1.0)); }), "1 0 50 10 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setBackward(true); }), "-40 0 -1 10 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setUpsideDown(true); }), "1 -10 40 0 ");
-    EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setVertical(true); }), "-4 -50 4 0 ");
+    EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setVertical(true); }), "-4 -55 4 0 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.style.setFont(L"@DejaVu Sans", false, false, 0, 0); }),
               "1 0 40 10 ");
     EXPECT_EQ(boxOf([](DrawnText& t) { t.direction = {0, 1, 0}; }), "-10 1 0 40 ");

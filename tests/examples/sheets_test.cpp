@@ -1,5 +1,6 @@
-// Every script of examples/ as a drafter runs it: its drawing, its audit, and that the saved
-// drawing opens and saves as the same bytes.
+// Every script of examples/ as a drafter runs it, on the drawing beside it if there is one: its
+// drawing, what passed between module and host, its audit, and that the saved drawing opens and
+// saves as the same bytes.
 
 #include <gtest/gtest.h>
 
@@ -7,6 +8,7 @@
 #include <cstdio>
 #include <cstdlib>
 #include <fstream>
+#include <set>
 
 #include "tests/support/event_lines.h"
 #include "tests/support/program_run.h"
@@ -29,6 +31,14 @@ std::string nameOf(testing::TestParamInfo<fs::path> const& row) {
     std::string name = row.param.stem().string();
     std::erase(name, '-');
     return name;
+}
+
+// The arguments that play a script, on the drawing beside it if there is one.
+std::vector<std::string> played(fs::path const& script, std::vector<std::string> arguments) {
+    arguments.insert(arguments.begin(), {"--script", script.string()});
+    fs::path const start = fs::path(script).replace_extension(".json");
+    if (fs::exists(start)) arguments.insert(arguments.begin(), start.string());
+    return arguments;
 }
 
 fs::path expectationOf(fs::path const& script) {
@@ -59,18 +69,34 @@ std::string printed(Json const& drawing) {
     return text;
 }
 
+// What passed between the text module and the host while its commands ran.
+std::string printed(std::vector<Json> const& events) {
+    std::set<std::string> commands;
+    std::string command;
+    tztest::EventLines lines(0, tztest::EventLines::Frames::left);
+    for (Json const& event : events) {
+        if (event.value("group", "") == "TZCORE_MTEXT") commands.insert(event["name"]);
+        if (event["event"] == "command") command = event["phase"] == "begin" ? event["name"] : "";
+        if (commands.contains(command)) lines.add(event);
+    }
+    std::string text = "\nevents\n";
+    for (std::string const& line : lines.lines())
+        text += line + "\n";
+    return text;
+}
+
 class Sheets : public testing::TestWithParam<fs::path> {};
 
 TEST_P(Sheets, GiveTheirDrawing) {
     fs::path const saved = scratch("sheet.json");
-    tztest::ProgramRun const run =
-        tztest::runProgram({"--script", GetParam().string(), "--save", saved.string(), "--svg",
-                            scratch("sheet.svg").string(), "--png", scratch("sheet.png").string(),
-                            "--events", scratch("sheet.jsonl").string()});
+    tztest::ProgramRun const run = tztest::runProgram(played(
+        GetParam(), {"--save", saved.string(), "--svg", scratch("sheet.svg").string(), "--png",
+                     scratch("sheet.png").string(), "--events", scratch("sheet.jsonl").string()}));
     ASSERT_EQ(run.status, 0) << run.output;
     EXPECT_EQ(run.errors, "");
 
-    std::string const seen = printed(Json::parse(tztest::bytesOf(saved)));
+    std::vector<Json> const events = tztest::eventsOf(scratch("sheet.jsonl"));
+    std::string const seen = printed(Json::parse(tztest::bytesOf(saved))) + printed(events);
     if (std::getenv("TZ_TEST_ACCEPT")) {
         std::ofstream(expectationOf(GetParam()), std::ios::binary) << seen;
     } else {
@@ -78,7 +104,7 @@ TEST_P(Sheets, GiveTheirDrawing) {
     }
 
     int audits = 0;
-    for (Json const& event : tztest::eventsOf(scratch("sheet.jsonl"))) {
+    for (Json const& event : events) {
         if (event["event"] != "audit") continue;
         ++audits;
         EXPECT_TRUE(tztest::isClean(event)) << event;
@@ -91,7 +117,7 @@ TEST_P(Sheets, GiveTheirDrawing) {
 TEST_P(Sheets, OpenAndSaveAsTheSameBytes) {
     std::string const first = scratch("first.json").string();
     std::string const second = scratch("second.json").string();
-    EXPECT_EQ(tztest::runProgram({"--script", GetParam().string(), "--save", first}).status, 0);
+    EXPECT_EQ(tztest::runProgram(played(GetParam(), {"--save", first})).status, 0);
     EXPECT_EQ(tztest::runProgram({first, "--script", "/dev/null", "--save", second}).status, 0);
     EXPECT_NE(tztest::bytesOf(first), "");
     EXPECT_TRUE(tztest::bytesOf(first) == tztest::bytesOf(second));

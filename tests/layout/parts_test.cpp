@@ -172,20 +172,57 @@ TEST(Columns, HoldWhatHangsBelowTheLine) {
     EXPECT_EQ(layOutMText(input).lines.back().column, 0);
 }
 
-// Letters stand 4/3 heights apart, each in the middle of its step; lines go to the left, 5/3 apart.
+// Letters stand 3/2 heights apart, each in the middle of its step; lines go to the left, 5/3 apart.
 TEST(Vertical, LinesGoDownAndToTheLeft) {
     MTextLayoutInput input = monospaced(L"ab\\Pc", 0);
     input.style.typeface = L"@DejaVu Sans Mono";
     MTextLayout const layout = layOutMText(input);
     double const across = (1.0 + 5.0 / 3.0) * kCapital;
     EXPECT_NEAR(layout.width, across, 1e-6);
-    EXPECT_NEAR(layout.height, 2.0 * 4.0 / 3.0 * kCapital, 1e-6);
+    EXPECT_NEAR(layout.height, 2.0 * 1.5 * kCapital, 1e-6);
     ASSERT_EQ(layout.runs.size(), 3U);
-    EXPECT_NEAR(layout.runs[0].x, across - kCapital / 2.0 - kLetter / 2.0, 1e-6);
-    EXPECT_NEAR(layout.runs[0].y, -(1.0 + 1.0 / 6.0) * kCapital, 1e-6);
-    EXPECT_NEAR(layout.runs[1].y, -(1.0 + 1.0 / 6.0 + 4.0 / 3.0) * kCapital, 1e-6);
-    EXPECT_NEAR(layout.runs[2].x, kCapital / 2.0 - kLetter / 2.0, 1e-6);
+    EXPECT_NEAR(layout.runs[0].x, -kCapital / 2.0 - kLetter / 2.0, 1e-6);
+    EXPECT_NEAR(layout.runs[0].y, -(1.0 + 0.25) * kCapital, 1e-6);
+    EXPECT_NEAR(layout.runs[1].y, -(1.0 + 0.25 + 1.5) * kCapital, 1e-6);
+    EXPECT_NEAR(layout.runs[2].x, kCapital / 2.0 - kLetter / 2.0 - across, 1e-6);
     EXPECT_NEAR(layout.runs[2].y, layout.runs[0].y, 1e-6);
+}
+
+struct VerticalAttachmentRow {
+    int attachment;
+    bool flag;  // else by the typeface
+    char const* box;
+};
+
+// One column "ab" of 1 text height across (1.21087 letters) and 2 steps of 3/2 down. The typeface's
+// frame is turned by 270 degrees: its left is the page's top, its top the page's right. "@" at
+// TL used to stand to the right of the corner that a drag had given.
+constexpr VerticalAttachmentRow kVerticalAttachments[] = {
+    {1, true,  "0,-3-1.21087,0"             },
+    {3, true,  "-1.21087,-3-0,0"            },
+    {5, true,  "-0.605434,-1.5-0.605434,1.5"},
+    {7, true,  "0,0-1.21087,3"              },
+    {1, false, "-1.21087,-3-0,0"            },
+    {3, false, "-1.21087,0-0,3"             },
+    {5, false, "-0.605434,-1.5-0.605434,1.5"},
+    {7, false, "0,-3-1.21087,0"             },
+    {8, false, "0,-1.5-1.21087,1.5"         },
+    {9, false, "0,0-1.21087,3"              },
+};
+
+TEST(Vertical, AttachmentCountsInTheFrameOfThePreview) {
+    for (VerticalAttachmentRow const& row : kVerticalAttachments) {
+        MTextLayoutInput input = monospaced(L"ab", 0);
+        input.attachment = row.attachment;
+        input.style.vertical = row.flag;
+        if (!row.flag) input.style.typeface = L"@DejaVu Sans Mono";
+        MTextLayout const layout = layOutMText(input);
+        EXPECT_EQ(printBox(layout.box), row.box) << row.attachment << " " << row.flag;
+        ASSERT_EQ(layout.runs.size(), 2U);
+        EXPECT_NEAR(layout.runs[0].y + kCapital * 1.25, layout.box.top, 1e-6);
+        EXPECT_NEAR(layout.runs[0].x + kLetter / 2.0, (layout.box.left + layout.box.right) / 2.0,
+                    1e-6);
+    }
 }
 
 struct SingleRow {
@@ -195,10 +232,10 @@ struct SingleRow {
 };
 
 constexpr SingleRow kSingleRows[] = {
-    {"Plain",      false, false, false, "0,0-3,1"            },
-    {"Backward",   false, true,  false, "-3,0-0,1"           },
-    {"UpsideDown", false, false, true,  "0,-1-3,0"           },
-    {"Vertical",   true,  false, false, "-0.5,-3.66667-0.5,0"},
+    {"Plain",      false, false, false, "0,0-3,1"      },
+    {"Backward",   false, true,  false, "-3,0-0,1"     },
+    {"UpsideDown", false, false, true,  "0,-1-3,0"     },
+    {"Vertical",   true,  false, false, "-0.5,-4-0.5,0"},
 };
 
 TEST(SingleLine, BoxFollowsTheStyle) {

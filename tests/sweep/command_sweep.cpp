@@ -216,7 +216,7 @@ void SweepSource::takeBack() {
 
 }  // namespace
 
-SweepCounts sweepScript(std::string const& script,
+SweepCounts sweepScript(SweepInput const& input,
                         Sweep kind,
                         SweepDepth depth,
                         std::function<void(SweepTry const&)> const& judge) {
@@ -224,11 +224,12 @@ SweepCounts sweepScript(std::string const& script,
     tzdraft::Options options;
     options.settings = std::filesystem::path(std::getenv("TZ_TEST_SCRATCH")) / "settings.json";
     std::ofstream(options.settings) << "{}";
+    options.drawing = input.drawing;
     options.module = std::filesystem::path(std::getenv("TZ_TEST_LIB")) / "tzmted.tzx";
     tzdraft::Screens screens;
     screens.output = [](std::string_view) {};
     screens.errors = [](std::string_view) {};
-    screens.source = std::make_unique<SweepSource>(script, kind, depth, judge, counts);
+    screens.source = std::make_unique<SweepSource>(input.script, kind, depth, judge, counts);
     int const status = tzdraft::runProgram(options, std::move(screens));
     if (status != tzdraft::kDone)
         judge({"the whole run", "exit status " + std::to_string(status), false});

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <filesystem>
 #include <functional>
 #include <memory>
 #include <string>
@@ -38,8 +39,14 @@ struct SweepDepth {
     long sampleBeyond = 20;
 };
 
+// A script and the drawing that it is played on; without one on an empty drawing.
+struct SweepInput {
+    std::string script;
+    std::filesystem::path drawing;
+};
+
 // Hands every try to `judge` and returns the counts.
-SweepCounts sweepScript(std::string const& script,
+SweepCounts sweepScript(SweepInput const& input,
                         Sweep kind,
                         SweepDepth depth,
                         std::function<void(SweepTry const&)> const& judge);

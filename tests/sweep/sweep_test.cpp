@@ -16,20 +16,27 @@ namespace {
 
 using namespace tztest;
 
-std::vector<std::string> examples() {
-    std::vector<std::string> names;
+std::vector<std::filesystem::path> examples() {
+    std::vector<std::filesystem::path> names;
     std::filesystem::path const folder =
         std::filesystem::path(std::getenv("TZ_TEST_SOURCE")) / "examples";
     for (auto const& entry : std::filesystem::directory_iterator(folder)) {
-        if (entry.path().extension() == ".scr") names.push_back(entry.path().string());
+        if (entry.path().extension() == ".scr") names.push_back(entry.path());
     }
     std::sort(names.begin(), names.end());
     return names;
 }
 
-std::string contentsOf(std::string const& file) {
+// A script with the drawing beside it.
+SweepInput inputOf(std::filesystem::path const& file) {
     std::ifstream in(file, std::ios::binary);
-    return {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+    SweepInput input{
+        {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()},
+        {                                  }
+    };
+    std::filesystem::path const start = std::filesystem::path(file).replace_extension(".json");
+    if (std::filesystem::exists(start)) input.drawing = start;
+    return input;
 }
 
 SweepDepth depth() {
@@ -38,29 +45,38 @@ SweepDepth depth() {
     return {50, 10};
 }
 
-void show(SweepCounts const& counts) {
-    std::printf("%ld commands, %ld questions, %ld host calls, %ld tries\n", counts.commands,
-                counts.questions, counts.calls, counts.tries);
+void show(std::string const& name, SweepCounts const& counts) {
+    std::printf("%-16s %4ld commands, %5ld questions, %8ld host calls, %7ld tries\n", name.c_str(),
+                counts.commands, counts.questions, counts.calls, counts.tries);
+}
+
+// Plays every example and prints its counts and their sums.
+void sweepExamples(Sweep kind, std::function<void(SweepTry const&)> const& judge) {
+    SweepCounts sum;
+    for (std::filesystem::path const& file : examples()) {
+        SCOPED_TRACE(file.string());
+        SweepCounts const counts = sweepScript(inputOf(file), kind, depth(), judge);
+        show(file.stem().string(), counts);
+        sum.commands += counts.commands;
+        sum.questions += counts.questions;
+        sum.calls += counts.calls;
+        sum.tries += counts.tries;
+    }
+    show("all", sum);
 }
 
 TEST(CancelSweep, LeavesTheDrawingAsItWas) {
-    for (std::string const& file : examples()) {
-        SCOPED_TRACE(file);
-        show(sweepScript(contentsOf(file), Sweep::cancels, depth(), [](SweepTry const& done) {
-            EXPECT_TRUE(done.auditIsClean) << done.command << ", " << done.what;
-            EXPECT_TRUE(done.drawingIsUntouched) << done.command << ", " << done.what;
-        }));
-    }
+    sweepExamples(Sweep::cancels, [](SweepTry const& done) {
+        EXPECT_TRUE(done.auditIsClean) << done.command << ", " << done.what;
+        EXPECT_TRUE(done.drawingIsUntouched) << done.command << ", " << done.what;
+    });
 }
 
 TEST(FaultSweep, LeavesAValidDrawingAndNothingOpen) {
-    for (std::string const& file : examples()) {
-        SCOPED_TRACE(file);
-        show(sweepScript(contentsOf(file), Sweep::faults, depth(), [](SweepTry const& done) {
-            EXPECT_TRUE(done.auditIsClean) << done.command << ", " << done.what;
-            EXPECT_TRUE(done.drawingIsValid) << done.command << ", " << done.what;
-        }));
-    }
+    sweepExamples(Sweep::faults, [](SweepTry const& done) {
+        EXPECT_TRUE(done.auditIsClean) << done.command << ", " << done.what;
+        EXPECT_TRUE(done.drawingIsValid) << done.command << ", " << done.what;
+    });
 }
 
 }  // namespace
