@@ -6,6 +6,7 @@
 #include "host/base/fault_point.h"
 #include "host/base/variables.h"
 #include "host/editors/markup_session.h"
+#include "host/faults/memory.h"
 #include "host/runtime/class_registry.h"
 #include "tz/ap/host_dialog.h"
 #include "tz/db/mtext.h"
@@ -84,14 +85,16 @@ Event describe(IPESettings const& settings) {
     return numbers;
 }
 
-void reportEditor(char const* kind, bool accepted, Event const& settings) {
+// What happened is told in any case. An event needs memory to free itself, hence the pause.
+void reportEditor(char const* kind, bool accepted, IPESettings const* settings) {
     if (!eventsWanted()) return;
+    MemoryFaultPause const pause;
     Event event{
         {"event",    "editor"},
         {"kind",     kind    },
         {"accepted", accepted}
     };
-    if (!settings.is_null()) event["settings"] = settings;
+    if (settings) event["settings"] = describe(*settings);
     reportEvent(event);
 }
 
@@ -99,7 +102,7 @@ void reportEditor(char const* kind, bool accepted, Event const& settings) {
 int runSession(TzDbMText& text,
                char const* kind,
                std::string const& program,
-               Event const& settings) {
+               IPESettings const* settings) {
     std::optional<TzString> const contents = editMarkup(text.contents(), program);
     bool const accepted = contents && text.setContents(contents->kwszPtr()) == Tzad::eOk;
     reportEditor(kind, accepted, settings);
@@ -112,7 +115,7 @@ void runRawEditor(TzApHostDialogParams& params) {
     EasyObject<TzDbMText> const* const text = raw.easyMText();
     if (!text || !text->object) return params.setReturnCode(3);
     std::string const& program = editorConfiguration().textEditor;
-    params.setReturnCode(runSession(*text->object, "raw", program, Event()) == kAccepted ? 1 : 2);
+    params.setReturnCode(runSession(*text->object, "raw", program, nullptr) == kAccepted ? 1 : 2);
 }
 
 struct DialogRow {
@@ -130,7 +133,7 @@ constexpr DialogRow kDialogs[] = {
 int IPEInvokeEditorOn(TzDbMText* text, IPESettings const* settings) {
     if (tzhost::faultAt("IPEInvokeEditorOn") || !text || !settings) return tzhost::kLeft;
     std::string const& program = tzhost::editorConfiguration().textEditor;
-    return tzhost::runSession(*text, "inPlace", program, tzhost::describe(*settings));
+    return tzhost::runSession(*text, "inPlace", program, settings);
 }
 
 bool IPEIsEditor(bool /*current*/) {
@@ -145,7 +148,7 @@ bool IPEIsEditor(bool /*current*/) {
 int tzedEditMTextInteractive(TzDbMText* text, bool /*interactive*/, bool /*view*/) {
     if (tzhost::faultAt("tzedEditMTextInteractive") || !text) return tzhost::kLeft;
     TzString const program(tzhost::Variables::instance().text(L"MTEXTED"));
-    return tzhost::runSession(*text, "external", program.toUtf8(), tzhost::Event());
+    return tzhost::runSession(*text, "external", program.toUtf8(), nullptr);
 }
 
 void tzedSetExistingMText(bool existing) {
