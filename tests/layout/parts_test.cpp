@@ -52,6 +52,14 @@ constexpr RunRow kRunRows[] = {
  // The H of Liberation Sans advances 1479 units and is 1409 high.
     {"FacesByTheirOwnMeasure", L"a{\\fLiberation Sans|b0|i0|c0|p0;H}b",
      "'a'@0,-1,1 'H'@1,-1,1.27102 'b'@2.27102,-1,1",                                                                                  ""                             },
+ // An ideograph is one em wide, 1.66099 letters; accents stand on their letter.
+    {"LatinAndIdeographs",     L"ab\u4E2D\u6587c",                         "'ab\u4E2D\u6587c'@0,-1,6.32198",                          ""                             },
+    {"AccentsTakeNoRoom",      L"e\u0301\u0302x\\Le\u0301",                "'e\u0301\u0302x'@0,-1,2 'e\u0301'@2,-1,1",
+     "u2,-1.2-3,-1.2"                                                                                                                                                },
+    {"WidthAndTracking",       L"\\W0.5;\\T2;ab\\Lc",                      "'ab'@0,-1,2 'c'@2,-1,1",                                  "u2,-1.2-3,-1.2"               },
+    {"ObliqueTakesNoRoom",     L"\\Q20;ab\\Oc",                            "'ab'@0,-1,2 'c'@2,-1,1",                                  "o2,0.2-3,0.2"                 },
+    {"StackInATab",            L"\\pt6165;\\S1^2;\tb",                     "'1'@0.121087,-1,1 '2'@0.121087,-2.4,1 'b'@5,-2.4,1",
+     ""                                                                                                                                                              },
     {"ControlsAreDropped",     L"a\rb\x1F\x7F\x85",                        "'ab'@0,-1,2",                                             ""                             },
 };
 
@@ -85,15 +93,18 @@ TEST(Parts, StackScaleSizesTheParts) {
 }
 
 // Hebrew (DejaVu Sans Mono has none, but its face decides no order) stands from right to left,
-// numbers in it from left to right; the first strong letter decides the order of the whole.
+// numbers in it from left to right; the first strong letter decides the order of the whole. Behind
+// Arabic letters a number goes with them, so the blank behind it does too.
 TEST(Parts, StandInTheOrderTheyAreSeen) {
     struct {
         wchar_t const* contents;
         char const* order;
     } const rows[] = {
-        {L"ab \u05D0\u05D1 cd",     "ab |\u05D0\u05D1| cd"    },
-        {L"\u05D0\u05D1 12 \u05D2", " \u05D2|12|\u05D0\u05D1 "},
-        {L"\u05D0 ab",              "ab|\u05D0 "              },
+        {L"ab \u05D0\u05D1 cd",                   "ab |\u05D0\u05D1| cd"                  },
+        {L"\u05D0\u05D1 12 \u05D2",               " \u05D2|12|\u05D0\u05D1 "              },
+        {L"\u05D0 ab",                            "ab|\u05D0 "                            },
+        {L"ab \u0633\u0644\u0627\u0645 \u4E2D c", "ab |\u0633\u0644\u0627\u0645| \u4E2D c"},
+        {L"\u0633 12 \u4E2D \u0644",              " \u0644|\u4E2D| |12|\u0633 "           },
     };
     for (auto const& row : rows) {
         MTextLayout const layout = layOutMText(monospaced(row.contents, 0));
@@ -153,6 +164,43 @@ TEST(Columns, BreakWhereTheyAreFull) {
         }
         EXPECT_EQ(printBox(layout.box), row.box) << row.name;
     }
+}
+
+// Words of 3 wrap at columns of 7 letters, two to a line and two lines to a column; gutters of 2.
+TEST(Columns, WrapAtTheirOwnWidth) {
+    struct {
+        int type, attachment;
+        char const* lines;
+        char const* box;
+    } const rows[] = {
+        {1, 1, "0:0,-1,7 0:0,-2.66667,7 1:9,-1,7 1:9,-2.66667,3",       "0,-2.66667-25,0" },
+        {2, 1, "0:0,-1,7 0:0,-2.66667,7 1:9,-1,7 1:9,-2.66667,3",       "0,-2.66667-16,0" },
+        {2, 3, "0:-16,-1,7 0:-16,-2.66667,7 1:-7,-1,7 1:-3,-2.66667,3", "-16,-2.66667-0,0"},
+    };
+    for (auto const& row : rows) {
+        MTextLayoutInput input = monospaced(L"aaa bbb ccc ddd eee fff ggg", 100);
+        input.columns = {row.type, true, 3, 7 * kLetter, 2 * kLetter, {}};
+        input.height = kCapital * (1.0 + 5.0 / 3.0);
+        input.attachment = row.attachment;
+        MTextLayout const layout = layOutMText(input);
+        EXPECT_EQ(printLines(layout), row.lines) << row.type << row.attachment;
+        EXPECT_EQ(printBox(layout.box), row.box) << row.type << row.attachment;
+    }
+}
+
+// A text height is 1.21087 letters; half of it is added on all sides at 1.5, four at 5.
+TEST(Background, IsWiderThanTheTextByItsScale) {
+    struct {
+        double scale;
+        char const* box;
+    } const rows[] = {
+        {1.0, "0,-2.66667-4,0"                },
+        {1.5, "-0.605434,-3.16667-4.60543,0.5"},
+        {5.0, "-4.84347,-6.66667-8.84347,4"   },
+    };
+    MTextLayout const layout = layOutMText(monospaced(L"aaaa\\Pbb", 6));
+    for (auto const& row : rows)
+        EXPECT_EQ(printBox(backgroundBox(layout, kCapital, row.scale)), row.box) << row.scale;
 }
 
 TEST(Columns, TakeALineHigherThanThemselves) {
