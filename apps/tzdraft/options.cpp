@@ -38,7 +38,9 @@ void declare(CLI::App& app, Options& options) {
         ->type_name("NAME=VALUE")
         ->expected(1);
     declareFile(app, "--font-map", options.fontMap, "the font map file");
-    declareText(app, "--locale", options.locale, "LL  the language of prompts and messages");
+    declareText(
+        app, "--locale", options.locale,
+        "LL  the language, such as de; the environment's (LC_ALL, LC_MESSAGES, LANG) without it");
     declareFile(app, "--settings", options.settings, "the settings file");
     declareFile(app, "--module", options.module,
                 "the module to load; beside the program when left out");
