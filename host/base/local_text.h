@@ -43,5 +43,8 @@ void setLocalTexts(std::vector<LocalTextRow> rows);
 constexpr wchar_t const* forLocalText(wchar_t const* english) {
     return english;
 }
+constexpr char const* forLocalText(char const* english) {
+    return english;
+}
 
 }  // namespace tzhost

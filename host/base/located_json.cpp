@@ -1,5 +1,7 @@
 #include "host/base/located_json.h"
 
+#include "host/base/local_text.h"
+
 #include <algorithm>
 
 #include <nlohmann/json.hpp>
@@ -53,7 +55,7 @@ public:
     bool end_array() { return close(); }
     bool key(string_t& name) {
         if (open_.back()->find(name) != nullptr) {
-            return fail("the member \"" + name + "\" stands here twice");
+            return fail(localText("the member \"") + name + localText("\" stands here twice"));
         }
         key_ = std::move(name);
         return true;
@@ -75,7 +77,7 @@ private:
     }
 
     bool open(LocatedJson::Kind kind) {
-        if (open_.size() == kDeepest) return fail("nested too deeply");
+        if (open_.size() == kDeepest) return fail(localText("nested too deeply"));
         LocatedJson* const here = place(kind);
         if (here != nullptr) open_.push_back(here);
         return here != nullptr;
@@ -117,7 +119,7 @@ LocatedJson::Result LocatedJson::read(std::string_view bytes) {
     LocatedJsonBuilder builder(counter);
     bool const isRead = nlohmann::json::sax_parse(counter.begin(), counter.end(), &builder);
     Result result = builder.take();
-    if (!isRead && result.error.empty()) result.error = "no JSON document";
+    if (!isRead && result.error.empty()) result.error = localText("no JSON document");
     return result;
 }
 
@@ -127,16 +129,16 @@ LocatedJson const* LocatedJson::find(std::string_view name) const {
     return at == members_.end() ? nullptr : &at->second;
 }
 
-std::string_view nameOf(LocatedJson::Kind kind) {
+std::string nameOf(LocatedJson::Kind kind) {
     switch (kind) {
     case LocatedJson::Kind::null: return "null";
-    case LocatedJson::Kind::boolean: return "true or false";
-    case LocatedJson::Kind::number: return "a number";
-    case LocatedJson::Kind::text: return "a text";
-    case LocatedJson::Kind::array: return "an array";
+    case LocatedJson::Kind::boolean: return localText("true or false");
+    case LocatedJson::Kind::number: return localText("a number");
+    case LocatedJson::Kind::text: return localText("a text");
+    case LocatedJson::Kind::array: return localText("an array");
     case LocatedJson::Kind::object: break;
     }
-    return "an object";
+    return localText("an object");
 }
 
 }  // namespace tzhost

@@ -105,6 +105,6 @@ struct LocatedJson::Result {
 };
 
 // What a kind is called in a complaint: "a number".
-[[nodiscard]] std::string_view nameOf(LocatedJson::Kind kind);
+[[nodiscard]] std::string nameOf(LocatedJson::Kind kind);
 
 }  // namespace tzhost

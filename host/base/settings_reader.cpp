@@ -7,6 +7,7 @@
 #include <limits>
 
 #include "host/base/ini_data.h"
+#include "host/base/local_text.h"
 #include "host/base/located_json.h"
 #include "host/base/settings.h"
 #include "host/base/utf8.h"
@@ -50,7 +51,7 @@ private:
     }
     bool isA(LocatedJson const& value, Kind kind, std::string const& path) {
         if (value.kind() == kind) return true;
-        fail(value, path, "expected " + std::string(nameOf(kind)));
+        fail(value, path, localText("expected ") + nameOf(kind));
         return false;
     }
     // A whole number of 32 bits without sign.
@@ -61,7 +62,7 @@ private:
             number == std::trunc(number)) {
             return static_cast<std::uint32_t>(number);
         }
-        fail(value, path, "expected a whole number from 0 to 4294967295");
+        fail(value, path, localText("expected a whole number from 0 to 4294967295"));
         return std::nullopt;
     }
     void registryValue(std::wstring const& key,
@@ -115,7 +116,7 @@ void Reader::read(LocatedJson const& root) {
         for (MemberRow const& row : kMembers) {
             if (row.name == name) found = &row;
         }
-        if (found == nullptr) return fail(value, name, "there is no such setting");
+        if (found == nullptr) return fail(value, name, localText("there is no such setting"));
         (this->*found->read)(value, name);
         if (!isGood()) return;
     }
@@ -126,8 +127,9 @@ void Reader::variables(LocatedJson const& value, std::string const& path) {
     for (auto const& [name, held] : value.members()) {
         std::string const here = path + '.' + name;
         VariableDefinition const* const row = findVariable(fromUtf8(name));
-        if (row == nullptr) return fail(held, here, "there is no such system variable");
-        if (row->kept != KeptIn::user) return fail(held, here, "is not kept in the settings");
+        if (row == nullptr) return fail(held, here, localText("there is no such system variable"));
+        if (row->kept != KeptIn::user)
+            return fail(held, here, localText("is not kept in the settings"));
         VariableValue const read = variableValue(held, row->type);
         if (auto const complaint = row->complaintAbout(read)) {
             return fail(held, here, toUtf8(*complaint));
@@ -155,7 +157,8 @@ void Reader::registry(LocatedJson const& value, std::string const& path) {
         std::string const here = path + '.' + name;
         std::wstring key = lowered(fromUtf8(name));
         if (!beginsWithRoot(key)) {
-            return fail(values, here, "expected HKEY_CURRENT_USER or HKEY_LOCAL_MACHINE first");
+            return fail(values, here,
+                        localText("expected HKEY_CURRENT_USER or HKEY_LOCAL_MACHINE first"));
         }
         while (key.back() == L'\\')
             key.pop_back();
@@ -189,8 +192,8 @@ SettingsResult readSettings(std::string_view bytes) {
     if (std::size_t const bad = firstBadByte(bytes); bad != kAllUtf8) {
         auto const line = 1 + std::count(bytes.begin(), bytes.begin() + bad, '\n');
         return {{},
-                std::to_string(line) + ": the byte at offset " + std::to_string(bad) +
-                    " is no UTF-8"};
+                std::to_string(line) + ": " + localText("the byte at offset ") +
+                    std::to_string(bad) + localText(" is no UTF-8")};
     }
     LocatedJson::Result const document = LocatedJson::read(bytes);
     if (!document.error.empty()) {

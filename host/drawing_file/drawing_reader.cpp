@@ -79,12 +79,13 @@ private:
         if (value.kind == JsonKind::number) {
             settings_.workingAngle = value.number;
         } else {
-            wrongKind("workingAngle", value, "a number");
+            wrongKind("workingAngle", value, nameOf(JsonKind::number));
         }
     }
-    void wrongKind(char const* name, JsonValue const& value, char const* expected) {
+    void wrongKind(char const* name, JsonValue const& value, std::string const& expected) {
         context_.complain(value.line, name,
-                          "is " + std::string(nameOf(value.kind)) + ", expected " + expected);
+                          localText("is ") + nameOf(value.kind) + localText(", expected ") +
+                              expected);
     }
 
     ReadContext& context_;
@@ -127,7 +128,7 @@ DrawingReader::MemberRow const DrawingReader::kRows[] = {
 void DrawingReader::readFormat(JsonValue const& value) {
     hasFormat_ = true;
     if (value.kind != JsonKind::text || value.text != "tz-drawing") {
-        context_.complain(value.line, "format", "is another, expected \"tz-drawing\"");
+        context_.complain(value.line, "format", localText("is another, expected \"tz-drawing\""));
     }
 }
 
@@ -136,17 +137,18 @@ void DrawingReader::readVersion(JsonValue const& value) {
     if (value.kind == JsonKind::number && value.number == kVersion) return;
     isNewer_ = value.kind == JsonKind::number && value.number > kVersion;
     context_.complain(value.line, "version",
-                      isNewer_ ? "is " + value.text + " and newer than this program, expected 1"
-                               : std::string("is no version, expected 1"));
+                      isNewer_ ? localText("is ") + value.text +
+                                     localText(" and newer than this program, expected 1")
+                               : localText("is no version, expected 1"));
 }
 
 bool DrawingReader::isObject(char const* name, JsonValue const& value) {
-    if (value.kind != JsonKind::object) wrongKind(name, value, "an object");
+    if (value.kind != JsonKind::object) wrongKind(name, value, nameOf(JsonKind::object));
     return value.kind == JsonKind::object;
 }
 
 void DrawingReader::readName(char const* name, JsonValue const& value, std::string& into) {
-    if (value.kind != JsonKind::text) return wrongKind(name, value, "a text");
+    if (value.kind != JsonKind::text) return wrongKind(name, value, nameOf(JsonKind::text));
     into = value.text;
     (&into == &layer_ ? layerLine_ : styleLine_) = value.line;
 }
@@ -208,10 +210,10 @@ bool DrawingReader::endBlock() {
     describe(members, values);
     members.keepRest();
     if (!context_.failed && name.empty()) {
-        members.complain("name", "is missing or empty, expected a name");
+        members.complain("name", localText("is missing or empty, expected a name"));
     }
     if (!Drawing::find(context_.drawing.blockTableId(), name).isNull() && !name.empty()) {
-        members.complain("name", "stands twice, expected each once");
+        members.complain("name", localText("stands twice, expected each once"));
     }
     values.name = std::move(name);
     noteNamesChanged();
@@ -233,14 +235,16 @@ TzDbObjectId DrawingReader::currentRecord(char const* name,
     TzDbObjectId const found = Drawing::find(table, fromUtf8(wanted));
     if (found.isNull()) {
         context_.complain(name == std::string_view("currentLayer") ? layerLine_ : styleLine_, name,
-                          "names \"" + wanted + "\", expected a name that the drawing has");
+                          localText("names \"") + wanted +
+                              localText("\", expected a name that the drawing has"));
     }
     return found;
 }
 
 void DrawingReader::finish() {
-    if (!hasFormat_) context_.complain(1, "format", "is missing, expected \"tz-drawing\"");
-    if (!hasVersion_) context_.complain(1, "version", "is missing, expected 1");
+    if (!hasFormat_)
+        context_.complain(1, "format", localText("is missing, expected \"tz-drawing\""));
+    if (!hasVersion_) context_.complain(1, "version", localText("is missing, expected 1"));
     if (context_.failed) return;
     entities_.finish();
     Drawing& drawing = context_.drawing;
@@ -253,7 +257,8 @@ void DrawingReader::finish() {
 
 std::string messageOf(std::filesystem::path const& file, Problem const& problem) {
     std::string text = file.string() + ':' + std::to_string(problem.line) + ": ";
-    text += problem.member.empty() ? "the drawing" : "member \"" + problem.member + '"';
+    text += problem.member.empty() ? localText("the drawing")
+                                   : localText("member \"") + problem.member + '"';
     return text + (problem.member.empty() ? " " : ": ") + problem.what;
 }
 

@@ -4,6 +4,7 @@
 #include <map>
 #include <type_traits>
 
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/database/field_imp.h"
 #include "host/database/open_state.h"
@@ -15,7 +16,7 @@
 namespace tzhost::drawingfile {
 namespace {
 
-constexpr char const* kTypes = "MTEXT, TEXT, ATTDEF, LINE, CIRCLE or INSERT";
+constexpr char const* kTypes = forLocalText("MTEXT, TEXT, ATTDEF, LINE, CIRCLE or INSERT");
 
 // Reading opens every object that it makes; closing it again is no change of a command.
 void closeUnchanged(TzDbObjectRecord& record) {
@@ -57,15 +58,17 @@ std::uint64_t EntityReader::handleOf(JsonValue const& value) {
     auto const [stop, error] = std::from_chars(member->text.data(), end, handle, kHexadecimal);
     if (member->kind != JsonKind::text || error != std::errc() || stop != end || handle == 0 ||
         handle > Drawing::kMaxEntityHandle) {
-        context_.complain(member->line, "handle",
-                          "is no handle, expected a text of hexadecimal digits from \"1\" to "
-                          "\"3FFFFFFFFFFFFFFF\"");
+        context_.complain(
+            member->line, "handle",
+            localText(
+                "is no handle, expected a text of hexadecimal digits from \"1\" to \"3FFFFFFFFFFFFFFF\""));
         return 0;
     }
     if (!context_.drawing.objectAt(handle).isNull()) {
-        context_.complain(member->line, "handle",
-                          "is \"" + member->text +
-                              "\" as that of an earlier entity, expected each handle once");
+        context_.complain(
+            member->line, "handle",
+            localText("is \"") + member->text +
+                localText("\" as that of an earlier entity, expected each handle once"));
         return 0;
     }
     return handle;
@@ -76,7 +79,8 @@ TzDbObjectRecord& EntityReader::spaceOf(JsonValue const& value) {
     JsonValue const* const member = value.find("space");
     bool const onPaper = member && member->kind == JsonKind::text && member->text == "paper";
     if (member && !onPaper && (member->kind != JsonKind::text || member->text != "model")) {
-        context_.complain(member->line, "space", "is no space, expected \"model\" or \"paper\"");
+        context_.complain(member->line, "space",
+                          localText("is no space, expected \"model\" or \"paper\""));
     }
     return *(onPaper ? drawing.paperSpace() : drawing.modelSpace()).record();
 }
@@ -134,9 +138,11 @@ void EntityReader::readAttributes(JsonValue const* list, TzDbObjectRecord& refer
     for (JsonValue const& each : list->items) {
         JsonValue const* const type = each.find("type");
         if (each.kind != JsonKind::object) {
-            context_.complain(each.line, "attributes", "holds no object, expected an ATTRIB");
+            context_.complain(each.line, "attributes",
+                              localText("holds no object, expected an ATTRIB"));
         } else if (!type || type->text != "ATTRIB") {
-            context_.complain(each.line, "type", "is missing or another, expected ATTRIB");
+            context_.complain(each.line, "type",
+                              localText("is missing or another, expected ATTRIB"));
         }
         if (context_.failed) return;
         readAs<TzDbAttribute, AttributeImp>(each, reference);
@@ -146,8 +152,8 @@ void EntityReader::readAttributes(JsonValue const* list, TzDbObjectRecord& refer
 void EntityReader::read(JsonValue const& value, TzDbObjectRecord* owner) {
     if (value.kind != JsonKind::object) {
         return context_.complain(value.line, "entities",
-                                 "holds " + std::string(nameOf(value.kind)) +
-                                     ", expected an object");
+                                 localText("holds ") + nameOf(value.kind) +
+                                     localText(", expected an object"));
     }
     struct TypeRow {
         std::string_view name;
@@ -163,15 +169,17 @@ void EntityReader::read(JsonValue const& value, TzDbObjectRecord* owner) {
     };
     JsonValue const* const type = value.find("type");
     if (!type) {
-        return context_.complain(value.line, "type", std::string("is missing, expected ") + kTypes);
+        return context_.complain(value.line, "type",
+                                 localText("is missing, expected ") + localText(kTypes));
     }
     for (TypeRow const& row : kRows) {
         if (type->kind != JsonKind::text || type->text != row.name) continue;
         return (this->*row.read)(value, owner ? *owner : spaceOf(value));
     }
     std::string const found =
-        type->kind == JsonKind::text ? '"' + type->text + '"' : std::string(nameOf(type->kind));
-    context_.complain(type->line, "type", "is " + found + ", expected " + kTypes);
+        type->kind == JsonKind::text ? '"' + type->text + '"' : nameOf(type->kind);
+    context_.complain(type->line, "type",
+                      localText("is ") + found + localText(", expected ") + localText(kTypes));
 }
 
 void EntityReader::refuseCycles() {
@@ -203,8 +211,9 @@ void EntityReader::refuseCycles() {
                 valuesOf<InsertImp>(*reference.reference->object).block.record();
             auto const mark = marks.find(target);
             if (mark != marks.end() && mark->second == Mark::open) {
-                return context_.complain(reference.line, "block",
-                                         "leads back to the block that holds it, expected another");
+                return context_.complain(
+                    reference.line, "block",
+                    localText("leads back to the block that holds it, expected another"));
             }
             if (mark != marks.end()) continue;
             marks.emplace(target, Mark::open);
@@ -217,9 +226,10 @@ void EntityReader::finish() {
     for (OpenReference const& each : references_) {
         TzDbObjectId const block = Drawing::find(context_.drawing.blockTableId(), each.block);
         if (block.isNull()) {
-            return context_.complain(each.line, "block",
-                                     "names \"" + toUtf8(each.block) +
-                                         "\", expected the name of a block of this drawing");
+            return context_.complain(
+                each.line, "block",
+                localText("names \"") + toUtf8(each.block) +
+                    localText("\", expected the name of a block of this drawing"));
         }
         valuesOf<InsertImp>(*each.reference->object).block = block;
     }

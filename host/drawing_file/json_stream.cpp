@@ -9,6 +9,7 @@
 #include <nlohmann/json.hpp>
 
 #include "host/base/file_bytes.h"
+#include "host/base/local_text.h"
 #include "host/drawing_file/json_source.h"
 
 namespace tzhost::drawingfile {
@@ -19,7 +20,7 @@ constexpr std::size_t kDeepest = 200;
 // Where the parser stands outside the values that are handed over whole.
 enum class Place { start, drawing, entities, blocks, block, blockEntities, end };
 
-constexpr char const* kTwice = "stands twice, expected each member once";
+constexpr char const* kTwice = forLocalText("stands twice, expected each member once");
 
 // The second value of a name that an object has twice, and that name; null when there is none.
 JsonValue const* secondOfName(JsonValue const& object, std::string& name) {
@@ -50,11 +51,12 @@ std::string sentenceOf(std::string_view message) {
 
 std::string explain(nlohmann::json::exception const& error) {
     std::string_view const message = error.what();
-    if (message.find("UTF-8") != message.npos) return "is not UTF-8, expected UTF-8 text";
+    if (message.find("UTF-8") != message.npos)
+        return localText("is not UTF-8, expected UTF-8 text");
     if (message.find("out_of_range") != message.npos) {
-        return "is too large a number, expected one below 1.8e308";
+        return localText("is too large a number, expected one below 1.8e308");
     }
-    return "is no JSON here: " + sentenceOf(message);
+    return localText("is no JSON here: ") + sentenceOf(message);
 }
 
 }  // namespace
@@ -143,7 +145,7 @@ bool StreamParser::key(string_t& name) {
     key_ = std::move(name);
     bool const isStreamed = open_.empty();
     if (!isStreamed || seen_[place_ == Place::block ? 1 : 0].insert(key_).second) return true;
-    return fail(kTwice);
+    return fail(localText(kTwice));
 }
 
 bool StreamParser::deliver(JsonValue value) {
@@ -162,11 +164,11 @@ bool StreamParser::deliver(JsonValue value) {
     case Place::entities:
     case Place::blockEntities: return hand(sink_.entity(std::move(value)));
     case Place::blocks:
-        return fail("holds " + std::string(nameOf(value.kind)) + ", expected an object");
+        return fail(localText("holds ") + nameOf(value.kind) + localText(", expected an object"));
     case Place::start:
     case Place::end: break;
     }
-    return fail("is " + std::string(nameOf(value.kind)) + ", expected an object");
+    return fail(localText("is ") + nameOf(value.kind) + localText(", expected an object"));
 }
 
 bool StreamParser::scalar(JsonValue value) {
@@ -174,7 +176,8 @@ bool StreamParser::scalar(JsonValue value) {
     bool const isStreamed =
         open_.empty() && ((place_ == Place::drawing && (key_ == "entities" || key_ == "blocks")) ||
                           (place_ == Place::block && key_ == "entities"));
-    if (isStreamed) return fail("is " + std::string(nameOf(value.kind)) + ", expected an array");
+    if (isStreamed)
+        return fail(localText("is ") + nameOf(value.kind) + localText(", expected an array"));
     return deliver(std::move(value));
 }
 
@@ -184,7 +187,7 @@ bool StreamParser::openPlace(JsonKind kind, bool& handled) {
     if (place_ == Place::start && !isArray) {
         place_ = Place::drawing;
     } else if (place_ == Place::drawing && (key_ == "entities" || key_ == "blocks")) {
-        if (!isArray) return fail("is an object, expected an array");
+        if (!isArray) return fail(localText("is an object, expected an array"));
         place_ = key_ == "blocks" ? Place::blocks : Place::entities;
         sink_.beginArray(key_);
     } else if (place_ == Place::blocks && !isArray) {
@@ -192,7 +195,7 @@ bool StreamParser::openPlace(JsonKind kind, bool& handled) {
         seen_[1].clear();
         return hand(sink_.beginBlock(source_.line()));
     } else if (place_ == Place::block && key_ == "entities") {
-        if (!isArray) return fail("is an object, expected an array");
+        if (!isArray) return fail(localText("is an object, expected an array"));
         place_ = Place::blockEntities;
     } else {
         handled = false;
@@ -201,7 +204,8 @@ bool StreamParser::openPlace(JsonKind kind, bool& handled) {
 }
 
 bool StreamParser::open(JsonKind kind) {
-    if (open_.size() == kDeepest) return fail("is nested too deeply, expected at most 200 levels");
+    if (open_.size() == kDeepest)
+        return fail(localText("is nested too deeply, expected at most 200 levels"));
     if (open_.empty()) {
         bool handled = false;
         if (!openPlace(kind, handled)) return false;
@@ -220,7 +224,7 @@ bool StreamParser::close() {
         key_ = std::move(name);
         if (JsonValue const* const twice = secondOfName(value, key_)) {
             result_.failed = true;
-            result_.problem = {twice->line, key_, kTwice};
+            result_.problem = {twice->line, key_, localText(kTwice)};
             return false;
         }
         return deliver(std::move(value));
@@ -242,10 +246,10 @@ StreamResult readStream(std::FILE* file, DrawingSink& sink) {
     StreamResult result = parser.take();
     if (source.failed()) {
         result.failed = true;
-        result.problem = {source.line(), "", "cannot be read: " + systemReason()};
+        result.problem = {source.line(), "", localText("cannot be read") + ": " + systemReason()};
     } else if (!isRead && !result.failed && !result.stopped) {
         result.failed = true;
-        result.problem = {source.line(), "", "is no JSON"};
+        result.problem = {source.line(), "", localText("is no JSON")};
     }
     return result;
 }

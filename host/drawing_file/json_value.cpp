@@ -1,5 +1,7 @@
 #include "host/drawing_file/json_value.h"
 
+#include "host/base/local_text.h"
+
 #include <algorithm>
 #include <array>
 #include <charconv>
@@ -51,16 +53,16 @@ JsonValue const* JsonValue::find(std::string_view name) const {
     return at == members.end() ? nullptr : &at->second;
 }
 
-std::string_view nameOf(JsonKind kind) {
+std::string nameOf(JsonKind kind) {
     switch (kind) {
     case JsonKind::null: return "null";
-    case JsonKind::flag: return "true or false";
-    case JsonKind::number: return "a number";
-    case JsonKind::text: return "a text";
-    case JsonKind::array: return "an array";
+    case JsonKind::flag: return localText("true or false");
+    case JsonKind::number: return localText("a number");
+    case JsonKind::text: return localText("a text");
+    case JsonKind::array: return localText("an array");
     case JsonKind::object: break;
     }
-    return "an object";
+    return localText("an object");
 }
 
 void writeText(std::string& out, std::string_view utf8) {

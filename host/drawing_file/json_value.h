@@ -31,7 +31,7 @@ struct JsonMember {
 };
 
 // What a kind is called in a message: "a number".
-[[nodiscard]] std::string_view nameOf(JsonKind kind);
+[[nodiscard]] std::string nameOf(JsonKind kind);
 
 // Append one value each.
 void writeText(std::string& out, std::string_view utf8);

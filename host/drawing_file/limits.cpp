@@ -1,5 +1,7 @@
 #include "host/drawing_file/limits.h"
 
+#include "host/base/local_text.h"
+
 namespace tzhost::drawingfile {
 
 bool isIn(Range range, double value) {
@@ -14,16 +16,16 @@ bool isIn(Range range, double value) {
     return true;
 }
 
-char const* nameOf(Range range) {
+std::string nameOf(Range range) {
     switch (range) {
     case Range::any: break;
-    case Range::positive: return "a number above 0";
-    case Range::size: return "a number, 0 or more";
-    case Range::nonZero: return "a number other than 0";
-    case Range::spacing: return "a number from 0.25 to 4";
-    case Range::enlargement: return "a number from 1 to 5";
+    case Range::positive: return localText("a number above 0");
+    case Range::size: return localText("a number, 0 or more");
+    case Range::nonZero: return localText("a number other than 0");
+    case Range::spacing: return localText("a number from 0.25 to 4");
+    case Range::enlargement: return localText("a number from 1 to 5");
     }
-    return "a number";
+    return localText("a number");
 }
 
 }  // namespace tzhost::drawingfile

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <string>
+
 namespace tzhost::drawingfile {
 
 // The numbers that a member takes. All are finite.
@@ -14,7 +16,7 @@ enum class Range {
 
 // Whether a finite number lies in a range, and how a message names that range.
 [[nodiscard]] bool isIn(Range range, double value);
-[[nodiscard]] char const* nameOf(Range range);
+[[nodiscard]] std::string nameOf(Range range);
 
 // Whole numbers from `low` to `high`.
 struct WholeRange {

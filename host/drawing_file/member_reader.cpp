@@ -3,6 +3,7 @@
 #include <charconv>
 #include <cmath>
 
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/database/geometry.h"
 
@@ -13,12 +14,13 @@ namespace {
 std::string shown(JsonValue const& value) {
     if (value.kind == JsonKind::number) return value.text;
     if (value.kind == JsonKind::flag) return value.flag ? "true" : "false";
-    return std::string(nameOf(value.kind));
+    return nameOf(value.kind);
 }
 
 std::string range(WholeRange numbers) {
-    return "a whole number from " + std::to_string(numbers.low) + " to " +
-           std::to_string(numbers.high);
+    return TzString::formatted(localText(L"a whole number from %d to %d"), numbers.low,
+                               numbers.high)
+        .toUtf8();
 }
 
 bool isWholeIn(double number, WholeRange numbers) {
@@ -75,7 +77,8 @@ void MemberReader::complain(char const* name, std::string what) const {
 void MemberReader::refuse(char const* name,
                           JsonValue const& member,
                           std::string_view expected) const {
-    complain(name, "is " + shown(member) + ", expected " + std::string(expected));
+    complain(name,
+             localText("is ") + shown(member) + localText(", expected ") + std::string(expected));
 }
 
 void MemberReader::flag(char const* name, bool& value) {
@@ -105,7 +108,7 @@ void MemberReader::text(char const* name, std::wstring& value) {
     JsonValue const* const member = takeOf(name, JsonKind::text);
     if (!member) return;
     if (member->text.find('\0') != std::string::npos) {
-        return complain(name, "holds a zero character, expected a text without one");
+        return complain(name, localText("holds a zero character, expected a text without one"));
     }
     value = fromUtf8(member->text);
 }
@@ -113,15 +116,16 @@ void MemberReader::text(char const* name, std::wstring& value) {
 bool MemberReader::triple(char const* name, double (&values)[3]) {
     JsonValue const* const member = take(name);
     if (!member) return false;
-    constexpr char const* kExpected = "an array of three numbers";
+    constexpr char const* kExpected = forLocalText("an array of three numbers");
     if (member->kind != JsonKind::array || member->items.size() != 3) {
-        refuse(name, *member, kExpected);
+        refuse(name, *member, localText(kExpected));
         return false;
     }
     for (std::size_t i = 0; i < 3; ++i) {
         JsonValue const& item = member->items[i];
         if (item.kind != JsonKind::number || !std::isfinite(item.number)) {
-            complain(name, "holds " + shown(item) + ", expected " + kExpected);
+            complain(name, localText("holds ") + shown(item) + localText(", expected ") +
+                               localText(kExpected));
             return false;
         }
         values[i] = item.number;
@@ -138,7 +142,7 @@ void MemberReader::direction(char const* name, TzGeVector3d& value) {
     double numbers[3];
     if (!triple(name, numbers)) return;
     TzGeVector3d const vector(numbers[0], numbers[1], numbers[2]);
-    if (!isDirection(vector)) return complain(name, "is zero, expected a direction");
+    if (!isDirection(vector)) return complain(name, localText("is zero, expected a direction"));
     value = unitVector(vector);
 }
 
@@ -149,7 +153,7 @@ void MemberReader::color(char const* name, TzCmColor& value, WholeRange indices)
     if (isIndex) {
         value = TzCmEntityColor::fromIndex(static_cast<int>(member->number));
     } else if (member->kind != JsonKind::text || !readTrueColor(member->text, value)) {
-        refuse(name, *member, range(indices) + " or a text \"#RRGGBB\"");
+        refuse(name, *member, range(indices) + localText(" or a text \"#RRGGBB\""));
     }
 }
 
@@ -166,16 +170,16 @@ void MemberReader::record(char const* name,
         value = found;
         return;
     }
-    complain(name,
-             "names \"" + member->text + "\", expected the name of " + kind + " of this drawing");
+    complain(name, localText("names \"") + member->text + localText("\", expected the name of ") +
+                       localText(kind) + localText(" of this drawing"));
 }
 
 void MemberReader::layer(char const* name, TzDbObjectId& value) {
-    record(name, value, context_.drawing.layerTableId(), "a layer");
+    record(name, value, context_.drawing.layerTableId(), forLocalText("a layer"));
 }
 
 void MemberReader::textStyle(char const* name, TzDbObjectId& value) {
-    record(name, value, context_.drawing.textStyleTableId(), "a text style");
+    record(name, value, context_.drawing.textStyleTableId(), forLocalText("a text style"));
 }
 
 void MemberReader::numbers(char const* name, std::vector<double>& values, Range allowed) {
@@ -185,7 +189,8 @@ void MemberReader::numbers(char const* name, std::vector<double>& values, Range 
     for (JsonValue const& item : member->items) {
         if (item.kind != JsonKind::number || !std::isfinite(item.number) ||
             !isIn(allowed, item.number)) {
-            return complain(name, "holds " + shown(item) + ", expected " + nameOf(allowed));
+            return complain(name, localText("holds ") + shown(item) + localText(", expected ") +
+                                      nameOf(allowed));
         }
         values.push_back(item.number);
     }

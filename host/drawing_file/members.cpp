@@ -1,5 +1,6 @@
 #include "host/drawing_file/members.h"
 
+#include "host/base/local_text.h"
 #include "host/database/geometry.h"
 #include "tz/db/mtext.h"
 
@@ -88,7 +89,8 @@ void describeLines(MemberWriter& members, DefinitionImp& values) {
 
 void settleAxes(MemberReader& members, MTextImp& values) {
     if (values.direction.isParallelTo(values.normal)) {
-        members.complain("direction", "is parallel to the normal, expected another direction");
+        members.complain("direction",
+                         localText("is parallel to the normal, expected another direction"));
     } else {
         values.direction = perpendicularTo(values.normal, values.direction);
     }

@@ -4,6 +4,7 @@
 #include <memory>
 #include <set>
 
+#include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/database/geometry.h"
 #include "host/drawing_file/members.h"
@@ -16,12 +17,14 @@ template <class Record, class Imp>
 void readTable(ReadContext& context, JsonValue const& list, char const* name, TzDbObjectId table) {
     if (list.kind != JsonKind::array) {
         return context.complain(list.line, name,
-                                "is " + std::string(nameOf(list.kind)) + ", expected an array");
+                                localText("is ") + nameOf(list.kind) +
+                                    localText(", expected an array"));
     }
     std::set<TzDbObjectRecord const*> seen;
     for (JsonValue const& item : list.items) {
         if (item.kind != JsonKind::object) {
-            return context.complain(item.line, name, "holds no object, expected objects");
+            return context.complain(item.line, name,
+                                    localText("holds no object, expected objects"));
         }
         UnknownMembers unknown;
         MemberReader members(context, item, unknown);
@@ -29,7 +32,7 @@ void readTable(ReadContext& context, JsonValue const& list, char const* name, Tz
         std::wstring recordName;
         members.text("name", recordName);
         if (!context.failed && recordName.empty()) {
-            members.complain("name", "is missing or empty, expected a name");
+            members.complain("name", localText("is missing or empty, expected a name"));
         }
         TzDbObjectId const found = Drawing::find(table, recordName);
         Imp& values = valuesOf<Imp>(found.isNull() ? *fresh : *found.record()->object);
@@ -42,7 +45,7 @@ void readTable(ReadContext& context, JsonValue const& list, char const* name, Tz
                 ? addTableRecord(context.drawing, table, std::move(fresh))
                 : *(found.isNull() ? table.record() : found.record());
         if (!seen.insert(&record).second)
-            members.complain("name", "stands twice, expected each once");
+            members.complain("name", localText("stands twice, expected each once"));
         if (context.failed) return;
     }
 }
@@ -50,12 +53,12 @@ void readTable(ReadContext& context, JsonValue const& list, char const* name, Tz
 // What a value of that type is called in a message.
 char const* nameOfType(VariableType type) {
     switch (type) {
-    case VariableType::shortInteger: return "a whole number";
-    case VariableType::real: return "a number";
-    case VariableType::text: return "a text";
+    case VariableType::shortInteger: return forLocalText("a whole number");
+    case VariableType::real: return forLocalText("a number");
+    case VariableType::text: return forLocalText("a text");
     case VariableType::point: break;
     }
-    return "an array of three numbers";
+    return forLocalText("an array of three numbers");
 }
 
 std::optional<VariableValue> valueFrom(JsonValue const& value, VariableType type) {
@@ -91,12 +94,12 @@ void readVariable(ReadContext& context,
     auto const value = valueFrom(member, row.type);
     if (!value) {
         return context.complain(member.line, path,
-                                "is " + std::string(nameOf(member.kind)) + ", expected " +
-                                    nameOfType(row.type));
+                                localText("is ") + nameOf(member.kind) + localText(", expected ") +
+                                    localText(nameOfType(row.type)));
     }
     if (row.complaintAbout(*value)) {
-        return context.complain(member.line, path,
-                                "is outside its limits, expected " + toUtf8(row.takes()));
+        return context.complain(
+            member.line, path, localText("is outside its limits, expected ") + toUtf8(row.takes()));
     }
     values.emplace_back(row.name, *value);
 }
@@ -126,8 +129,9 @@ void readVariables(ReadContext& context, JsonValue const& object, Variables::Val
             writeValue(json, member);
             context.drawing.unknown.push_back({"variables", name, std::move(json)});
         } else if (row->kept != KeptIn::drawing) {
-            context.warnings.push_back(std::to_string(member.line) + ": member \"variables." +
-                                       name + "\": a drawing does not decide it, left out");
+            context.warnings.push_back(std::to_string(member.line) + ": " + localText("member \"") +
+                                       "variables." + name +
+                                       localText("\": a drawing does not decide it, left out"));
         } else {
             readVariable(context, *row, name, member, values);
         }
@@ -146,7 +150,7 @@ void readUserSystem(ReadContext& context,
     members.keepRest();
     constexpr double kSlack = 1e-9;
     if (!system.xAxis.isPerpendicularTo(system.yAxis, TzGeTol(kSlack))) {
-        members.complain("y", "stands at no right angle to x, expected one that does");
+        members.complain("y", localText("stands at no right angle to x, expected one that does"));
     }
 }
 

@@ -3,6 +3,7 @@
 #include <charconv>
 
 #include "host/base/fault_point.h"
+#include "host/base/local_text.h"
 #include "host/faults/memory.h"
 
 namespace tzhost {
@@ -20,7 +21,8 @@ std::optional<Number> readWhole(std::string_view text) {
 }
 
 std::string wrong(std::string_view rule, char const* what) {
-    return "\"" + std::string(rule) + "\": " + what + "; expected NAME[:K][=STATUS]";
+    return "\"" + std::string(rule) + "\": " + localText(what) +
+           localText("; expected NAME[:K][=STATUS]");
 }
 
 }  // namespace
@@ -30,7 +32,7 @@ std::optional<std::string> FaultPlan::add(std::string_view rule) {
     std::string_view left = rule;
     if (auto const equals = left.rfind('='); equals != std::string_view::npos) {
         added.status = readWhole<int>(left.substr(equals + 1));
-        if (!added.status) return wrong(rule, "the status is no integer");
+        if (!added.status) return wrong(rule, forLocalText("the status is no integer"));
         left = left.substr(0, equals);
     }
     // A single colon: names hold double ones.
@@ -40,11 +42,11 @@ std::optional<std::string> FaultPlan::add(std::string_view rule) {
         std::optional<long> const number =
             call == "*" ? std::optional<long>(0) : readWhole<long>(call);
         if (!number || (call != "*" && *number < 1))
-            return wrong(rule, "the call is neither 1 or more nor *");
+            return wrong(rule, forLocalText("the call is neither 1 or more nor *"));
         added.call = *number;
         left = left.substr(0, colon);
     }
-    if (left.empty()) return wrong(rule, "the operation has no name");
+    if (left.empty()) return wrong(rule, forLocalText("the operation has no name"));
     added.name = left;
     rules_.push_back(std::move(added));
     return std::nullopt;

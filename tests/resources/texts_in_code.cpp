@@ -67,21 +67,48 @@ std::wstring meantBy(std::string const& literals) {
     return tzhost::unescaped(tzhost::fromUtf8(text)).value_or(L"");
 }
 
-void addHostTexts(std::string const& source, std::set<std::wstring>& texts) {
+std::regex const& marked() {
     static std::regex const kMarked(
         R"re(\b(?:localText|forLocalText)\(\s*((?:L?"(?:[^"\\]|\\.)*"\s*)+)\))re");
-    for (Words use(source.begin(), source.end(), kMarked), end; use != end; ++use)
-        texts.insert(meantBy((*use)[1]));
+    return kMarked;
+}
+
+// Calls `look` with each source file of the host and of its program.
+template <class Look>
+void forEachHostSource(Look look) {
+    fs::path const source(std::getenv("TZ_TEST_SOURCE"));
+    for (char const* const folder : {"apps/tzdraft", "host"})
+        for (fs::directory_entry const& entry : fs::recursive_directory_iterator(source / folder))
+            if (entry.path().extension() == ".cpp") look(entry.path());
+}
+
+// Two words in small letters make a text; comments and what is included are none.
+void addUnmarked(fs::path const& file, std::vector<std::string>& texts) {
+    static std::regex const kText(R"re("(?:[^"\\\n]|\\.)*")re");
+    static std::regex const kWords("[a-z]{2} [a-z]{2}");
+    static std::regex const kComment(R"re((^|\s)//[^\n]*)re");
+    std::string const code =
+        std::regex_replace(std::regex_replace(contentsOf(file), kComment, ""), marked(), "");
+    for (Words text(code.begin(), code.end(), kText), end; text != end; ++text)
+        if (std::regex_search(text->str(), kWords))
+            texts.push_back(file.filename().string() + ": " + text->str());
 }
 
 }  // namespace
 
 std::set<std::wstring> hostTextsInCode() {
     std::set<std::wstring> texts;
-    fs::path const source(std::getenv("TZ_TEST_SOURCE"));
-    for (char const* const folder : {"apps/tzdraft", "host"})
-        for (fs::directory_entry const& entry : fs::recursive_directory_iterator(source / folder))
-            if (entry.path().extension() == ".cpp") addHostTexts(contentsOf(entry.path()), texts);
+    forEachHostSource([&](fs::path const& file) {
+        std::string const source = contentsOf(file);
+        for (Words use(source.begin(), source.end(), marked()), end; use != end; ++use)
+            texts.insert(meantBy((*use)[1]));
+    });
+    return texts;
+}
+
+std::vector<std::string> unmarkedTextsInCode() {
+    std::vector<std::string> texts;
+    forEachHostSource([&](fs::path const& file) { addUnmarked(file, texts); });
     return texts;
 }
 

@@ -18,3 +18,6 @@ struct UsedText {
 
 // The texts that the source of the host and of its program marks for translation.
 [[nodiscard]] std::set<std::wstring> hostTextsInCode();
+
+// Texts there that read like English and are not marked, each "file: text".
+[[nodiscard]] std::vector<std::string> unmarkedTextsInCode();
