@@ -7,8 +7,8 @@ Converts each text of tests/markup/office.txt to RTF, lets a word processor prin
 pages into FOLDER: one picture a text (nnn.png) and all of them beside their markup (index.html). Each
 word of a text must be on its page and in what unrtf reads; stacks are left out, since their document
 form is for the module's own editor, and for unrtf words with characters above 0x7F, since it takes all
-that stands behind one, up to the next blank, for its substitute. Needs soffice, unrtf, pdftotext and pdftoppm; without one of them
-nothing is done and the exit status is 77.
+that stands behind one, up to the next blank, for its substitute. Needs soffice, unrtf, pdftotext and pdftoppm
+(scripts/setup.sh pages); without one of them nothing is done and the exit status is 77.
 """
 import html
 import os
