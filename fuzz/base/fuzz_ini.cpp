@@ -3,8 +3,8 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-#include <map>
 #include <string>
+#include <unordered_map>
 
 #include "host/base/ini_data.h"
 
@@ -15,7 +15,7 @@ extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size
     for (wchar_t const* const name : {L"", L"a", L"SHX Map", L"Proxy Fonts"}) {
         tzhost::IniData::Section const* const section = ini.section(name);
         if (section == nullptr) continue;
-        std::map<std::wstring, std::wstring> last;
+        std::unordered_map<std::wstring, std::wstring> last;
         for (auto const& [key, value] : section->rows) {
             length += key.size() + value.size();
             last[tzhost::lowered(key)] = value;
