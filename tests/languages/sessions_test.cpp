@@ -7,6 +7,7 @@
 #include <fstream>
 #include <set>
 #include <sstream>
+#include <vector>
 
 #include "tests/support/program_run.h"
 
@@ -20,16 +21,22 @@ struct Session {
     std::string drawing;
 };
 
-Session play(char const* script, char const* language) {
+// Runs a script, on the drawing of its name if there is one.
+Session playFile(fs::path const& file, char const* language) {
     fs::path const saved = scratch("session.json");
     fs::path const settings = scratch("settings.json", "{}");
-    fs::path const file = tztest::sourceFolder() / "tests/languages" / script;
-    tztest::ProgramRun const run =
-        tztest::runProgram({"--locale", language, "--settings", settings.string(), "--script",
-                            file.string(), "--save", saved.string()});
+    std::vector<std::string> arguments{"--locale", language,      "--settings", settings.string(),
+                                       "--script", file.string(), "--save",     saved.string()};
+    fs::path drawing = file;
+    if (fs::exists(drawing.replace_extension(".json"))) arguments.push_back(drawing.string());
+    tztest::ProgramRun const run = tztest::runProgram(arguments);
     EXPECT_EQ(run.status, 0);
     EXPECT_EQ(run.errors, "");
     return {run.output, tztest::bytesOf(saved)};
+}
+
+Session play(char const* script, char const* language) {
+    return playFile(tztest::sourceFolder() / "tests/languages" / script, language);
 }
 
 std::set<std::string> linesOf(std::string const& text) {
@@ -64,6 +71,18 @@ TEST(GermanSession, HasNoLineOfTheEnglishOne) {
         bool const isDrafters = line.starts_with("RAUM ");
         EXPECT_TRUE(isDrafters || english.count(line) == 0) << line;
     }
+}
+
+// Each runs in the language of whoever tries it: no local word takes the place of one in a script.
+TEST(Examples, DrawTheSameInEachLanguage) {
+    int count = 0;
+    for (auto const& entry : fs::directory_iterator(tztest::sourceFolder() / "examples")) {
+        if (entry.path().extension() != ".scr") continue;
+        ++count;
+        EXPECT_EQ(playFile(entry.path(), "de").drawing, playFile(entry.path(), "en").drawing)
+            << entry.path();
+    }
+    EXPECT_GT(count, 1);
 }
 
 }  // namespace

@@ -148,10 +148,10 @@ TEST_P(Translations, HaveWordsThatAreToldApart) {
         auto const words = tzhost::KeywordList::parse(list);
         ASSERT_TRUE(words) << tzhost::toUtf8(list);
         for (int index = 0; index < words->count(); ++index) {
-            std::wstring const short_ = capitalsOf(words->local(index));
+            std::wstring const brief = capitalsOf(words->local(index));
             EXPECT_EQ(words->match(words->local(index)), index) << tzhost::toUtf8(list);
             EXPECT_EQ(words->match(L"_" + words->global(index)), index) << tzhost::toUtf8(list);
-            EXPECT_TRUE(short_.empty() || words->match(short_) == index) << tzhost::toUtf8(list);
+            EXPECT_TRUE(brief.empty() || words->match(brief) == index) << tzhost::toUtf8(list);
         }
     }
 }
