@@ -207,6 +207,8 @@ constexpr RtfCase kFonts[] = {
     {"FullName",             L"{\\fonttbl{\\f1{\\*\\fname B;}c;}}\\f1 a",                           L"{\\fB|b0|i0|c0|p0;a"    },
     {"FullNameEscaped",      L"{\\fonttbl{\\f1\\fcharset204{\\fname\\'c0}}}\\f1 a",
      L"{\\f\u0410|b0|i0|c204|p0;a"                                                                                            },
+    {"FullNameBehindName",   L"{\\fonttbl{\\f1 A{\\fname B};}}\\f1 a",                              L"{\\fA|b0|i0|c0|p0;a"    },
+    {"PanoseNested",         L"{\\fonttbl{\\f1{\\*\\panose{x}2}A;}}\\f1 a",                         L"{\\fA|b0|i0|c0|p0;a"    },
     {"FullNameStarred",      L"{\\fonttbl{\\f1{\\fname\\*B;}}}\\f1 a",                              L"{\\fB|b0|i0|c0|p0;a"    },
     {"LaterEntryWins",       L"{\\fonttbl{\\f1 A;}{\\f1 B;}}\\f1 a",                                L"{\\fB|b0|i0|c0|p0;a"    },
     {"EntryCutOff",          L"{\\fonttbl{\\f1 A;",                                                 L""                       },
