@@ -35,7 +35,7 @@ public:
         setFont(context);
         context.SetInitialFontColor(options_.color);
         setColors(context);
-        std::wstring rtf = context.Parse(markup.c_str());
+        std::wstring rtf = context.Parse(markup);
         results_ = {context.GetIncidents(),       context.GetTracking(),
                     context.GetCharWidth(),       context.GetOblique(),
                     context.GetBaseAlignment(),   context.GetMinFontSize(),
@@ -55,7 +55,7 @@ public:
         context.SetBaseAlignment(static_cast<VerticalAlignment>(results_.baseAlignment), 0);
         if (options_.keepsTrailingParagraphs)
             context.SetOptions(CRichTextToMTextContext::kKeepTrailingParagraphs);
-        std::wstring markup = context.Parse(rtf.c_str());
+        std::wstring markup = context.Parse(rtf);
         results_.stacksSeen = results_.stacksSeen || context.StackSeen();
         return markup;
     }

@@ -1,108 +1,153 @@
-// Both converters over plain text and over text whose look changes every 40 characters, at growing
-// sizes. The floor appends the same characters to a growing wide string: plain text may take four
-// times as long, dense text twenty times. From size to size the time for a character stays within
-// 1.3.
+// Both converters beside their floors. Plain text may take four times as long as appending the same
+// characters to a growing wide string, text whose look changes every 40 characters twenty times.
+//
+// The sweeps show that the time for a character does not grow with the size: from 10 thousand to 50
+// million characters, those read and those written, its ratio to the floor stays within 1.3 of what
+// it is at the smallest size. Times are those of the processor, and memory stays with the process,
+// so that neither other work nor the first touch of memory is in them.
 #include <benchmark/benchmark.h>
 
+#include <algorithm>
+#include <array>
+#include <ctime>
 #include <string>
+#include <unordered_map>
+#include <vector>
 
-#include "module/markup/mtext_to_rtf.h"
-#include "module/markup/rtf_to_mtext.h"
-#include "module/markup/scale_correction.h"
-#include "tz/mte/font_map_database.h"
+#include <malloc.h>
+
+#include "bench/markup/texts.h"
 
 namespace {
 
-constexpr wchar_t kFace[] = L"Liberation Sans";
-constexpr std::int64_t kLeast = 10 << 10;
-constexpr std::int64_t kMost = 40 << 20;
+using tzbench::Sort;
+using tzbench::TextKind;
 
-enum class Text { plain, denseMarkup, denseRtf };
+constexpr std::array<std::size_t, 4> kSizes = {10000, 200000, 4000000, 50000000};
+constexpr char const* kSizeNames[] = {"10K", "200K", "4M", "50M"};
+constexpr std::size_t kSpeedSize = 10000000;
+constexpr std::size_t kLeastPerTurn = 1000000;  // characters that are timed at once
+constexpr double kMostGrowth = 1.3;
 
-std::wstring textOf(Text kind, std::int64_t size) {
-    struct Change {
-        wchar_t const* markup;
-        wchar_t const* rtf;
-    };
-    static constexpr Change kChanges[] = {
-        {L"\\L",     L"\\ul "  },
-        {L"\\l",     L"\\ul0 " },
-        {L"\\H2x;",  L"\\fs56 "},
-        {L"\\H.5x;", L"\\fs28 "},
-        {L"\\O",     L"\\b "   },
-        {L"\\o",     L"\\b0 "  },
-    };
-    std::wstring text;
-    for (std::size_t i = 0; static_cast<std::int64_t>(text.size()) < size; ++i) {
-        Change const& change = kChanges[i % std::size(kChanges)];
-        if (kind == Text::denseMarkup) text += change.markup;
-        if (kind == Text::denseRtf) text += change.rtf;
-        text += L"a run of text that no code interrupts, it";
-    }
-    return text;
+// Freed memory is kept and used again.
+void keepMemory() {
+    (void)mallopt(M_MMAP_MAX, 0);
+    (void)mallopt(M_TRIM_THRESHOLD, -1);
 }
 
-struct Session {
-    Session() {
-        for (CScaleCorrection* scale : {&fontScale, &marginScale}) {
-            scale->SetScaleUnits(0.2);
-            scale->SetScaleTwips(280);
-        }
+double processorSeconds() {
+    timespec time{};
+    (void)clock_gettime(CLOCK_THREAD_CPUTIME_ID, &time);
+    return static_cast<double>(time.tv_sec) + static_cast<double>(time.tv_nsec) * 1e-9;
+}
+
+template <class Call>
+double secondsOf(Call call) {
+    double const start = processorSeconds();
+    call();
+    return processorSeconds() - start;
+}
+
+void appendAll(std::wstring const& text) {
+    std::wstring copy;
+    for (wchar_t const c : text)
+        copy.push_back(c);
+    benchmark::DoNotOptimize(copy.data());
+}
+
+// What entries of a table cost at the least: each under its own text in a table that is looked up.
+void appendToTable(TextKind const& kind, std::wstring const& text) {
+    appendAll(text);
+    std::unordered_map<std::wstring, std::wstring> table;
+    std::size_t start = kind.head.size();
+    for (std::size_t end = 0; (end = text.find(kind.unit.back(), start)) != text.npos;) {
+        std::wstring entry = text.substr(start, end + 1 - start);
+        table.emplace(entry, entry);
+        start = end + 1;
     }
-    CMTextFontMapDatabase fonts{0};
-    CScaleCorrection fontScale{1};
-    CScaleCorrection marginScale{0};
+    benchmark::DoNotOptimize(table.size());
+}
+
+struct Measure {
+    double work;   // seconds for a character read or written
+    double floor;  // the same for a character appended
 };
 
-void count(benchmark::State& state, std::wstring const& text) {
-    state.SetItemsProcessed(state.iterations() * static_cast<std::int64_t>(text.size()));
-}
-
-void floorOf(benchmark::State& state, Text kind) {
-    std::wstring const text = textOf(kind, state.range(0));
-    while (state.KeepRunning()) {
-        std::wstring copy;
-        for (wchar_t const c : text)
-            copy.push_back(c);
-        benchmark::DoNotOptimize(copy.data());
+// The least of a few turns, after one that brings the memory.
+Measure measured(TextKind const& kind, std::size_t size, int turns) {
+    std::wstring const text = tzbench::textOf(kind, size);
+    std::size_t const again = std::max<std::size_t>(1, kLeastPerTurn / size);
+    tzbench::Session session;
+    std::size_t written = 0;
+    Measure least{1e9, 1e9};
+    for (int turn = 0; turn <= turns; ++turn) {
+        double const floor = secondsOf([&] {
+            for (std::size_t i = 0; i < again; ++i)
+                kind.sort == Sort::entries ? appendToTable(kind, text) : appendAll(text);
+        });
+        double const work = secondsOf([&] {
+            for (std::size_t i = 0; i < again; ++i)
+                written = session.converted(kind.way, text).size();
+        });
+        if (turn == 0) continue;
+        auto const characters = static_cast<double>(text.size() * again);
+        least.floor = std::min(least.floor, floor / characters);
+        least.work =
+            std::min(least.work, work / static_cast<double>((text.size() + written) * again));
     }
-    count(state, text);
+    return least;
 }
 
-void toRtf(benchmark::State& state, Text kind) {
-    std::wstring const text = textOf(kind, state.range(0));
-    Session session;
+void speed(benchmark::State& state, TextKind const& kind) {
+    constexpr int kTurns = 5;
     while (state.KeepRunning()) {
-        CMTextToRichTextContext context(&session.fonts, &session.fontScale, &session.marginScale);
-        context.SetInitialFontName(kFace, false, false, kAnsiCharset, 34);
-        context.SetInitialFontSize(0.2, 280);
-        context.SetInitialFontColor(0);
-        benchmark::DoNotOptimize(context.Parse(text.c_str()));
+        std::wstring const text = tzbench::textOf(kind, kSpeedSize);
+        tzbench::Session session;
+        double work = 1e9;
+        double floor = 1e9;
+        for (int turn = 0; turn < kTurns; ++turn) {
+            floor = std::min(floor, secondsOf([&] { appendAll(text); }));
+            work = std::min(work, secondsOf([&] { (void)session.converted(kind.way, text); }));
+        }
+        state.counters["work"] = work;
+        state.counters["floor"] = floor;
+        state.counters["ratio"] = work / floor;
+        state.counters["bound"] = kind.sort == Sort::dense ? 20 : 4;
     }
-    count(state, text);
 }
 
-void toMtext(benchmark::State& state, Text kind) {
-    std::wstring const text = textOf(kind, state.range(0));
-    Session session;
+void sweep(benchmark::State& state, TextKind const& kind) {
     while (state.KeepRunning()) {
-        CRichTextToMTextContext context(&session.fonts, &session.fontScale, &session.marginScale);
-        context.SetInitialFontName(kFace, false, false, kAnsiCharset, 34);
-        context.SetInitialFontSize(0.2, 280);
-        context.SetInitialColor(0);
-        benchmark::DoNotOptimize(context.Parse(text.c_str()));
+        double first = 0;
+        double growth = 0;
+        for (std::size_t i = 0; i < kSizes.size(); ++i) {
+            Measure const each = measured(kind, kSizes[i], kSizes[i] > kSpeedSize ? 2 : 4);
+            double const ratio = each.work / each.floor;
+            if (i == 0) first = ratio;
+            growth = std::max(growth, ratio / first);
+            state.counters[kSizeNames[i]] = ratio;
+        }
+        state.counters["ratio"] = growth;
+        state.counters["bound"] = kMostGrowth;
     }
-    count(state, text);
 }
 
-void sizes(benchmark::internal::Benchmark* each) {
-    each->RangeMultiplier(16)->Range(kLeast, kMost)->Unit(benchmark::kMicrosecond);
+void declare() {
+    for (TextKind const& kind : tzbench::textKinds()) {
+        std::string const name = kind.name;
+        auto const once = [](benchmark::internal::Benchmark* each) {
+            each->Iterations(1)->Unit(benchmark::kMillisecond);
+        };
+        if (kind.sort == Sort::plain || kind.sort == Sort::dense)
+            once(benchmark::RegisterBenchmark(("speed/" + name).c_str(), speed, kind));
+        once(benchmark::RegisterBenchmark(("sweep/" + name).c_str(), sweep, kind));
+    }
 }
 
-BENCHMARK_CAPTURE(floorOf, plain, Text::plain)->Apply(sizes);
-BENCHMARK_CAPTURE(toRtf, plain, Text::plain)->Apply(sizes);
-BENCHMARK_CAPTURE(toMtext, plain, Text::plain)->Apply(sizes);
-BENCHMARK_CAPTURE(toRtf, dense, Text::denseMarkup)->Apply(sizes);
-BENCHMARK_CAPTURE(toMtext, dense, Text::denseRtf)->Apply(sizes);
+bool const kIsDeclared = [] {
+    keepMemory();
+    declare();
+    return true;
+}();
 
 }  // namespace

@@ -2,19 +2,8 @@
 
 #include <utility>
 
-namespace {
-
-CStdStrW folded(CStdStrW text) {
-    text.MakeLower();
-    return text;
-}
-
-}  // namespace
-
 FontName::FontName(CStdStrW const& text) {
-    if (text.empty()) return;
-    text_ = std::make_shared<Shared const>(
-        Shared{text, std::make_shared<CStdStrW const>(folded(text))});
+    if (!text.empty()) text_ = std::make_shared<Shared const>(Shared{text, nullptr});
 }
 
 CStdStrW const& FontName::text() const {
@@ -27,22 +16,26 @@ bool FontName::operator==(FontName const& other) const {
 }
 
 bool FontName::isSameAs(FontName const& other) const {
-    if (caseIdentity() == other.caseIdentity()) return true;
-    return text_ && other.text_ && *text_->folded == *other.text_->folded;
+    if (text_ == other.text_) return true;
+    if (!text_ || !other.text_) return false;
+    return folded() == other.folded() || *folded() == *other.folded();
 }
 
-void const* FontName::caseIdentity() const {
-    return text_ ? text_->folded.get() : nullptr;
+// Of a name that is not empty.
+std::shared_ptr<CStdStrW const> const& FontName::folded() const {
+    if (!text_->folded) {
+        CStdStrW lower = text_->text;
+        lower.MakeLower();
+        text_->folded = std::make_shared<CStdStrW const>(std::move(lower));
+    }
+    return text_->folded;
 }
 
 FontName FontNamePool::intern(CStdStrW const& text) {
     if (text.empty()) return {};
     if (auto const at = names_.find(text); at != names_.end()) return at->second;
-    FontName name(text);
-    auto const& lower = name.text_->folded;
-    if (auto const [at, isNew] = folded_.try_emplace(*lower, lower); !isNew) {
-        name.text_ = std::make_shared<FontName::Shared const>(FontName::Shared{text, at->second});
-    }
+    FontName const name(text);
+    name.text_->folded = folded_.try_emplace(*name.folded(), name.folded()).first->second;
     names_.emplace(name.text(), name);
     return name;
 }

@@ -29,15 +29,14 @@ public:
     [[nodiscard]] bool isSameAs(FontName const& other) const;
     // Tells names of one pool apart without looking at their letters.
     [[nodiscard]] void const* identity() const { return text_.get(); }
-    // Names that are the same but for case have one of these in a pool.
-    [[nodiscard]] void const* caseIdentity() const;
 
 private:
     friend class FontNamePool;
     struct Shared {
         CStdStrW text;
-        std::shared_ptr<CStdStrW const> folded;  // in lower case
+        mutable std::shared_ptr<CStdStrW const> folded;  // in lower case; null until asked for
     };
+    [[nodiscard]] std::shared_ptr<CStdStrW const> const& folded() const;
 
     std::shared_ptr<Shared const> text_;  // null for the empty name
 };
@@ -48,7 +47,8 @@ public:
     [[nodiscard]] FontName intern(CStdStrW const& text);
 
 private:
-    // Keys are views of the texts that the values hold.
+    // Keys are views of the texts that the values hold; names that are the same but for case share
+    // one in lower case.
     std::unordered_map<std::wstring_view, FontName> names_;
     std::unordered_map<std::wstring_view, std::shared_ptr<CStdStrW const>> folded_;
 };

@@ -97,7 +97,7 @@ CMTextToRichTextContext::resolveFile(FontFields const& fields) {
     if (type == CMTextFontMapDatabase::MapTypeProxy) font.incidents = kFontByProxy;
     if (fields.hasCharset) font.charset = fields.charset;
     font.slot = AddFont(face.c_str(), font.charset, font.pitchAndFamily);
-    font.font = names().intern(face);
+    font.font = face;
     return font;
 }
 
@@ -115,7 +115,7 @@ CMTextToRichTextContext::resolveFace(FontFields const& fields) {
     CFontInfoItem item;
     bool const isKnown = tzFontInfo().FontInfoFromTypeFaceName(face, item);
     font.slot = AddFont(face.c_str(), isKnown ? item.charset : fields.charset, fields.pitch);
-    font.font = names().intern(fields.name);
+    font.font = fields.name;
     font.pitchAndFamily = fields.pitch;
     font.charset = fields.charset;
     return font;

@@ -57,9 +57,23 @@ struct MarkupCodes {
 
 namespace {
 
+// A longer run of characters is copied in pieces, which are then still in the cache.
+constexpr std::ptrdiff_t kLongestRun = 2048;
+constexpr std::size_t kAsciiEnd = 128;
+
+constexpr auto plainTable() {
+    constexpr std::wstring_view kOthers(L"\0\n\\{}", 5);
+    std::array<bool, kAsciiEnd> table{};
+    for (std::size_t c = 0; c < kAsciiEnd; ++c)
+        table[c] = kOthers.find(static_cast<wchar_t>(c)) == kOthers.npos;
+    return table;
+}
+
 // Whether a character is written as it is when nothing is pending.
-constexpr bool isPlain(wchar_t c) {
-    return c > 0 && c < 0x80 && c != L'\n' && c != L'\\' && c != L'{' && c != L'}';
+bool isPlain(wchar_t c) {
+    static constexpr auto kTable = plainTable();
+    auto const code = static_cast<std::size_t>(c);
+    return code < kAsciiEnd && kTable[code];
 }
 
 }  // namespace
@@ -86,7 +100,7 @@ void CMTextToRichTextContext::convert(wchar_t const* cursor) {
 // Characters that nothing comes between, at once.
 wchar_t const* CMTextToRichTextContext::convertRun(wchar_t const* cursor) {
     wchar_t const* end = cursor + 1;
-    while (isPlain(*end))
+    while (end - cursor < kLongestRun && isPlain(*end))
         ++end;
     Append(std::wstring_view(cursor, static_cast<std::size_t>(end - cursor)));
     chars_ += end - cursor;

@@ -38,7 +38,7 @@ void CMTextToRichTextContext::SetInitialFontName(
     if (entry && entry->m_eMapType != CMTextFontMapDatabase::MapTypeSystem &&
         !entry->m_sFileName.empty()) {
         g_sInitialFont = name;
-        SetFont(names().intern(name));
+        SetFont(name);
         SetPitchAndFamily(pitchAndFamily);
         SetCharSet(charset);
     } else {
@@ -57,7 +57,7 @@ void CMTextToRichTextContext::SetInitialFontFileName(wchar_t const* file) {
     Charset charset = kAnsiCharset;
     int pitch = 0;
     CStdStrW const face = m_pFontMap->MapFileToFont(type, file, bold, italic, charset, pitch);
-    SetFont(names().intern(file));
+    SetFont(file);
     SetPitchAndFamily(pitch);
     SetCharSet(charset);
     g_sInitialFont = file;
@@ -87,11 +87,18 @@ void CMTextToRichTextContext::SetInitialFontColor(unsigned int rgb) {
 }
 
 CStdStrW CMTextToRichTextContext::Parse(wchar_t const* text) {
+    return parse(text, std::wcslen(text));
+}
+
+CStdStrW CMTextToRichTextContext::Parse(std::wstring const& text) {
+    return parse(text.c_str(), text.size());
+}
+
+CStdStrW CMTextToRichTextContext::parse(wchar_t const* text, std::size_t length) {
     updateSizes(m_nInitialFontSize);
     // Only an empty text keeps the system's stack alignment.
     if (*text != 0) m_eBaseAlignment = kAlignBottom;
     // Memory that is not written to costs nothing, a copy of what was written does.
-    std::size_t const length = std::wcslen(text);
     reserve(length + length / 2);
     convert(text);
     CStdStrW const head = documentHead();

@@ -64,6 +64,8 @@ public:
 
     // The whole document.
     [[nodiscard]] CStdStrW Parse(wchar_t const* text);
+    // The same, without counting the characters first.
+    [[nodiscard]] CStdStrW Parse(std::wstring const& text);
 
     [[nodiscard]] unsigned int GetIncidents() const { return m_nIncidents; }
     // Whether all bits of the mask are set.
@@ -133,6 +135,7 @@ private:
 
     // Set-up and results.
     void updateSizes(int halfPoints);
+    [[nodiscard]] CStdStrW parse(wchar_t const* text, std::size_t length);
     [[nodiscard]] CStdStrW documentHead() const;
 
     // The loop.

@@ -4,6 +4,7 @@
 #include <limits>
 #include <vector>
 
+#include "module/fonts/table_key.h"
 #include "module/markup/number_text.h"
 #include "module/markup/rtf_writing.h"
 #include "tz/text/code_page.h"
@@ -29,6 +30,11 @@ wchar_t const* familyWord(int pitchAndFamily) {
     return L"fnil";
 }
 
+// What finds a font again, case not counting.
+TableKey keyOf(wchar_t const* name, Charset charset, int pitch) {
+    return descriptionKey(name ? name : L"", false, false, charset, pitch);
+}
+
 void appendFont(CStdStrW& text, int slot, CRichTextFontTable::Record const& font) {
     text += L"{\\f";
     appendDecimal(text, slot);
@@ -47,43 +53,34 @@ void appendFont(CStdStrW& text, int slot, CRichTextFontTable::Record const& font
 
 }  // namespace
 
-std::size_t CRichTextFontTable::KeyHash::operator()(Key const& key) const {
-    std::size_t const numbers =
-        static_cast<std::size_t>(static_cast<unsigned int>(key.charset)) * 0x9E3779B97F4A7C15U +
-        static_cast<unsigned int>(key.pitch);
-    return std::hash<void const*>()(key.name) * 31 + (numbers ^ (numbers >> 29));
-}
-
 int CRichTextFontTable::FindFont(wchar_t const* name, Charset charset, int pitch) {
     if (!isIndexed_) indexSlots();
-    auto const at = firstSlots_.find({names_.intern(name).caseIdentity(), charset, pitch});
+    auto const at = firstSlots_.find(keyOf(name, charset, pitch).view());
     return at == firstSlots_.end() ? -1 : at->second;
 }
 
 int CRichTextFontTable::AddFont(wchar_t const* name, Charset charset, int pitch) {
     if (int const slot = FindFont(name, charset, pitch); slot >= 0) return slot;
     int const slot = static_cast<int>(length_++);
-    Record const font{charset, pitch, names_.intern(name)};
-    firstSlots_.try_emplace({font.name.caseIdentity(), charset, pitch}, slot);
-    m_aFonts[slot] = font;
+    firstSlots_.try_emplace(std::wstring(keyOf(name, charset, pitch).view()), slot);
+    m_aFonts[slot] = {charset, pitch, name};
     return slot;
 }
 
 void CRichTextFontTable::AddFont(long long slot, wchar_t const* name, Charset charset, int pitch) {
     if (slot < 0 || slot > std::numeric_limits<int>::max()) return;
-    m_aFonts[static_cast<int>(slot)] = {charset, pitch, names_.intern(name)};
+    m_aFonts[static_cast<int>(slot)] = {charset, pitch, name};
     length_ = std::max(length_, slot + 1);
     isIndexed_ = false;
 }
 
 bool CRichTextFontTable::GetFont(int slot, CStdStrW& name, Charset& charset, int& pitch) const {
-    Record const none;
-    Record const* const font = fontAt(slot);
-    Record const& shown = font ? *font : none;
+    auto const at = m_aFonts.find(slot);
+    Record const shown = at == m_aFonts.end() ? Record() : at->second;
     name = shown.name.text();
     charset = shown.charset;
     pitch = shown.pitchAndFamily;
-    return font != nullptr;
+    return at != m_aFonts.end();
 }
 
 CStdStrW CRichTextFontTable::EmitFontTable() const {
@@ -99,16 +96,20 @@ CStdStrW CRichTextFontTable::EmitFontTable() const {
     return text;
 }
 
-CRichTextFontTable::Record const* CRichTextFontTable::fontAt(int slot) const {
+CRichTextFontTable::Record const* CRichTextFontTable::fontAt(int slot) {
     auto const at = m_aFonts.find(slot);
-    return at == m_aFonts.end() ? nullptr : &at->second;
+    if (at == m_aFonts.end()) return nullptr;
+    Record& font = at->second;
+    if (!font.isInterned) font.name = names_.intern(font.name.text());
+    font.isInterned = true;
+    return &font;
 }
 
 void CRichTextFontTable::indexSlots() {
     firstSlots_.clear();
     for (auto const& [slot, font] : m_aFonts) {
-        Key const key{font.name.caseIdentity(), font.charset, font.pitchAndFamily};
-        auto const [at, isNew] = firstSlots_.try_emplace(key, slot);
+        TableKey const key = keyOf(font.name.text().c_str(), font.charset, font.pitchAndFamily);
+        auto const [at, isNew] = firstSlots_.try_emplace(std::wstring(key.view()), slot);
         if (!isNew) at->second = std::min(at->second, slot);
     }
     isIndexed_ = true;

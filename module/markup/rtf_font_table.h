@@ -1,5 +1,8 @@
 #pragma once
 
+#include <functional>
+#include <string>
+#include <string_view>
 #include <unordered_map>
 
 #include "module/markup/font_name.h"
@@ -19,6 +22,7 @@ public:
         Charset charset = kAnsiCharset;
         int pitchAndFamily = 0;
         FontName name;
+        bool isInterned = false;  // a name is, once it is asked for
     };
 
     CRichTextFontTable() = default;
@@ -39,26 +43,24 @@ public:
     [[nodiscard]] CStdStrW EmitFontTable() const;
 
 protected:
-    // Null for an empty slot; valid until the slot is stored to.
-    [[nodiscard]] Record const* fontAt(int slot) const;
+    // Null for an empty slot; valid until the slot is stored to. Its name is of the names below.
+    [[nodiscard]] Record const* fontAt(int slot);
     // The names of this document; the owner's own names come from here too.
     FontNamePool& names() { return names_; }
 
 private:
-    struct Key {
-        void const* name;  // the case identity
-        Charset charset;
-        int pitch;
-        bool operator==(Key const&) const = default;
-    };
-    struct KeyHash {
-        std::size_t operator()(Key const& key) const;
+    struct TextHash {
+        using is_transparent = void;
+        std::size_t operator()(std::wstring_view text) const {
+            return std::hash<std::wstring_view>()(text);
+        }
     };
     void indexSlots();
 
     FontNamePool names_;
     std::unordered_map<int, Record> m_aFonts;
     long long length_ = 0;  // behind the highest slot
-    std::unordered_map<Key, int, KeyHash> firstSlots_;
+    // By description, for writers.
+    std::unordered_map<std::wstring, int, TextHash, std::equal_to<>> firstSlots_;
     bool isIndexed_ = true;  // false once a reader has stored to a slot
 };

@@ -12,6 +12,9 @@ namespace {
 constexpr std::wstring_view kSigns(L"\0\n\r\\{}", 6);
 constexpr std::size_t kEndOfSigns = 128;
 
+// A longer run of text is copied in pieces, which are then still in the cache.
+constexpr std::ptrdiff_t kLongestRun = 2048;
+
 constexpr auto textTable() {
     std::array<bool, kEndOfSigns> table{};
     for (std::size_t c = 0; c < kEndOfSigns; ++c)
@@ -49,7 +52,7 @@ void CRichTextToMTextContext::Convert(wchar_t const* cursor) {
             isBehindFirst = true;
             break;
         default:
-            while (isText(*cursor))
+            while (cursor - start < kLongestRun && isText(*cursor))
                 ++cursor;
             onText(std::wstring_view(start, static_cast<std::size_t>(cursor - start)));
             break;

@@ -52,9 +52,16 @@ void CRichTextToMTextContext::SetInitialColor(unsigned int rgb) {
 }
 
 CStdStrW CRichTextToMTextContext::Parse(wchar_t const* text) {
+    return parse(text, std::wcslen(text));
+}
+
+CStdStrW CRichTextToMTextContext::Parse(std::wstring const& text) {
+    return parse(text.c_str(), text.size());
+}
+
+CStdStrW CRichTextToMTextContext::parse(wchar_t const* text, std::size_t length) {
     m_bStackSeen = false;
     // Memory that is not written to costs nothing, a copy of what was written does.
-    std::size_t const length = std::wcslen(text);
     reserve(length + length / 2);
     Convert(text);
     CStdStrW markup = std::move(Close());

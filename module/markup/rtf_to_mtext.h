@@ -54,6 +54,8 @@ public:
 
     // The whole markup.
     [[nodiscard]] CStdStrW Parse(wchar_t const* text);
+    // The same, without counting the characters first.
+    [[nodiscard]] CStdStrW Parse(std::wstring const& text);
 
     // Whether the text held a `\S`, which stacks begin with.
     [[nodiscard]] bool StackSeen() const { return m_bStackSeen; }
@@ -73,6 +75,8 @@ private:
     };
     struct Replacement;
     struct FontEntry;
+
+    [[nodiscard]] CStdStrW parse(wchar_t const* text, std::size_t length);
 
     // Groups.
     void Convert(wchar_t const* cursor);

@@ -1,0 +1,96 @@
+#include "bench/markup/texts.h"
+
+#include <type_traits>
+
+#include "module/markup/mtext_to_rtf.h"
+#include "module/markup/rtf_to_mtext.h"
+
+namespace tzbench {
+
+namespace {
+
+constexpr wchar_t kFace[] = L"Liberation Sans";
+constexpr wchar_t kPlain[] = L"a run of text that no code interrupts, it";
+constexpr double kSize = 0.2;
+constexpr int kTwips = 280;
+constexpr int kPitch = 34;
+constexpr std::size_t kLongName = 300;
+
+// A change of the look every 40 characters.
+std::wstring denseUnit(std::initializer_list<wchar_t const*> changes) {
+    std::wstring unit;
+    for (wchar_t const* const change : changes)
+        unit += std::wstring(change) + kPlain;
+    return unit;
+}
+
+}  // namespace
+
+std::span<TextKind const> textKinds() {
+    static std::wstring const longName(kLongName, L'n');
+    static TextKind const kinds[] = {
+        {"plainMarkup",        Sort::plain,   Way::toRtf,           L"",                    kPlain,                                            L""                },
+        {"plainRtf",           Sort::plain,   Way::toMtext,         L"",                    kPlain,                                            L""                },
+        {"denseMarkup",        Sort::dense,   Way::toRtf,           L"",
+         denseUnit({L"\\L", L"\\l", L"\\H2x;", L"\\H.5x;", L"\\O", L"\\o"}),                                                                   L""                },
+        {"denseRtf",           Sort::dense,   Way::toMtext,         L"",
+         denseUnit({L"\\ul ", L"\\ul0 ", L"\\fs56 ", L"\\fs28 ", L"\\b ", L"\\b0 "}),                                                          L""                },
+        {"nestedMarkup",       Sort::other,   Way::toRtf,           L"",                    L"{a",                                             L""                },
+        {"nestedRtf",          Sort::other,   Way::toMtext,         L"{\\rtf1 ",            L"{\\b a",                                         L""                },
+        {"fontsOfMarkup",      Sort::entries, Way::toRtf,           L"",                    L"\\fFont #|b0|i0|c0|p0;a",                        L""                },
+        {"fontsOfRtf",         Sort::entries, Way::toMtext,         L"{\\fonttbl",          L"{\\f#\\fcharset0 Font #;}",
+         L"}\\f1 a"                                                                                                                                               },
+        {"fontsOfHighNumbers", Sort::entries, Way::toMtext,         L"{\\fonttbl",
+         L"{\\f#\\fcharset0 Font #;}",                                                                                                         L"}\\f2000000001 a", 2000000000},
+        {"colorsOfMarkup",                    Sort::entries,                  Way::toRtf,      L"", L"\\c#;a",                                          L""                                                   },
+        {"colorsOfRtf",                    Sort::other,                     Way::toMtext,           L"{\\colortbl", L"\\red#\\green1\\blue2;",
+         L"}\\cf1 a"},
+        {"paragraphs",                    Sort::other,                      Way::toMtext,            L"", L"\\pard\\li#\\tx# a",                                    L""                                                                 },
+        {"paragraphsWithoutText",                    Sort::other,           Way::toMtext, L"", L"\\pard",                                               L""},
+        {"stacks",                    Sort::other,                          Way::toRtf,                L"",   L"\\S",                                  L""                                                     },
+        {"fontToggles",                    Sort::other,                     Way::toMtext,           L"{\\fonttbl{\\f1 " + longName + L";}}",
+         L"\\f1 a\\f2 b\\f1\\b c\\b0 d", L""                                                                                                                           },
+    };
+    return kinds;
+}
+
+std::wstring textOf(TextKind const& kind, std::size_t size) {
+    std::wstring text = kind.head;
+    text.reserve(size + kind.unit.size() * 4 + kind.tail.size());
+    for (long number = kind.first; text.size() < size; ++number) {
+        std::wstring const digits = std::to_wstring(number);
+        for (wchar_t const c : kind.unit) {
+            if (c == L'#')
+                text += digits;
+            else
+                text += c;
+        }
+    }
+    return text += kind.tail;
+}
+
+Session::Session() {
+    for (CScaleCorrection* scale : {&fontScale_, &marginScale_}) {
+        scale->SetScaleUnits(kSize);
+        scale->SetScaleTwips(kTwips);
+    }
+}
+
+template <class Context>
+std::wstring Session::parsed(Context&& context, std::wstring const& text) {
+    context.SetInitialFontName(kFace, false, false, kAnsiCharset, kPitch);
+    context.SetInitialFontSize(kSize, kTwips);
+    if constexpr (std::is_same_v<Context, CMTextToRichTextContext>)
+        context.SetInitialFontColor(0);
+    else
+        context.SetInitialColor(0);
+    return context.Parse(text);
+}
+
+std::wstring Session::converted(Way way, std::wstring const& text) {
+    return way == Way::toRtf
+               ? parsed(CMTextToRichTextContext(&fonts_, &fontScale_, &marginScale_), text)
+               : parsed(CRichTextToMTextContext(&fonts_, &fontScale_, &marginScale_), text);
+}
+
+}  // namespace tzbench

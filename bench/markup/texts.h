@@ -1,0 +1,53 @@
+#pragma once
+
+// Texts of any size for both converters: plain ones, dense ones and those that a careless converter
+// would read over and over.
+
+#include <cstddef>
+#include <span>
+#include <string>
+
+#include "module/markup/scale_correction.h"
+#include "tz/mte/font_map_database.h"
+
+namespace tzbench {
+
+enum class Way { toRtf, toMtext };
+
+// What a text is like: plain, with a change of the look every 40 characters, or made of entries of
+// a table.
+enum class Sort { plain, dense, entries, other };
+
+// A text is the head, the unit again and again, and the tail. A "#" in the unit is its number,
+// counted from `first`.
+struct TextKind {
+    char const* name;
+    Sort sort;
+    Way way;
+    std::wstring head;
+    std::wstring unit;
+    std::wstring tail;
+    long first = 0;
+};
+
+[[nodiscard]] std::span<TextKind const> textKinds();
+
+// The text of that many characters, or a unit more.
+[[nodiscard]] std::wstring textOf(TextKind const& kind, std::size_t size);
+
+// Converts with one font map and the same scales, as an editor does.
+class Session {
+public:
+    Session();
+    [[nodiscard]] std::wstring converted(Way way, std::wstring const& text);
+
+private:
+    template <class Context>
+    [[nodiscard]] std::wstring parsed(Context&& context, std::wstring const& text);
+
+    CMTextFontMapDatabase fonts_{0};
+    CScaleCorrection fontScale_{1};
+    CScaleCorrection marginScale_{0};
+};
+
+}  // namespace tzbench
