@@ -6,6 +6,7 @@
 #   add_fuzz(NAME source [LIBS layers...])            a fuzzer and the replay of its seeds, target fuzz_NAME
 #   add_bench(NAME sources... [LIBS layers...])       a benchmark (release only), target bench_NAME
 #   add_example_module(NAME sources...)               a further module lib/NAME.tzx, built from sdk/ alone
+#   add_example_program(NAME sources...)              a program bin/NAME, built from sdk/ alone
 #   add_lint(NAME command...)                         a check of the source tree, test lint.NAME
 #
 # LIBS names layers (module_markup, app_tzdraft), support libraries or third-party targets; a layer
@@ -255,6 +256,18 @@ function(tz_module_properties target output)
         CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON)
     target_compile_options(${target} PRIVATE $<$<CXX_COMPILER_ID:GNU>:-fno-gnu-unique>)
     target_link_options(${target} PRIVATE -Wl,-soname,${output}.tzx ${TZ_LINK_DEFS})
+endfunction()
+
+function(add_example_program name)
+    if(NOT TARGET tz)
+        return()
+    endif()
+    add_executable(example_${name} ${ARGN})
+    tz_flags(example_${name})
+    set_target_properties(example_${name} PROPERTIES OUTPUT_NAME ${name})
+    target_include_directories(example_${name} PRIVATE ${TZ_ROOT_sdk} ${TZ_ROOT_examples})
+    target_link_libraries(example_${name} PRIVATE tz ${CMAKE_DL_LIBS})
+    add_dependencies(tz_products example_${name})
 endfunction()
 
 function(add_example_module name)
