@@ -5,7 +5,8 @@
 #
 # Rows stand bottom to top, so a folder may only use folders of rows above its own line here: no
 # cycles. Each row is one line, since the lint reads this file too. Folders with no LIBRARIES
-# column under sdk/, module/ and examples/ use the standard library alone.
+# column under sdk/, module/ and examples/ use the standard library alone
+# (and the smallest host the loader).
 #
 # Names of libraries: json (nlohmann-json), ini (SimpleIni), fontconfig, pango (with GLib), cairo,
 # cli (CLI11), editline (libedit).
