@@ -3,32 +3,26 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-#include <string>
 
-#include "host/base/file_bytes.h"
+#include "fuzz/markup/memory_file.h"
 #include "host/base/font_map_path.h"
 #include "tz/mte/font_map_database.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
-    std::string const file = "font_map_file.ini";
-    if (!tzhost::writeFileSafely(file, std::string(data, data + size))) std::abort();
-    std::string const before = tzhost::setFontMapFile(file);
-    {
-        CMTextFontMapDatabase fonts(0);
-        fonts.ResetContents();
-        for (wchar_t const* const name :
-             {L"a", L"txt.shx", L"C:\\x\\a.shx", L"a,b", L"none", L","}) {
-            auto type = CMTextFontMapDatabase::MapTypeSystem;
-            bool bold = false;
-            bool italic = false;
-            Charset charset = kAnsiCharset;
-            int pitch = 0;
-            CStdStrW const face = fonts.MapFileToFont(type, name, bold, italic, charset, pitch);
-            if (face.size() > size + 100) std::abort();
-            (void)fonts.MapFontToFile(type, face, bold, italic, charset, pitch);
-        }
-        fonts.ResetContents();
+    static markupfuzz::MemoryFile file;
+    file.write(data, size);
+    tzhost::setFontMapFile(file.path());
+    CMTextFontMapDatabase fonts(0);
+    for (wchar_t const* const name : {L"a", L"txt.shx", L"C:\\x\\a.shx", L"a,b", L"none", L","}) {
+        auto type = CMTextFontMapDatabase::MapTypeSystem;
+        bool bold = false;
+        bool italic = false;
+        Charset charset = kAnsiCharset;
+        int pitch = 0;
+        CStdStrW const face = fonts.MapFileToFont(type, name, bold, italic, charset, pitch);
+        if (face.size() > size + 100) std::abort();
+        (void)fonts.MapFontToFile(type, face, bold, italic, charset, pitch);
     }
-    tzhost::setFontMapFile(before);
+    fonts.ResetContents();
     return 0;
 }

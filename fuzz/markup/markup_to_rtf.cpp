@@ -2,18 +2,15 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-#include <string_view>
 
-#include "tests/markup/conversions.h"
+#include "fuzz/markup/fuzz_session.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
-    TzString const text = TzString::fromUtf8(
-        std::string_view(reinterpret_cast<char const*>(data), size));  // bytes as UTF-8
-    markuptest::Session first;
-    CStdStrW const rtf = first.toRtf(text.str());
+    std::wstring const text = markupfuzz::textOf(data, size);
+    CStdStrW const rtf = markupfuzz::FreshConversions().toRtf(text);
     if (rtf.compare(0, 6, L"{\\rtf1") != 0 || rtf.back() != L'}') std::abort();
+    if (!markupfuzz::isLookedAtTwice(size)) return 0;
     if (markuptest::bodyOf(rtf).compare(0, 4, L"no d") == 0) std::abort();
-    markuptest::Session second;
-    if (second.toRtf(text.str()) != rtf) std::abort();
+    if (markupfuzz::FreshConversions().toRtf(text) != rtf) std::abort();
     return 0;
 }

@@ -3,17 +3,15 @@
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
-#include <string_view>
 
-#include "tests/markup/conversions.h"
+#include "fuzz/markup/fuzz_session.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
-    TzString const text = TzString::fromUtf8(
-        std::string_view(reinterpret_cast<char const*>(data), size));  // bytes as UTF-8
-    markuptest::Session first;
-    CStdStrW const markup = first.toMtext(text.str());
+    std::wstring const text = markupfuzz::textOf(data, size);
+    if (markupfuzz::mayExplodeAsRtf(text)) return 0;
+    CStdStrW const markup = markupfuzz::FreshConversions().toMtext(text);
     if (markup.size() > (size + 100) * (size + 100)) std::abort();
-    markuptest::Session second;
-    if (second.toMtext(text.str()) != markup) std::abort();
+    if (!markupfuzz::isLookedAtTwice(size)) return 0;
+    if (markupfuzz::FreshConversions().toMtext(text) != markup) std::abort();
     return 0;
 }

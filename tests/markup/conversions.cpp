@@ -17,26 +17,26 @@ OwnFontMap::~OwnFontMap() {
     CMTextFontMapDatabase(0).ResetContents();
 }
 
-Session::Session() {
+Conversions::Conversions() {
     for (CScaleCorrection* scale : {&fontScale_, &marginScale_}) {
         scale->SetScaleUnits(kSize);
         scale->SetScaleTwips(kTwips);
     }
 }
 
-CStdStrW Session::toRtf(std::wstring const& markup) {
+CStdStrW Conversions::toRtf(std::wstring const& markup) {
     CMTextToRichTextContext context(&fonts_, &fontScale_, &marginScale_);
     setUp(context);
     return context.Parse(markup.c_str());
 }
 
-CStdStrW Session::toMtext(std::wstring const& rtf) {
+CStdStrW Conversions::toMtext(std::wstring const& rtf) {
     CRichTextToMTextContext context(&fonts_, &fontScale_, &marginScale_);
     setUp(context);
     return context.Parse(rtf.c_str());
 }
 
-CStdStrW Session::roundTrip(std::wstring const& markup) {
+CStdStrW Conversions::roundTrip(std::wstring const& markup) {
     CMTextToRichTextContext there(&fonts_, &fontScale_, &marginScale_);
     setUp(there);
     CStdStrW const rtf = there.Parse(markup.c_str());

@@ -27,10 +27,11 @@ private:
     std::string before_;
 };
 
-// A font map and scales that see several conversions. The style's font is "Liberation Sans".
-class Session {
+// Scales and a font database that see several conversions, over the font map that is in force. The
+// style's font is "Liberation Sans".
+class Conversions {
 public:
-    Session();
+    Conversions();
 
     CMTextFontMapDatabase& fonts() { return fonts_; }
     CScaleCorrection& fontScale() { return fontScale_; }
@@ -44,11 +45,13 @@ public:
     [[nodiscard]] CStdStrW roundTrip(std::wstring const& markup);
 
 private:
-    OwnFontMap map_;
     CMTextFontMapDatabase fonts_{0};
     CScaleCorrection fontScale_{1};
     CScaleCorrection marginScale_{0};
 };
+
+// Conversions over the suite's own font map, which goes when they do.
+class Session : private OwnFontMap, public Conversions {};
 
 // A session with one conversion in it, which is not set up yet.
 struct RtfWriter : Session {
