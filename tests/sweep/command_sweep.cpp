@@ -9,7 +9,7 @@
 #include <iterator>
 #include <optional>
 #include <random>
-#include <regex>
+#include <string_view>
 
 #include "apps/tzdraft/program.h"
 #include "apps/tzdraft/session.h"
@@ -57,9 +57,11 @@ std::string savedDrawing() {
     if (!tzhost::writeDrawing(tzdraft::Session::current().drawing(), scratchFile()).empty())
         return {};
     std::ifstream in(scratchFile(), std::ios::binary);
-    std::string const text{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
-    static std::regex const lastPoint(R"re("LASTPOINT":\[[^\]]*\],)re");
-    return std::regex_replace(text, lastPoint, "");
+    std::string text{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
+    constexpr std::string_view kEnd = "],";
+    if (auto const point = text.find(R"("LASTPOINT":[)"); point != text.npos)
+        text.erase(point, text.find(kEnd, point) + kEnd.size() - point);
+    return text;
 }
 
 class SweepSource : public tzhost::AnswerSource {
