@@ -12,7 +12,7 @@ namespace {
 
 // What the program prints, with its exit status behind it.
 std::string outputOf(std::string const& module) {
-    std::string const program = std::string(std::getenv("TZ_TEST_BIN")) + "/other_host";
+    std::string const program = (tztest::libraryFolder().parent_path() / "bin/other_host").string();
     std::string const file = tztest::scratch("other_host.txt").string();
     std::string const command = program + " " + module + " > " + file + " 2>&1";
     int const status = std::system(command.c_str());  // NOLINT(bugprone-command-processor): ours

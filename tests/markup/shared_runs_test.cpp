@@ -73,8 +73,9 @@ MarkupText readByModule(std::wstring const& markup, CMTextFontMapDatabase& map) 
 TEST(SharedRuns, ReadAsTheHostReadsThem) {
     OwnFontMap const own;
     CMTextFontMapDatabase map(0);
-    auto const cases =
-        tztest::readRunsFile(std::string(std::getenv("TZ_TEST_SOURCE")) + "/tests/layout/runs.txt");
+    char const* const source = std::getenv("TZ_TEST_SOURCE");
+    ASSERT_NE(source, nullptr);
+    auto const cases = tztest::readRunsFile(std::string(source) + "/tests/layout/runs.txt");
     ASSERT_GT(cases.size(), 60U);
     for (tztest::RunsCase const& row : cases) {
         EXPECT_EQ(evened(readByModule(row.markup, map), map),
