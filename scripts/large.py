@@ -106,6 +106,20 @@ def speed(folder, options, report):
     report.count("opened and saved with nothing changed", not same, 1)
 
 
+def wait_for_size(process, temporaries, wanted, whole):
+    """Until the new temporary file has the wanted size; what is wanted beyond the whole of it is
+    time, up to 0.3 seconds, in which it is flushed and renamed."""
+    reached = 0
+    while process.poll() is None and reached < min(wanted, whole * 0.999):
+        try:
+            reached = max((each.stat().st_size for each in temporaries()), default=reached)
+        except FileNotFoundError:
+            break
+        time.sleep(0.0005)
+    if wanted > whole:
+        time.sleep(wanted / whole - 1)
+
+
 class Saves:
     """Saves of one large drawing, each with another TEXTSIZE in it, to the same file."""
 
@@ -147,20 +161,15 @@ class Saves:
         return [each for each in self.plans.iterdir() if each != self.file]
 
     def kill(self, times):
-        """Kills saves at random times between the making of the temporary file and the end."""
-        duration, wrong, new, litter = 1.0, 0, 0, 0
+        """Kills saves when the temporary file has a random size, or a little after it has all."""
+        wrong, new, litter = 0, 0, 0
+        size = self.file.stat().st_size
         for _ in range(times):
             before, left = self.held(), set(self.temporaries())
             process = self.start()
-            while process.poll() is None and not set(self.temporaries()) - left:
-                time.sleep(0.001)
-            begun = time.monotonic()
-            try:
-                process.wait(random.uniform(0, duration * 1.1))
-                duration = 0.5 * duration + 0.5 * (time.monotonic() - begun + 0.1)
-            except subprocess.TimeoutExpired:
-                process.send_signal(signal.SIGKILL)
-                duration = max(duration, time.monotonic() - begun)
+            wait_for_size(process, lambda: set(self.temporaries()) - left,
+                          random.uniform(0, 1.3) * size, size)
+            process.send_signal(signal.SIGKILL)
             process.communicate()
             after = self.held()
             wrong += after not in (before, self.number)
@@ -170,8 +179,7 @@ class Saves:
                 if left:  # one stays, in the way of all that follow
                     each.unlink()
         self.report.count(f"files whole after kill -9, {new} of them the new one, "
-                          f"{litter} times with a temporary file beside",
-                          wrong, times)
+                          f"{litter} times with a temporary file beside", wrong, times)
         before = self.number
         self.save()
         self.report.count("saves behind them", self.held() != before + 1, 1)

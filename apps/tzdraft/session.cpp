@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "apps/tzdraft/local_text.h"
+#include "host/base/memory_faults.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/database/user_system.h"
@@ -53,9 +54,10 @@ Session& Session::current() {
     return *running;
 }
 
-// There is a drawing whatever fails on the way.
+// Whole or not at all: without a document in the end no command could run.
 void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
                         std::function<void()> const& setVariables) {
+    tzhost::MemoryFaultPause const isWhole;
     if (drawing_) {
         // What the command has done so far to the drawing that goes stays one step of its undo.
         if (isInCommand_) drawing_->undoLog().end();

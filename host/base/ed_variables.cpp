@@ -11,11 +11,13 @@
 namespace {
 
 void reportWrite(wchar_t const* name, tzhost::VariableValue const& value) {
-    std::wstring const capitals(tzhost::findVariable(name)->name);
-    tzhost::reportEvent({
-        {"event", "variable"              },
-        {"name",  tzhost::toUtf8(capitals)},
-        {"value", tzhost::toJson(value)   }
+    tzhost::reportEvent([&] {
+        std::wstring const capitals(tzhost::findVariable(name)->name);
+        return tzhost::Event{
+            {"event", "variable"              },
+            {"name",  tzhost::toUtf8(capitals)},
+            {"value", tzhost::toJson(value)   }
+        };
     });
 }
 
@@ -36,6 +38,6 @@ int tzedSetVar(wchar_t const* name, resbuf const* value) {
     auto const held = tzhost::fromRecord(*value);
     if (!held) return Tzad::ePromptError;
     auto const written = tzhost::Variables::instance().set(name, *held, tzhost::Writer::module);
-    if (written.isDone() && tzhost::eventsWanted()) reportWrite(name, *held);
+    if (written.isDone()) reportWrite(name, *held);
     return written.status;
 }

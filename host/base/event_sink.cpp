@@ -16,8 +16,8 @@ bool eventsWanted() {
     return static_cast<bool>(sink());
 }
 
-void reportEvent(Event const& event) {
-    if (sink()) sink()(event);
+void handOver(Event const& event) {
+    sink()(event);
 }
 
 EventSink setEventSink(EventSink next) {

@@ -3,21 +3,31 @@
 #include <functional>
 #include <nlohmann/json.hpp>
 
+#include "host/base/memory_faults.h"
 #include "tz/text/string.h"
 
 // What passes between a module and the host, as JSON objects in the order in which it happens. Each
 // layer reports its own events; one sink, when there is one, takes them all.
 //
-//   if (tzhost::eventsWanted()) tzhost::reportEvent({{"event", "write"}, {"handle", "2A"}});
+//   tzhost::reportEvent([&] { return tzhost::Event{{"event", "write"}, {"handle", "2A"}}; });
 //
-// Building an event costs more than asking whether somebody wants it, so ask first.
+// An event is only built when somebody wants it, and no memory fault is met on the way: what
+// happened is told in any case, and the JSON library cannot pass such a fault on.
 namespace tzhost {
 
 using Event = nlohmann::ordered_json;
 using EventSink = std::function<void(Event const&)>;
 
 [[nodiscard]] bool eventsWanted();
-void reportEvent(Event const& event);
+// Hands an event to the sink, which must be there.
+void handOver(Event const& event);
+// Reports what `build` returns.
+template <class Build>
+void reportEvent(Build const& build) {
+    if (!eventsWanted()) return;
+    MemoryFaultPause const pause;
+    handOver(build());
+}
 // Replaces the sink; an empty one stops events. Returns the sink before.
 EventSink setEventSink(EventSink sink);
 

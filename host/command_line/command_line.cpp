@@ -55,10 +55,12 @@ void CommandLine::reset() {
 
 void CommandLine::print(std::wstring_view text) {
     if (text.empty()) return;
-    if (voice_ == Voice::module && eventsWanted()) {
-        reportEvent({
-            {"event", "print"     },
-            {"text",  toUtf8(text)}
+    if (voice_ == Voice::module) {
+        reportEvent([&] {
+            return Event{
+                {"event", "print"     },
+                {"text",  toUtf8(text)}
+            };
         });
     }
     transcript_.message(text);
@@ -144,13 +146,13 @@ int CommandLine::failed(int status) {
 }
 
 int CommandLine::answered(std::wstring_view line, int status) const {
-    if (eventsWanted()) {
-        reportEvent({
+    reportEvent([&] {
+        return Event{
             {"event",  "answer"    },
             {"line",   toUtf8(line)},
             {"status", status      }
-        });
-    }
+        };
+    });
     return status;
 }
 

@@ -41,13 +41,14 @@ Question::Question(QuestionKind kind, wchar_t const* prompt)
 
 Question::Question(QuestionKind kind, wchar_t const* prompt, Armed armed)
     : line_(commandLine()), kind_(kind), prompt_(prompt ? prompt : L""), armed_(std::move(armed)) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event",    "prompt"           },
-        {"kind",     nameOf(kind_)      },
-        {"text",     toUtf8(prompt_)    },
-        {"keywords", toUtf8(armed_.list)},
-        {"flags",    armed_.flags       }
+    reportEvent([&] {
+        return Event{
+            {"event",    "prompt"           },
+            {"kind",     nameOf(kind_)      },
+            {"text",     toUtf8(prompt_)    },
+            {"keywords", toUtf8(armed_.list)},
+            {"flags",    armed_.flags       }
+        };
     });
 }
 

@@ -10,14 +10,16 @@ void reportPoint(int component,
                  TzString const& name,
                  char const* which,
                  TzEdJigInputData const& data) {
-    if (!data.hasPoint || !tzhost::eventsWanted()) return;
+    if (!data.hasPoint) return;
     TzGePoint3d const& point = data.point;
-    tzhost::reportEvent({
-        {"event",     "telemetryPoint"                                 },
-        {"component", component                                        },
-        {"name",      tzhost::utf8(name)                               },
-        {"which",     which                                            },
-        {"point",     tzhost::Event::array({point.x, point.y, point.z})}
+    tzhost::reportEvent([&] {
+        return tzhost::Event{
+            {"event",     "telemetryPoint"                                 },
+            {"component", component                                        },
+            {"name",      tzhost::utf8(name)                               },
+            {"which",     which                                            },
+            {"point",     tzhost::Event::array({point.x, point.y, point.z})}
+        };
     });
 }
 
@@ -27,13 +29,14 @@ TzTelemetryCmdHelper::TzTelemetryCmdHelper(int component, wchar_t const* name)
     : component_(component), name_(name) {}
 
 void TzTelemetryCmdHelper::SendEvent(int phase, int value, wchar_t const* /*data*/) const {
-    if (!tzhost::eventsWanted()) return;
-    tzhost::reportEvent({
-        {"event",     "telemetry"        },
-        {"component", component_         },
-        {"name",      tzhost::utf8(name_)},
-        {"phase",     phase              },
-        {"value",     value              }
+    tzhost::reportEvent([&] {
+        return tzhost::Event{
+            {"event",     "telemetry"        },
+            {"component", component_         },
+            {"name",      tzhost::utf8(name_)},
+            {"phase",     phase              },
+            {"value",     value              }
+        };
     });
 }
 

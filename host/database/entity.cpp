@@ -2,13 +2,13 @@
 
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
+#include "host/base/memory_faults.h"
 #include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/database/entity_imp.h"
 #include "host/database/geometry.h"
 #include "host/database/open_state.h"
 #include "host/database/symbol_imp.h"
-#include "host/faults/memory.h"
 #include "tz/db/host_services.h"
 #include "tz/gi/draw.h"
 
@@ -88,13 +88,13 @@ namespace {
 void markHighlighted(TzDbObjectRecord& record, bool on) {
     if (record.highlighted != on) tzhost::audit().highlighted += on ? 1 : -1;
     record.highlighted = on;
-    if (!tzhost::eventsWanted()) return;
-    tzhost::MemoryFaultPause const pause;  // what happened is told in any case
-    tzhost::Event event;
-    event["event"] = "highlight";
-    event["handle"] = tzhost::utf8(tzhost::handleText(record.handle));
-    event["on"] = on;
-    tzhost::reportEvent(event);
+    tzhost::reportEvent([&] {
+        return tzhost::Event{
+            {"event",  "highlight"                                    },
+            {"handle", tzhost::utf8(tzhost::handleText(record.handle))},
+            {"on",     on                                             }
+        };
+    });
 }
 
 }  // namespace

@@ -127,9 +127,11 @@ bool tzdbFindField(wchar_t const* text, int start, int& first, int& end) {
 }
 
 void tzedTextFieldModified(TzDbField* field) {
-    if (!field || !tzhost::eventsWanted()) return;
-    tzhost::reportEvent({
-        {"event", "notify"           },
-        {"name",  "textFieldModified"}
+    if (!field) return;
+    tzhost::reportEvent([&] {
+        return tzhost::Event{
+            {"event", "notify"           },
+            {"name",  "textFieldModified"}
+        };
     });
 }

@@ -11,11 +11,12 @@ namespace {
 Drawing* theWorkingDrawing = nullptr;
 
 void notify(char const* name) {
-    if (eventsWanted())
-        reportEvent({
+    reportEvent([&] {
+        return Event{
             {"event", "notify"},
             {"name",  name    }
-        });
+        };
+    });
 }
 
 class Services final : public TzDbHostApplicationServices {

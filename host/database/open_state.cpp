@@ -2,10 +2,10 @@
 
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
+#include "host/base/memory_faults.h"
 #include "host/database/drawing.h"
 #include "host/database/entity_imp.h"
 #include "host/database/symbol_imp.h"
-#include "host/faults/memory.h"
 #include "tz/db/entity.h"
 #include "tz/db/field.h"
 
@@ -14,11 +14,12 @@ namespace {
 
 void reportWrite(TzDbObjectRecord const& record) {
     if (!eventsWanted() || !record.object->isKindOf(TzDbEntity::desc())) return;
-    MemoryFaultPause const pause;  // what happened is told in any case
-    Event event;
-    event["event"] = "write";
-    event["handle"] = utf8(handleText(record.handle));
-    reportEvent(event);
+    reportEvent([&] {
+        return Event{
+            {"event",  "write"                        },
+            {"handle", utf8(handleText(record.handle))}
+        };
+    });
 }
 
 }  // namespace

@@ -6,9 +6,9 @@
 
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
+#include "host/base/memory_faults.h"
 #include "host/base/variables.h"
 #include "host/database/geometry.h"
-#include "host/faults/memory.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/ucs.h"
 #include "tz/ge/matrix3d.h"
@@ -70,20 +70,21 @@ bool isProper(UserSystem const& system) {
            system.xAxis.isPerpendicularTo(system.yAxis, tolerance);
 }
 
-Event threeNumbers(double x, double y, double z) {
-    return Event::array({x, y, z});
+template <class Triple>
+Event threeNumbers(Triple const& value) {
+    return Event::array({value.x, value.y, value.z});
 }
 
 void reportSystem(char const* action, UserSystem const& system) {
-    if (!eventsWanted()) return;
-    MemoryFaultPause const pause;  // what happened is told in any case
-    Event event;
-    event["event"] = "ucs";
-    event["action"] = action;
-    event["origin"] = threeNumbers(system.origin.x, system.origin.y, system.origin.z);
-    event["x"] = threeNumbers(system.xAxis.x, system.xAxis.y, system.xAxis.z);
-    event["y"] = threeNumbers(system.yAxis.x, system.yAxis.y, system.yAxis.z);
-    reportEvent(event);
+    reportEvent([&] {
+        return Event{
+            {"event",  "ucs"                      },
+            {"action", action                     },
+            {"origin", threeNumbers(system.origin)},
+            {"x",      threeNumbers(system.xAxis) },
+            {"y",      threeNumbers(system.yAxis) }
+        };
+    });
 }
 
 // The system that was in force when TILEMODE or CVPORT was last looked at.

@@ -84,7 +84,7 @@ Event frameEvent(DrawList const& list) {
 void reportFrame(TzDbEntity* entity, TzDbDatabase* database) {
     DrawPass pass(database, DrawPass::Entities::whole);
     pass.draw(entity);
-    if (eventsWanted()) reportEvent(frameEvent(pass.list()));
+    reportEvent([&] { return frameEvent(pass.list()); });
 }
 
 }  // namespace tzhost

@@ -4,9 +4,9 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
+#include "host/base/memory_faults.h"
 #include "host/base/variables.h"
 #include "host/editors/markup_session.h"
-#include "host/faults/memory.h"
 #include "host/runtime/class_registry.h"
 #include "tz/ap/host_dialog.h"
 #include "tz/db/mtext.h"
@@ -19,11 +19,12 @@ constexpr int kLeft = 0;
 constexpr int kAccepted = 1;
 
 void notify(char const* name) {
-    if (eventsWanted())
-        reportEvent({
+    reportEvent([&] {
+        return Event{
             {"event", "notify"},
             {"name",  name    }
-        });
+        };
+    });
 }
 
 // How one number of the in-place editor's record is read.
@@ -85,17 +86,17 @@ Event describe(IPESettings const& settings) {
     return numbers;
 }
 
-// What happened is told in any case. An event needs memory to free itself, hence the pause.
+// Only the in-place editor has settings.
 void reportEditor(char const* kind, bool accepted, IPESettings const* settings) {
-    if (!eventsWanted()) return;
-    MemoryFaultPause const pause;
-    Event event{
-        {"event",    "editor"},
-        {"kind",     kind    },
-        {"accepted", accepted}
-    };
-    if (settings) event["settings"] = describe(*settings);
-    reportEvent(event);
+    reportEvent([&] {
+        Event event{
+            {"event",    "editor"},
+            {"kind",     kind    },
+            {"accepted", accepted}
+        };
+        if (settings) event["settings"] = describe(*settings);
+        return event;
+    });
 }
 
 // Edits the text's contents with a program or the script's block; kAccepted or kLeft.

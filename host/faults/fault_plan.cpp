@@ -4,7 +4,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/base/local_text.h"
-#include "host/faults/memory.h"
+#include "host/base/memory_faults.h"
 
 namespace tzhost {
 namespace {

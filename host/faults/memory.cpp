@@ -1,4 +1,4 @@
-#include "host/faults/memory.h"
+#include "host/base/memory_faults.h"
 
 #include <cstdlib>
 #include <new>
@@ -8,29 +8,8 @@
 namespace tzhost {
 namespace {
 
-// The host has one thread; these are per thread so that threads of libraries never meet a fault.
-thread_local int scopes = 0;
-thread_local int pauses = 0;
-
-}  // namespace
-
-MemoryFaultScope::MemoryFaultScope() noexcept {
-    ++scopes;
-}
-MemoryFaultScope::~MemoryFaultScope() {
-    --scopes;
-}
-MemoryFaultPause::MemoryFaultPause() noexcept {
-    ++pauses;
-}
-MemoryFaultPause::~MemoryFaultPause() {
-    --pauses;
-}
-
-namespace {
-
 void* allocate(std::size_t size) {
-    if (scopes > 0 && pauses == 0) {
+    if (memoryMayFail()) {
         MemoryFaultPause const pause;
         if (faultAt("operator new")) throw std::bad_alloc();
     }

@@ -5,6 +5,7 @@
 #include <map>
 #include <memory>
 #include <string>
+#include <utility>
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
@@ -70,19 +71,20 @@ Classes& classes() {
 
 // The new descriptor, or null when the name is taken.
 ClassDescriptor* insertClass(wchar_t const* name, wchar_t const* parent, TzRxCreator creator) {
-    auto const [at, isNew] = classes().try_emplace(name ? name : L"");
-    if (!isNew) return nullptr;
-    at->second = std::make_unique<ClassDescriptor>(at->first, parent ? parent : L"", creator);
-    return at->second.get();
+    std::wstring const key(name ? name : L"");
+    auto made = std::make_unique<ClassDescriptor>(key, parent ? parent : L"", creator);
+    auto const [at, isNew] = classes().try_emplace(key, std::move(made));
+    return isNew ? at->second.get() : nullptr;
 }
 
 void reportClass(wchar_t const* name, bool on) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event", "register"},
-        {"what",  "class"   },
-        {"name",  utf8(name)},
-        {"on",    on        }
+    reportEvent([&] {
+        return Event{
+            {"event", "register"},
+            {"what",  "class"   },
+            {"name",  utf8(name)},
+            {"on",    on        }
+        };
     });
 }
 

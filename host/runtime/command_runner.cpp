@@ -1,8 +1,8 @@
 #include "host/runtime/command_runner.h"
 
 #include "host/base/event_sink.h"
+#include "host/base/memory_faults.h"
 #include "host/base/variables.h"
-#include "host/faults/memory.h"
 #include "host/runtime/command_stack.h"
 
 namespace tzhost {
@@ -23,25 +23,27 @@ Audit& worst() {
 }
 
 void reportPhase(Command const& command, char const* phase) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event", "command"               },
-        {"name",  utf8(command.globalName)},
-        {"phase", phase                   }
+    reportEvent([&] {
+        return Event{
+            {"event", "command"               },
+            {"name",  utf8(command.globalName)},
+            {"phase", phase                   }
+        };
     });
 }
 
 void reportAudit(Audit const& left) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event",           "audit"             },
-        {"openObjects",     left.openObjects    },
-        {"selectionSets",   left.selectionSets  },
-        {"filters",         left.filters        },
-        {"gestureHandlers", left.gestureHandlers},
-        {"highlighted",     left.highlighted    },
-        {"ucsStack",        left.ucsStack       },
-        {"keywordCallback", left.keywordCallback}
+    reportEvent([&] {
+        return Event{
+            {"event",           "audit"             },
+            {"openObjects",     left.openObjects    },
+            {"selectionSets",   left.selectionSets  },
+            {"filters",         left.filters        },
+            {"gestureHandlers", left.gestureHandlers},
+            {"highlighted",     left.highlighted    },
+            {"ucsStack",        left.ucsStack       },
+            {"keywordCallback", left.keywordCallback}
+        };
     });
 }
 

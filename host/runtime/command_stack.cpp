@@ -20,15 +20,16 @@ std::map<TzString, HelpTopic, NoCaseLess>& helpTopics() {
 }
 
 void reportCommand(Command const& command, bool on) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event", "register"              },
-        {"what",  "command"               },
-        {"name",  utf8(command.globalName)},
-        {"on",    on                      },
-        {"local", utf8(command.localName) },
-        {"group", utf8(command.group)     },
-        {"flags", command.flags           }
+    reportEvent([&] {
+        return Event{
+            {"event", "register"              },
+            {"what",  "command"               },
+            {"name",  utf8(command.globalName)},
+            {"on",    on                      },
+            {"local", utf8(command.localName) },
+            {"group", utf8(command.group)     },
+            {"flags", command.flags           }
+        };
     });
 }
 
@@ -104,15 +105,15 @@ int tzedSetFunHelp(wchar_t const* name,
     if (auto const fault = tzhost::faultAt("tzedSetFunHelp")) return *fault;
     if (!name || !*name) return Tzad::ePromptError;
     tzhost::helpTopics()[name] = {file, topic};
-    if (tzhost::eventsWanted()) {
-        tzhost::reportEvent({
+    tzhost::reportEvent([&] {
+        return tzhost::Event{
             {"event", "register"         },
             {"what",  "help"             },
             {"name",  tzhost::utf8(name) },
             {"on",    true               },
             {"topic", tzhost::utf8(topic)}
-        });
-    }
+        };
+    });
     return Tzad::ePromptNormal;
 }
 

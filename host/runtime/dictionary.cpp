@@ -37,12 +37,14 @@ class ServiceDictionary : public Dictionary {
 public:
     TzRxObject* remove(wchar_t const* name) override {
         TzRxObject* const removed = Dictionary::remove(name);
-        if (removed && eventsWanted()) {
-            reportEvent({
-                {"event", "register"},
-                {"what",  "service" },
-                {"name",  utf8(name)},
-                {"on",    false     }
+        if (removed) {
+            reportEvent([&] {
+                return Event{
+                    {"event", "register"},
+                    {"what",  "service" },
+                    {"name",  utf8(name)},
+                    {"on",    false     }
+                };
             });
         }
         return removed;
@@ -87,14 +89,14 @@ TzRxObject* tzrxRegisterService(wchar_t const* name) {
     if (TzRxObject* const there = services.at(name)) return there;
     TzRxObject* const service = new tzhost::Service;
     services.atPut(name, service);
-    if (tzhost::eventsWanted()) {
-        tzhost::reportEvent({
+    tzhost::reportEvent([&] {
+        return tzhost::Event{
             {"event", "register"        },
             {"what",  "service"         },
             {"name",  tzhost::utf8(name)},
             {"on",    true              }
-        });
-    }
+        };
+    });
     return service;
 }
 

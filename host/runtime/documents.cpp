@@ -5,7 +5,7 @@
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
-#include "host/faults/memory.h"
+#include "host/base/memory_faults.h"
 #include "host/runtime/module_linker.h"
 #include "tz/rx/status.h"
 
@@ -28,11 +28,12 @@ bool GestureProcessor::removeOverruleHandler(Handler* handler) {
 }
 
 void Documents::redraw() {
-    if (eventsWanted())
-        reportEvent({
+    reportEvent([&] {
+        return Event{
             {"event", "notify"},
             {"name",  "redraw"}
-        });
+        };
+    });
 }
 
 int Documents::sendStringToExecute(TzApDocument* document,

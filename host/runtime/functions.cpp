@@ -33,13 +33,14 @@ private:
 };
 
 void reportFunction(TzString const& name, int code, bool on) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event", "register"},
-        {"what",  "function"},
-        {"name",  utf8(name)},
-        {"on",    on        },
-        {"code",  code      }
+    reportEvent([&] {
+        return Event{
+            {"event", "register"},
+            {"what",  "function"},
+            {"name",  utf8(name)},
+            {"on",    on        },
+            {"code",  code      }
+        };
     });
 }
 

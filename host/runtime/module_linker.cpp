@@ -3,10 +3,12 @@
 #include <dlfcn.h>
 
 #include <algorithm>
+#include <exception>
 #include <utility>
 
 #include "host/base/fault_point.h"
 #include "host/base/local_text.h"
+#include "host/base/memory_faults.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/documents.h"
 
@@ -63,6 +65,49 @@ int DynamicLinker::send(LoadedModule const& module, TzRx::AppMsgCode message) co
     return deliver(module, message, nullptr);
 }
 
+std::string DynamicLinker::openingProblem(LoadedModule& module) {
+    MemoryFaultPause const pause;  // what the loader runs could not pass a failure on
+    module.library = dlopen(module.file.c_str(), RTLD_NOW | RTLD_LOCAL);
+    if (!module.library) return localText("the module cannot be loaded") + ": " + loaderError();
+    module.entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module.library, "tzrxEntryPoint"));
+    if (module.entry) return {};
+    dlclose(module.library);
+    return localText("this is no module of the host: it has no tzrxEntryPoint");
+}
+
+// An exception ends here: its type may be the module's, which goes.
+std::string DynamicLinker::startingProblem(LoadedModule& module) const {
+    try {
+        int const status = deliver(module, TzRx::kInitAppMsg, &module);
+        if (status == TzRx::kRetOK) {
+            if (documents().curDocument())
+                (void)send(module, TzRx::kLoadDwgMsg);  // the module stays either way
+            return {};
+        }
+        return TzString::formatted(localText(L"the module refused to start (status %d)"), status)
+            .toUtf8();
+    } catch (std::exception const& thrown) {
+        MemoryFaultPause const pause;
+        return localText("the module failed at its start") + ": " + thrown.what();
+    } catch (...) {
+        MemoryFaultPause const pause;
+        return localText("the module failed at its start");
+    }
+}
+
+void DynamicLinker::dropNewest() {
+    MemoryFaultPause const givesBack;
+    LoadedModule const& module = *modules_.back();
+    try {
+        (void)deliver(module, TzRx::kUnloadAppMsg, nullptr);  // safe whatever load reached
+    } catch (...) {
+        // There is nothing more that it could give back.
+    }
+    documents().forgetModule(module);
+    dlclose(module.library);
+    modules_.pop_back();
+}
+
 bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) {
     auto const sameFile = [&](auto const& module) {
         return module->file.filename() == file.filename();
@@ -73,34 +118,15 @@ bool DynamicLinker::load(std::filesystem::path const& file, std::string& error) 
     }
     auto module = std::make_unique<LoadedModule>();
     module->file = file;
-    module->library = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
-    if (!module->library) {
-        error =
-            file.string() + ": " + localText("the module cannot be loaded") + ": " + loaderError();
-        return false;
+    modules_.reserve(modules_.size() + 1);
+    std::string problem = openingProblem(*module);
+    if (problem.empty()) {
+        modules_.push_back(std::move(module));
+        problem = startingProblem(*modules_.back());
+        if (!problem.empty()) dropNewest();
     }
-    module->entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module->library, "tzrxEntryPoint"));
-    if (!module->entry) {
-        error = file.string() + ": " +
-                localText("this is no module of the host: it has no tzrxEntryPoint");
-        dlclose(module->library);
-        return false;
-    }
-    modules_.push_back(std::move(module));
-    LoadedModule& loaded = *modules_.back();
-    int const status = deliver(loaded, TzRx::kInitAppMsg, &loaded);
-    if (status != TzRx::kRetOK) {
-        error = file.string() + ": " +
-                TzString::formatted(localText(L"the module refused to start (status %d)"), status)
-                    .toUtf8();
-        (void)deliver(loaded, TzRx::kUnloadAppMsg, nullptr);  // safe whatever load reached
-        dlclose(loaded.library);
-        modules_.pop_back();
-        return false;
-    }
-    if (documents().curDocument())
-        (void)send(loaded, TzRx::kLoadDwgMsg);  // the module stays either way
-    return true;
+    if (!problem.empty()) error = file.string() + ": " + problem;
+    return problem.empty();
 }
 
 bool DynamicLinker::unload(std::filesystem::path const& file, std::string& error) {

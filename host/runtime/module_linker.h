@@ -26,8 +26,8 @@ public:
     bool allowUnload(void* appHandle) override;
     bool declareMultiDocument(void* appHandle) override;
 
-    // Loads a module: message 1, then message 3 for the drawing that is open. On failure nothing of
-    // it stays and `error` says in one line why.
+    // Loads a module: message 1, then message 3 for the drawing that is open. On failure, which an
+    // exception at either is too, nothing of it stays and `error` says in one line why.
     bool load(std::filesystem::path const& file, std::string& error);
     // Unloads a module by its file name: message 4 for the open drawing, message 2, and its file
     // leaves the process. On failure `error` says why and the module stays.
@@ -47,6 +47,12 @@ public:
 
 private:
     [[nodiscard]] LoadedModule* byHandle(void* handle) const;
+    // Open the module's file and send it its first messages; empty, or what keeps it from being
+    // loaded.
+    [[nodiscard]] static std::string openingProblem(LoadedModule& module);
+    [[nodiscard]] std::string startingProblem(LoadedModule& module) const;
+    // Undoes what the newest module's start has reached.
+    void dropNewest();
     int deliver(LoadedModule const& module, TzRx::AppMsgCode message, void* argument) const;
 
     std::vector<std::unique_ptr<LoadedModule>> modules_;

@@ -6,7 +6,7 @@
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
-#include "host/faults/memory.h"
+#include "host/base/memory_faults.h"
 #include "host/runtime/documents.h"
 #include "tz/rx/status.h"
 
@@ -78,11 +78,12 @@ void runFilters(int wanted, EntityIds& ids, Hook const& hook) {
 }
 
 void reportFilter(char const* action, int flags) {
-    if (!eventsWanted()) return;
-    reportEvent({
-        {"event",  "filter"},
-        {"action", action  },
-        {"flags",  flags   }
+    reportEvent([&] {
+        return Event{
+            {"event",  "filter"},
+            {"action", action  },
+            {"flags",  flags   }
+        };
     });
 }
 

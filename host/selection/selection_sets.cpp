@@ -5,7 +5,7 @@
 
 #include "host/base/audit.h"
 #include "host/base/fault_point.h"
-#include "host/faults/memory.h"
+#include "host/base/memory_faults.h"
 #include "tz/ed/selection.h"
 #include "tz/rx/status.h"
 

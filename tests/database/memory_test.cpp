@@ -2,8 +2,8 @@
 
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
+#include "host/base/memory_faults.h"
 #include "host/faults/fault_plan.h"
-#include "host/faults/memory.h"
 #include "tests/database/drawing_fixture.h"
 #include "tz/ed/ucs.h"
 

@@ -3,8 +3,8 @@
 #include <new>
 
 #include "host/base/fault_point.h"
+#include "host/base/memory_faults.h"
 #include "host/faults/fault_plan.h"
-#include "host/faults/memory.h"
 
 namespace {
 

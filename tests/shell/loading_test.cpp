@@ -13,9 +13,11 @@
 #include "host/base/event_sink.h"
 #include "host/base/file_bytes.h"
 #include "host/base/install_paths.h"
+#include "host/base/memory_faults.h"
 #include "host/base/resource_search.h"
 #include "host/command_line/command_line.h"
 #include "host/database/drawing.h"
+#include "host/faults/fault_plan.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
@@ -121,6 +123,30 @@ TEST_F(Loading, AThousandTimesLeavesMemoryAndProcessAsTheyWere) {
         (void)takeEvents();
     }
     EXPECT_LT(bytesInUse() - before, kSlack);
+}
+
+// It used to stay listed when its first message passed an exception.
+TEST_F(Loading, WithoutMemoryForItLeavesNothing) {
+    constexpr int kCalls = 400;  // loading makes some hundreds
+    for (int call = 1; call <= kCalls; call += 3) {
+        tzhost::FaultPlan plan;
+        ASSERT_FALSE(plan.add("operator new:" + std::to_string(call)));
+        plan.install();
+        std::string error = "thrown";
+        try {
+            tzhost::MemoryFaultScope const memory;
+            error = load();
+        } catch (std::bad_alloc const&) {
+            // The host itself lacked memory.
+        }
+        plan.remove();
+        if (error.empty()) {
+            EXPECT_EQ(unload(), "") << call;
+        }
+        ASSERT_TRUE(tzhost::dynamicLinker().modules().empty()) << call << ": " << error;
+        ASSERT_FALSE(isMapped()) << call << ": " << error;
+    }
+    EXPECT_EQ(load(), "");
 }
 
 // One language for as long as the module is loaded; the next load reads its texts again.

@@ -33,8 +33,8 @@ struct resbuf;
 [[nodiscard]] TZ_API int tzedSSName(long long const* set, int index, long long* name);
 // [command] Frees the set; a set freed before may be freed again (5100).
 TZ_API int tzedSSFree(long long const* set);
-// [command] Makes a set the implied selection, or drops the implied selection with two nulls; the
-// second set is the part to grip and may be null.
+// [command] Makes `selected` the implied selection, or drops that when it is null; `grips` is the
+// part of it to grip, which this host shows nowhere, and may be null.
 TZ_API int tzedSSSetFirst(long long const* grips, long long const* selected);
 
 // [command] Picks one entity. `name` and `point` (user coordinates) are left alone but for 5100; a

@@ -23,4 +23,7 @@ public:
     ~MemoryFaultPause();
 };
 
+// Whether an allocation made now asks the fault plan.
+[[nodiscard]] bool memoryMayFail() noexcept;
+
 }  // namespace tzhost
