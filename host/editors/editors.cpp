@@ -4,7 +4,6 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
-#include "host/base/memory_faults.h"
 #include "host/base/variables.h"
 #include "host/editors/markup_session.h"
 #include "host/runtime/class_registry.h"
