@@ -5,6 +5,7 @@
 #   add_suite(NAME sources... [LIBS layers...])       a GoogleTest program, target test_NAME
 #   add_fuzz(NAME source [LIBS layers...])            a fuzzer and the replay of its seeds, target fuzz_NAME
 #   add_bench(NAME sources... [LIBS layers...])       a benchmark (release only), target bench_NAME
+#   add_bench_program(NAME sources...)                a program that scripts/compare.py measures (release only)
 #   add_example_module(NAME sources...)               a further module lib/NAME.tzx, built from sdk/ alone
 #   add_example_program(NAME sources...)              a program bin/NAME, built from sdk/ alone
 #   add_lint(NAME command...)                         a check of the source tree, test lint.NAME
@@ -248,6 +249,15 @@ function(add_bench name)
         ${PROJECT_SOURCE_DIR}/bench/support/against_floor.cpp)
     tz_proof_target(bench_${name} ${ARG_LIBS})
     target_link_libraries(bench_${name} PRIVATE benchmark::benchmark benchmark::benchmark_main)
+endfunction()
+
+function(add_bench_program name)
+    if(NOT TZ_BENCH)
+        return()
+    endif()
+    add_executable(${name} ${ARGN})
+    tz_flags(${name})
+    set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/tests)
 endfunction()
 
 # What a loadable module needs to be: a plain file NAME.tzx that nothing pins to the process.

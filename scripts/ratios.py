@@ -22,6 +22,11 @@ def rows_of(report):
             yield name, run["ratio"], run["bound"]
 
 
+def line_of(name, ratio, bound):
+    """The line of one ratio."""
+    return f"{'OVER' if ratio > bound else 'within':8} {ratio:7.2f} of {bound:5.2f}  {name}"
+
+
 def main():
     over = 0
     for report in sys.argv[1:]:
@@ -30,9 +35,8 @@ def main():
                 over += 1
                 print(f"failed   {name}")
                 continue
-            is_over = ratio > bound
-            over += is_over
-            print(f"{'OVER' if is_over else 'within':8} {ratio:7.2f} of {bound:5.2f}  {name}")
+            over += ratio > bound
+            print(line_of(name, ratio, bound))
     return 1 if over else 0
 
 

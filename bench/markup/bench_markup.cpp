@@ -120,8 +120,8 @@ void sweep(benchmark::State& state, TextKind const& kind) {
     while (state.KeepRunning()) {
         double first = 0;
         double growth = 0;
-        for (std::size_t i = 0; i < kSizes.size(); ++i) {
-            Measure const each = measured(kind, kSizes[i], kSizes[i] > kSpeedSize ? 2 : 4);
+        for (std::size_t i = 0; i < kSizes.size() && kSizes[i] <= kind.mostSize; ++i) {
+            Measure const each = measured(kind, kSizes[i], kSizes[i] > kSpeedSize ? 1 : 3);
             double const ratio = each.work / each.floor;
             if (i == 0) first = ratio;
             growth = std::max(growth, ratio / first);

@@ -16,7 +16,7 @@ enum class Way { toRtf, toMtext };
 
 // What a text is like: plain, with a change of the look every 40 characters, or made of entries of
 // a table.
-enum class Sort { plain, dense, entries, other };
+enum class Sort { plain, dense, entries, growing, other };
 
 // A text is the head, the unit again and again, and the tail. A "#" in the unit is its number,
 // counted from `first`.
@@ -28,6 +28,9 @@ struct TextKind {
     std::wstring unit;
     std::wstring tail;
     long first = 0;
+    // Beyond 100,000 entries a sweep takes minutes, and beyond as many toggles of a long name the
+    // result takes all memory.
+    std::size_t mostSize = sort == Sort::entries || sort == Sort::growing ? 4000000 : 50000000;
 };
 
 [[nodiscard]] std::span<TextKind const> textKinds();
