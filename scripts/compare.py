@@ -21,6 +21,7 @@ HEAD = (r"{\rtf1\ansi\deff0{\fonttbl{\f0\fswiss Arial;}{\f1\froman Times New Rom
         r"{\colortbl;\red255\green0\blue0;}")
 RUN = "a run of text that no code interrupts, i"
 MILLION = 1000000
+WARMING = 3  # rounds that are not counted: memory that a virtual machine touches first is slow
 LETTERS = 100 * MILLION
 
 
@@ -62,10 +63,11 @@ def compare_speed(report, convert, bare, file, rounds):
             print(f"skipped  {name}: not installed")
     times = {name: [] for name in commands}
     peaks = {}
-    for _ in range(rounds):
+    for turn in range(-WARMING, rounds):
         for name, command in commands.items():
             seconds, peaks[name] = run(command + [file])
-            times[name].append(seconds)
+            if turn >= 0:
+                times[name].append(seconds)
     medians = {name: statistics.median(each) for name, each in times.items()}
     size = os.path.getsize(file)
     for name in commands:
