@@ -2,8 +2,9 @@
 
 #include <cstdlib>
 #include <fstream>
-#include <iterator>
 #include <system_error>
+
+#include "host/base/file_bytes.h"
 
 namespace tzhost {
 
@@ -27,11 +28,7 @@ PrivateFile::~PrivateFile() {
 }
 
 std::optional<std::string> PrivateFile::read() const {
-    std::ifstream in(file_, std::ios::binary);
-    if (!in) return std::nullopt;
-    std::string bytes{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
-    if (in.bad()) return std::nullopt;
-    return bytes;
+    return readFile(file_.string());
 }
 
 }  // namespace tzhost
