@@ -115,7 +115,8 @@ CStdStrW CMTextFontMapDatabase::MapFileToFont(
         charset = entry.m_eCharset;
         pitch = entry.m_nPitch;
         type = entry.m_eMapType;
-        return entry.m_sFaceName;
+        file = entry.m_sFaceName;  // in the memory of the copy that was handed in
+        return file;
     }
     if (IsBigfontFilespec(file)) {
         CStdStrW const face = AddBigfontProxy(file);
@@ -137,7 +138,8 @@ CStdStrW CMTextFontMapDatabase::MapFontToFile(
     MapType& type, CStdStrW face, bool bold, bool italic, Charset charset, int pitch) {
     if (auto const* const entry = fontEntry(*this, face, bold, italic, charset, pitch)) {
         type = entry->m_eMapType;
-        return entry->m_sFileName;
+        face = entry->m_sFileName;  // in the memory of the copy that was handed in
+        return face;
     }
     type = MapTypeSystem;
     CStdStrW file;
