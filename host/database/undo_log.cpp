@@ -1,5 +1,6 @@
 #include "host/database/undo_log.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "host/database/drawing.h"
@@ -12,6 +13,15 @@ namespace {
 
 bool isSameSlot(Variables::Slot const& a, Variables::Slot const& b) {
     return a.value == b.value && a.override_ == b.override_;
+}
+
+// Whether a slot of a snapshot is LASTPOINT.
+bool isLastPoint(std::size_t slot) {
+    for (VariableDefinition const& row : variableTable()) {
+        if (row.kept != KeptIn::drawing) continue;
+        if (slot-- == 0) return row.name == L"LASTPOINT";
+    }
+    return false;
 }
 
 }  // namespace
@@ -42,12 +52,19 @@ void UndoLog::collectVariables() {
     }
 }
 
+// A command that only picked a point, such as LIST, is none that a drafter would take back.
+bool UndoLog::Step::isKept() const {
+    return !entries.empty() || settings ||
+           !std::all_of(variables.begin(), variables.end(),
+                        [](VariableChange const& change) { return isLastPoint(change.slot); });
+}
+
 void UndoLog::end() {
     if (depth_ == 0 || --depth_ > 0) return;
     collectVariables();
     if (!baseSettings_->isSameAs(drawing_.settings())) open_.settings = std::move(baseSettings_);
     Step step = std::exchange(open_, {});
-    if (step.entries.empty() && step.variables.empty() && !step.settings) return;
+    if (!step.isKept()) return;
     step.entries.shrink_to_fit();
     step.variables.shrink_to_fit();
     steps_.push_back(std::move(step));

@@ -26,7 +26,7 @@ public:
 
     // Steps do not nest: inside a step, begin and end are counted and change nothing.
     void begin();
-    // Keeps the step when it changed anything.
+    // Keeps the step when it changed anything but the last point.
     void end();
     // Takes back the last finished step; false when there is none. Within a step the undoing itself
     // is not noted.
@@ -56,6 +56,8 @@ private:
         std::vector<Entry> entries;
         std::vector<VariableChange> variables;
         std::unique_ptr<DrawingSettings> settings;  // null when they did not change
+
+        [[nodiscard]] bool isKept() const;
     };
 
     void rememberBase();

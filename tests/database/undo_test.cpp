@@ -144,6 +144,10 @@ TEST_F(DrawingTest, UndoGoesStepByStep) {
     }
     log.begin();  // a command that changes nothing is no step
     log.end();
+    log.begin();  // nor is one that only picks
+    (void)Variables::instance().set(L"LASTPOINT", tzhost::VariablePoint{1, 2, 0},
+                                    tzhost::Writer::host);
+    log.end();
     log.begin();
     EXPECT_TRUE(log.takeBack());
     log.end();
