@@ -18,8 +18,8 @@ constexpr double kStep = 0.37;
 // The linear units from 1, with the number 1234.5 as each writes it.
 struct Unit {
     char const* name;
-    char const* libraryFormat;
-    char const* libraryText;
+    char const* floorFormat;
+    char const* floorText;
     wchar_t const* text;
 };
 constexpr Unit kUnits[] = {
@@ -40,11 +40,9 @@ void writeLength(benchmark::State& state) {
     double theirs = 0.1;
     tzbench::AgainstFloor against(state, kMost, kCalls);
     while (state.KeepRunning())
-        against.turn([&] { return tzdbRToS(ours += kStep, unit, kPrecision, text); },
-                     [&] {
-                         return std::snprintf(digits, sizeof digits, row.libraryFormat,
-                                              theirs += kStep);
-                     });
+        against.turn(
+            [&] { return tzdbRToS(ours += kStep, unit, kPrecision, text); },
+            [&] { return std::snprintf(digits, sizeof digits, row.floorFormat, theirs += kStep); });
 }
 
 void readLength(benchmark::State& state) {
@@ -60,7 +58,7 @@ void readLength(benchmark::State& state) {
                     state.SkipWithError("a length is not read");
                 return value;
             },
-            [&] { return std::strtod(row.libraryText, nullptr); });
+            [&] { return std::strtod(row.floorText, nullptr); });
 }
 
 BENCHMARK(writeLength)->DenseRange(1, 5)->UseManualTime();

@@ -67,11 +67,12 @@ int DynamicLinker::send(LoadedModule const& module, TzRx::AppMsgCode message) co
 
 std::string DynamicLinker::openingProblem(LoadedModule& module) {
     MemoryFaultPause const pause;  // what the loader runs could not pass a failure on
-    module.library = dlopen(module.file.c_str(), RTLD_NOW | RTLD_LOCAL);
-    if (!module.library) return localText("the module cannot be loaded") + ": " + loaderError();
-    module.entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module.library, "tzrxEntryPoint"));
+    module.loaderHandle = dlopen(module.file.c_str(), RTLD_NOW | RTLD_LOCAL);
+    if (!module.loaderHandle)
+        return localText("the module cannot be loaded") + ": " + loaderError();
+    module.entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module.loaderHandle, "tzrxEntryPoint"));
     if (module.entry) return {};
-    dlclose(module.library);
+    dlclose(module.loaderHandle);
     return localText("this is no module of the host: it has no tzrxEntryPoint");
 }
 
@@ -104,7 +105,7 @@ void DynamicLinker::dropNewest() {
         // There is nothing more that it could give back.
     }
     documents().forgetModule(module);
-    dlclose(module.library);
+    dlclose(module.loaderHandle);
     modules_.pop_back();
 }
 
@@ -145,7 +146,7 @@ bool DynamicLinker::unload(std::filesystem::path const& file, std::string& error
     if (documents().curDocument()) (void)send(module, TzRx::kUnloadDwgMsg);
     (void)send(module, TzRx::kUnloadAppMsg);
     documents().forgetModule(module);
-    dlclose(module.library);
+    dlclose(module.loaderHandle);
     modules_.erase(at);
     return true;
 }

@@ -14,7 +14,7 @@ namespace tzhost {
 // A loaded module. Its address is the handle that the module gets with message 1.
 struct LoadedModule {
     std::filesystem::path file;
-    void* library = nullptr;  // of the dynamic loader
+    void* loaderHandle = nullptr;  // of dlopen
     TzRxEntryPoint entry = nullptr;
     bool mayUnload = false;
     bool servesDocuments = false;

@@ -59,7 +59,8 @@ protected:
     // A variable that the module exports.
     template <class T>
     T& exported(char const* name) {
-        return *static_cast<T*>(dlsym(tzhost::dynamicLinker().modules().front()->library, name));
+        return *static_cast<T*>(
+            dlsym(tzhost::dynamicLinker().modules().front()->loaderHandle, name));
     }
 
     // Registrations as "what name", with "-" ahead of those taken back; a line of the debug output
