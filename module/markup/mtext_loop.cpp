@@ -2,6 +2,7 @@
 
 #include <array>
 
+#include "module/markup/ascii_set.h"
 #include "module/markup/markup_reading.h"
 #include "module/markup/mtext_to_rtf.h"
 #include "module/markup/number_text.h"
@@ -59,21 +60,11 @@ namespace {
 
 // A longer run of characters is copied in pieces, which are then still in the cache.
 constexpr std::ptrdiff_t kLongestRun = 2048;
-constexpr std::size_t kAsciiEnd = 128;
-
-constexpr auto plainTable() {
-    constexpr std::wstring_view kOthers(L"\0\n\\{}", 5);
-    std::array<bool, kAsciiEnd> table{};
-    for (std::size_t c = 0; c < kAsciiEnd; ++c)
-        table[c] = kOthers.find(static_cast<wchar_t>(c)) == kOthers.npos;
-    return table;
-}
+constexpr AsciiSet kNotPlain(std::wstring_view(L"\0\n\\{}", 5));
 
 // Whether a character is written as it is when nothing is pending.
 bool isPlain(wchar_t c) {
-    static constexpr auto kTable = plainTable();
-    auto const code = static_cast<std::size_t>(c);
-    return code < kAsciiEnd && kTable[code];
+    return AsciiSet::isAscii(c) && !kNotPlain.has(c);
 }
 
 }  // namespace

@@ -1,32 +1,17 @@
 // Groups, escaped characters and plain text.
 
-#include <array>
-
+#include "module/markup/ascii_set.h"
 #include "module/markup/rtf_reading.h"
 #include "module/markup/rtf_to_mtext.h"
 #include "module/markup/rtf_tokens.h"
 
 namespace {
 
-// The characters that are no plain text, all of them below kEndOfSigns.
-constexpr std::wstring_view kSigns(L"\0\n\r\\{}", 6);
-constexpr std::size_t kEndOfSigns = 128;
+// The characters that are no plain text.
+constexpr AsciiSet kSigns(std::wstring_view(L"\0\n\r\\{}", 6));
 
 // A longer run of text is copied in pieces, which are then still in the cache.
 constexpr std::ptrdiff_t kLongestRun = 2048;
-
-constexpr auto textTable() {
-    std::array<bool, kEndOfSigns> table{};
-    for (std::size_t c = 0; c < kEndOfSigns; ++c)
-        table[c] = kSigns.find(static_cast<wchar_t>(c)) == kSigns.npos;
-    return table;
-}
-
-bool isText(wchar_t c) {
-    static constexpr auto kTable = textTable();
-    auto const code = static_cast<std::size_t>(c);
-    return code >= kEndOfSigns || kTable[code];
-}
 
 }  // namespace
 
@@ -52,7 +37,7 @@ void CRichTextToMTextContext::Convert(wchar_t const* cursor) {
             isBehindFirst = true;
             break;
         default:
-            while (cursor - start < kLongestRun && isText(*cursor))
+            while (cursor - start < kLongestRun && !kSigns.has(*cursor))
                 ++cursor;
             onText(std::wstring_view(start, static_cast<std::size_t>(cursor - start)));
             break;
