@@ -2,11 +2,13 @@
 
 #include <iconv.h>
 
+#include <algorithm>
 #include <cstdio>
 #include <filesystem>
 #include <new>
 #include <set>
 #include <stdexcept>
+#include <utility>
 
 #include "apps/tzconvert/conversion.h"
 #include "apps/tzconvert/report.h"
@@ -53,18 +55,34 @@ bool prepare(Options const& options) {
     return true;
 }
 
-// Where a file's result goes: under its own name with the ending of the result.
-fs::path targetOf(Options const& options, std::string const& file) {
+// Where a file's result goes: in a folder, under its own name with the ending of the result. Empty
+// for standard output.
+std::string targetOf(Options const& options, std::string const& file) {
+    if (options.outputDir.empty()) return options.output;
     fs::path name = file == "-" ? fs::path("stdin") : fs::path(file).filename();
     name.replace_extension(options.direction == Direction::toRtf ? ".rtf" : ".mtext");
-    return fs::path(options.outputDir) / name;
+    return (fs::path(options.outputDir) / name).string();
 }
 
 class Batch {
 public:
     explicit Batch(Options const& options) : options_(options) {
         for (std::string const& file : options.files)
-            inputs_.insert(placeOf(file));
+            if (file != "-") inputs_.insert(placeOf(file));
+        if (!options.fontMap.empty()) inputs_.insert(placeOf(options.fontMap));
+    }
+
+    // The report takes the place of no input and of no result.
+    [[nodiscard]] Failure checkReport() const {
+        if (options_.report.empty() || options_.report == "-") return {};
+        fs::path const place = placeOf(options_.report);
+        if (inputs_.count(place) != 0) return "--report " + options_.report + ": it is an input";
+        bool const isTarget =
+            std::any_of(options_.files.begin(), options_.files.end(), [&](std::string const& file) {
+                return placeOf(targetOf(options_, file)) == place;
+            });
+        if (isTarget) return "--report " + options_.report + ": a result goes there";
+        return {};
     }
 
     [[nodiscard]] Failure convertFile(std::string const& file) {
@@ -84,30 +102,33 @@ public:
 
 private:
     [[nodiscard]] Failure convertUnguarded(std::string const& file) {
-        std::string target = options_.output;
+        std::string const target = targetOf(options_, file);
         if (!options_.outputDir.empty()) {
-            target = targetOf(options_, file).string();
             if (Failure failure = checkTarget(file, target)) return failure;
         }
         std::wstring text;
         if (Failure failure = readText(file, text)) return failure;
         Converted const converted = convert(options_, std::move(text));
         if (Failure failure = writeText(target, converted.text)) return failure;
+        targets_.insert(placeOf(target));
         reports_.push_back({file, converted.results});
         return {};
     }
 
-    // The file itself, links followed.
+    // The file itself, links followed, from the root even when it is not there.
     [[nodiscard]] static fs::path placeOf(std::string const& file) {
         std::error_code unreadable;  // will be named when it is read
-        return fs::weakly_canonical(file, unreadable);
+        fs::path const named = fs::absolute(file, unreadable);
+        fs::path const real = fs::weakly_canonical(named, unreadable);
+        return unreadable ? named : real;
     }
 
-    // A result takes the place of no input and of no other result.
+    // A result takes the place of no input and of no other result; one that was not made has none.
     [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) {
-        if (inputs_.count(placeOf(target)) != 0)
+        fs::path const place = placeOf(target);
+        if (inputs_.count(place) != 0)
             return file + ": its result would take the place of " + target;
-        if (!targets_.insert(target).second)
+        if (targets_.count(place) != 0)
             return file + ": " + target + " is another file's result already";
         return {};
     }
@@ -115,7 +136,7 @@ private:
     Options const& options_;
     std::vector<FileReport> reports_;
     std::set<fs::path> inputs_;
-    std::set<std::string> targets_;
+    std::set<fs::path> targets_;  // the results that were written
 };
 
 }  // namespace
@@ -123,9 +144,12 @@ private:
 int run(Options const& options) {
     if (!prepare(options)) return kUnusable;
     Batch batch(options);
+    if (Failure const failure = batch.checkReport()) {
+        complain(*failure);
+        return kUnusable;
+    }
     int status = kDone;
-    std::vector<std::string> const standardInput{"-"};
-    for (std::string const& file : options.files.empty() ? standardInput : options.files) {
+    for (std::string const& file : options.files) {
         if (Failure const failure = batch.convertFile(file)) {
             complain(*failure);
             status = kUnusable;

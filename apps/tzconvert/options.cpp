@@ -141,8 +141,7 @@ void checkTogether(Options const& options) {
     if (options.files.size() > 1 && options.outputDir.empty())
         throw CLI::ValidationError("FILE", "several of them need --output-dir");
     bool const isTextOnOutput = options.outputDir.empty() && options.output.empty();
-    if (isTextOnOutput ? options.report == "-"
-                       : options.report == options.output && !options.report.empty())
+    if (isTextOnOutput && options.report == "-")
         throw CLI::ValidationError("--report", "the result goes there");
 }
 
@@ -182,3 +181,4 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
 }
 
 }  // namespace tzconvert
+        if (parsed.options.files.empty()) parsed.options.files.push_back("-");

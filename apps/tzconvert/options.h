@@ -15,7 +15,7 @@ enum class Direction { toRtf, toMtext, roundTrip };
 
 struct Options {
     Direction direction = Direction::toRtf;
-    std::vector<std::string> files;  // "-" is standard input
+    std::vector<std::string> files;  // at least one; "-" is standard input
 
     // The text style's font: a face, or a file when there is none.
     std::string face;

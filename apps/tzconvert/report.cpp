@@ -1,5 +1,7 @@
 #include "apps/tzconvert/report.h"
 
+#include <cassert>
+
 #include <nlohmann/json.hpp>
 
 namespace tzconvert {
@@ -25,6 +27,7 @@ nlohmann::ordered_json resultsOf(Results const& results) {
 std::string reportText(Options const& options, std::vector<FileReport> const& reports) {
     nlohmann::ordered_json root;
     if (options.outputDir.empty()) {
+        assert(reports.size() == 1);
         root = resultsOf(reports.front().results);
     } else {
         root = nlohmann::ordered_json::array();

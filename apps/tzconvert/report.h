@@ -14,7 +14,8 @@ struct FileReport {
     Results results;
 };
 
-// One object; a list of them, each with its file's name, when results go into a folder.
+// One object, of the only report, which must be there; when results go into a folder, a list of
+// them, each with its file's name.
 [[nodiscard]] std::string reportText(Options const& options,
                                      std::vector<FileReport> const& reports);
 

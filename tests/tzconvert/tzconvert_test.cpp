@@ -32,11 +32,11 @@ struct Outcome {
     std::string err;
 };
 
-// Behind `first`, which may limit what the program gets.
+// Behind `first`, which may limit what the program gets or where it runs.
 Outcome run(std::string const& arguments, std::string const& input, std::string const& first = "") {
     write("in", input);
-    std::string const command =
-        first + "'" + std::getenv("TZ_TEST_BIN") + "/tzconvert' " + arguments + " <in >out 2>err";
+    std::string const command = "{ " + first + "'" + std::getenv("TZ_TEST_BIN") + "/tzconvert' " +
+                                arguments + "; } <in >out 2>err";
     int const status = std::system(command.c_str());
     return {WEXITSTATUS(status), contentsOf("out"), contentsOf("err")};
 }
@@ -141,8 +141,9 @@ TEST(Files, OfABatchAreConvertedThoughOneFails) {
     write("one.txt", "1");
     write("bad.txt", "\xFF");
     write("two.txt", "{\\L2}");
-    Outcome const result =
-        run("to-rtf --output-dir batch --report batch.json one.txt bad.txt two.txt one.txt", "");
+    Outcome const result = run("to-rtf --output-dir batch --report batch.json "
+                               "none/one.txt one.txt bad.txt two.txt one.txt",
+                               "");
     EXPECT_EQ(result.status, 2);
     EXPECT_NE(result.err.find("bad.txt: byte 0"), std::string::npos) << result.err;
     EXPECT_NE(result.err.find("another file's result"), std::string::npos) << result.err;
@@ -150,6 +151,7 @@ TEST(Files, OfABatchAreConvertedThoughOneFails) {
     EXPECT_NE(contentsOf("batch/two.rtf").find("{\\ul 2}\\par }"), std::string::npos);
     EXPECT_FALSE(fs::exists("batch/bad.rtf"));
     std::string const report = contentsOf("batch.json");
+    EXPECT_NE(result.err.find("none/one.txt: cannot be read"), std::string::npos) << result.err;
     EXPECT_NE(report.find("\"file\": \"two.txt\""), std::string::npos) << report;
     EXPECT_EQ(report.find("bad.txt"), std::string::npos) << report;
 }
@@ -188,6 +190,37 @@ TEST(Reports, NameWhatWasFound) {
     for (char const* part :
          {"\"incidents\": 1073741825", "\"tracking\": 2.0", "\"baseAlignment\": 1",
           "\"minFontSize\": 28", "\"maxFontSize\": 64", "\"initialFontSize\": 32",
+// It was written over an input, or over the result that stood there already.
+TEST(Reports, TakeThePlaceOfNothingElse) {
+    struct Row {
+        char const* arguments;
+        char const* reason;
+    };
+    constexpr Row kRows[] = {
+        {"--output text.rtf --report a.mtext a.mtext",        "it is an input"     },
+        {"--output text.rtf --report link.json a.mtext",      "it is an input"     },
+        {"--output-dir made --report $PWD/a.mtext b a.mtext", "it is an input"     },
+        {"--report own.ini --font-map ./own.ini a.mtext",     "it is an input"     },
+        {"--output ./text.rtf --report text.rtf a.mtext",     "a result goes there"},
+        {"--output-dir made --report ./made/a.rtf b a.mtext", "a result goes there"},
+        {"--output-dir made --report made/stdin.rtf",         "a result goes there"},
+    };
+    fs::remove_all("reports");
+    fs::create_directories("reports/made");
+    write("reports/a.mtext", "x");
+    write("reports/own.ini", "[SHX Map]\n");
+    fs::create_symlink("a.mtext", "reports/link.json");
+    for (Row const& row : kRows) {
+        Outcome const result = run(std::string("to-rtf ") + row.arguments, "", "cd reports; ");
+        EXPECT_EQ(result.status, 2) << row.arguments;
+        EXPECT_NE(result.err.find(row.reason), std::string::npos) << row.arguments << result.err;
+        EXPECT_EQ(contentsOf("reports/a.mtext"), "x") << row.arguments;
+        EXPECT_EQ(contentsOf("reports/own.ini"), "[SHX Map]\n") << row.arguments;
+        EXPECT_FALSE(fs::exists("reports/text.rtf")) << row.arguments;
+        EXPECT_TRUE(fs::is_empty("reports/made")) << row.arguments;
+    }
+}
+
           "\"currentFontSize\": 64", "\"stacksSeen\": true"}) {
         EXPECT_NE(report.find(part), std::string::npos) << part << report;
     }
