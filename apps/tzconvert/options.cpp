@@ -1,6 +1,7 @@
 #include "apps/tzconvert/options.h"
 
 #include <CLI/CLI.hpp>
+#include <cmath>
 #include <cstdio>
 #include <limits>
 
@@ -25,6 +26,10 @@ constexpr DirectionRow kDirections[] = {
 };
 
 constexpr int kMostTwips = 65535;  // what an RTF size can say
+
+// Numbers of this size are written in six digits without an exponent.
+constexpr double kLeastInMarkup = 1e-4;
+constexpr double kBeyondMarkup = 999999.5;
 
 constexpr char kHexDigits[] = "0123456789abcdefABCDEF";
 
@@ -63,9 +68,22 @@ CLI::Validator aboveZero() {
             ""};
 }
 
+// Markup knows no exponent, and neither infinity nor what is no number.
+CLI::Validator sayable() {
+    return {[](std::string& text) {
+                double value = 0;
+                bool const isSayable = CLI::detail::lexical_cast(text, value) &&
+                                       (value == 0 || (std::abs(value) >= kLeastInMarkup &&
+                                                       std::abs(value) < kBeyondMarkup));
+                return isSayable ? std::string() : text + " is no number that markup can say";
+            },
+            ""};
+}
+
 void declareFont(CLI::App& app, Options& options) {
-    auto* const face =
-        app.add_option("--font", options.face, "the style's font, by face")->type_name("FACE");
+    auto* const face = app.add_option("--font", options.face, "the style's font, by face")
+                           ->type_name("FACE")
+                           ->check(aName());
     app.add_flag("--bold", options.bold, "the face is bold")->needs(face);
     app.add_flag("--italic", options.italic, "the face is italic")->needs(face);
     app.add_option("--charset", options.charset, "its character set (0)")
@@ -78,6 +96,7 @@ void declareFont(CLI::App& app, Options& options) {
         ->needs(face);
     app.add_option("--font-file", options.fontFile, "the style's font, by file (txt.shx)")
         ->type_name("FILE")
+        ->check(aName())
         ->excludes(face);
 }
 
@@ -92,9 +111,14 @@ void declareText(CLI::App& app, Options& options) {
     declareColor(app, "--by-layer", options.byLayer, "the colour of ByLayer (not set)");
     declareColor(app, "--by-block", options.byBlock, "the colour of ByBlock (not set)");
     app.add_option("--tracking", options.tracking, "tracking of the markup written (1)")
-        ->type_name("R");
-    app.add_option("--width-factor", options.widthFactor, "its width factor (1)")->type_name("R");
-    app.add_option("--oblique", options.oblique, "its oblique angle (0)")->type_name("R");
+        ->type_name("R")
+        ->check(sayable());
+    app.add_option("--width-factor", options.widthFactor, "its width factor (1)")
+        ->type_name("R")
+        ->check(sayable());
+    app.add_option("--oblique", options.oblique, "its oblique angle (0)")
+        ->type_name("R")
+        ->check(sayable());
     app.add_option("--base-alignment", options.baseAlignment,
                    "its stack alignment: 0 bottom, 1 middle, 2 top (0)")
         ->type_name("N")
@@ -166,6 +190,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     try {
         app.parse(count, arguments);
         if (parsed.options.output == "-") parsed.options.output.clear();
+        if (parsed.options.files.empty()) parsed.options.files.push_back("-");
         checkTogether(parsed.options);
     } catch (CLI::CallForVersion const& version) {
         std::printf("%s\n", version.what());
@@ -181,4 +206,3 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
 }
 
 }  // namespace tzconvert
-        if (parsed.options.files.empty()) parsed.options.files.push_back("-");

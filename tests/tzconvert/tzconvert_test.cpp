@@ -97,10 +97,16 @@ constexpr RunCase kRuns[] = {
     {"NoSize",           "to-rtf --size 0",                                                         "a"sv,                2, "",                             "0 is no number above 0"                           },
     {"SizeWithoutEnd",   "to-rtf --size inf",                                                       "a"sv,                2, "",                             "inf is no number above 0"                         },
     {"SizeThatIsNone",   "to-rtf --size nan",                                                       "a"sv,                2, "",                             "nan is no number above 0"                         },
+    {"NoTracking",       "to-mtext --tracking nan",                                                 "a"sv,                2, "",                             "nan is no number that markup can say"             },
+    {"WidthWithoutEnd",  "to-mtext --width-factor 1e400",                                           "a"sv,                2, "",                             "1e400 is no number"                               },
+    {"ObliqueInPowers",  "to-mtext --oblique -1e6",                                                 "a"sv,                2, "",                             "-1e6 is no number"                                },
+    {"TrackingInPowers", "to-mtext --tracking 0.00001",                                             "a"sv,                2, "",                             "0.00001 is no number"                             },
     {"NegativeTwips",    "to-rtf --twips -5",                                                       "a"sv,                2, "",                             "--twips"                                          },
     {"NoCharset",        "to-rtf --font Some --charset 999",                                        "a"sv,                2, "",                             "--charset"                                        },
     {"UnknownPage",      "to-rtf --code-page 99",                                                   "a"sv,                2, "",                             "--code-page 99 is not known"                      },
     {"EmptyName",        "to-rtf --output \"\"",                                                    "a"sv,                2, "",                             "an empty name"                                    },
+    {"EmptyFace",        "to-rtf --font \"\" --bold",                                               "a"sv,                2, "",                             "an empty name"                                    },
+    {"EmptyFontFile",    "to-rtf --font-file \"\"",                                                 "a"sv,                2, "",                             "an empty name"                                    },
     {"UnknownOption",    "to-rtf --loud",                                                           "a"sv,                2, "",                             "--loud"                                           },
     {"BadColor",         "to-rtf --color red",                                                      "a"sv,                2, "",                             "\"red\" is not RRGGBB"                            },
     {"BadNumber",        "to-rtf --twips many",                                                     "a"sv,                2, "",                             "--twips"                                          },
@@ -145,13 +151,13 @@ TEST(Files, OfABatchAreConvertedThoughOneFails) {
                                "none/one.txt one.txt bad.txt two.txt one.txt",
                                "");
     EXPECT_EQ(result.status, 2);
+    EXPECT_NE(result.err.find("none/one.txt: cannot be read"), std::string::npos) << result.err;
     EXPECT_NE(result.err.find("bad.txt: byte 0"), std::string::npos) << result.err;
     EXPECT_NE(result.err.find("another file's result"), std::string::npos) << result.err;
     EXPECT_NE(contentsOf("batch/one.rtf").find("1\\par }"), std::string::npos);
     EXPECT_NE(contentsOf("batch/two.rtf").find("{\\ul 2}\\par }"), std::string::npos);
     EXPECT_FALSE(fs::exists("batch/bad.rtf"));
     std::string const report = contentsOf("batch.json");
-    EXPECT_NE(result.err.find("none/one.txt: cannot be read"), std::string::npos) << result.err;
     EXPECT_NE(report.find("\"file\": \"two.txt\""), std::string::npos) << report;
     EXPECT_EQ(report.find("bad.txt"), std::string::npos) << report;
 }
@@ -184,12 +190,6 @@ TEST(Files, DoNotOverwriteInputs) {
     EXPECT_EQ(contentsOf("trip.rtf"), "y");
 }
 
-TEST(Reports, NameWhatWasFound) {
-    EXPECT_EQ(run("to-rtf --report r.json", "a\\T2;\\K\\A1;\\S1/2;\\H0.4;x").status, 0);
-    std::string const report = contentsOf("r.json");
-    for (char const* part :
-         {"\"incidents\": 1073741825", "\"tracking\": 2.0", "\"baseAlignment\": 1",
-          "\"minFontSize\": 28", "\"maxFontSize\": 64", "\"initialFontSize\": 32",
 // It was written over an input, or over the result that stood there already.
 TEST(Reports, TakeThePlaceOfNothingElse) {
     struct Row {
@@ -221,6 +221,12 @@ TEST(Reports, TakeThePlaceOfNothingElse) {
     }
 }
 
+TEST(Reports, NameWhatWasFound) {
+    EXPECT_EQ(run("to-rtf --report r.json", "a\\T2;\\K\\A1;\\S1/2;\\H0.4;x").status, 0);
+    std::string const report = contentsOf("r.json");
+    for (char const* part :
+         {"\"incidents\": 1073741825", "\"tracking\": 2.0", "\"baseAlignment\": 1",
+          "\"minFontSize\": 28", "\"maxFontSize\": 64", "\"initialFontSize\": 32",
           "\"currentFontSize\": 64", "\"stacksSeen\": true"}) {
         EXPECT_NE(report.find(part), std::string::npos) << part << report;
     }
