@@ -48,15 +48,37 @@ void flushFolder(std::filesystem::path const& folder) {
     (void)close(handle);
 }
 
-}  // namespace
-
-SafeFile::SafeFile(std::filesystem::path const& target) : target_(target) {
+// The file that a symbolic link leads to, be it there yet or not; else the path itself.
+std::filesystem::path followed(std::filesystem::path const& target) {
     namespace fs = std::filesystem;
     std::error_code error;
-    if (fs::is_symlink(target_, error)) {
-        auto const real = fs::canonical(target_, error);
-        if (!error) target_ = real;
+    if (!fs::is_symlink(target, error)) return target;
+    if (fs::path real = fs::canonical(target, error); !error) return real;
+    fs::path next = fs::read_symlink(target, error);
+    bool const isMissing = fs::status(target, error).type() == fs::file_type::not_found;
+    return isMissing ? target.parent_path() / next : target;
+}
+
+// A descriptor for the file when the program's own output goes there ("/dev/stdout"), which must
+// not be replaced, since others write to it too. -1 when it does not.
+int ownOutput(std::filesystem::path const& target) {
+    struct stat file {};
+    if (stat(target.c_str(), &file) != 0 || !S_ISREG(file.st_mode)) return -1;
+    for (int const output : {STDOUT_FILENO, STDERR_FILENO}) {
+        struct stat own {};
+        if (fstat(output, &own) == 0 && own.st_dev == file.st_dev && own.st_ino == file.st_ino)
+            return fcntl(output, F_DUPFD_CLOEXEC, 0);
     }
+    return -1;
+}
+
+}  // namespace
+
+SafeFile::SafeFile(std::filesystem::path const& target)
+    : target_(followed(target)), file_(ownOutput(target_)) {
+    namespace fs = std::filesystem;
+    if (isOpen()) return;
+    std::error_code error;
     fs::file_status const old = fs::status(target_, error);
     if (fs::is_directory(old)) {
         errno = EISDIR;

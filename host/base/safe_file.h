@@ -10,7 +10,8 @@ namespace tzhost {
 // the pieces go to a temporary file in the same folder, which `commit` flushes to the disk and
 // renames, so that a crash leaves the old file or the new one. A symbolic link is followed; an old
 // file's permissions stay. Without `commit` the temporary file goes away and the old one stays.
-// What is no file (a device, a pipe) is written to as it is.
+// What is no file (a device, a pipe) is written to as it is, and so is the file that the program's
+// own output or messages go to: what stands in it stays.
 //
 //   SafeFile file("plan.json");
 //   if (!file.isOpen() || !file.write(bytes) || !file.commit()) complain(file.reason());

@@ -61,6 +61,15 @@ TEST_F(FileBytes, KeepPermissionsAndLinks) {
     EXPECT_EQ(status.st_mode & 07777U, 0640U);
 }
 
+// It used to put a file in the place of a link whose file was not there yet.
+TEST_F(FileBytes, FollowALinkThatLeadsToNoFileYet) {
+    fs::create_directory(path("folder"));
+    fs::create_symlink("folder/real", path("link"));
+    ASSERT_TRUE(tzhost::writeFileSafely(path("link"), "new"));
+    EXPECT_TRUE(fs::is_symlink(path("link")));
+    EXPECT_EQ(tzhost::readFile(path("folder/real")), "new");
+}
+
 TEST_F(FileBytes, StayOldWhenTheyCannotBeWritten) {
     EXPECT_FALSE(tzhost::writeFileSafely(path("no/such/file"), "new"));
     fs::create_directory(path("folder"));
@@ -79,6 +88,21 @@ TEST_F(FileBytes, GoIntoAPipeAsItIs) {
     EXPECT_TRUE(fs::is_fifo(path("pipe")));
     EXPECT_EQ(filesThere(), 1);
     ::close(reader);
+}
+
+// It used to replace the file that standard output was directed to, with all that stood in it.
+TEST_F(FileBytes, JoinTheProgramsOwnOutput) {
+    ASSERT_TRUE(tzhost::writeFileSafely(path("log"), "before "));
+    int const terminal = ::fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, 0);
+    int const log = ::open(path("log").c_str(), O_WRONLY | O_APPEND | O_CLOEXEC);
+    ASSERT_EQ(::dup2(log, STDOUT_FILENO), STDOUT_FILENO);
+    bool const isWritten = tzhost::writeFileSafely("/dev/stdout", "new");
+    bool const isGoingOn = ::write(STDOUT_FILENO, " behind", 7) == 7;
+    ASSERT_EQ(::dup2(terminal, STDOUT_FILENO), STDOUT_FILENO);
+    ::close(log);
+    ::close(terminal);
+    EXPECT_TRUE(isWritten && isGoingOn);
+    EXPECT_EQ(tzhost::readFile(path("log")), "before new behind");
 }
 
 TEST(InstallPaths, LeadToTheLibraries) {
