@@ -66,12 +66,15 @@ bool Drawing::orthomode() const {
     return Variables::instance().number(L"ORTHOMODE") != 0;
 }
 
+// Previews turn the mode off and give it back by this, so it is set even when the fault plan makes
+// the call report a failure.
 Tzad::ErrorStatus Drawing::setOrthomode(bool on) {
     tzhost::MemoryFaultPause const givesBack;
-    if (auto const fault = faultStatus("TzDbDatabase::setOrthomode")) return fault;
+    Tzad::ErrorStatus const fault = faultStatus("TzDbDatabase::setOrthomode");
     VariableValue const value = static_cast<short>(on ? 1 : 0);
     bool const done = Variables::instance().set(L"ORTHOMODE", value, Writer::host).isDone();
-    return done ? Tzad::eOk : Tzad::eInternal;
+    if (!done) return Tzad::eInternal;
+    return fault;
 }
 
 }  // namespace tzhost
