@@ -1,12 +1,12 @@
 #include "module/access/easy_upgrade.h"
 #include "module/access/lock_tests.h"
-#include "module/access/resources.h"
 #include "module/access/string_table.h"
 #include "module/access/sys_var.h"
 #include "module/edit/editor_choice.h"
 #include "module/edit/editor_result.h"
 #include "module/edit/in_place_settings.h"
 #include "module/edit/old_editor.h"
+#include "module/edit/session_field.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/editors.h"
 #include "tz/ed/print.h"
@@ -116,5 +116,9 @@ int InvokeEditorOn(TzDbMText* text,
                    bool option14) {
     EasyObject<TzDbMText> held(text);
     if (unsigned const lock = lockMessage(text)) return refuse(lock);
-    return InvokeEditorOn(held, tab, flags, interactive, view, false, option13, option14);
+    SessionField field(held);
+    int const result =
+        InvokeEditorOn(held, tab, flags, interactive, view, false, option13, option14);
+    if (result == kEditorAccepted) field.attachTo(*text);
+    return result;
 }

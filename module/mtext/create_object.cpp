@@ -2,7 +2,6 @@
 
 #include <memory>
 #include <new>
-#include <utility>
 
 #include "module/access/attachment_ids.h"
 #include "module/access/line_spacing.h"
@@ -11,12 +10,12 @@
 #include "module/access/sys_var.h"
 #include "module/edit/attachment.h"
 #include "module/edit/editor_result.h"
+#include "module/edit/session_field.h"
 #include "module/mtext/entity_fields.h"
 #include "module/mtext/points.h"
 #include "module/mtext/user_axes.h"
 #include "tz/db/database.h"
 #include "tz/db/extensions.h"
-#include "tz/db/field.h"
 #include "tz/db/host_services.h"
 #include "tz/mte/edit_mtext.h"
 #include "tz/mte/globals.h"
@@ -30,10 +29,13 @@ constexpr double kGutterHeights = 5.0;
 constexpr int kSuccessPhase = 1;
 constexpr int kMadeText = 0x98;
 
+// What a text is made for.
+enum class Purpose { drawing, attribute };
+
 void fillEntity(TzxMtextCommand const& command,
                 TzDbMText& text,
                 TzDbObjectId style,
-                bool forAttribute) {
+                Purpose purpose) {
     UserAxes const axes = activeUserAxes();
     text.setDatabaseDefaults(tzdbHostApplicationServices()->workingDatabase());
     text.setNormal(axes.normal);
@@ -41,7 +43,7 @@ void fillEntity(TzxMtextCommand const& command,
     text.setTextStyle(style);
     text.setLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
     text.setLineSpacingFactor(command.lineSpacingFactor);
-    if (!forAttribute) TzTextSetLayer::setTextLayer(&text);
+    if (purpose == Purpose::drawing) TzTextSetLayer::setTextLayer(&text);
     text.setDirection(axes.turned(command.rotation).x.normalize());
     text.setTextHeight(command.textHeight);
     text.setAttachment(MapAttachment(command.attachmentId));
@@ -102,8 +104,9 @@ bool typeText(TzxMtextCommand& command, TzDbMText& text) {
 }
 
 // A box that was dragged stays where it is although the editor may have changed the attachment.
-bool editText(TzxMtextCommand const& command, EasyObject<TzDbMText>& text, bool forAttribute) {
-    int const result = InvokeEditorOn(text, kMTETabText, 0, true, true, forAttribute, false, false);
+bool editText(TzxMtextCommand const& command, EasyObject<TzDbMText>& text, Purpose purpose) {
+    int const result = InvokeEditorOn(text, kMTETabText, 0, true, true,
+                                      purpose == Purpose::attribute, false, false);
     if (result != kEditorAccepted) return false;
     TzDbMText::AttachmentPoint const attachment = text->attachment();
     text->setLocation(pointOf(command.location));
@@ -132,14 +135,15 @@ int TzxMtextCommand::CreateObject(TzDbMText* existing, bool forAttribute) {
     EasyObject<TzDbMText> text(existing ? existing : created.get(), EasyFlags::kNone);
     if (!text.object) return false;
 
+    SessionField field(text);
+    Purpose const purpose = forAttribute ? Purpose::attribute : Purpose::drawing;
     TzDbObjectId const style = GetTextStyleID(styleName);
-    fillEntity(*this, *text.object, style, forAttribute);
+    fillEntity(*this, *text.object, style, purpose);
     setColumns(*this, *text.object);
     TzDbAnnotativeObjectPE* const annotation = followStyle(*text.object, style);
     gbUsedIPE = 0;
     bool const accepted =
-        useCommandLineEditor ? typeText(*this, *text.object) : editText(*this, text, forAttribute);
-    std::unique_ptr<TzDbField> field(std::exchange(text.field, nullptr));
+        useCommandLineEditor ? typeText(*this, *text.object) : editText(*this, text, purpose);
     if (!accepted) return false;
     if (!gbUsedIPE && annotation) {
         bool changed = false;
@@ -152,8 +156,8 @@ int TzxMtextCommand::CreateObject(TzDbMText* existing, bool forAttribute) {
         // A text that cannot be posted is gone; the options still become the defaults.
         (void)postToDb(created.release(), id, worksOnPaper());
     }
-    if (field)
-        attachField(id, std::move(field));
+    if (field.isLeft())
+        attachField(id, field);
     else if (useCommandLineEditor)
         evaluateField(id);
     storeDefaults(*this, style);

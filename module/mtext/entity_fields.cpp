@@ -1,12 +1,14 @@
 #include "module/mtext/entity_fields.h"
 
+#include <memory>
+
+#include "tz/db/field.h"
 #include "tz/db/host_services.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/easy_object.h"
 
 namespace {
 
-constexpr wchar_t const* kFieldKey = L"TEXT";
 constexpr int kEveryKind = 0x20;
 constexpr int kEvaluatedText = 2;
 
@@ -26,21 +28,16 @@ TzString withFieldsEvaluated(TzString const& text) {
     return result;
 }
 
-void attachField(TzDbObjectId text, std::unique_ptr<TzDbField> field) {
+void attachField(TzDbObjectId text, SessionField& field) {
     EasyObject<TzDbMText> opened;
-    bool attached = false;
-    if (tzdbOpenObject(opened.object, text, TzDb::kForWrite) == Tzad::eOk) {
-        TzDbObjectId id;
-        attached = opened->setField(kFieldKey, field.get(), id) == Tzad::eOk;
-    }
-    field->close();
-    if (attached) (void)field.release();  // the drawing's now
+    if (tzdbOpenObject(opened.object, text, TzDb::kForWrite) != Tzad::eOk) return;
+    field.attachTo(*opened.object);
 }
 
 void evaluateField(TzDbObjectId text) {
     EasyObject<TzDbMText> opened;
     if (tzdbOpenObject(opened.object, text, TzDb::kForRead) != Tzad::eOk) return;
     EasyObject<TzDbField> field;
-    if (opened->getField(kFieldKey, field.object, TzDb::kForWrite) != Tzad::eOk) return;
+    if (opened->getField(kTextFieldKey, field.object, TzDb::kForWrite) != Tzad::eOk) return;
     (void)evaluate(*field.object);  // without a value the field shows that it has none
 }

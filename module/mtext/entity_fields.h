@@ -1,8 +1,6 @@
 #pragma once
 
-#include <memory>
-
-#include "tz/db/field.h"
+#include "module/edit/session_field.h"
 #include "tz/db/object_id.h"
 #include "tz/text/string.h"
 
@@ -11,8 +9,8 @@
 // The text with what its fields stand for; a text without fields, or with fields that have no
 // value, comes back as it is.
 [[nodiscard]] TzString withFieldsEvaluated(TzString const& text);
-// Attaches a field that is in no drawing to the text with that id; one that cannot be attached is
+// Attaches the field that a session left to the text with that id; one that cannot be attached is
 // deleted.
-void attachField(TzDbObjectId text, std::unique_ptr<TzDbField> field);
+void attachField(TzDbObjectId text, SessionField& field);
 // Brings the field of the text with that id up to date, when it has one.
 void evaluateField(TzDbObjectId text);

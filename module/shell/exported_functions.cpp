@@ -1,35 +1,24 @@
 #include <memory>
-#include <utility>
 
 #include "module/access/attachment_ids.h"
 #include "module/access/style_rules.h"
-#include "tz/db/field.h"
+#include "module/edit/editor_result.h"
+#include "module/edit/session_field.h"
+#include "module/mtext/points.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/globals.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
 
-constexpr int kAccepted = 1;
-constexpr int kNoEditorRan = 3;
-
 // The rotation is taken as it is, without the working angle.
 void copyOptions(TzDbMText const& text, TzxMtextCommand& command) {
-    TzGePoint3d const location = text.location();
-    command.location[0] = location.x;
-    command.location[1] = location.y;
-    command.location[2] = location.z;
+    setCoordinates(command.location, text.location());
     command.boxWidth = text.width();
     command.rotation = text.rotation();
     command.textHeight = text.textHeight();
     command.attachmentId = MapAttachmentToIDS(text.attachment());
     command.styleName = GetTextStyleName(text.textStyle());
-}
-
-// Attaches the field that a session left; one that the text does not take is deleted.
-void attachField(TzDbMText& text, std::unique_ptr<TzDbField> field) {
-    TzDbObjectId dropped;
-    if (text.setField(L"TEXT", field.get(), dropped) == Tzad::eOk) field.release()->close();
 }
 
 }  // namespace
@@ -60,10 +49,10 @@ int doMTextCommandForAttDefCmd(TzDbMText* text) {
 
 int TzadEditMTextEntity(
     void*, MTETabType tab, TzDbMText* text, int, unsigned int flags, bool interactive, bool view) {
-    if (!text) return kNoEditorRan;
+    if (!text) return kNoEditor;
     EasyObject<TzDbMText> held(text, EasyFlags::kNone);
+    SessionField field(held);
     int const result = InvokeEditorOn(held, tab, flags, interactive, view, false, false, false);
-    std::unique_ptr<TzDbField> field(std::exchange(held.field, nullptr));
-    if (result == kAccepted && field) attachField(*text, std::move(field));
+    if (result == kEditorAccepted) field.attachTo(*text);
     return result;
 }
