@@ -1,11 +1,18 @@
 #include "module/edit/old_editor.h"
 
+#include "module/access/string_table.h"
 #include "module/edit/editor_result.h"
 #include "tz/ed/print.h"
 #include "tz/mte/globals.h"
 
+namespace {
+
+constexpr unsigned kNoDialogEditor = 1025;
+
+}  // namespace
+
 int InvokeOldEditorOn(EasyObject<TzDbMText>&, MTETabType, unsigned int, bool) {
-    tzutPrintf(L"\nThe dialog editor is not part of this version; MTEXTED chooses another one.\n");
+    tzutPrintf(L"%ls", gStringTable[kNoDialogEditor].kwszPtr());
     return kNoEditor;
 }
 
