@@ -1,5 +1,6 @@
 #include "module/access/mtext_versioner.h"
 
+#include "module/access/scope_guard.h"
 #include "module/access/string_table.h"
 #include "tz/pal/message_box.h"
 
@@ -16,10 +17,8 @@ MTextVersioner::MTextVersioner(TzDbMText* text)
 MTextVersioner::~MTextVersioner() = default;
 
 bool MTextVersioner::isNewer(wchar_t const* contents) {
-    initialize(contents);
-    bool const newer = !unreadable_.IsEmpty() || from_mtext(contents) >= kFirstNewerFormat;
-    uninitialize();
-    return newer;
+    TzScopeGuard const engine([&] { initialize(contents); }, [&] { uninitialize(); });
+    return !unreadable_.IsEmpty() || from_mtext(contents) >= kFirstNewerFormat;
 }
 
 bool MTextVersioner::too_new(wchar_t const* contents) {
