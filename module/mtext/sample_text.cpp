@@ -15,15 +15,15 @@ double rotationOfCurrentStyle() {
     return IsVerticalTTF() ? kVerticalRotation : 0.0;
 }
 
-bool isCurrentStyleVertical() {
+LineFlow flowOfCurrentStyle() {
     TzDbObjectId const id = currentStyle();
-    if (id.isNull()) return false;
+    if (id.isNull()) return LineFlow::horizontal;
     TzGiTextStyle style;
     (void)fromTzDbTextStyle(style, id);  // a style that cannot be read is not vertical
-    return style.isVertical();
+    return style.isVertical() ? LineFlow::vertical : LineFlow::horizontal;
 }
 
-TzGiTextStyle sampleTextStyle(double size, bool vertical) {
+TzGiTextStyle sampleTextStyle(double size, LineFlow flow) {
     TzGiTextStyle style;
     TzDbObjectId const id = currentStyle();
     if (id.isNull()) return style;
@@ -31,7 +31,7 @@ TzGiTextStyle sampleTextStyle(double size, bool vertical) {
     style.setTextSize(size);
     style.setUpsideDown(false);
     style.setBackward(false);
-    style.setVertical(vertical);
+    style.setVertical(flow == LineFlow::vertical);
     return style;
 }
 

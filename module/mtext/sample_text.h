@@ -1,5 +1,6 @@
 #pragma once
 
+#include "module/mtext/box_geometry.h"
 #include "tz/ge/point3d.h"
 #include "tz/gi/draw.h"
 #include "tz/gi/text_style.h"
@@ -13,11 +14,11 @@ inline constexpr int kSampleColor = 253;
 
 // The rotation that the current style asks for: kVerticalRotation or 0.
 [[nodiscard]] double rotationOfCurrentStyle();
-// Whether the current style runs from top to bottom.
-[[nodiscard]] bool isCurrentStyleVertical();
+// Which way the current style runs; horizontal without one.
+[[nodiscard]] LineFlow flowOfCurrentStyle();
 // The current style at a text size, upright and readable whatever it says; without a current style
 // a plain one, its size and direction left alone.
-[[nodiscard]] TzGiTextStyle sampleTextStyle(double size, bool vertical);
+[[nodiscard]] TzGiTextStyle sampleTextStyle(double size, LineFlow flow);
 // The text itself, of the drafter's choice; may be empty.
 [[nodiscard]] TzString sampleText();
 // Draws one line of it without looking at codes in it.
