@@ -2,12 +2,11 @@
 
 #include "module/access/class_registration.h"
 #include "module/commands/placeholder.h"
+#include "module/edit/editor_result.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/globals.h"
 
 namespace {
-
-constexpr int kNoEditorRan = 3;
 
 TzRxObject* makeEditMtext() {
     return newTzxEditMtext();
@@ -43,5 +42,5 @@ void TzxEditMtext::EditMtext(MTETabType tab, bool, bool) {
 
 int EditMtextByAdsName(long long const*, MTETabType tab, bool, bool) {
     printNotYetAvailable(commandOf(tab));
-    return kNoEditorRan;
+    return kNoEditor;
 }

@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "module/access/string_table.h"
+#include "module/mtext/column_outcome.h"
 #include "module/mtext/question.h"
 #include "module/prompt/integer_input.h"
 #include "module/prompt/keyword_input.h"
@@ -42,11 +43,6 @@ bool askSize(SizeQuestion const& question, double textHeight, double& size) {
     input.SetDefault(textHeight * question.heights);
     return askOnce(input, [&] { size = input.GetReal(); });
 }
-
-// The outcomes of DoColumnPrompt.
-constexpr int kCancelled = -1;
-constexpr int kNone = 0;
-constexpr int kSetUp = 1;
 
 // The present type stays when the question failed.
 void chooseType(int status, CTzsKeywordInput& input, TextEditorColumns& columns) {
@@ -98,14 +94,14 @@ int TzxMtextCommand::DoColumnPrompt() {
     CTzsKeywordInput input(0, keywords, gStringTable[kTypePrompt]);
     input.SetDefault(kDynamic);
     int const status = input.Prompt();
-    if (status == statusCancel) return kCancelled;
+    if (status == statusCancel) return kColumnsCancelled;
     chooseType(status, input, columns);
 
-    if (columns.columnType == TzDbMText::kNoColumns) return kNone;
+    if (columns.columnType == TzDbMText::kNoColumns) return kColumnsNone;
     bool const answered = columns.columnType == TzDbMText::kStaticColumns
                               ? DoTotalWidthPrompt() && DoColumnCountPrompt()
                               : DoColumnWidthPrompt();
-    if (!answered || !DoColumnGutterPrompt() || !DoColumnHeightPrompt()) return kCancelled;
+    if (!answered || !DoColumnGutterPrompt() || !DoColumnHeightPrompt()) return kColumnsCancelled;
     columnsConfirmed = true;
-    return kSetUp;
+    return kColumnsSetUp;
 }

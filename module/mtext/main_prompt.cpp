@@ -27,6 +27,10 @@ constexpr unsigned kAnnotative = 1101;
 constexpr unsigned kNotAnnotative = 1102;
 constexpr unsigned kAttributePoint = 3010;
 
+// The telemetry of a first corner.
+constexpr int kCornerPhase = 0;
+constexpr int kAskedCorner = 4;
+
 constexpr auto kControls = static_cast<TzEdJig::UserInputControls>(TzEdJig::kGovernedByUCSDetect |
                                                                    TzEdJig::kAccept3dCoordinates);
 
@@ -74,7 +78,7 @@ bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
     setCoordinates(location, corner);
     CTzadSysVar::SetPoint(L"LASTPOINT", corner);
     telemetry.set_start_point(input.getInputData());
-    telemetry.SendEvent(0, 4);
+    telemetry.SendEvent(kCornerPhase, kAskedCorner);
     if (wantSecondPoint) return DoSecondPointPrompt(forAttribute);
     telemetry.set_end_point(input.getInputData());
     return true;

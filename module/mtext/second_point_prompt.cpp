@@ -5,6 +5,7 @@
 #include "module/access/attachment_ids.h"
 #include "module/access/string_table.h"
 #include "module/access/style_rules.h"
+#include "module/mtext/column_outcome.h"
 #include "module/mtext/points.h"
 #include "module/mtext/question.h"
 #include "module/mtext/rectangle_jig.h"
@@ -26,10 +27,6 @@ struct SecondCorner {
     CTzsMtextJig& jig;
 };
 
-Next askAgainUnless(bool cancelled) {
-    return cancelled ? Next::cancelled : Next::askAgain;
-}
-
 Next askHeight(SecondCorner& at) {
     if (!at.command.DoHeightPrompt(true)) return Next::cancelled;
     at.jig.SetTextSize(at.command.textHeight);
@@ -44,7 +41,8 @@ Next askAttachment(SecondCorner& at) {
 }
 
 Next askLineSpacing(SecondCorner& at) {
-    return askAgainUnless(!at.command.DoLineSpacingPrompts());
+    if (!at.command.DoLineSpacingPrompts()) return Next::cancelled;
+    return Next::askAgain;
 }
 
 Next askRotation(SecondCorner& at) {
@@ -69,8 +67,8 @@ Next askWidth(SecondCorner& at) {
 
 Next askColumns(SecondCorner& at) {
     switch (at.command.DoColumnPrompt()) {
-    case -1: return Next::cancelled;
-    case 0: return Next::askAgain;
+    case kColumnsCancelled: return Next::cancelled;
+    case kColumnsNone: return Next::askAgain;
     default: return Next::finished;
     }
 }

@@ -1,7 +1,6 @@
 // The question for the text style.
 
 #include "module/access/string_table.h"
-#include "module/access/style_rules.h"
 #include "module/prompt/string_input.h"
 #include "tz/ed/print.h"
 #include "tz/mte/mtext_command.h"
