@@ -1,5 +1,7 @@
 #include "module/prompt/keyword_table.h"
 
+#include <cassert>
+
 #include "module/access/resources.h"
 #include "tz/mte/globals.h"
 
@@ -13,6 +15,7 @@ void CKeywordTable::LoadStrings() {
 }
 
 void CKeywordTable::GetKeywords(int index, TzString& local, TzString& global) const {
+    assert(index >= 0 && index < keywordStrings.length() && "LoadStrings comes first");
     TzString const& text = keywordStrings[index];
     int const separator = text.find(gsLocalizationSeparator.kwszPtr());
     local = separator == -1 ? text : text.left(separator);
