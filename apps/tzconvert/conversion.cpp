@@ -21,11 +21,13 @@ public:
             scale->SetScaleUnits(options.size);
             scale->SetScaleTwips(options.twips);
         }
+        // The style's size comes back as itself, also when a size beside it is met first.
+        int const halfPoints = options.twips / kTwipsPerHalfPoint;
+        fontScale_.AddScale(halfPoints * kTwipsPerHalfPoint, options.size);
         results_.tracking = options.tracking;
         results_.widthFactor = options.widthFactor;
         results_.oblique = options.oblique;
         results_.baseAlignment = options.baseAlignment;
-        int const halfPoints = options.twips / kTwipsPerHalfPoint;
         results_.minFontSize = results_.maxFontSize = halfPoints;
         results_.initialFontSize = results_.currentFontSize = halfPoints;
     }

@@ -25,7 +25,9 @@ constexpr DirectionRow kDirections[] = {
     {"round-trip", Direction::roundTrip, "markup to RTF to markup within one session"},
 };
 
-constexpr int kMostTwips = 65535;  // what an RTF size can say
+// What an RTF size can say: half-points of 10 twips.
+constexpr int kFewestTwips = 10;
+constexpr int kMostTwips = 65535;
 
 // Numbers of this size are written in six digits without an exponent.
 constexpr double kLeastInMarkup = 1e-4;
@@ -106,7 +108,7 @@ void declareText(CLI::App& app, Options& options) {
         ->check(aboveZero());
     app.add_option("--twips", options.twips, "the same size in twips of the document (320)")
         ->type_name("N")
-        ->check(CLI::Range(1, kMostTwips));
+        ->check(CLI::Range(kFewestTwips, kMostTwips));
     declareColor(app, "--color", options.color, "the initial colour (000000)");
     declareColor(app, "--by-layer", options.byLayer, "the colour of ByLayer (not set)");
     declareColor(app, "--by-block", options.byBlock, "the colour of ByBlock (not set)");
