@@ -15,6 +15,7 @@
 #include "apps/tzconvert/streams.h"
 #include "host/base/code_page_table.h"
 #include "host/base/file_bytes.h"
+#include "host/base/file_reader.h"
 #include "host/base/font_map_path.h"
 #include "host/base/variables.h"
 
@@ -34,6 +35,17 @@ bool isKnownPage(int codePage) {
     return isKnown;
 }
 
+// The map is read again for each conversion, which a pipe cannot give.
+Failure checkFontMap(std::string const& file) {
+    std::error_code unknown;  // of a file that is not there, which opening it will tell
+    if (fs::is_fifo(file, unknown)) return file + ": cannot be read: it is a pipe";
+    tzhost::FileReader reader(file);
+    char first = 0;
+    (void)reader.read(&first, 1);  // a folder opens
+    if (reader.hasFailed()) return file + ": cannot be read: " + tzhost::systemReason();
+    return {};
+}
+
 // Puts the machine's settings in place; false when one cannot be used.
 bool prepare(Options const& options) {
     if (!isKnownPage(options.codePage)) {
@@ -47,8 +59,8 @@ bool prepare(Options const& options) {
         return false;
     }
     if (options.fontMap.empty()) return true;
-    if (!tzhost::readFile(options.fontMap)) {
-        complain(options.fontMap + ": cannot be read: " + tzhost::systemReason());
+    if (Failure const failure = checkFontMap(options.fontMap)) {
+        complain(*failure);
         return false;
     }
     tzhost::setFontMapFile(options.fontMap);

@@ -82,6 +82,16 @@ CLI::Validator sayable() {
             ""};
 }
 
+// Tracking 0 means 1 in markup.
+CLI::Validator notZero() {
+    return {[](std::string& text) {
+                double value = 1;
+                bool const isZero = CLI::detail::lexical_cast(text, value) && value == 0;
+                return isZero ? text + " is no tracking" : std::string();
+            },
+            ""};
+}
+
 void declareFont(CLI::App& app, Options& options) {
     auto* const face = app.add_option("--font", options.face, "the style's font, by face")
                            ->type_name("FACE")
@@ -112,17 +122,18 @@ void declareText(CLI::App& app, Options& options) {
     declareColor(app, "--color", options.color, "the initial colour (000000)");
     declareColor(app, "--by-layer", options.byLayer, "the colour of ByLayer (not set)");
     declareColor(app, "--by-block", options.byBlock, "the colour of ByBlock (not set)");
-    app.add_option("--tracking", options.tracking, "tracking of the markup written (1)")
+    app.add_option("--tracking", options.tracking, "to-mtext: tracking of the whole text (1)")
+        ->type_name("R")
+        ->check(sayable())
+        ->check(notZero());
+    app.add_option("--width-factor", options.widthFactor, "to-mtext: its width factor (1)")
         ->type_name("R")
         ->check(sayable());
-    app.add_option("--width-factor", options.widthFactor, "its width factor (1)")
-        ->type_name("R")
-        ->check(sayable());
-    app.add_option("--oblique", options.oblique, "its oblique angle (0)")
+    app.add_option("--oblique", options.oblique, "to-mtext: its oblique angle (0)")
         ->type_name("R")
         ->check(sayable());
     app.add_option("--base-alignment", options.baseAlignment,
-                   "its stack alignment: 0 bottom, 1 middle, 2 top (0)")
+                   "to-mtext: its stacks stand at 0 bottom, 1 middle, 2 top (0)")
         ->type_name("N")
         ->check(CLI::Range(0, 2));
     app.add_flag("--keep-trailing-paragraphs", options.keepsTrailingParagraphs,
@@ -173,11 +184,14 @@ void checkTogether(Options const& options) {
 
 // What is wrong, in a line.
 std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
-    if (!app.get_subcommands().empty()) return wrong.what();
+    std::vector<std::string> const rest = app.remaining();
+    if (!app.get_subcommands().empty()) {
+        return rest.empty() ? wrong.what()
+                            : "options stand behind the command, not \"" + rest.front() + "\"";
+    }
     std::string text = "expected";
     for (DirectionRow const& row : kDirections)
         text += std::string(&row == kDirections ? " " : ", ") + row.name;
-    std::vector<std::string> const rest = app.remaining();
     return rest.empty() ? text : text + ", not \"" + rest.front() + "\"";
 }
 
