@@ -2,6 +2,7 @@
 
 #include "module/access/style_rules.h"
 #include "module/mtext/sample_text.h"
+#include "module/mtext/user_axes.h"
 #include "tz/rx/variables.h"
 
 namespace {
@@ -17,19 +18,25 @@ bool cursorHidesText() {
 
 }  // namespace
 
-CTzsMtextFirstPointJig::CTzsMtextFirstPointJig(TzGePoint3d const&) : m_flow(flowOfCurrentStyle()) {
+CTzsMtextFirstPointJig::CTzsMtextFirstPointJig(TzGePoint3d const&) {
     updateVectors();
     m_dTextSize = ComputeTextSize();
+    m_bVertical = isCurrentStyleVertical();
 }
 
 void CTzsMtextFirstPointJig::updateVectors() {
-    m_ucs = activeUserAxes();
+    UserAxes const axes = activeUserAxes();
+    m_vecUcsX = axes.x;
+    m_vecUcsY = axes.y;
+    m_vecNormal = axes.normal;
     SetRotation(rotationOfCurrentStyle());
 }
 
 void CTzsMtextFirstPointJig::SetRotation(double radians) {
     m_dRotation = radians;
-    m_frame = m_ucs.turned(radians);
+    UserAxes const frame = UserAxes{m_vecUcsX, m_vecUcsY, m_vecNormal}.turned(radians);
+    m_vecX = frame.x;
+    m_vecY = frame.y;
 }
 
 TzEdJig::DragStatus CTzsMtextFirstPointJig::OnSample(TzEdJig& jig) {
@@ -58,13 +65,13 @@ bool CTzsMtextFirstPointJig::subWorldDraw(TzGiWorldDraw* draw) {
     traits.setColor(kSampleColor);
     traits.setLineWeight(0);
 
+    UserAxes const frame{m_vecX, m_vecY, m_vecNormal};
     CTzsJigEntity::subWorldDraw(draw);
-    TzGiTextStyle const style = sampleTextStyle(m_dTextSize, m_flow);
-    TzGePoint3d const position = m_flow == LineFlow::vertical
-                                     ? m_ptCursor + m_frame.x * (0.5 * m_dTextSize)
-                                     : m_ptCursor - m_frame.y * m_dTextSize;
+    TzGiTextStyle const style = sampleTextStyle(m_dTextSize, m_bVertical);
+    TzGePoint3d const position = m_bVertical ? m_ptCursor + frame.x * (0.5 * m_dTextSize)
+                                             : m_ptCursor - frame.y * m_dTextSize;
     TzString const text = sampleText();
-    if (!text.isEmpty()) drawSampleText(*draw, text, position, m_frame.normal, m_frame.x, style);
+    if (!text.isEmpty()) drawSampleText(*draw, text, position, frame.normal, frame.x, style);
     traits.setColor(colorBefore);
     return true;
 }

@@ -1,9 +1,8 @@
 #pragma once
 
-#include "module/mtext/box_geometry.h"
-#include "module/mtext/user_axes.h"
 #include "module/prompt/jig.h"
 #include "tz/ge/point3d.h"
+#include "tz/ge/vector3d.h"
 
 // The preview before the first corner of a text is chosen: the sample text in the current text
 // style, beside the cursor. It draws no lines.
@@ -33,12 +32,15 @@ protected:
     bool subWorldDraw(TzGiWorldDraw* draw) override;
 
 private:
-    UserAxes m_ucs;
-    UserAxes m_frame;  // the axes turned by the rotation
+    TzGeVector3d m_vecUcsX;
+    TzGeVector3d m_vecUcsY;
+    TzGeVector3d m_vecNormal;
+    TzGeVector3d m_vecX;  // the axes turned by the rotation
+    TzGeVector3d m_vecY;
     TzGePoint3d m_ptCursor;
     double m_dRotation = 0;
     double m_dTextSize = 0;
     bool m_bFirstSample = true;
     bool m_bHidden = false;
-    LineFlow m_flow;
+    bool m_bVertical = false;
 };

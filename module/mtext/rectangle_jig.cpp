@@ -46,37 +46,45 @@ constexpr EdgeDrawing kEdgesByRow[] = {
 
 }  // namespace
 
-CTzsMtextJig::CTzsMtextJig(TzGePoint3d const& first)
-    : m_ucs(activeUserAxes()), m_flow(flowOfCurrentStyle()) {
+CTzsMtextJig::CTzsMtextJig(TzGePoint3d const& first) {
     m_dArrowSize = CTzadSysVar::GetDouble(L"VIEWSIZE") * kArrowPerView;
+    UserAxes const axes = activeUserAxes();
+    m_vecUcsX = axes.x;
+    m_vecUcsY = axes.y;
+    m_vecNormal = axes.normal;
     m_corners.bottomRight = first;
     SetBasePoint(first);
     SetRotation(rotationOfCurrentStyle());
     m_ptLastSample = first;
     m_solidLine = GetSolidLine();
     m_dTextSize = ComputeTextSize();
+    m_bVertical = isCurrentStyleVertical();
 }
 
 void CTzsMtextJig::SetRotation(double radians) {
     m_dRotation = radians;
-    m_frame = m_ucs.turned(radians);
+    UserAxes const turned = UserAxes{m_vecUcsX, m_vecUcsY, m_vecNormal}.turned(radians);
+    m_vecX = turned.x;
+    m_vecY = turned.y;
     SetStretchPoint(m_corners.bottomRight);
 }
 
 void CTzsMtextJig::SetStretchPoint(TzGePoint3d const& point) {
-    stretchBox(m_corners, GetBasePoint(), point, m_frame);
-    m_vecWidth = m_frame.x * m_corners.topLeft.distanceTo(m_corners.topRight);
-    m_vecHeight = m_frame.y * m_corners.topLeft.distanceTo(m_corners.bottomLeft);
+    stretchBox(m_corners, GetBasePoint(), point, frame());
+    m_vecWidth = m_vecX * m_corners.topLeft.distanceTo(m_corners.topRight);
+    m_vecHeight = m_vecY * m_corners.topLeft.distanceTo(m_corners.bottomLeft);
+}
+
+LineFlow CTzsMtextJig::flow() const {
+    return m_bVertical ? LineFlow::vertical : LineFlow::horizontal;
 }
 
 double CTzsMtextJig::Width() const {
-    bool const vertical = m_flow == LineFlow::vertical;
-    return m_corners.topLeft.distanceTo(vertical ? m_corners.bottomLeft : m_corners.topRight);
+    return m_corners.topLeft.distanceTo(m_bVertical ? m_corners.bottomLeft : m_corners.topRight);
 }
 
 double CTzsMtextJig::Height() const {
-    bool const vertical = m_flow == LineFlow::vertical;
-    return m_corners.topLeft.distanceTo(vertical ? m_corners.topRight : m_corners.bottomLeft);
+    return m_corners.topLeft.distanceTo(m_bVertical ? m_corners.topRight : m_corners.bottomLeft);
 }
 
 void CTzsMtextJig::GetJigAttachPoint(TzGePoint3d& out) const {
@@ -117,7 +125,7 @@ bool CTzsMtextJig::subWorldDraw(TzGiWorldDraw* draw) {
     traits.setLineWeight(0);
     traits.setColor(kLineColor);
     CTzsJigEntity::subWorldDraw(draw);
-    for (BoxEdge const& side : edgesOf(m_corners, m_flow).sides)
+    for (BoxEdge const& side : edgesOf(m_corners, flow()).sides)
         DrawLine(draw, side.from, side.to);
     if (m_nAttachment >= 1 && m_nAttachment <= 9) {
         EdgeDrawing const& edges = kEdgesByRow[(m_nAttachment - 1) / 3];
@@ -140,44 +148,44 @@ void CTzsMtextJig::DrawArrow(TzGiWorldDraw* draw,
     bool const roomy =
         m_vecHeight.length() > 2 * m_dArrowSize && m_vecWidth.length() > m_dArrowSize;
     if (!roomy) return;
-    UserAxes axes = m_frame;
+    UserAxes axes = frame();
     if (flip) {
         axes.x.negate();
         axes.y.negate();
     }
-    auto const outline = arrowOutline({a, b}, axes, m_flow, m_dArrowSize);
+    auto const outline = arrowOutline({a, b}, axes, flow(), m_dArrowSize);
     draw->geometry().polyline(static_cast<int>(outline.size()), outline.data());
 }
 
 void CTzsMtextJig::DrawClosedTop(TzGiWorldDraw* draw) const {
-    BoxEdge const top = edgesOf(m_corners, m_flow).top;
+    BoxEdge const top = edgesOf(m_corners, flow()).top;
     DrawLine(draw, top.from, top.to);
 }
 
 void CTzsMtextJig::DrawClosedBottom(TzGiWorldDraw* draw) const {
-    BoxEdge const bottom = edgesOf(m_corners, m_flow).bottom;
+    BoxEdge const bottom = edgesOf(m_corners, flow()).bottom;
     DrawLine(draw, bottom.from, bottom.to);
 }
 
 void CTzsMtextJig::DrawOpenTop(TzGiWorldDraw* draw) const {
     DrawClosedTop(draw);
-    BoxEdge const top = edgesOf(m_corners, m_flow).top;
+    BoxEdge const top = edgesOf(m_corners, flow()).top;
     DrawArrow(draw, top.from, top.to, false);
 }
 
 void CTzsMtextJig::DrawOpenBottom(TzGiWorldDraw* draw) const {
     DrawClosedBottom(draw);
-    BoxEdge const bottom = edgesOf(m_corners, m_flow).bottom;
+    BoxEdge const bottom = edgesOf(m_corners, flow()).bottom;
     DrawArrow(draw, bottom.from, bottom.to, true);
 }
 
 void CTzsMtextJig::drawSample(TzGiWorldDraw& draw) const {
     TzString const text = sampleText();
     if (text.isEmpty()) return;
-    TzGiTextStyle const style = sampleTextStyle(m_dTextSize, m_flow);
+    TzGiTextStyle const style = sampleTextStyle(m_dTextSize, m_bVertical);
     draw.subEntityTraits().setColor(kSampleColor);
     double const width = style.extents(text, true, text.length(), true, &draw).x;
     TzGePoint3d const position =
-        samplePosition(m_corners, m_frame, m_flow, m_nAttachment, m_dTextSize, width);
-    drawSampleText(draw, text, position, m_frame.normal, m_frame.x, style);
+        samplePosition(m_corners, frame(), flow(), m_nAttachment, m_dTextSize, width);
+    drawSampleText(draw, text, position, m_vecNormal, m_vecX, style);
 }

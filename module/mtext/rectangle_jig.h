@@ -53,12 +53,17 @@ protected:
     bool subWorldDraw(TzGiWorldDraw* draw) override;
 
 private:
+    [[nodiscard]] UserAxes frame() const { return {m_vecX, m_vecY, m_vecNormal}; }
+    [[nodiscard]] LineFlow flow() const;
     void drawSample(TzGiWorldDraw& draw) const;
 
     TzDbObjectId m_solidLine;
     BoxCorners m_corners;
-    UserAxes m_ucs;
-    UserAxes m_frame;         // the axes turned by the rotation
+    TzGeVector3d m_vecUcsX;
+    TzGeVector3d m_vecUcsY;
+    TzGeVector3d m_vecNormal;
+    TzGeVector3d m_vecX;  // the axes turned by the rotation
+    TzGeVector3d m_vecY;
     TzGeVector3d m_vecWidth;  // along the turned axes, as long as the box's edges
     TzGeVector3d m_vecHeight;
     int m_nAttachment = 1;
@@ -67,5 +72,5 @@ private:
     double m_dTextSize = 0;
     TzGePoint3d m_ptLastSample;
     bool m_bFirstSample = true;
-    LineFlow m_flow;
+    bool m_bVertical = false;
 };

@@ -15,15 +15,15 @@ double rotationOfCurrentStyle() {
     return IsVerticalTTF() ? kVerticalRotation : 0.0;
 }
 
-LineFlow flowOfCurrentStyle() {
+bool isCurrentStyleVertical() {
     TzDbObjectId const id = currentStyle();
-    if (id.isNull()) return LineFlow::horizontal;
+    if (id.isNull()) return false;
     TzGiTextStyle style;
     (void)fromTzDbTextStyle(style, id);  // a style that cannot be read is not vertical
-    return style.isVertical() ? LineFlow::vertical : LineFlow::horizontal;
+    return style.isVertical();
 }
 
-TzGiTextStyle sampleTextStyle(double size, LineFlow flow) {
+TzGiTextStyle sampleTextStyle(double size, bool vertical) {
     TzGiTextStyle style;
     TzDbObjectId const id = currentStyle();
     if (id.isNull()) return style;
@@ -31,7 +31,7 @@ TzGiTextStyle sampleTextStyle(double size, LineFlow flow) {
     style.setTextSize(size);
     style.setUpsideDown(false);
     style.setBackward(false);
-    style.setVertical(flow == LineFlow::vertical);
+    style.setVertical(vertical);
     return style;
 }
 

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "module/mtext/box_geometry.h"
 #include "tz/ge/point3d.h"
 #include "tz/gi/draw.h"
 #include "tz/gi/text_style.h"
@@ -14,11 +13,11 @@ inline constexpr int kSampleColor = 253;
 
 // The rotation that the current style asks for: kVerticalRotation or 0.
 [[nodiscard]] double rotationOfCurrentStyle();
-// Which way the current style runs; horizontal without one.
-[[nodiscard]] LineFlow flowOfCurrentStyle();
+// Whether the current style runs from top to bottom.
+[[nodiscard]] bool isCurrentStyleVertical();
 // The current style at a text size, upright and readable whatever it says; without a current style
 // a plain one, its size and direction left alone.
-[[nodiscard]] TzGiTextStyle sampleTextStyle(double size, LineFlow flow);
+[[nodiscard]] TzGiTextStyle sampleTextStyle(double size, bool vertical);
 // The text itself, of the drafter's choice; may be empty.
 [[nodiscard]] TzString sampleText();
 // Draws one line of it without looking at codes in it.
