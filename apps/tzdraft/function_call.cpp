@@ -1,14 +1,13 @@
 #include "apps/tzdraft/function_call.h"
 
-#include <charconv>
 #include <memory>
-#include <optional>
 #include <string>
 
 #include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
+#include "host/database/open_state.h"
 #include "host/runtime/functions.h"
 #include "tz/rx/app.h"
 #include "tz/rx/resbuf.h"
@@ -29,15 +28,6 @@ std::wstring_view trimmed(std::wstring_view text) {
     return text.substr(first, text.find_last_not_of(kBlanks) - first + 1);
 }
 
-std::optional<std::uint64_t> readHandle(std::wstring_view digits) {
-    std::string const bytes = tzhost::toUtf8(digits);
-    std::uint64_t handle = 0;
-    auto const [end, problem] =
-        std::from_chars(bytes.data(), bytes.data() + bytes.size(), handle, 16);
-    if (problem != std::errc() || end != bytes.data() + bytes.size()) return std::nullopt;
-    return handle;
-}
-
 // The one argument as the function gets it; null when it is neither an entity nor a text.
 Arguments readArgument(std::wstring_view text) {
     if (text.size() >= 2 && text.front() == L'"' && text.back() == L'"') {
@@ -47,7 +37,7 @@ Arguments readArgument(std::wstring_view text) {
         return argument;
     }
     if (text.empty() || text.front() != L'#') return nullptr;
-    std::optional<std::uint64_t> const handle = readHandle(text.substr(1));
+    auto const handle = tzhost::readHandle(tzhost::toUtf8(text.substr(1)));
     if (!handle) return nullptr;
     Arguments argument(tzutNewRb(Tzad::eResultEntityName));
     TzDbObjectId const id = Session::current().drawing().objectAt(*handle);

@@ -141,11 +141,7 @@ Tzad::ErrorStatus TzDbEntity::subTransformBy(TzGeMatrix3d const& /*matrix*/) {
 unsigned int TzDbEntity::subSetAttributes(TzGiDrawableTraits* traits) {
     EntityImp const& values = valuesOf<EntityImp>(*this);
     if (traits) {
-        if (values.color.isByColor()) {
-            traits->setTrueColor(values.color);
-        } else {
-            traits->setColor(values.color.colorIndex());
-        }
+        traits->setTrueColor(values.color);
         traits->setLayer(values.layer);
         traits->setLineType(TzDbObjectId::kNull);
         traits->setFillType(0);

@@ -1,13 +1,15 @@
 #include "host/database/field_codes.h"
 
-#include <charconv>
 #include <cstdlib>
 #include <ctime>
 #include <vector>
 
+#include "host/base/result_time.h"
+#include "host/base/utf8.h"
 #include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/database/field_properties.h"
+#include "host/database/open_state.h"
 
 namespace tzhost {
 namespace {
@@ -36,18 +38,9 @@ Value variableValue(Words const& words, Drawing const* /*drawing*/) {
     return value ? Value(writeValue(*value)) : std::nullopt;
 }
 
-// The time of a reproducible run when one is set, else now.
-std::time_t today() {
-    char const* const fixed = std::getenv("SOURCE_DATE_EPOCH");
-    if (!fixed) return std::time(nullptr);
-    std::string_view const text(fixed);
-    long long seconds = 0;
-    std::from_chars(text.data(), text.data() + text.size(), seconds);
-    return static_cast<std::time_t>(seconds);
-}
-
+// The date where the user is, but for a result that can be made again anywhere.
 Value dateValue(Words const& words, Drawing const* /*drawing*/) {
-    std::time_t const seconds = today();
+    std::time_t const seconds = resultTime();
     std::tm date{};
     bool const isFixed = std::getenv("SOURCE_DATE_EPOCH") != nullptr;
     if (words.size() != 1 ||
@@ -64,19 +57,8 @@ Value fileValue(Words const& words, Drawing const* drawing) {
     return TzString::fromUtf8(drawing->file().filename().string()).str();
 }
 
-std::optional<std::uint64_t> readHandle(std::wstring_view text) {
-    constexpr std::size_t kMostDigits = 16;
-    if (text.empty() || text.size() > kMostDigits) return std::nullopt;
-    std::string const digits(text.begin(), text.end());
-    std::uint64_t handle = 0;
-    auto const [end, error] =
-        std::from_chars(digits.data(), digits.data() + digits.size(), handle, 16);
-    if (error != std::errc() || end != digits.data() + digits.size()) return std::nullopt;
-    return handle;
-}
-
 Value objectValue(Words const& words, Drawing const* drawing) {
-    auto const handle = words.size() == 3 ? readHandle(words[1]) : std::nullopt;
+    auto const handle = words.size() == 3 ? readHandle(toUtf8(words[1])) : std::nullopt;
     if (!handle || !drawing) return std::nullopt;
     TzDbObjectId const id = drawing->objectAt(*handle);
     if (id.isNull() || id.isErased()) return std::nullopt;

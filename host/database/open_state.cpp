@@ -1,5 +1,7 @@
 #include "host/database/open_state.h"
 
+#include <charconv>
+
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
 #include "host/base/memory_faults.h"
@@ -78,6 +80,16 @@ TzString handleText(std::uint64_t handle) {
         handle /= 16;
     } while (handle != 0);
     return text;
+}
+
+std::optional<std::uint64_t> readHandle(std::string_view text) {
+    constexpr int kHexadecimal = 16;
+    std::uint64_t handle = 0;
+    char const* const end = text.data() + text.size();
+    auto const [stop, error] = std::from_chars(text.data(), end, handle, kHexadecimal);
+    bool const isWhole = error == std::errc() && stop == end;
+    bool const isEntity = handle > 0 && handle <= Drawing::kMaxEntityHandle;
+    return isWhole && isEntity ? std::optional(handle) : std::nullopt;
 }
 
 }  // namespace tzhost

@@ -1,6 +1,8 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
+#include <string_view>
 
 #include "tz/db/object.h"
 #include "tz/text/string.h"
@@ -39,5 +41,7 @@ private:
 
 // A handle as drawings and scripts write it: hexadecimal capitals without a prefix.
 [[nodiscard]] TzString handleText(std::uint64_t handle);
+// Reads a handle of an entity, in small letters too; nothing for any other text.
+[[nodiscard]] std::optional<std::uint64_t> readHandle(std::string_view text);
 
 }  // namespace tzhost

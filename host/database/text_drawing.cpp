@@ -20,7 +20,7 @@ public:
         if (color == now_) return;
         now_ = color;
         if (color.kind == TextColorKind::entity) {
-            put(entity_);
+            traits_.setTrueColor(entity_);
         } else if (color.kind == TextColorKind::index) {
             traits_.setColor(color.index);
         } else {
@@ -32,14 +32,6 @@ public:
     }
 
 private:
-    void put(TzCmEntityColor const& color) {
-        if (color.isByColor()) {
-            traits_.setTrueColor(color);
-        } else {
-            traits_.setColor(color.colorIndex());
-        }
-    }
-
     TzGiSubEntityTraits& traits_;
     TzCmEntityColor entity_;
     TextColor now_;
@@ -92,14 +84,7 @@ void drawBackground(TzGiWorldDraw& draw,
                     tzhost::MTextBackground const& background) {
     TzGiSubEntityTraits& traits = draw.subEntityTraits();
     TzCmEntityColor const entityColor = traits.trueColor();
-    auto const put = [&](TzCmEntityColor const& color) {
-        if (color.isByColor()) {
-            traits.setTrueColor(color);
-        } else {
-            traits.setColor(color.colorIndex());
-        }
-    };
-    put(background.color);
+    traits.setTrueColor(background.color);
     traits.setTransparency(background.transparency);
     traits.setFillType(background.useBackgroundColor ? tzhost::kFillPage : tzhost::kFillColor);
     TzGePoint3d const corners[] = {frame.at({box.left, box.bottom}),
@@ -108,7 +93,7 @@ void drawBackground(TzGiWorldDraw& draw,
     draw.geometry().polygon(4, corners);
     traits.setFillType(tzhost::kFillNothing);
     traits.setTransparency(TzCmTransparency());
-    put(entityColor);
+    traits.setTrueColor(entityColor);
 }
 
 }  // namespace

@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "host/database/true_color.h"
 #include "host/display/draw_pass.h"
 #include "host/display/record_access.h"
 #include "tz/db/entity.h"
@@ -17,14 +18,7 @@ Event tripleOf(Triple const& value) {
 }
 
 Event colorOf(TzCmEntityColor const& color) {
-    if (!color.isByColor()) return color.colorIndex();
-    constexpr char kDigits[] = "0123456789ABCDEF";
-    std::string text = "#";
-    for (int const part : {color.red(), color.green(), color.blue()}) {
-        text += kDigits[part / 16];
-        text += kDigits[part % 16];
-    }
-    return text;
+    return color.isByColor() ? Event(trueColorText(color)) : Event(color.colorIndex());
 }
 
 std::string linetypeOf(TzDbObjectId id) {

@@ -3,15 +3,14 @@
 #include <variant>
 
 #include "host/base/variables.h"
+#include "host/database/active_space.h"
 #include "tz/ed/ucs.h"
 #include "tz/ge/arbitrary_axis.h"
 
 namespace tzhost {
 
 Space activeSpace() {
-    Variables const& variables = Variables::instance();
-    bool const onPaper = variables.number(L"TILEMODE") == 0 && variables.number(L"CVPORT") == 1;
-    return onPaper ? Space::paper : Space::model;
+    return isPaperActive() ? Space::paper : Space::model;
 }
 
 ViewAxes::ViewAxes(TzGeVector3d const& towardsViewer) {

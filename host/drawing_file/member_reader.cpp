@@ -1,11 +1,11 @@
 #include "host/drawing_file/member_reader.h"
 
-#include <charconv>
 #include <cmath>
 
 #include "host/base/local_text.h"
 #include "host/base/utf8.h"
 #include "host/database/geometry.h"
+#include "host/database/true_color.h"
 
 namespace tzhost::drawingfile {
 namespace {
@@ -28,19 +28,6 @@ bool isWholeIn(double number, WholeRange numbers) {
 }
 
 }  // namespace
-
-bool readTrueColor(std::string_view text, TzCmColor& color) {
-    constexpr std::size_t kLength = 7;
-    unsigned int rgb = 0;
-    if (text.size() != kLength || text[0] != '#') return false;
-    auto const [end, error] = std::from_chars(text.data() + 1, text.data() + kLength, rgb, 16);
-    if (error != std::errc() || end != text.data() + kLength) return false;
-    auto const part = [=](unsigned int shift) {
-        return static_cast<std::uint8_t>(rgb >> shift & 0xFFU);
-    };
-    color.setRGB(part(16), part(8), part(0));
-    return true;
-}
 
 MemberReader::MemberReader(ReadContext& context,
                            JsonValue const& object,
@@ -149,10 +136,12 @@ void MemberReader::direction(char const* name, TzGeVector3d& value) {
 void MemberReader::color(char const* name, TzCmColor& value, WholeRange indices) {
     JsonValue const* const member = take(name);
     if (!member) return;
-    bool const isIndex = member->kind == JsonKind::number && isWholeIn(member->number, indices);
-    if (isIndex) {
+    auto const trueColor = readTrueColor(member->kind == JsonKind::text ? member->text : "");
+    if (trueColor) {
+        value = *trueColor;
+    } else if (member->kind == JsonKind::number && isWholeIn(member->number, indices)) {
         value = TzCmEntityColor::fromIndex(static_cast<int>(member->number));
-    } else if (member->kind != JsonKind::text || !readTrueColor(member->text, value)) {
+    } else {
         refuse(name, *member, range(indices) + localText(" or a text \"#RRGGBB\""));
     }
 }

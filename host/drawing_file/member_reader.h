@@ -80,7 +80,4 @@ private:
     std::vector<bool> known_;  // by the index of the member
 };
 
-// The index or the true colour of a text "#RRGGBB"; false when it is none.
-[[nodiscard]] bool readTrueColor(std::string_view text, TzCmColor& color);
-
 }  // namespace tzhost::drawingfile

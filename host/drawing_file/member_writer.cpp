@@ -2,6 +2,7 @@
 
 #include "host/base/utf8.h"
 #include "host/database/symbol_imp.h"
+#include "host/database/true_color.h"
 #include "host/drawing_file/json_value.h"
 
 namespace tzhost::drawingfile {
@@ -63,9 +64,7 @@ void MemberWriter::direction(char const* name, TzGeVector3d const& value) {
 
 void MemberWriter::color(char const* name, TzCmColor const& value, WholeRange /*indices*/) {
     if (!value.isByColor()) return number(name, value.colorIndex());
-    TzString const text =
-        TzString::formatted(L"#%02X%02X%02X", value.red(), value.green(), value.blue());
-    writeText(begin(name), text.toUtf8());
+    writeText(begin(name), trueColorText(value));
 }
 
 void MemberWriter::record(char const* name, TzDbObjectId value, wchar_t const* none) {
