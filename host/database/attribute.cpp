@@ -48,10 +48,12 @@ Tzad::ErrorStatus TzDbAttributeDefinition::setMTextAttributeDefinition(TzDbMText
     if (auto const fault = faultStatus("TzDbAttributeDefinition::setMTextAttributeDefinition")) {
         return fault;
     }
-    if (text && !text->objectId().isNull()) return Tzad::eAlreadyInDatabase;
-    if (auto const status = tzhost::beginChange(*this)) return status;
     DefinitionImp& values = valuesOf<DefinitionImp>(*this);
-    values.lines.reset(text);
+    bool const isOwn = text && text == values.lines.get();
+    if (text && !text->objectId().isNull()) return Tzad::eAlreadyInDatabase;
+    if (text && !isOwn && TzDbObjectAccess::imp(*text)->embedder) return Tzad::eInvalidInput;
+    if (auto const status = tzhost::beginChange(*this)) return status;
+    if (!isOwn) values.lines.reset(text);
     values.settle(*this);
     return Tzad::eOk;
 }

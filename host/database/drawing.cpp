@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <vector>
 
-#include "host/base/variables.h"
+#include "host/database/active_space.h"
 #include "host/database/classes.h"
 #include "host/database/object_list.h"
 #include "host/database/open_state.h"
@@ -46,6 +46,15 @@ openTable(char const* operation, Table*& table, TzDbObjectId id, TzDb::OpenMode 
     table = nullptr;
     if (auto const fault = faultStatus(operation)) return fault;
     return tzdbOpenObject(table, id, mode);
+}
+
+// Handles go up. When a file has used the highest, those that it left out serve.
+std::uint64_t freeHandle(std::unordered_map<std::uint64_t, TzDbObjectRecord*> const& taken,
+                         std::uint64_t& next) {
+    if (next > Drawing::kMaxEntityHandle) next = 1;
+    while (taken.contains(next))
+        ++next;
+    return next;
 }
 
 }  // namespace
@@ -96,7 +105,8 @@ TzDbObjectRecord& Drawing::addObject(TzDbObject* object,
     record.owner = owner;
     try {
         if (numbered == Numbered::service) handle = nextService_++;
-        if (numbered == Numbered::entity && handle == 0) handle = nextHandle_;
+        if (numbered == Numbered::entity && handle == 0)
+            handle = freeHandle(byHandle_, nextHandle_);
         if (handle != 0) byHandle_.emplace(handle, &record);
     } catch (...) {
         records_.pop_back();
@@ -114,8 +124,10 @@ TzDbObjectRecord& Drawing::addObject(TzDbObject* object,
 
 void Drawing::numberObject(TzDbObjectRecord& record) {
     if (record.handle != 0) return;
-    byHandle_.emplace(nextHandle_, &record);
-    record.handle = nextHandle_++;
+    std::uint64_t const handle = freeHandle(byHandle_, nextHandle_);
+    byHandle_.emplace(handle, &record);
+    record.handle = handle;
+    nextHandle_ = handle + 1;
 }
 
 TzDbObjectId Drawing::objectAt(std::uint64_t handle) const {
@@ -129,9 +141,7 @@ TzDbObjectId Drawing::find(TzDbObjectId table, std::wstring_view name) {
 }
 
 TzDbObjectId Drawing::activeSpace() const {
-    Variables const& variables = Variables::instance();
-    bool const onPaper = variables.number(L"TILEMODE") == 0 && variables.number(L"CVPORT") == 1;
-    return onPaper ? paperSpace_ : modelSpace_;
+    return isPaperActive() ? paperSpace_ : modelSpace_;
 }
 
 Tzad::ErrorStatus Drawing::getBlockTable(TzDbBlockTable*& table, TzDb::OpenMode mode) {

@@ -211,12 +211,30 @@ Tzad::ErrorStatus TzDbMText::getPlane(TzGePlane& plane, TzDb::Planarity& planari
     return Tzad::eOk;
 }
 
+namespace {
+
+// Columns at another scale; false when one of them would have no finite size.
+bool scale(TextEditorColumns& columns, double along, double up) {
+    columns.columnWidth *= along;
+    columns.columnGutter *= along;
+    bool valid = tzhost::isSize(columns.columnWidth) && tzhost::isSize(columns.columnGutter);
+    for (double& height : columns.heights) {
+        height *= up;
+        valid = valid && tzhost::isSize(height);
+    }
+    return valid;
+}
+
+}  // namespace
+
 Tzad::ErrorStatus TzDbMText::subTransformBy(TzGeMatrix3d const& matrix) {
     MTextImp const& now = valuesOf<MTextImp>(*this);
     auto const turned = tzhost::transformed(matrix, now.location, now.normal, now.direction);
+    auto columns = now.columns ? std::make_unique<TextEditorColumns>(*now.columns) : nullptr;
     if (!turned || !tzhost::isPositive(now.textHeight * turned->scaleUp) ||
         !tzhost::isSize(now.width * turned->scaleAlong) ||
-        !tzhost::isSize(now.height * turned->scaleUp)) {
+        !tzhost::isSize(now.height * turned->scaleUp) ||
+        (columns && !scale(*columns, turned->scaleAlong, turned->scaleUp))) {
         return Tzad::eDegenerateGeometry;
     }
     if (auto const status = tzhost::beginChange(*this)) return status;
@@ -228,12 +246,7 @@ Tzad::ErrorStatus TzDbMText::subTransformBy(TzGeMatrix3d const& matrix) {
     values.textHeight *= turned->scaleUp;
     values.width *= turned->scaleAlong;
     values.height *= turned->scaleUp;
-    if (values.columns) {
-        values.columns->columnWidth *= turned->scaleAlong;
-        values.columns->columnGutter *= turned->scaleAlong;
-        for (double& height : values.columns->heights)
-            height *= turned->scaleUp;
-    }
+    values.columns = std::move(columns);
     values.forgetComputed();
     return Tzad::eOk;
 }

@@ -75,13 +75,14 @@ Tzad::ErrorStatus TzDbSymbolTableRecord::setName(wchar_t const* name) {
     if (auto const fault = faultStatus("TzDbSymbolTableRecord::setName")) return fault;
     std::wstring next(name ? name : L"");
     if (!isSymbolName(next)) return Tzad::eInvalidSymbolName;
-    if (TzDbObjectRecord* const record = objectId().record(); record && record->owner) {
+    TzDbObjectRecord const* const record = objectId().record();
+    if (record) {
         TzDbObjectId const found = tzhost::Drawing::find(TzDbObjectId(record->owner), next);
         if (!found.isNull() && found != objectId()) return Tzad::eDuplicateKey;
     }
     if (auto const status = tzhost::beginChange(*this)) return status;
     valuesOf<SymbolImp>(*this).name = std::move(next);
-    tzhost::noteNamesChanged();
+    if (record) tzhost::noteNamesChanged();
     return Tzad::eOk;
 }
 
@@ -127,7 +128,6 @@ Tzad::ErrorStatus TzDbSymbolTable::addRecord(TzDbSymbolTableRecord* record, TzDb
     TzDbObjectRecord* const table = objectId().record();
     TzDbObjectRecord& added =
         table->drawing->addObject(record, table, tzhost::Drawing::Numbered::service);
-    tzhost::noteNamesChanged();
     id = TzDbObjectId(&added);
     return Tzad::eOk;
 }

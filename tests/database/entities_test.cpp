@@ -2,6 +2,7 @@
 #include <limits>
 #include <numbers>
 
+#include "host/database/symbol_imp.h"
 #include "tests/database/drawing_fixture.h"
 #include "tz/db/extensions.h"
 #include "tz/db/shapes.h"
@@ -83,6 +84,11 @@ constexpr SetterCase kSetters[] = {
     {"MovedTooFar",
      [](T& t) {
          return t.transformBy(TzGeMatrix3d::translation({kInfinity, 0, 0}));
+     },                                                                                 kFlat                 },
+    {"ColumnsTooLarge",
+     [](T& t) {
+         (void)t.setStaticColumns(1e200, 0, 2);
+         return t.transformBy(TzGeMatrix3d::scaling(1e200));
      },                                                                                 kFlat                 },
     {"GrownTooLarge",
      [](T& t) {
@@ -209,6 +215,33 @@ TEST_F(DrawingTest, ReferenceCarriesItsAttributes) {
     reference->erase();
     reference->close();
     EXPECT_TRUE(attributeId.isErased());
+}
+
+TEST_F(DrawingTest, DefinitionKeepsItsOwnLinesAndTakesNoOthers) {
+    TzDbAttributeDefinition one;
+    auto* const lines = new TzDbMText;
+    ASSERT_EQ(lines->setContents(L"two\\Plines"), Tzad::eOk);
+    ASSERT_EQ(one.setMTextAttributeDefinition(lines), Tzad::eOk);
+    EXPECT_EQ(one.setMTextAttributeDefinition(one.getMTextAttributeDefinition()), Tzad::eOk);
+    EXPECT_EQ(one.getMTextAttributeDefinitionConst()->contents(), L"two\\Plines");
+    TzDbAttributeDefinition other;
+    EXPECT_EQ(other.setMTextAttributeDefinition(lines), Tzad::eInvalidInput);
+    EXPECT_FALSE(other.isMTextAttributeDefinition());
+}
+
+// Each new record used to cost a walk over all of them.
+TEST_F(DrawingTest, NewRecordsLeaveTheIndexOfNamesAsItIs) {
+    addLayer(L"A");
+    unsigned int const before = tzhost::namesGeneration();
+    TzDbObjectId const added = addLayer(L"B");
+    EXPECT_EQ(tzhost::namesGeneration(), before);
+    EXPECT_EQ(drawing->find(drawing->layerTableId(), L"b"), added);
+    TzDbLayerTableRecord* record = nullptr;
+    ASSERT_EQ(tzdbOpenObject(record, added, TzDb::kForWrite), Tzad::eOk);
+    EXPECT_EQ(record->setName(L"C"), Tzad::eOk);
+    record->close();
+    EXPECT_EQ(drawing->find(drawing->layerTableId(), L"c"), added);
+    EXPECT_TRUE(drawing->find(drawing->layerTableId(), L"B").isNull());
 }
 
 TEST_F(DrawingTest, RecordsInUseAreNotErased) {
