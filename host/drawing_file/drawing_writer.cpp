@@ -1,135 +1,10 @@
-#include "host/base/local_text.h"
-#include "host/base/safe_file.h"
-#include "host/database/field_imp.h"
-#include "host/database/open_state.h"
-#include "host/drawing_file/drawing_file.h"
+#include "host/drawing_file/drawing_writer.h"
+
+#include "host/drawing_file/entity_writer.h"
 #include "host/drawing_file/members.h"
-#include "tz/db/shapes.h"
-#include "tz/db/text.h"
 
-namespace tzhost {
-namespace drawingfile {
+namespace tzhost::drawingfile {
 namespace {
-
-// Members that hold the text box in the text's own frame.
-void writeBox(MemberWriter& members, LayoutBox const& box) {
-    members.nested("measured", [&](MemberWriter& inner) {
-        std::string& low = inner.begin("lowerLeft");
-        auto const pair = [](std::string& out, double x, double y) {
-            out += '[';
-            writeNumber(out, x);
-            out += ',';
-            writeNumber(out, y);
-            out += ']';
-        };
-        pair(low, box.left, box.bottom);
-        pair(inner.begin("upperRight"), box.right, box.top);
-    });
-}
-
-void writeField(MemberWriter& members, TzDbObjectImp const& values) {
-    if (!values.fields || values.fields->empty()) return members.null("field");
-    TzDbObjectId const field = values.fields->front().second;
-    members.text("field", valuesOf<FieldImp>(*field.record()->object).code);
-}
-
-enum class Named { asSpace, notAtAll };
-
-class EntityWriter {
-public:
-    EntityWriter(std::string& out, TzDbObjectRecord const& record)
-        : record_(record), object_(*record.object),
-          members_(out, TzDbObjectAccess::imp(object_)->unknown.get()) {}
-
-    void write(Named space);
-
-private:
-    template <class Imp>
-    void own() {
-        describe(members_, static_cast<EntityImp&>(valuesOf<Imp>(object_)));
-        describeOwn(members_, valuesOf<Imp>(object_));
-    }
-    template <class Imp>
-    void lineText(char const* type, Named space);
-    void lines(Named space);
-    void insert(Named space);
-    void begin(char const* type, Named space);
-
-    TzDbObjectRecord const& record_;
-    TzDbObject const& object_;
-    MemberWriter members_;
-};
-
-void EntityWriter::begin(char const* type, Named space) {
-    members_.open();
-    members_.text("handle", handleText(record_.handle).str());
-    writeText(members_.begin("type"), type);
-    if (space == Named::notAtAll) return;
-    bool const onPaper = record_.owner == record_.drawing->paperSpace().record();
-    writeText(members_.begin("space"), onPaper ? "paper" : "model");
-}
-
-template <class Imp>
-void EntityWriter::lineText(char const* type, Named space) {
-    begin(type, space);
-    own<Imp>();
-    Imp const& values = valuesOf<Imp>(object_);
-    if (values.fields && !values.fields->empty()) writeField(members_, values);
-    members_.flag("inWorkingSet", record_.inWorkingSet);
-    writeBox(members_, values.box());
-}
-
-void EntityWriter::lines(Named space) {
-    begin("MTEXT", space);
-    own<MTextImp>();
-    MTextImp const& values = valuesOf<MTextImp>(object_);
-    writeField(members_, values);
-    members_.flag("inWorkingSet", record_.inWorkingSet);
-    members_.nested("measured", [&](MemberWriter& inner) {
-        inner.number("width", values.size().x);
-        inner.number("height", values.size().y);
-    });
-}
-
-void EntityWriter::insert(Named space) {
-    begin("INSERT", space);
-    InsertImp const& values = valuesOf<InsertImp>(object_);
-    describe(members_, static_cast<EntityImp&>(valuesOf<InsertImp>(object_)));
-    writeText(members_.begin("block"), recordName(values.block));
-    describeOwn(members_, valuesOf<InsertImp>(object_));
-    std::string& out = members_.begin("attributes");
-    out += '[';
-    bool first = true;
-    for (TzDbObjectRecord const* const each : values.attributes->items) {
-        if (each->erased) continue;
-        if (!first) out += ',';
-        first = false;
-        EntityWriter(out, *each).write(Named::notAtAll);
-    }
-    out += ']';
-    members_.flag("inWorkingSet", record_.inWorkingSet);
-}
-
-void EntityWriter::write(Named space) {
-    TzRxClass const* const kind = object_.isA();
-    if (kind == TzDbMText::desc()) {
-        lines(space);
-    } else if (kind == TzDbText::desc()) {
-        lineText<TextImp>("TEXT", space);
-    } else if (kind == TzDbAttributeDefinition::desc()) {
-        lineText<DefinitionImp>("ATTDEF", space);
-    } else if (kind == TzDbAttribute::desc()) {
-        lineText<AttributeImp>("ATTRIB", space);
-    } else if (kind == TzDbBlockReference::desc()) {
-        insert(space);
-    } else {
-        bool const isLine = kind == TzDbLine::desc();
-        begin(isLine ? "LINE" : "CIRCLE", space);
-        isLine ? own<LineImp>() : own<CircleImp>();
-        members_.flag("inWorkingSet", record_.inWorkingSet);
-    }
-    members_.close();
-}
 
 // Writes the whole drawing; the text is handed to the file whenever it has grown.
 class DrawingWriter {
@@ -224,7 +99,7 @@ void DrawingWriter::entities(TzDbObjectId block, Named space, bool& first) {
         if (each->erased) continue;
         out_ += first ? "\n  " : ",\n  ";
         first = false;
-        EntityWriter(out_, *each).write(space);
+        writeEntity(out_, *each, space);
         good_ = good_ && flush();
         if (!good_) return;
     }
@@ -280,15 +155,9 @@ bool DrawingWriter::write() {
 }
 
 }  // namespace
-}  // namespace drawingfile
 
-std::string writeDrawing(Drawing& drawing, std::filesystem::path const& file) {
-    using namespace drawingfile;
-    if (faultStatus("writeDrawing", Tzad::eFileError))
-        return file.string() + ": " + localText("cannot be written");
-    SafeFile target(file);
-    if (target.isOpen() && DrawingWriter(drawing, target).write() && target.commit()) return {};
-    return file.string() + ": " + localText("cannot be written") + ": " + target.reason();
+bool writeWhole(Drawing& drawing, SafeFile& file) {
+    return DrawingWriter(drawing, file).write();
 }
 
-}  // namespace tzhost
+}  // namespace tzhost::drawingfile

@@ -1,6 +1,5 @@
 #include "host/drawing_file/entity_reader.h"
 
-#include <charconv>
 #include <map>
 #include <type_traits>
 
@@ -52,26 +51,23 @@ std::wstring const* fieldText(EntityImp const& values) {
 std::uint64_t EntityReader::handleOf(JsonValue const& value) {
     JsonValue const* const member = value.find("handle");
     if (!member) return 0;
-    constexpr int kHexadecimal = 16;
-    std::uint64_t handle = 0;
-    char const* const end = member->text.data() + member->text.size();
-    auto const [stop, error] = std::from_chars(member->text.data(), end, handle, kHexadecimal);
-    if (member->kind != JsonKind::text || error != std::errc() || stop != end || handle == 0 ||
-        handle > Drawing::kMaxEntityHandle) {
+    auto const handle =
+        member->kind == JsonKind::text ? readHandle(member->text) : std::optional<std::uint64_t>();
+    if (!handle) {
         context_.complain(
             member->line, "handle",
             localText(
                 "is no handle, expected a text of hexadecimal digits from \"1\" to \"3FFFFFFFFFFFFFFF\""));
         return 0;
     }
-    if (!context_.drawing.objectAt(handle).isNull()) {
+    if (!context_.drawing.objectAt(*handle).isNull()) {
         context_.complain(
             member->line, "handle",
             localText("is \"") + member->text +
                 localText("\" as that of an earlier entity, expected each handle once"));
         return 0;
     }
-    return handle;
+    return *handle;
 }
 
 TzDbObjectRecord& EntityReader::spaceOf(JsonValue const& value) {

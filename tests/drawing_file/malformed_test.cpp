@@ -1,3 +1,5 @@
+#include <unistd.h>
+
 #include <gtest/gtest.h>
 
 #include "host/base/audit.h"
@@ -154,6 +156,28 @@ TEST(DrawingFiles, MissingFileAndFolderAreSaid) {
               scratch("none.json").string() + ": cannot be read: No such file or directory");
     EXPECT_EQ(tzhost::readDrawing(std::filesystem::current_path()).error,
               std::filesystem::current_path().string() + ": cannot be read: Is a directory");
+}
+
+// What a pipe gave is gone, so that only a file in the order of a saved one can come from there.
+TEST(DrawingFiles, ComeFromAPipeInTheirOrder) {
+    struct {
+        std::string members;
+        std::string error;
+    } const rows[] = {
+        {R"("layers":[],"textStyles":[],"entities":[])", ""                                    },
+        {R"("entities":[],"layers":[],"textStyles":[])",
+         ": can be read only once, expected layers and textStyles ahead of blocks and entities"},
+    };
+    for (auto const& row : rows) {
+        std::string const text = R"({"format":"tz-drawing","version":1,)" + row.members + "}";
+        int ends[2] = {};
+        ASSERT_EQ(pipe(ends), 0);
+        ASSERT_EQ(write(ends[1], text.data(), text.size()), static_cast<ssize_t>(text.size()));
+        close(ends[1]);
+        std::string const name = "/dev/fd/" + std::to_string(ends[0]);
+        EXPECT_EQ(tzhost::readDrawing(name).error, row.error.empty() ? "" : name + row.error);
+        close(ends[0]);
+    }
 }
 
 TEST(DrawingFiles, VariablesOfTheUserAreLeftOut) {

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include "host/database/symbol_imp.h"
 #include "host/drawing_file/drawing_file.h"
 #include "tests/drawing_file/drawing_texts.h"
 
@@ -43,6 +44,15 @@ constexpr KeptCase kKept[] = {
      R"("background":{"fill":true,"color":"#0A0B0C","scale":1.5,"useBackgroundColor":false,"transparency":0})"                                                                                                                                                                                                                                                  },
     {"PaperSpace",           R"("entities":[{"type":"LINE","space":"paper"},{"type":"CIRCLE"}])",
      R"({"handle":"1","type":"LINE","space":"paper")"                                                                                                                                                                                                                                                                                                           },
+    {"HandlesToTheLast",
+     R"("entities":[{"handle":"3FFFFFFFFFFFFFFF","type":"LINE"},{"handle":"1","type":"LINE"},{"type":"CIRCLE"}])",
+     R"({"handle":"2","type":"CIRCLE")"                                                                                                                                                                                                                                                                                                                         },
+    {"UnmeasuredLine",       R"("entities":[{"type":"TEXT","textHeight":1e308,"text":"hello"}])",
+     R"("inWorkingSet":true}])"                                                                                                                                                                                                                                                                                                                                 },
+    {"UnmeasuredColumns",
+     R"("entities":[{"type":"MTEXT","contents":"a","columns":{"type":1,"count":1000,"width":1e306}}])",
+     R"("inWorkingSet":true}])"                                                                                                                                                                                                                                                                                                                                 },
+    {"NameOfAMark",          R"("entities read":1,"entities":[{"type":"LINE"}])",                                                                                                                                                                R"("type":"LINE")"                                                                                             },
     {"Handles",              R"("entities":[{"type":"LINE"},{"handle":"ff","type":"CIRCLE"}])",
      R"({"handle":"100","type":"LINE")"                                                                                                                                                                                                                                                                                                                         },
     {"Field",                R"("entities":[{"type":"MTEXT","contents":"old","field":"%<\\Date>%"}])",
@@ -89,6 +99,14 @@ TEST_P(RoundTrips, KeepWhatIsThere) {
         saved(std::string(R"({"format":"tz-drawing","version":1,)") + GetParam().text + "}");
     EXPECT_NE(once.find(GetParam().found), std::string::npos) << once;
     EXPECT_EQ(saved(once), once);
+}
+
+// Reading n blocks used to index the table of blocks n times.
+TEST(ReadingBlocks, IndexesTheirNamesOnce) {
+    unsigned int const before = tzhost::namesGeneration();
+    (void)saved(
+        R"({"format":"tz-drawing","version":1,"blocks":[{"name":"A"},{"name":"B"},{"name":"C"}]})");
+    EXPECT_LE(tzhost::namesGeneration(), before + 1);
 }
 
 INSTANTIATE_TEST_SUITE_P(Members, RoundTrips, testing::ValuesIn(kKept), [](auto const& row) {
