@@ -1,5 +1,6 @@
 #include "host/display/draw_pass.h"
 
+#include <algorithm>
 #include <cmath>
 #include <numbers>
 #include <utility>
@@ -67,13 +68,11 @@ bool DrawPass::take(TzDbEntity const& entity, wchar_t const* type, TzGePoint3d c
     return true;
 }
 
-void DrawPass::addLines(std::vector<TzGePoint3d> points, bool closed) {
-    if (points.empty()) return;
-    for (TzGePoint3d& each : points)
+void DrawPass::addLines(DrawnLines lines) {
+    if (lines.points.empty()) return;
+    for (TzGePoint3d& each : lines.points)
         each.transformBy(transform());
-    list_.push_back({
-        traits_.pen(), DrawnLines{std::move(points), closed}
-    });
+    list_.push_back({traits_.pen(), std::move(lines)});
 }
 
 void DrawPass::place(DrawnText& text) const {
@@ -96,12 +95,12 @@ bool DrawPass::Geometry::polyline(int count,
                                   TzGePoint3d const* points,
                                   TzGeVector3d const* /*normal*/,
                                   long long /*marker*/) {
-    pass_.addLines(pointsOf(count, points), false);
+    pass_.addLines({pointsOf(count, points), false});
     return true;
 }
 
 bool DrawPass::Geometry::polygon(int count, TzGePoint3d const* points) {
-    pass_.addLines(pointsOf(count, points), true);
+    pass_.addLines({pointsOf(count, points), true});
     return true;
 }
 
@@ -115,7 +114,7 @@ bool DrawPass::Geometry::circle(TzGePoint3d const& center,
         points.push_back(center + axes.xAxis() * (radius * std::cos(angle)) +
                          axes.yAxis() * (radius * std::sin(angle)));
     }
-    pass_.addLines(std::move(points), true);
+    pass_.addLines({std::move(points), true});
     return true;
 }
 
@@ -135,7 +134,9 @@ bool DrawPass::Geometry::text(TzGePoint3d const& position,
 }
 
 bool DrawPass::Geometry::draw(TzGiDrawable* drawable) {
-    if (drawable) pass_.drawNested(*drawable);
+    if (!drawable) return true;
+    pass_.nested_ = std::min(pass_.nested_ + 1, kMostNested + 1);
+    if (pass_.isWhole()) pass_.drawNested(*drawable);
     return true;
 }
 

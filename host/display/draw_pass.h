@@ -15,7 +15,8 @@ class TzDbDatabase;
 //   pass.draw(jig.entity());
 //   use(pass.list());
 //
-// Entities that say they are invisible are left out, whoever draws them.
+// Entities that say they are invisible are left out, whoever draws them. Blocks within blocks can
+// stand for more than any memory holds, so a pass takes no more nested drawables than kMostNested.
 namespace tzhost {
 
 class DrawPass {
@@ -29,10 +30,14 @@ public:
     DrawPass(DrawPass const&) = delete;
     DrawPass& operator=(DrawPass const&) = delete;
 
+    static constexpr int kMostNested = 500'000;
+
     // Draws one drawable behind what was drawn before: its attributes, then itself. Null draws
     // nothing.
     void draw(TzGiDrawable* drawable);
     [[nodiscard]] DrawList const& list() const { return list_; }
+    // Whether nothing was left out for its number.
+    [[nodiscard]] bool isWhole() const { return nested_ <= kMostNested; }
 
 private:
     class Context : public TzGiContext {
@@ -91,7 +96,7 @@ private:
 
     void drawNested(TzGiDrawable& drawable);
     bool take(TzDbEntity const& entity, wchar_t const* type, TzGePoint3d const& position);
-    void addLines(std::vector<TzGePoint3d> points, bool closed);
+    void addLines(DrawnLines lines);
     // Brings a text from the innermost transform's coordinates to those of the world.
     void place(DrawnText& text) const;
     [[nodiscard]] TzGeMatrix3d const& transform() const;
@@ -105,6 +110,7 @@ private:
     std::vector<TzGeMatrix3d> transforms_;  // each from its own coordinates to the world
     TzGiDrawable const* top_ = nullptr;     // what `draw` was given, while it draws
     int depth_ = 0;
+    int nested_ = 0;  // drawables that others drew; kMostNested + 1 when there were more
     DrawList list_;
 };
 

@@ -10,14 +10,12 @@
 namespace tzhost {
 namespace {
 
-DrawList strokesOfActiveSpace(TzDbDatabase& database) {
-    DrawPass pass(&database, DrawPass::Entities::strokes);
+void drawActiveSpace(DrawPass& pass, TzDbDatabase& database) {
     auto const* const space = objectOf<TzDbBlockTableRecord>(drawingOf(&database)->activeSpace());
     TzArray<TzDbObjectId> ids;
     if (space) space->entities(ids);
     for (TzDbObjectId const& id : ids)
         pass.draw(objectOf<TzDbEntity>(id));
-    return pass.list();
 }
 
 }  // namespace
@@ -25,7 +23,11 @@ DrawList strokesOfActiveSpace(TzDbDatabase& database) {
 std::optional<std::string>
 plotDrawing(TzDbDatabase& database, PlotFormat format, std::string const& file) {
     if (faultAt("plotDrawing")) return file + ": " + localText("cannot be plotted");
-    PlotScene const scene = makeScene(strokesOfActiveSpace(database), viewAxes(activeSpace()));
+    DrawPass pass(&database, DrawPass::Entities::strokes);
+    drawActiveSpace(pass, database);
+    if (!pass.isWhole())
+        return file + ": " + localText("blocks within blocks hold too much to plot");
+    PlotScene const scene = makeScene(pass.list(), viewAxes(activeSpace()));
     std::string const bytes = paintPlot(scene, format);
     if (bytes.empty()) return file + ": " + localText("the picture could not be made");
     if (!writeFileSafely(file, bytes))

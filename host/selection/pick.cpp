@@ -1,13 +1,13 @@
 #include "host/selection/pick.h"
 
 #include <algorithm>
-#include <charconv>
 #include <cstdint>
 #include <string>
 
 #include "host/base/utf8.h"
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
+#include "host/database/open_state.h"
 #include "host/database/user_system.h"
 #include "host/display/record_access.h"
 #include "host/selection/outline.h"
@@ -20,6 +20,7 @@ namespace {
 constexpr wchar_t kHandleMark = L'#';
 constexpr wchar_t kInside = L'/';
 constexpr int kDeepest = 64;
+constexpr int kMostLooks = 100'000;
 
 using Records = std::vector<TzDbObjectRecord*>;
 
@@ -57,26 +58,22 @@ bool boxHolds(TzDbObjectRecord* record, TzGeMatrix3d const& placed, TzGePoint3d 
     return entity != nullptr && Outline::of(*entity, placed).boxHolds(user.convert2d());
 }
 
-std::optional<Picked> pickInside(Picked const& outer, TzGePoint3d const& user, int depth) {
+// Blocks within blocks can stand for more than one can look at: `looks` says at how many entities
+// the search may look yet.
+std::optional<Picked>
+pickInside(Picked const& outer, TzGePoint3d const& user, int depth, int& looks) {
     if (objectOf<TzDbBlockReference>(outer.id) == nullptr) return outer;
     if (depth == kDeepest) return std::nullopt;
     for (Inside const& inside : insidesOf(outer)) {
         if (inside.items == nullptr) continue;
         for (auto at = inside.items->rbegin(); at != inside.items->rend(); ++at) {
+            if (--looks < 0) return std::nullopt;
             if (!boxHolds(*at, inside.placed, user)) continue;
-            auto const found = pickInside(stepInto(outer, inside, *at), user, depth + 1);
+            auto const found = pickInside(stepInto(outer, inside, *at), user, depth + 1, looks);
             if (found) return found;
         }
     }
     return std::nullopt;
-}
-
-std::optional<std::uint64_t> readHandle(std::wstring_view text) {
-    std::string const digits = toUtf8(text);
-    std::uint64_t handle = 0;
-    auto const read = std::from_chars(digits.data(), digits.data() + digits.size(), handle, 16);
-    bool const isWhole = read.ec == std::errc() && read.ptr == digits.data() + digits.size();
-    return isWhole && handle <= Drawing::kMaxEntityHandle ? std::optional(handle) : std::nullopt;
 }
 
 std::optional<Picked> findInside(Picked const& outer, std::uint64_t handle) {
@@ -101,7 +98,8 @@ std::optional<Picked> pickAt(TzGePoint3d const& user, Depth depth) {
         if (!boxHolds(*at, TzGeMatrix3d::kIdentity, user)) continue;
         Picked const top{TzDbObjectId(*at), TzDbObjectId(*at), {}, {}};
         if (depth == Depth::top) return top;
-        if (auto const found = pickInside(top, user, 0)) return found;
+        int looks = kMostLooks;
+        if (auto const found = pickInside(top, user, 0, looks)) return found;
     }
     return std::nullopt;
 }
@@ -117,7 +115,7 @@ std::optional<Picked> pickByHandles(std::wstring_view text) {
     std::optional<Picked> picked;
     for (bool isMore = true; isMore;) {
         std::size_t const end = text.find(kInside);
-        auto const handle = readHandle(text.substr(0, end));
+        auto const handle = readHandle(toUtf8(text.substr(0, end)));
         if (!handle) return std::nullopt;
         if (picked) {
             picked = findInside(*picked, *handle);

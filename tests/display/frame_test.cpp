@@ -157,6 +157,26 @@ TEST(Passes, EndWhereDrawablesDrawEachOther) {
     EXPECT_LE(pass.list().size(), 100U);
 }
 
+// Each drawable draws the next one twice, 2^20 in all. With a few more such a pass never ended.
+TEST(Passes, EndWhereDrawablesMultiply) {
+    int level = 0;
+    int drawn = 0;
+    TzDbEntity* self = nullptr;
+    Preview doubling([&](TzGiWorldDraw& draw) {
+        ++drawn;
+        if (++level < 20) {
+            draw.geometry().draw(self);
+            draw.geometry().draw(self);
+        }
+        --level;
+    });
+    self = &doubling;
+    DrawPass pass(nullptr, DrawPass::Entities::strokes);
+    pass.draw(&doubling);
+    EXPECT_EQ(drawn, 1 + DrawPass::kMostNested);
+    EXPECT_FALSE(pass.isWhole());
+}
+
 TEST(Passes, CarryTextsThroughTransforms) {
     TzGiTextStyle style;
     style.setTextSize(2);

@@ -61,6 +61,18 @@ protected:
         return id;
     }
 
+    TzDbObjectId addBlock(std::wstring const& name) {
+        TzDbBlockTable* table = nullptr;
+        EXPECT_EQ(drawing_->getBlockTable(table, TzDb::kForWrite), Tzad::eOk);
+        auto* const block = new TzDbBlockTableRecord;
+        EXPECT_EQ(block->setName(name.c_str()), Tzad::eOk);
+        TzDbObjectId id;
+        EXPECT_EQ(table->addRecord(block, id), Tzad::eOk);
+        block->close();
+        table->close();
+        return id;
+    }
+
     void post(std::unique_ptr<TzDbEntity> entity, wchar_t const* space) {
         TzDbBlockTable* table = nullptr;
         ASSERT_EQ(drawing_->getBlockTable(table, TzDb::kForRead), Tzad::eOk);
@@ -111,6 +123,27 @@ TEST_F(PlotFiles, ShowTextsOnTheirBackground) {
     EXPECT_GT(picture.count(kBlue), 500);
     EXPECT_GT(picture.count(0x000000), 500);
     EXPECT_GT(picture.count(0xFFFF00), 20000);
+}
+
+TEST_F(PlotFiles, RefuseBlocksThatStandForTooMuch) {
+    constexpr int kLevels = 20;
+    std::wstring inner = L"B0";
+    TzDbObjectId block = addBlock(inner);
+    for (int level = 1; level <= kLevels; ++level) {
+        std::wstring const outer =
+            level < kLevels ? L"B" + std::to_wstring(level) : kModelSpaceName;
+        TzDbObjectId const next = level < kLevels ? addBlock(outer) : block;
+        for (int i = 0; i < 2; ++i) {
+            auto reference = std::make_unique<TzDbBlockReference>();
+            ASSERT_EQ(reference->setBlockTableRecord(block), Tzad::eOk);
+            post(std::move(reference), outer.c_str());
+        }
+        block = next;
+    }
+    std::string const file = "doubled.svg";
+    EXPECT_EQ(plotDrawing(*drawing_, PlotFormat::svg, file),
+              "doubled.svg: blocks within blocks hold too much to plot");
+    EXPECT_FALSE(std::filesystem::exists(file));
 }
 
 TEST_F(PlotFiles, SayWhatWentWrong) {
