@@ -7,6 +7,7 @@
 #include "apps/tzdraft/session.h"
 #include "host/database/user_system.h"
 #include "tz/db/block_table.h"
+#include "tz/db/field.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"
@@ -36,6 +37,17 @@ Copy withoutAttributes(TzDbBlockReference const& reference) {
     return copy;
 }
 
+// A copy has the text of the original alone; the code that the text comes from goes with it too.
+void copyField(TzDbEntity const& from, TzDbEntity& to) {
+    TzDbField* found = nullptr;
+    if (from.getField(L"TEXT", found, TzDb::kForRead) != Tzad::eOk) return;
+    Opened<TzDbField> const original(found);
+    auto copy = std::make_unique<TzDbField>();
+    TzDbObjectId id;
+    if (copy->setFieldCode(original->getFieldCode(0), 0, nullptr) != Tzad::eOk) return;
+    if (to.setField(L"TEXT", copy.get(), id) == Tzad::eOk) (void)copy.release()->close();
+}
+
 void copyAttributes(TzDbBlockReference const& from,
                     TzDbBlockReference& to,
                     TzGeMatrix3d const& toBlock) {
@@ -48,7 +60,8 @@ void copyAttributes(TzDbBlockReference const& from,
         TzDbObjectId id;
         if (!copy || copy->transformBy(toBlock) != Tzad::eOk) continue;
         if (to.appendAttribute(id, static_cast<TzDbAttribute*>(copy.get())) != Tzad::eOk) continue;
-        (void)copy.release()->close();
+        Opened<TzDbEntity> const added(copy.release());
+        copyField(*attribute.get(), *added.get());
     }
 }
 
@@ -61,6 +74,7 @@ bool copyInto(TzDbBlockTableRecord& block, TzDbEntity const& entity, TzGeMatrix3
     if (!copy || copy->transformBy(toBlock) != Tzad::eOk) return false;
     if (block.appendTzDbEntity(id, copy.get()) != Tzad::eOk) return false;
     Opened<TzDbEntity> const added(copy.release());
+    copyField(entity, *added.get());
     if (reference)
         copyAttributes(*reference, static_cast<TzDbBlockReference&>(*added.get()), toBlock);
     return true;
