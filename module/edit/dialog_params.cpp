@@ -1,7 +1,6 @@
 #include "tz/mte/dialog_params.h"
 
 #include "module/access/class_registration.h"
-#include "module/edit/dialog_classes.h"
 
 namespace {
 

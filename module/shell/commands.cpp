@@ -47,9 +47,20 @@ void addCommand(TzString const& globalName,
                 TzString const& localName,
                 int flags,
                 void (*callback)()) {
+    // A name that is taken stays its owner's; the other commands are still added.
     if (TzEdCommandStack* const commands = commandStack())
-        commands->addCommand(gsCommandGroupName, globalName, localName, flags, callback, nullptr,
-                             -1, TzRxResourceInstance::empty, nullptr);
+        (void)commands->addCommand(gsCommandGroupName, globalName, localName, flags, callback,
+                                   nullptr, -1, TzRxResourceInstance::empty, nullptr);
+}
+
+void RegisterCommand(TzString const& globalName, TzString const& localName, void (*callback)()) {
+    addCommand(globalName, localName, kSeesSelection, callback);
+    Tzworks::Tzdraft::PAL::Diagnostics::outputDebugString(TzString::formatted(
+        L"  Registered command under the global name '%ls' and local name '%ls'\r\n",
+        globalName.kwszPtr(), localName.kwszPtr()));
+    // A command without help is a command all the same.
+    (void)tzedSetFunHelp(globalName, nullptr, globalName, 0);
+    (void)tzedSetFunHelp(localName, nullptr, globalName, 0);
 }
 
 }  // namespace
@@ -59,15 +70,6 @@ void InitGlobalStrings() {
         *command.globalVariable = command.globalName;
         *command.localVariable = loadResourceString(command.localNameId);
     }
-}
-
-void RegisterCommand(TzString const& globalName, TzString const& localName, void (*callback)()) {
-    addCommand(globalName, localName, kSeesSelection, callback);
-    Tzworks::Tzdraft::PAL::Diagnostics::outputDebugString(TzString::formatted(
-        L"  Registered command under the global name '%ls' and local name '%ls'\r\n",
-        globalName.kwszPtr(), localName.kwszPtr()));
-    tzedSetFunHelp(globalName, nullptr, globalName, 0);
-    tzedSetFunHelp(localName, nullptr, globalName, 0);
 }
 
 void registerCommands() {
@@ -81,6 +83,7 @@ void registerCommands() {
 }
 
 void unregisterCommands() {
+    // A group that is not there has nothing left to remove.
     if (TzEdCommandStack* const commands = commandStack())
-        commands->removeGroup(gsCommandGroupName);
+        (void)commands->removeGroup(gsCommandGroupName);
 }

@@ -1,9 +1,9 @@
 #include "module/shell/entry.h"
 
 #include "module/access/resources.h"
-#include "module/shell/font_database.h"
 #include "module/shell/registration.h"
 #include "tz/mte/entry_points.h"
+#include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/settings.h"
 #include "tz/rx/registry.h"
@@ -18,9 +18,11 @@ TzRxDynamicLinker* dynamicLinker() {
     return tzrxCast<TzRxDynamicLinker>(tzrxSysRegistry()->at(L"DynamicLinker"));
 }
 
+// A linker that does not know the handle loads the module all the same.
 void declareToLinker(void* appHandle) {
-    if (TzRxDynamicLinker* const linker = dynamicLinker()) linker->allowUnload(appHandle);
-    if (TzRxDynamicLinker* const linker = dynamicLinker()) linker->declareMultiDocument(appHandle);
+    if (TzRxDynamicLinker* const linker = dynamicLinker()) (void)linker->allowUnload(appHandle);
+    if (TzRxDynamicLinker* const linker = dynamicLinker())
+        (void)linker->declareMultiDocument(appHandle);
 }
 
 TzRx::AppRetCode load(void* appHandle) {

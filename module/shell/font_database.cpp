@@ -1,5 +1,3 @@
-#include "module/shell/font_database.h"
-
 #include "tz/mte/font_map_database.h"
 
 void LoadFontDatabase() {

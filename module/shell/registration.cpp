@@ -1,7 +1,7 @@
 #include "module/shell/registration.h"
 
 #include "module/access/class_registration.h"
-#include "module/edit/dialog_classes.h"
+#include "tz/mte/dialog_params.h"
 #include "tz/mte/edit_mtext.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/globals.h"

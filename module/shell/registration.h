@@ -1,7 +1,5 @@
 #pragma once
 
-#include "tz/text/string.h"
-
 // What the module makes known to the host at load, and takes back at unload: its classes, its
 // service, its commands, and for each drawing the functions of the interpreter. Called by the entry
 // alone, in the order in which they stand here.
@@ -11,9 +9,8 @@ void registerService();
 // The names of the seven commands: fixed global ones, and local ones from the resources, empty when
 // missing.
 void InitGlobalStrings();
-// Adds one command to the module's group, tells the debug output and registers its help. `callback`
-// is called without arguments when the command starts.
-void RegisterCommand(TzString const& globalName, TzString const& localName, void (*callback)());
+// Adds the commands under those names to the module's group. But for MTEXTPROPERTIES each one is
+// told to the debug output and gets its help registered.
 void registerCommands();
 
 // For one drawing: false as soon as the host refuses a function; those defined before it stay.

@@ -1,6 +1,7 @@
 #!/usr/bin/env python3
 """Turns the module's list of exported names into a linker version script, or compares it with the
-module and with the bodies that carry the export mark. Exit status 77 when there is no module."""
+module, with the bodies that carry the export mark and with the headers that declare them. Exit
+status 77 when there is no module."""
 import argparse
 import fnmatch
 import glob
@@ -9,6 +10,10 @@ import re
 import subprocess
 import sys
 
+import tree
+
+INTERFACE = "sdk/tz/mte/"
+MARKED_FUNCTION = re.compile(r"TZ_API[^;{}()]*?\b(\w+)\(")
 PLAIN = re.compile(r"^[A-Za-z_.$][\w.$]*$")
 
 
@@ -71,6 +76,22 @@ def fits(entry, mangled, readable):
     return entry in (mangled, readable)
 
 
+def misdeclared(symbols):
+    """Faults of the headers: other modules see sdk/ alone, and what it declares must be there."""
+    bodies = {shown.split("(")[0] for _, shown in symbols}
+    faults = []
+    for name in tree.tracked(".h"):
+        if not name.startswith(("module/", INTERFACE)):
+            continue
+        code = re.sub(r"//.*", "", "\n".join(tree.text_of(name)))
+        if name.startswith(INTERFACE):
+            faults += [f"{name}: declared but not exported: {function}"
+                       for function in MARKED_FUNCTION.findall(code) if function not in bodies]
+        elif "TZ_API" in code:
+            faults.append(f"{name}: what the module exports is declared in {INTERFACE}")
+    return faults
+
+
 def compare(names, module, archives):
     def unlisted(symbols):
         return [shown for mangled, shown in symbols
@@ -81,6 +102,7 @@ def compare(names, module, archives):
     faults += [f"marked and defined but not in the list: {name}" for name in unlisted(marked(archives))]
     faults += [f"in the list but not exported: {entry}" for entry in names
                if not any(fits(entry, *symbol) for symbol in symbols)]
+    faults += misdeclared(symbols)
     faults += [f"twice in the list: {name}" for name in sorted(set(names)) if names.count(name) > 1]
     return faults
 

@@ -8,7 +8,6 @@
 #include "host/base/font_map_path.h"
 #include "host/base/output.h"
 #include "module/access/string_table.h"
-#include "module/shell/font_database.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
 

@@ -74,6 +74,12 @@ private:
     TzApHostEditorParamsImp* imp_;  // owned
 };
 
+// [any] Make both parameter classes known to the host, ahead of tzrxBuildClassHierarchy, and take
+// that back, which does no harm when they are not known. The module calls them at its load and
+// unload.
+TZ_API void MteCoreDialogParamsRXInit();
+TZ_API void MteCoreDialogParamsRXUninit();
+
 // The dialogs, one of each in the process, made on first use.
 class TZ_API TzApHostDialogRawEditor : public TzApHostDialog {
 public:

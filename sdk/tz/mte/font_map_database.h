@@ -124,3 +124,12 @@ BuildFontDescription(CStdStrW face, bool bold, bool italic, Charset charset, int
 TZ_API bool GetOsFontInfo(CStdStrW const& face, Charset& charset, int& pitch);
 TZ_API int font_supports_charset(wchar_t const* face, int charset);
 TZ_API void find_supporting_font(int charset, CStdStrW& face, int& pitch);
+
+// [any] The tables' place in the life of the module: they outlive the objects that fill and empty
+// them. The module loads them at its load, which reads the big-font proxy alone, and empties them
+// at its unload.
+TZ_API void LoadFontDatabase();
+TZ_API void UnloadFontDatabase();
+// [any] LoadFontDatabase in the form of a thread's entry; always 0. No thread of the module's runs
+// it.
+TZ_API int FontDatabaseLoader(void* unused);
