@@ -2,7 +2,8 @@
 
 #include <functional>
 
-// Does one thing now and another one on every way out of the block. Either may be empty.
+// Does one thing now and another one on every way out of the block. Either may be empty. `leave`
+// must not throw: it runs in the destructor, where an exception ends the process.
 //
 //   TzScopeGuard const guard([&] { add(handler); }, [&] { remove(handler); });
 class [[nodiscard]] TzScopeGuard {

@@ -24,7 +24,8 @@ public:
     EasyHolder& operator=(EasyHolder const&) = delete;
     virtual ~EasyHolder() {
         if (!object) return;
-        if (flags & EasyFlags::kClose) object->close();
+        // A refusal to close leaves nothing that this holder could do.
+        if (flags & EasyFlags::kClose) (void)object->close();
         if (flags & EasyFlags::kDelete) delete object;
         object = nullptr;
     }

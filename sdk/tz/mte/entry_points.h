@@ -30,7 +30,7 @@ extern "C" {
 [[nodiscard]] TZ_API int doMTextCommandForAttDefCmd(TzDbMText* text);
 // [command] Opens an editor on a text that the caller has open and keeps, with the result of
 // InvokeEditorOn; no lock is tested, and null gives 3 without a message. The two ignored arguments
-// belong to the signature. A field that the session leaves is attached to the text.
+// belong to the signature. A field that an accepted session leaves is attached.
 [[nodiscard]] TZ_API int TzadEditMTextEntity(void* ignored,
                                              MTETabType tab,
                                              TzDbMText* text,

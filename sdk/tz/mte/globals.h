@@ -46,13 +46,13 @@ extern TZ_API double gdy;
 extern TZ_API EasyObject<TzDbMText>* gpText;  // null: the text being edited
 extern TZ_API void* gpFontList;               // null: font list of the dialog editor
 extern TZ_API std::uint8_t g_bEnableFieldUI;  // 1: whether fields may be typed as such; set at load
-extern TZ_API std::int32_t gPixelsPerInch;    // 0
+extern TZ_API std::int32_t gPixelsPerInch;    // 0; nothing reads or sets it
 
 // Conversion between markup and rich text.
 extern TZ_API std::int32_t g_nDefaultTabTwips;  // 0: default tab width, twips
 extern TZ_API double gdTweakFactor;             // 0.72: indents and tabs of the markup over twips
 extern TZ_API double g_dWidthFactor;            // 1: scaling of margins
-extern TZ_API std::int64_t TZDB_FIELDCODE_MODIFIED;  // 1
+extern TZ_API std::int64_t TZDB_FIELDCODE_MODIFIED;  // 1: flag of a field with a changed code
 extern TZ_API wchar_t const* gszStartOfStackToken;   // "\S"
 extern TZ_API wchar_t const* gszEndOfStackToken;     // "\s"
 extern TZ_API TzString g_sInitialFont;               // empty
@@ -67,7 +67,8 @@ extern TZ_API wchar_t const* gszIniKeyBigfontProxy;            // "Default Bigfo
 extern TZ_API TzString gsExtensionSHX;                         // ".shx"
 extern TZ_API TzString gsIniFileDatabase;                      // empty: path of the font map file
 
-// Names that the module registers; local names are empty until it is loaded.
+// Names that the module registers, empty until it is loaded: the global ones such as "MTEDIT", and
+// the local ones in the user's language.
 extern TZ_API TzString gsEditMtext_GlobalName, gsEditMtext_LocalName;
 extern TZ_API TzString gsCompatibleEditMtext_GlobalName, gsCompatibleEditMtext_LocalName;
 extern TZ_API TzString gsAlignText_GlobalName, gsAlignText_LocalName;
@@ -77,7 +78,7 @@ extern TZ_API TzString gsMtprop_GlobalName, gsMtprop_LocalName;
 extern TZ_API TzString gsMtextProperties_GlobalName, gsMtextProperties_LocalName;
 extern TZ_API TzString gsServiceName;            // empty; "TzMTextService_TZC" once loaded
 extern TZ_API TzString gsCommandGroupName;       // empty; "TZCORE_MTEXT" once loaded
-extern TZ_API TzString gsMtextRegistryKey;       // empty
+extern TZ_API TzString gsMtextRegistryKey;       // empty, also once loaded
 extern TZ_API TzString gsLocalizationSeparator;  // " _"
 extern TZ_API TzStringTable gStringTable;
 }

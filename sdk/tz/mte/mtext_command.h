@@ -13,12 +13,15 @@
 //
 //   TzxMtextCommand* command = newTzxMtextCommand();
 //   command->UseCommandLineEditor(true);
-//   if (command->DoMainPrompt(false, true)) command->CreateObject(nullptr, false);
+//   if (command->DoMainPrompt(false, true)) accepted = command->CreateObject(nullptr, false);
 //   delete command;
 //
 // Lengths in drawing units, angles in radians; points in world coordinates but for firstCornerUcs.
-// The constructor reads the drawing's defaults, so a drawing must be open. A question that returns
-// false was cancelled and changed nothing.
+// The constructor reads the drawing's defaults, so a drawing must be open.
+//
+// The questions, Do... [command], store their answers in the members below. False means that the
+// user cancelled: what was asked for last is as before, what was answered ahead of it stays. A
+// question that the host could not ask is asked again, where nothing else is said.
 
 // The options and the questions that commands share.
 class TZ_API TzxMtextCommandBase {
@@ -26,31 +29,47 @@ public:
     TzxMtextCommandBase();
 
     void UseCommandLineEditor(bool use) { useCommandLineEditor = use; }
-    // Whether a text style of that name is in the drawing.
+    // [any] Whether a text style of that name is in the drawing.
     [[nodiscard]] bool IsStyleNameOK(TzString const& name) const;
-    // Reads the options from an entity, or writes them to one that is open for write. They are not
+    // [read-open] Takes the options from an entity; [write-open] writes them to one. They are not
     // exact inverses: reading adds the working globals' angle to the rotation, writing does not
-    // take it away.
+    // take it away. A value that the entity refuses leaves it as it is.
     void setMTextOptionsFrom(TzDbMText* entity);
     void setMTextOptionsTo(TzDbMText* entity) const;
-    // The text height that the style in force gives.
+    // [any] Takes the text height that the command's style gives.
     void ComputeTextSize();
-    // Factor 1, at least.
+    // [any] Factor 1, at least.
     void ResetLineSpacing();
-    // Stores a factor from 0.25 to 4; false for any other.
-    bool ValidateLineSpacingFactor(double factor);
+    // [any] Stores a factor from 0.25 to 4; false for any other. One that misses a limit by no more
+    // than the rounding of the drawing's units is pulled onto it.
+    [[nodiscard]] bool ValidateLineSpacingFactor(double factor);
     [[nodiscard]] double getTextHeight() const { return textHeight; }
 
-    bool DoAttachPrompt();
-    bool DoRotatePrompt();
-    bool DoHeightPrompt(bool useBase);
-    bool DoWidth();
-    bool DoLineSpacingStylePrompt();
-    bool DoLineSpacingFactorPrompt();
-    bool DoLineSpacingPrompts();
-    bool DoTextString();
-    bool DoStylePrompt();
-    // Lists the drawing's text styles.
+    // Which of the nine points of its box the text is attached to. Enter takes the top left one,
+    // whatever the attachment was.
+    [[nodiscard]] bool DoAttachPrompt();
+    // The rotation, as an angle or by a point from the first corner; Enter keeps it.
+    [[nodiscard]] bool DoRotatePrompt();
+    // The text height; Enter keeps it. For an annotative style it is asked for, and shown, times
+    // the annotation scale. With `useBase` a point is measured from the first corner, else from a
+    // first point. Asked once: a failed question changes nothing and gives true.
+    [[nodiscard]] bool DoHeightPrompt(bool useBase);
+    // The width of the box; Enter gives 0, a text that does not wrap. Asked once, as the height is.
+    [[nodiscard]] bool DoWidth();
+    // At least or exactly; Enter keeps what it is.
+    [[nodiscard]] bool DoLineSpacingStylePrompt();
+    // The distance of lines, or a factor written with an x behind it; Enter keeps the factor. One
+    // outside the limits is told and asked for again.
+    [[nodiscard]] bool DoLineSpacingFactorPrompt();
+    // Both, in this order. Cancelled at the factor, the new style stays.
+    [[nodiscard]] bool DoLineSpacingPrompts();
+    // The text, line by line up to an empty one; each line is a paragraph.
+    [[nodiscard]] bool DoTextString();
+    // The text style, asked again for one that is not in the drawing or belongs to another drawing
+    // ("|" in its name); "?" lists the styles. Enter keeps it, and a failed question too. The text
+    // height stays.
+    [[nodiscard]] bool DoStylePrompt();
+    // [command] Asks for a pattern, and lists the drawing's text styles that fit it.
     static void EnumerateStyles();
 
     bool useCommandLineEditor = false;  // the text comes from the command line, not from an editor
@@ -76,20 +95,35 @@ public:
     TzxMtextCommand();
     ~TzxMtextCommand() override;
 
-    // The first corner and, when wanted, the second one; `forAttribute` for an attribute's text.
-    bool DoMainPrompt(bool forAttribute, bool wantSecondPoint);
-    bool DoSecondPointPrompt(bool forAttribute);
-    // The column questions: -1 cancelled, 0 no columns, 1 columns set up.
-    int DoColumnPrompt();
-    bool DoColumnCountPrompt();
-    bool DoTotalWidthPrompt();
-    bool DoColumnWidthPrompt();
-    bool DoColumnGutterPrompt();
-    bool DoColumnHeightPrompt();
-    // Makes the entity: a new one, posted to the drawing, with `existing` null; else fills the
-    // caller's, which is not posted. True when the text was accepted.
-    int CreateObject(TzDbMText* existing, bool forAttribute);
-    // For outside callers, instead of the first questions.
+    // The first corner, which goes to both points and to LASTPOINT, and, when wanted, the second
+    // one. Enter takes the place where the preview stands. `forAttribute` asks for an attribute's
+    // text: other words, no line about style and height.
+    [[nodiscard]] bool DoMainPrompt(bool forAttribute, bool wantSecondPoint);
+    // The opposite corner, from `location`, with the options as keywords; columns are none for an
+    // attribute. A pick, or Enter, takes the box as it is dragged. A width, or columns, asked for
+    // by keyword end the question too, and the text then begins at the first corner. A new height
+    // or style resets the line spacing. Cancelled at an option, the whole question is.
+    [[nodiscard]] bool DoSecondPointPrompt(bool forAttribute);
+    // The kind of columns, then its sizes: -1 cancelled, 0 no columns, 1 columns set up. Enter
+    // chooses dynamic columns of automatic height; a failed question goes on with the present kind.
+    [[nodiscard]] int DoColumnPrompt();
+    // From 2 to 100; Enter gives 2.
+    [[nodiscard]] bool DoColumnCountPrompt();
+    // Sizes. Enter gives 80, 30, 5 and 10 text heights; each is asked once, and a failed question
+    // changes nothing and gives true. The total width becomes boxWidth, the height boxHeight.
+    [[nodiscard]] bool DoTotalWidthPrompt();
+    [[nodiscard]] bool DoColumnWidthPrompt();
+    [[nodiscard]] bool DoColumnGutterPrompt();
+    [[nodiscard]] bool DoColumnHeightPrompt();
+    // [command] Makes the entity from the options and asks for its text: 1 when the user accepted
+    // that, else 0. With `existing` null a new entity is posted to the drawing; one that is not
+    // accepted is deleted, one that the drawing refuses is lost, and the result is still 1. Else it
+    // fills the caller's entity, which must be open for write or in no drawing, stays open and is
+    // not posted; not accepted, it keeps the options that it got. Accepted, the options become the
+    // drawing's defaults for new texts. `forAttribute` is for the text of an attribute, which is
+    // not moved to the layer of new texts. Column sizes and the text height may change on the way.
+    [[nodiscard]] int CreateObject(TzDbMText* existing, bool forAttribute);
+    // [any] For outside callers, instead of the first questions.
     void setInitialProperties(TzGePoint3d const& location,
                               double width,
                               double rotation,
