@@ -14,6 +14,6 @@ bool CEasyUpgrade::Upgrade(TzDbObject* toUpgrade) {
 }
 
 void CEasyUpgrade::Downgrade() {
-    if (object) object->downgradeOpen();
+    if (object) (void)object->downgradeOpen();  // refused, it is open for write until it is closed
     object = nullptr;
 }

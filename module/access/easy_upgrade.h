@@ -7,7 +7,8 @@ class TzDbObject;
 //   CEasyUpgrade writable;
 //   if (!text->isWriteEnabled() && !writable.Upgrade(text)) return;
 //
-// The object stays open at least as long as the holder lives.
+// One holder serves one object, which stays open at least as long as the holder lives: a second
+// object that is upgraded takes the first one's place, and the first stays open for write.
 class CEasyUpgrade {
 public:
     CEasyUpgrade() = default;
@@ -15,9 +16,9 @@ public:
     CEasyUpgrade& operator=(CEasyUpgrade const&) = delete;
     virtual ~CEasyUpgrade();
 
-    // Whether this holder has made the object writable, now or before; false for an object that is
-    // writable by itself, and when the host refuses.
-    virtual bool Upgrade(TzDbObject* toUpgrade);
+    // True when this holder has made the object writable, now or by an earlier call. False when the
+    // host refuses, and for an object that was writable before the holder's first upgrade.
+    [[nodiscard]] virtual bool Upgrade(TzDbObject* toUpgrade);
     // Gives back what Upgrade took; the destructor does the same.
     virtual void Downgrade();
 

@@ -14,12 +14,12 @@ public:
     [[nodiscard]] virtual bool IsAttached() const;
     // Takes a handle over without closing one held before. The invalid handle, all bits set, is
     // refused and gives false; null gives false too, but is stored.
-    virtual bool Attach(void* newHandle);
+    [[nodiscard]] virtual bool Attach(void* newHandle);
     virtual bool operator=(void* newHandle);
     // Hands the handle to the caller, open as it is.
-    virtual void* Detach();
+    [[nodiscard]] virtual void* Detach();
     // Closes the handle; false without one, or when the host refused.
-    virtual bool Close();
+    [[nodiscard]] virtual bool Close();
     virtual operator void*() const;
     [[nodiscard]] virtual void* Handle() const;
 

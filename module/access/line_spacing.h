@@ -12,9 +12,9 @@ inline constexpr double kLargestLineSpacingFactor = 4.0;
 
 // The variables TSPACEFAC and TSPACETYPE; a setter gives false when the host refused.
 [[nodiscard]] double GetLineSpacingFactor();
-bool SetLineSpacingFactor(double factor);
+[[nodiscard]] bool SetLineSpacingFactor(double factor);
 [[nodiscard]] TzDb::LineSpacingStyle GetLineSpacingStyle();
-bool SetLineSpacingStyle(TzDb::LineSpacingStyle style);
+[[nodiscard]] bool SetLineSpacingStyle(TzDb::LineSpacingStyle style);
 
 // Whether a factor lies within the limits, both included; false for NaN.
 [[nodiscard]] bool ValidateLineSpacingFactor(double factor);

@@ -11,7 +11,7 @@ enum VerticalAlignment : std::int32_t { kAlignBottom = 0, kAlignMiddle = 1, kAli
 // Per cent of the text height, the variable TSTACKSIZE; the setter gives false when the host
 // refused.
 [[nodiscard]] int GetDefaultStackScale();
-bool SetDefaultStackScale(int percent);
+[[nodiscard]] bool SetDefaultStackScale(int percent);
 // The variable TSTACKALIGN.
 [[nodiscard]] VerticalAlignment GetDefaultStackAlignment();
-bool SetDefaultStackAlignment(VerticalAlignment alignment);
+[[nodiscard]] bool SetDefaultStackAlignment(VerticalAlignment alignment);

@@ -8,7 +8,7 @@ class TzGePoint3d;
 // does not convert, gives the neutral value. Names count without case.
 //
 //   double const height = CTzadSysVar::GetDouble(L"TEXTSIZE");
-//   CTzadSysVar::SetInt(L"TSPACETYPE", 2);
+//   bool const stored = CTzadSysVar::SetInt(L"TSPACETYPE", 2);
 class CTzadSysVar {
 public:
     // The value as text: a real in its shortest form with up to six digits, a whole number in
@@ -20,7 +20,7 @@ public:
     [[nodiscard]] static double GetDouble(wchar_t const* name);
 
     // Write a variable of that type; false when the host refused. SetInt writes the low 16 bits.
-    static bool SetInt(wchar_t const* name, int value);
-    static bool SetDouble(wchar_t const* name, double value);
-    static bool SetPoint(wchar_t const* name, TzGePoint3d const& point);
+    [[nodiscard]] static bool SetInt(wchar_t const* name, int value);
+    [[nodiscard]] static bool SetDouble(wchar_t const* name, double value);
+    [[nodiscard]] static bool SetPoint(wchar_t const* name, TzGePoint3d const& point);
 };

@@ -4,4 +4,5 @@
 
 // Opens the editor on the text that one of the host's older names means; the result is that of
 // InvokeEditorOn, 3 for a name of no object.
-int EditMtextByAdsName(long long const* name, MTETabType tab, bool interactive, bool view);
+[[nodiscard]] int
+EditMtextByAdsName(long long const* name, MTETabType tab, bool interactive, bool view);

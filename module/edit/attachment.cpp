@@ -45,5 +45,6 @@ void UpdateAttachPoint(EasyObject<TzDbMText>& text,
     BoxFactors const from = factorsOf(text->attachment());
     BoxFactors const to = factorsOf(newPoint);
     TzGePoint3d const topLeft = text->location() - across * from.width - down * from.height;
-    text->setLocation(topLeft + across * to.width + down * to.height);
+    // A place that is not finite is refused, and the text stays where it is.
+    (void)text->setLocation(topLeft + across * to.width + down * to.height);
 }

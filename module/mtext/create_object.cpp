@@ -32,22 +32,23 @@ constexpr int kMadeText = 0x98;
 // What a text is made for.
 enum class Purpose { drawing, attribute };
 
+// A value that the text refuses leaves the text's own, here and below: it is made all the same.
 void fillEntity(TzxMtextCommand const& command,
                 TzDbMText& text,
                 TzDbObjectId style,
                 Purpose purpose) {
     UserAxes const axes = activeUserAxes();
     text.setDatabaseDefaults(tzdbHostApplicationServices()->workingDatabase());
-    text.setNormal(axes.normal);
-    text.setLocation(pointOf(command.location));
-    text.setTextStyle(style);
-    text.setLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
-    text.setLineSpacingFactor(command.lineSpacingFactor);
+    (void)text.setNormal(axes.normal);
+    (void)text.setLocation(pointOf(command.location));
+    (void)text.setTextStyle(style);
+    (void)text.setLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
+    (void)text.setLineSpacingFactor(command.lineSpacingFactor);
     if (purpose == Purpose::drawing) TzTextSetLayer::setTextLayer(&text);
-    text.setDirection(axes.turned(command.rotation).x.normalize());
-    text.setTextHeight(command.textHeight);
-    text.setAttachment(MapAttachment(command.attachmentId));
-    text.setWidth(command.boxWidth);
+    (void)text.setDirection(axes.turned(command.rotation).x.normalize());
+    (void)text.setTextHeight(command.textHeight);
+    (void)text.setAttachment(MapAttachment(command.attachmentId));
+    (void)text.setWidth(command.boxWidth);
 }
 
 // The columns share the box's width; gutters that would eat all of it are dropped.
@@ -56,20 +57,21 @@ void setStaticColumns(TzxMtextCommand& command, TzDbMText& text) {
     int const gutters = columns.columnCount - 1;
     if (gutters * columns.columnGutter > command.boxWidth) columns.columnGutter = 0;
     columns.columnWidth = (command.boxWidth - gutters * columns.columnGutter) / columns.columnCount;
-    text.setHeight(command.boxHeight);
-    text.setStaticColumns(columns.columnWidth, columns.columnGutter, columns.columnCount);
+    (void)text.setHeight(command.boxHeight);
+    (void)text.setStaticColumns(columns.columnWidth, columns.columnGutter, columns.columnCount);
 }
 
 // Columns that were not asked for are as wide as the box.
 void setDynamicColumns(TzxMtextCommand& command, TzDbMText& text) {
     TextEditorColumns& columns = command.columns;
     if (command.columnsConfirmed)
-        text.setWidth(columns.columnWidth);
+        (void)text.setWidth(columns.columnWidth);
     else
         columns.columnWidth = command.boxWidth;
-    if (columns.autoHeight) text.setHeight(command.boxHeight);
-    text.setDynamicColumns(columns.columnWidth, columns.columnGutter, columns.autoHeight);
-    if (!command.columnsConfirmed) text.setColumnGutterWidth(command.textHeight * kGutterHeights);
+    if (columns.autoHeight) (void)text.setHeight(command.boxHeight);
+    (void)text.setDynamicColumns(columns.columnWidth, columns.columnGutter, columns.autoHeight);
+    if (!command.columnsConfirmed)
+        (void)text.setColumnGutterWidth(command.textHeight * kGutterHeights);
 }
 
 void setColumns(TzxMtextCommand& command, TzDbMText& text) {
@@ -80,8 +82,8 @@ void setColumns(TzxMtextCommand& command, TzDbMText& text) {
     }
 }
 
-// Makes the text annotative as its style is. Gives the text's extension, null without one or when
-// the style cannot be opened.
+// Makes the text annotative as its style is, unless the host refuses. Gives the text's extension,
+// null without one or when the style cannot be opened.
 TzDbAnnotativeObjectPE* followStyle(TzDbMText& text, TzDbObjectId styleId) {
     EasyObject<TzDbTextStyleTableRecord> style;
     if (tzdbOpenObject(style.object, styleId, TzDb::kForRead) != Tzad::eOk) return nullptr;
@@ -89,17 +91,17 @@ TzDbAnnotativeObjectPE* followStyle(TzDbMText& text, TzDbObjectId styleId) {
     auto* const ofText = tzrxQuery<TzDbAnnotativeObjectPE>(&text);
     bool const annotative = ofStyle && ofStyle->annotative(style.object);
     if (!annotative || !ofText) return ofText;
-    ofText->setAnnotative(&text, true);
+    (void)ofText->setAnnotative(&text, true);
     auto* const orientation = tzrxQuery<TzDbPaperOrientationPE>(style.object);
     if (orientation && orientation->paperOrientation(style.object))
-        orientation->setPaperOrientation(&text, true);
+        (void)orientation->setPaperOrientation(&text, true);
     return ofText;
 }
 
 bool typeText(TzxMtextCommand& command, TzDbMText& text) {
     if (!command.DoTextString()) return false;
     if (!g_bEnableFieldUI) command.contents = withFieldsEvaluated(command.contents);
-    text.setContents(command.contents);
+    (void)text.setContents(command.contents);
     return true;
 }
 
@@ -109,23 +111,24 @@ bool editText(TzxMtextCommand const& command, EasyObject<TzDbMText>& text, Purpo
                                       purpose == Purpose::attribute, false, false);
     if (result != kEditorAccepted) return false;
     TzDbMText::AttachmentPoint const attachment = text->attachment();
-    text->setLocation(pointOf(command.location));
+    (void)text->setLocation(pointOf(command.location));
     if (!command.boxDragged) return true;
-    text->setAttachment(MapAttachment(command.attachmentId));
+    (void)text->setAttachment(MapAttachment(command.attachmentId));
     UpdateAttachPoint(text, attachment, command.boxHeight);
-    text->setAttachment(attachment);
+    (void)text->setAttachment(attachment);
     return true;
 }
 
-// The options become what the drawing's next text begins with.
+// The options become what the drawing's next text begins with. What the drawing refuses stays as it
+// is.
 void storeDefaults(TzxMtextCommand& command, TzDbObjectId style) {
     TzDbDatabase* const database = tzdbHostApplicationServices()->workingDatabase();
     if (StyleIsAnnotative(database->textstyle()))
         command.textHeight *= CTzadSysVar::GetDouble(L"CANNOSCALEVALUE");
-    CTzadSysVar::SetDouble(L"TEXTSIZE", command.textHeight);
-    (void)database->setTextstyle(style);  // a drawing that refuses keeps the style that it has
-    SetLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
-    SetLineSpacingFactor(command.lineSpacingFactor);
+    (void)CTzadSysVar::SetDouble(L"TEXTSIZE", command.textHeight);
+    (void)database->setTextstyle(style);
+    (void)SetLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));
+    (void)SetLineSpacingFactor(command.lineSpacingFactor);
 }
 
 }  // namespace

@@ -21,10 +21,10 @@ Tzad::ErrorStatus evaluate(TzDbField& field) {
 TzString withFieldsEvaluated(TzString const& text) {
     if (!tzdbHasFields(text, 1)) return text;
     auto const field = std::make_unique<TzDbField>();
-    field->setFieldCode(text, 0, nullptr);
+    (void)field->setFieldCode(text, 0, nullptr);  // refused, it has no value
     TzString const result =
         evaluate(*field) == Tzad::eOk ? field->getFieldCode(kEvaluatedText) : text;
-    field->close();
+    (void)field->close();
     return result;
 }
 

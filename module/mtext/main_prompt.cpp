@@ -59,7 +59,8 @@ void printStatusLine(TzxMtextCommand const& command) {
 }  // namespace
 
 bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
-    if (StyleIsAnnotative(GetTextStyleID(styleName))) tzedInvokeAnnoSelectScaleDlg();
+    if (StyleIsAnnotative(GetTextStyleID(styleName)))
+        (void)tzedInvokeAnnoSelectScaleDlg();  // whatever it answers, the scale in force counts
     if (!forAttribute) printStatusLine(*this);
 
     CTzsMtextFirstPointJig jig(TzGePoint3d::kOrigin);
@@ -72,11 +73,12 @@ bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
         if (status == statusCancel) return false;
     }
 
+    // What the host refuses here stays as it is; the corner holds without it.
     TzGePoint3d const corner = jig.cursor();
     setCoordinates(firstCornerUcs, corner);
-    tzdbWcs2Ucs(firstCornerUcs, firstCornerUcs, false);
+    (void)tzdbWcs2Ucs(firstCornerUcs, firstCornerUcs, false);
     setCoordinates(location, corner);
-    CTzadSysVar::SetPoint(L"LASTPOINT", corner);
+    (void)CTzadSysVar::SetPoint(L"LASTPOINT", corner);
     telemetry.set_start_point(input.getInputData());
     telemetry.SendEvent(kCornerPhase, kAskedCorner);
     if (wantSecondPoint) return DoSecondPointPrompt(forAttribute);

@@ -75,17 +75,18 @@ void TzxMtextCommandBase::setMTextOptionsFrom(TzDbMText* entity) {
     rotation = entity->rotation() + workingAngle();
 }
 
+// A value that the entity refuses leaves the entity's own.
 void TzxMtextCommandBase::setMTextOptionsTo(TzDbMText* entity) const {
-    entity->setAttachment(MapAttachment(attachmentId));
-    entity->setWidth(boxWidth);
-    entity->setTextStyle(GetTextStyleID(styleName));
-    entity->setTextHeight(textHeight);
-    entity->setLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(lineSpacingStyle));
-    entity->setLineSpacingFactor(lineSpacingFactor);
-    entity->setLocation(pointOf(location));
+    (void)entity->setAttachment(MapAttachment(attachmentId));
+    (void)entity->setWidth(boxWidth);
+    (void)entity->setTextStyle(GetTextStyleID(styleName));
+    (void)entity->setTextHeight(textHeight);
+    (void)entity->setLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(lineSpacingStyle));
+    (void)entity->setLineSpacingFactor(lineSpacingFactor);
+    (void)entity->setLocation(pointOf(location));
     UserAxes const axes = activeUserAxes();
-    entity->setNormal(axes.normal);
-    entity->setDirection(axes.turned(rotation).x.normalize());
+    (void)entity->setNormal(axes.normal);
+    (void)entity->setDirection(axes.turned(rotation).x.normalize());
 }
 
 TzRxClass* TzxMtextCommand::gpDesc = nullptr;

@@ -18,15 +18,15 @@ TzDbDatabase& workingDatabase() {
     return *tzdbHostApplicationServices()->workingDatabase();
 }
 
-// Ortho mode off, and back as it was on every way out.
+// Ortho mode off, and back as it was on every way out. A drawing that refuses keeps its mode.
 class WithoutOrtho {
 public:
     WithoutOrtho() : before_(workingDatabase().orthomode()) {
-        workingDatabase().setOrthomode(false);
+        (void)workingDatabase().setOrthomode(false);
     }
     WithoutOrtho(WithoutOrtho const&) = delete;
     WithoutOrtho& operator=(WithoutOrtho const&) = delete;
-    ~WithoutOrtho() { workingDatabase().setOrthomode(before_); }
+    ~WithoutOrtho() { (void)workingDatabase().setOrthomode(before_); }
 
 private:
     bool before_;

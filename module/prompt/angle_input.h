@@ -18,9 +18,10 @@ public:
 
     // In the drawing's angular units.
     [[nodiscard]] TzString FormattedReal() const override;
+    // The angle of the last answer, or the default behind an empty one; GetReal by another name.
     [[nodiscard]] virtual double GetAngle() const;
 
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 protected:
     BasePoint basePoint_;
@@ -31,5 +32,5 @@ class CTzsOrientationInput : public CTzsAngleInput {
 public:
     using CTzsAngleInput::CTzsAngleInput;
 
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 };

@@ -18,9 +18,10 @@ public:
 
     // In the drawing's linear units.
     [[nodiscard]] TzString FormattedReal() const override;
+    // The length of the last answer, or the default behind an empty one; GetReal by another name.
     [[nodiscard]] virtual double GetDistance() const;
 
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 private:
     BasePoint basePoint_;

@@ -29,7 +29,7 @@ TzString CTzsInput::GetInput() {
 
 unsigned int CTzsInput::GetKeyword() {
     unsigned int id = 0;
-    keywords.FindKeyword(GetInput(), id);
+    (void)keywords.FindKeyword(GetInput(), id);  // sets 0 when there is none
     return id;
 }
 
@@ -72,7 +72,8 @@ unsigned int CTzsInput::GetFlags() const {
 }
 
 void CTzsInput::Init() {
-    tzedInitGet(static_cast<int>(flags), keywordList);
+    // A host that does not arm the question asks it without keywords.
+    (void)tzedInitGet(static_cast<int>(flags), keywordList);
 }
 
 TzString CTzsInput::DefaultPrompt(TzString const& text) const {

@@ -30,11 +30,11 @@ public:
     CTzsInput& operator=(CTzsInput const&) = delete;
 
     // Asks once and ends the line; the status.
-    virtual int Prompt();
+    [[nodiscard]] virtual int Prompt();
     // The text of the last answer: the global word of a keyword, or free text.
-    virtual TzString GetInput();
+    [[nodiscard]] virtual TzString GetInput();
     // The id of the keyword that was answered; 0 when the answer is none.
-    virtual unsigned int GetKeyword();
+    [[nodiscard]] virtual unsigned int GetKeyword();
     virtual ~CTzsInput();
     // The keywords as tzedInitGet takes them: local words, a separator, global words.
     [[nodiscard]] virtual TzString KeywordList() const;
@@ -45,10 +45,13 @@ public:
     [[nodiscard]] virtual TzString PromptString() const = 0;
     // The two steps of Prompt: arms the host for the next question; asks the host for the status.
     virtual void Init();
-    virtual int OnPrompt(TzString const& prompt) = 0;
+    [[nodiscard]] virtual int OnPrompt(TzString const& prompt) = 0;
+    // The flags of the next questions: as given at first, without bit 0 once a value input has a
+    // default.
     virtual void SetFlags(unsigned int newFlags);
     [[nodiscard]] virtual unsigned int GetFlags() const;
 
+    // How many keywords the question has.
     [[nodiscard]] int GetKeywordCount() const { return keywords.GetCount(); }
 
 protected:

@@ -14,14 +14,18 @@ public:
 
     // Also lets an empty answer through (bit 0 of the flags) that the flags refused.
     virtual void SetDefault(int value);
+    // The last answer, or the default behind an empty one; 0 before one, and as it was after a
+    // failure or a cancel.
     [[nodiscard]] virtual int GetInteger() const;
     // The default as the prompt shows it.
     [[nodiscard]] virtual TzString FormattedInteger() const;
+    // 0 before SetDefault.
     [[nodiscard]] virtual int GetDefault() const;
+    // Whether SetDefault was called.
     [[nodiscard]] virtual bool HasDefault() const;
 
     [[nodiscard]] TzString PromptString() const override;
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 private:
     int result_ = 0;

@@ -18,10 +18,11 @@ public:
     // What the host draws: the preview itself.
     [[nodiscard]] virtual TzDbEntity* GetJigEntity();
     // A sample of the cursor. The body says that nothing changed.
-    virtual TzEdJig::DragStatus OnSample(TzEdJig& jig) = 0;
+    [[nodiscard]] virtual TzEdJig::DragStatus OnSample(TzEdJig& jig) = 0;
     // Called when a sample changed something; true to be drawn.
-    virtual bool OnUpdate(TzEdJig& jig);
+    [[nodiscard]] virtual bool OnUpdate(TzEdJig& jig);
 
+    // A point for the derived class to keep, from which its drag starts; the origin at first.
     void SetBasePoint(TzGePoint3d const& point);
     void SetBasePoint(double const (&point)[3]);
     [[nodiscard]] TzGePoint3d GetBasePoint() const;

@@ -18,12 +18,12 @@ public:
                  TzString const& prompt);
 
     // The keyword that ended the drag; 0 when none did.
-    unsigned int GetKeyword() override;
+    [[nodiscard]] unsigned int GetKeyword() override;
     [[nodiscard]] TzString PromptString() const override;
     // What the last drag learned, for telemetry; valid as long as the input.
     [[nodiscard]] TzEdJigInputData const& getInputData() const;
     void Init() override;
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 private:
     CTzsJigHandler driver_;

@@ -15,10 +15,11 @@ public:
     virtual void SetDefault(unsigned int keywordId);
     // 0 before SetDefault.
     [[nodiscard]] virtual unsigned int GetDefault() const;
+    // Whether SetDefault was called.
     [[nodiscard]] virtual bool HasDefault() const;
 
     [[nodiscard]] TzString PromptString() const override;
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 private:
     bool hasDefault_ = false;

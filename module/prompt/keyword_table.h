@@ -22,6 +22,7 @@ public:
     CKeywordTable(CKeywordTable const& other) = default;
     CKeywordTable& operator=(CKeywordTable const& other) = default;
 
+    // How many keywords there are.
     [[nodiscard]] int GetCount() const { return keywordCount; }
     // Reads the texts; what follows needs them.
     void LoadStrings();
@@ -32,7 +33,7 @@ public:
     [[nodiscard]] unsigned int GetKeywordID(int index) const { return keywordIds[index]; }
     // The first keyword whose global word is `input`, whatever its case; false, and an id of 0,
     // when there is none.
-    bool FindKeyword(TzString const& input, unsigned int& id) const;
+    [[nodiscard]] bool FindKeyword(TzString const& input, unsigned int& id) const;
     // One part of the keyword with that id; empty when the table lacks it.
     [[nodiscard]] TzString GetKeywordString(unsigned int id, bool local) const;
 

@@ -21,7 +21,7 @@ void CTzsPointInput::GetPoint(double* point) const {
 
 void CTzsPointInput::GetPointInWorldCS(double* point) const {
     GetPoint(point);
-    tzdbUcs2Wcs(point, point, false);
+    (void)tzdbUcs2Wcs(point, point, false);  // refused, the coordinates stay as they were given
 }
 
 TzString CTzsPointInput::PromptString() const {

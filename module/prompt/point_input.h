@@ -34,7 +34,7 @@ public:
     virtual void GetPointInWorldCS(double* point) const;
 
     [[nodiscard]] TzString PromptString() const override;
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 private:
     BasePoint basePoint_;

@@ -6,26 +6,29 @@
 //
 //   CTzsRealInput input(6, none, gStringTable[1111]);
 //   input.SetDefault(6.0);
-//   input.Prompt();
-//   use(input.GetReal());
+//   if (input.Prompt() != statusCancel) use(input.GetReal());
 class CTzsRealInput : public CTzsInput {
 public:
     using CTzsInput::CTzsInput;
 
     // Also lets an empty answer through (bit 0 of the flags) that the flags refused.
     virtual void SetDefault(double value);
+    // The last answer, or the default behind an empty one; 0 before one, and as it was after a
+    // failure or a cancel.
     [[nodiscard]] virtual double GetReal() const;
     // The default as the prompt shows it: a length in the drawing's units.
     [[nodiscard]] virtual TzString FormattedReal() const;
+    // 0 before SetDefault.
     [[nodiscard]] virtual double GetDefault() const;
+    // Whether SetDefault was called.
     [[nodiscard]] virtual bool HasDefault() const;
 
     [[nodiscard]] TzString PromptString() const override;
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 protected:
     // Puts the default in place of an empty answer; the status is handed through.
-    int WithDefault(int status);
+    [[nodiscard]] int WithDefault(int status);
 
     double result_ = 0;
 

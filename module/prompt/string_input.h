@@ -14,15 +14,16 @@ public:
                     TzString const& prompt,
                     bool allowSpaces);
 
-    TzString GetInput() override;
+    [[nodiscard]] TzString GetInput() override;
     // The text that the prompt shows as the answer to Enter; the caller applies it.
     virtual void SetDefault(TzString const& text);
     // Empty before SetDefault.
     [[nodiscard]] virtual TzString GetDefault() const;
+    // Whether SetDefault was called.
     [[nodiscard]] virtual bool HasDefault() const;
 
     [[nodiscard]] TzString PromptString() const override;
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 
 private:
     bool allowSpaces_;
@@ -35,5 +36,5 @@ class CTzsSymbolStringInput : public CTzsStringInput {
 public:
     CTzsSymbolStringInput(unsigned int theFlags, CKeywordTable& table, TzString const& prompt);
 
-    int OnPrompt(TzString const& prompt) override;
+    [[nodiscard]] int OnPrompt(TzString const& prompt) override;
 };

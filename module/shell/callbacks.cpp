@@ -24,14 +24,15 @@ bool always() {
     return true;
 }
 
-// MTEXTCOMMANDACTIVE stays 1 when an exception passes.
+// MTEXTCOMMANDACTIVE stays 1 when an exception passes. The command runs whether or not the host
+// keeps that variable, and a text that was not accepted was not made.
 void runMtext(bool (*commandLineEditor)()) {
     gdJigBoundBoxHeight = 0;
     std::unique_ptr<TzxMtextCommand> const command(newTzxMtextCommand());
-    CTzadSysVar::SetInt(L"MTEXTCOMMANDACTIVE", 1);
+    (void)CTzadSysVar::SetInt(L"MTEXTCOMMANDACTIVE", 1);
     command->UseCommandLineEditor(commandLineEditor());
-    if (command->DoMainPrompt(false, true)) command->CreateObject(nullptr, false);
-    CTzadSysVar::SetInt(L"MTEXTCOMMANDACTIVE", 0);
+    if (command->DoMainPrompt(false, true)) (void)command->CreateObject(nullptr, false);
+    (void)CTzadSysVar::SetInt(L"MTEXTCOMMANDACTIVE", 0);
 }
 
 void editOneMtext(MTETabType tab) {

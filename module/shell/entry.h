@@ -7,7 +7,7 @@
 
 // Loads, unloads, serves the functions of the interpreter; 0, or 3 for a failure. Any message that
 // is none of the five does nothing and gives 0. `appHandle` counts for loading alone.
-int tzrxEntryPoint_Mte(TzRx::AppMsgCode message, void* appHandle);
+[[nodiscard]] int tzrxEntryPoint_Mte(TzRx::AppMsgCode message, void* appHandle);
 
 // Never attached: the module has no thread but the host's.
 extern CHandleObject ghBackgroundThread;

@@ -33,27 +33,30 @@ constexpr unsigned int kNeedsEntityMessage = 163;
 bool defineFunctions() {
     for (Function const& function : kFunctions)
         if (tzedDefun(*function.name, function.code) != Tzad::ePromptNormal) return false;
-    tzedSetFunHelp(gsEditMtext_GlobalName, nullptr, gsEditMtext_GlobalName, 0);
-    tzedSetFunHelp(gsEditMtext_LocalName, nullptr, gsEditMtext_GlobalName, 0);
-    tzedSetFunHelp(gsAlignText_GlobalName, nullptr, gsAlignText_GlobalName, 0);
-    tzedSetFunHelp(gsAlignText_LocalName, nullptr, gsAlignText_GlobalName, 0);
+    // A function without help is a function all the same.
+    (void)tzedSetFunHelp(gsEditMtext_GlobalName, nullptr, gsEditMtext_GlobalName, 0);
+    (void)tzedSetFunHelp(gsEditMtext_LocalName, nullptr, gsEditMtext_GlobalName, 0);
+    (void)tzedSetFunHelp(gsAlignText_GlobalName, nullptr, gsAlignText_GlobalName, 0);
+    (void)tzedSetFunHelp(gsAlignText_LocalName, nullptr, gsAlignText_GlobalName, 0);
     return true;
 }
 
+// A function that was not defined has nothing to take back.
 void undefineFunctions() {
     for (Function const& function : kFunctions)
-        tzedUndef(*function.name, function.code);
+        (void)tzedUndef(*function.name, function.code);
 }
 
 bool invokeFunction() {
-    tzedRetVoid();
+    (void)tzedRetVoid();  // outside a call nobody waits for a value
     int const code = tzedGetFunCode();
     // The function for aligning is defined, but has no body.
     if (code != kEdit && code != kProperties) return false;
     resbuf const* const first = tzedGetArgs();
     if (first && first->restype == Tzad::eResultEntityName) {
         MTETabType const tab = code == kEdit ? kMTETabText : kMTETabProperties;
-        EditMtextByAdsName(first->resval.rlname, tab, true, true);
+        // The gate has told what there is to tell; the call itself has worked.
+        (void)EditMtextByAdsName(first->resval.rlname, tab, true, true);
     } else {
         tzutPrintf(gStringTable[kNeedsEntityMessage]);
     }

@@ -46,7 +46,8 @@ public:
     virtual void ResetContents();
     // Which forms of a face have to be synthesised; any pointer may be null. False, with nothing
     // written, for an unknown face.
-    virtual bool GetFontSynthesisInfo(CStdStrW face, bool* bold, bool* italic, bool* boldItalic);
+    [[nodiscard]] virtual bool
+    GetFontSynthesisInfo(CStdStrW face, bool* bold, bool* italic, bool* boldItalic);
 
     // Where a system of that kind lists its fonts.
     static void InitSystemLocations();
