@@ -46,16 +46,23 @@ private:
     struct sigaction before_ {};
 };
 
-// In the child: becomes the program, or tells through the pipe why it cannot.
-[[noreturn]] void become(std::vector<std::string>& words, Terminal const& terminal, int report) {
-    setpgid(0, 0);
-    terminal.giveTo(getpid());
-    for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE, SIGXFSZ})
-        std::signal(each, SIG_DFL);
+// The words as execvp takes them; they must outlive that.
+std::vector<char*> argumentsOf(std::vector<std::string>& words) {
     std::vector<char*> arguments;
     for (std::string& word : words)
         arguments.push_back(word.data());
     arguments.push_back(nullptr);
+    return arguments;
+}
+
+// In the child: becomes the program, or tells through the pipe why it cannot. Nothing here may
+// throw, else the child would go on as a second host.
+[[noreturn]] void
+become(std::vector<char*> const& arguments, Terminal const& terminal, int report) noexcept {
+    setpgid(0, 0);
+    terminal.giveTo(getpid());
+    for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE, SIGXFSZ})
+        std::signal(each, SIG_DFL);
     execvp(arguments[0], arguments.data());
     int const reason = errno;
     (void)!write(report, &reason, sizeof reason);
@@ -112,11 +119,12 @@ ProgramResult runProgram(std::string_view command, std::filesystem::path const& 
     std::vector<std::string> words = splitCommand(command);
     if (words.empty()) return {false, localText("is no command")};
     words.push_back(file.string());
+    std::vector<char*> const arguments = argumentsOf(words);
     int report[2];
     if (pipe2(report, O_CLOEXEC) != 0) return {false, notRun(errno)};
     Terminal const terminal;
     pid_t const child = fork();
-    if (child == 0) become(words, terminal, report[1]);
+    if (child == 0) become(arguments, terminal, report[1]);
     close(report[1]);
     if (child < 0) {
         int const reason = errno;
