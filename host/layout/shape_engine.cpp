@@ -81,13 +81,13 @@ ShapeEngine::ShapeEngine()
 EngineFace const& ShapeEngine::face(LayoutFace const& face) {
     std::wstring const key =
         face.typeface + (face.bold ? L"|b" : L"|") + (face.italic ? L"i" : L"");
-    auto const [entry, isNew] = faces_.try_emplace(key);
-    EngineFace& made = entry->second;
-    if (!isNew) {
-        return made;
+    if (auto const known = faces_.find(key); known != faces_.end()) {
+        return known->second;
     }
+    std::string const family = toUtf8(face.typeface);
+    EngineFace& made = faces_[key];  // nothing throws from here on: no face is kept half made
     made.description = pango_font_description_new();
-    pango_font_description_set_family(made.description, toUtf8(face.typeface).c_str());
+    pango_font_description_set_family(made.description, family.c_str());
     pango_font_description_set_weight(made.description,
                                       face.bold ? PANGO_WEIGHT_BOLD : PANGO_WEIGHT_NORMAL);
     pango_font_description_set_style(made.description,

@@ -1,10 +1,14 @@
 #include <gtest/gtest.h>
 
 #include <cmath>
+#include <new>
 #include <string>
 
+#include "host/base/memory_faults.h"
+#include "host/faults/fault_plan.h"
 #include "host/layout/line_layout.h"
 #include "host/layout/mtext_layout.h"
+#include "host/layout/shape_engine.h"
 
 namespace {
 
@@ -48,6 +52,31 @@ TEST(Measure, AdvancesComeFromTheFaceAtEveryHeight) {
             EXPECT_NEAR(layOutLine(line).box.right / expected, 1.0, 1e-9) << height;
         }
     }
+}
+
+// A face whose making failed half-way used to serve without a height of capitals until the process
+// ended.
+TEST(Measure, FacesAreKeptWholeWhicheverAllocationFails) {
+    bool struck = true;
+    for (int call = 1; struck && call < 50; ++call) {
+        // A new face each time, with a name that does not fit into a string object.
+        LayoutFace const face{L"A typeface that nobody has, number " + std::to_wstring(call), false,
+                              false};
+        FaultPlan plan;
+        ASSERT_FALSE(plan.add("operator new:" + std::to_string(call)));
+        plan.install();
+        try {
+            MemoryFaultScope const command;
+            (void)ShapeEngine::instance().face(face);
+        } catch (std::bad_alloc const&) {
+            EXPECT_TRUE(plan.hasStruck());
+        }
+        plan.remove();
+        struck = plan.hasStruck();
+        EXPECT_NE(ShapeEngine::instance().face(face).description, nullptr) << call;
+        EXPECT_GT(ShapeEngine::instance().face(face).capHeight, 0.0) << call;
+    }
+    EXPECT_FALSE(struck) << "the sweep came to its end";
 }
 
 // Wrapped at 5.5 letters the words "aaaa" stand one to a line.
