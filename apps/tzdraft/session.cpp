@@ -8,7 +8,6 @@
 #include "host/base/memory_faults.h"
 #include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
-#include "host/database/user_system.h"
 #include "host/display/plot.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/runtime/documents.h"
@@ -64,11 +63,10 @@ void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
         tzhost::documents().close();
     }
     std::swap(drawing_, drawing);
+    setVariables();  // ahead of what the drawing itself shows in them
     tzhost::setWorkingDrawing(drawing_.get());
     if (drawing) retired_.push_back(std::move(drawing));
-    setVariables();
     if (isInCommand_) drawing_->undoLog().begin();
-    tzhost::noteUserSystem();
     tzhost::documents().open(drawing_.get());
 }
 
