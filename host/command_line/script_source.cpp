@@ -137,10 +137,13 @@ std::optional<EditorBlock> ScriptSource::readBlock() {
     return std::nullopt;
 }
 
+// Where a fault ended the script nobody knows what was meant for the editor: it is left.
 std::optional<EditorBlock> ScriptSource::takeBlock() {
     Line const* const line = peek();
-    if (line == nullptr || withoutBlanksBehind(line->text) != kBlockStart) return std::nullopt;
-    return readBlock();
+    bool const opens = line != nullptr && withoutBlanksBehind(line->text) == kBlockStart;
+    std::optional<EditorBlock> block = opens ? readBlock() : std::nullopt;
+    if (!block && !fault_.empty()) block = EditorBlock{L"", false};
+    return block;
 }
 
 Answer ScriptSource::last() {

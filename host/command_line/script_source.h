@@ -11,7 +11,7 @@
 //
 // To a string question only ^C and comments are special. A block that is met where an answer is due
 // is reported and stepped over; a block without an end, and a line that is no UTF-8, end the
-// script.
+// script, and an editor that opens there is left without accepting.
 
 #include <istream>
 #include <memory>

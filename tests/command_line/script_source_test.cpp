@@ -75,7 +75,11 @@ constexpr ScriptRow kScripts[] = {
     {"UntakenBlock",    "a\n<<<\nb\n>>>\nc\n",      kPoint,  "",
      "[a] fault(script:2: no editor takes this block) [c] end"                                                       },
     {"BlockWithoutEnd", "\n<<<\nb\n",               kPoint,  "AB",
-     "[] none fault(script:2: this block has no end, a line >>> or >>>cancel) end"                                   },
+     "[] left{} fault(script:2: this block has no end, a line >>> or >>>cancel) end"                                 },
+    {"BlockNotUtf8",    "<<<\n\xFF\n>>>\n",         kPoint,  "B",
+     "left{} fault(script:2: this line is not UTF-8) end"                                                            },
+    {"NotUtf8AtEditor", "\xFF\n<<<\na\n>>>\n",      kPoint,  "B",
+     "left{} fault(script:1: this line is not UTF-8) end"                                                            },
     {"NotUtf8",         "a\n\xFF\nb\n",             kPoint,  "",    "[a] fault(script:2: this line is not UTF-8) end"},
 };
 
