@@ -96,15 +96,18 @@ bool UnitReader::readFraction(double& value) {
 
 bool UnitReader::readMixed(double& value) {
     if (readFraction(value)) return true;
-    if (!readNumber(value)) return false;
+    char const* const start = at_;
+    double whole = 0;
+    if (!readNumber(whole)) return false;
     char const* const before = at_;
     double fraction = 0;
     if (!skip('-')) skipBlanks();
-    if (at_ != before && readFraction(fraction)) {
-        value += fraction;
-    } else {
-        at_ = before;
+    if (at_ == before || !readFraction(fraction)) at_ = before;
+    if (!std::isfinite(whole + fraction)) {
+        at_ = start;
+        return false;
     }
+    value = whole + fraction;
     return true;
 }
 

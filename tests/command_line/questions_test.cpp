@@ -110,6 +110,7 @@ constexpr QuestionRow kQuestions[] = {
     {"PointZeroTaken",     askPoint,   6,    "0,0",                                                "5100 0,0,0"       },
     {"Real",               askReal,    0,    "-1.5e1",                                             "5100 -15"         },
     {"RealFraction",       askReal,    0,    "1 1/2",                                              "5100 1.5"         },
+    {"RealTooLarge",       askReal,    0,    "1.7e308 1.7e308/1\n7",                               "5100 7"           },
     {"RealTakesNoPoint",   askReal,    0,    "1,2\n1'\n7",                                         "5100 7"           },
     {"RealNoZero",         askReal,    2,    "0\n-0\n-1",                                          "5100 -1"          },
     {"RealNoNegative",     askReal,    4,    "-1\n0",                                              "5100 0"           },
@@ -286,6 +287,8 @@ TEST(SymbolNames, OfNewSymbols) {
     for (wchar_t const* name : {L"", L" a", L"a ", L"a|b", L"a*", L"?", L"a,b", L"a=b", L"a\nb"}) {
         EXPECT_FALSE(services->isValidSymbolName(name)) << TzString(name).toUtf8();
     }
+    EXPECT_TRUE(services->isValidSymbolName(std::wstring(255, L'a').c_str()));
+    EXPECT_FALSE(services->isValidSymbolName(std::wstring(256, L'a').c_str()));
     EXPECT_FALSE(services->isValidSymbolName(nullptr));
 }
 
