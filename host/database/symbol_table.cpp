@@ -5,10 +5,12 @@
 
 #include "host/database/drawing.h"
 #include "host/database/symbol_imp.h"
+#include "host/database/symbol_name.h"
 #include "tz/gi/draw.h"
 #include "tz/rx/class.h"
 
 using tzhost::faultStatus;
+using tzhost::isSymbolName;
 using tzhost::SymbolImp;
 using tzhost::TableImp;
 using tzhost::valuesOf;
@@ -56,14 +58,6 @@ private:
     std::shared_ptr<TableImp::Shared> shared_;
     std::ptrdiff_t at_ = 0;
 };
-
-// Characters that no name may hold, since prompts and patterns give them a meaning.
-constexpr std::wstring_view kForbidden = L"<>/\\\":;?*|,=`";
-
-bool isSymbolName(std::wstring_view name) {
-    return !name.empty() && name.find_first_of(kForbidden) == name.npos &&
-           std::all_of(name.begin(), name.end(), [](wchar_t c) { return c >= L' '; });
-}
 
 }  // namespace
 

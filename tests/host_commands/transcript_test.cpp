@@ -29,6 +29,11 @@ TranscriptCase const kCases[] = {
      "Command: LIST\nSelect objects: ^C"                                                                                                                },
     {"NothingToTakeBack",            "U\n",                                              "There is nothing to take back.\n"                             },
     {"NoModuleLeft",                 "UNLOAD\nUNLOAD\n",                                 "Command: UNLOAD\nNo module is loaded.\n"                      },
+    {"NamesForRecords",              "LAYER\nM\n lead\n\n",                              "\" lead\" cannot be the name of a layer.\n"                   },
+ // The style of the file used to be current while the variable said "Standard".
+    {"OpenedStyleIsShown",
+     "STYLE\nBig\n\n\n\n\n\n\n\n\n"
+     "SAVE\nbig.json\nNEW\nOPEN\nbig.json\nSETVAR\nTEXTSTYLE\n\n",                       "TEXTSTYLE <Big>:"                                             },
     {"GoneWithItsModule",            "UNLOAD\nMTEXT\n",                                  "There is no command \"MTEXT\".\n"                             },
     {"LoadedTwice",                  "LOAD\n\n",                                         "tzmted.tzx: this module is loaded already\n"                  },
     {"NoSuchModule",                 "LOAD\nmissing.tzx\n",                              "missing.tzx: the module cannot be loaded: "                   },
