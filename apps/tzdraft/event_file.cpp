@@ -1,49 +1,48 @@
 #include "apps/tzdraft/event_file.h"
 
-#include <system_error>
-
 #include "apps/tzdraft/local_text.h"
 #include "host/base/event_sink.h"
 
 namespace tzdraft {
+namespace {
+
+constexpr std::size_t kBlock = 1 << 16;
+
+std::string problemWith(std::filesystem::path const& file) {
+    return file.string() + ": " + localText("the events cannot be written");
+}
+
+}  // namespace
 
 bool EventFile::begin(std::filesystem::path const& file, std::string& error) {
-    file_ = file;
-    part_ = file.string() + ".part";
-    out_.open(part_, std::ios::binary | std::ios::trunc);
-    if (!out_) {
-        error = file.string() + ": " + localText("the events cannot be written");
-        part_.clear();
+    name_ = file;
+    file_.emplace(file);
+    if (!file_->isOpen()) {
+        error = problemWith(file);
+        file_.reset();
         return false;
     }
     tzhost::setEventSink([this](tzhost::Event const& event) {
         // What is no UTF-8 is shown as such rather than lost.
-        out_ << event.dump(-1, ' ', false, tzhost::Event::error_handler_t::replace) << '\n';
+        pending_ += event.dump(-1, ' ', false, tzhost::Event::error_handler_t::replace) + '\n';
+        if (pending_.size() < kBlock) return;
+        (void)file_->write(pending_);  // a failure makes finish fail
+        pending_.clear();
     });
     return true;
 }
 
 bool EventFile::finish(std::string& error) {
-    if (part_.empty()) return true;
+    if (!file_) return true;
     tzhost::setEventSink({});
-    out_.close();
-    std::error_code problem;
-    if (out_) std::filesystem::rename(part_, file_, problem);
-    bool const written = out_ && !problem;
-    if (written) {
-        part_.clear();
-    } else {
-        error = file_.string() + ": " + localText("the events cannot be written");
-    }
+    bool const written = file_->write(pending_) && file_->commit();
+    if (!written) error = problemWith(name_);
+    file_.reset();
     return written;
 }
 
 EventFile::~EventFile() {
-    if (part_.empty()) return;
-    tzhost::setEventSink({});
-    out_.close();
-    std::error_code ignored;  // nothing more can be done about a file that will not go
-    std::filesystem::remove(part_, ignored);
+    if (file_) tzhost::setEventSink({});
 }
 
 }  // namespace tzdraft

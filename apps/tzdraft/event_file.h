@@ -1,8 +1,10 @@
 #pragma once
 
 #include <filesystem>
-#include <fstream>
+#include <optional>
 #include <string>
+
+#include "host/base/safe_file.h"
 
 // The file of events: one JSON object a line, in the order in which they happened. It gets its name
 // when it is finished; a run that ends early leaves none.
@@ -22,9 +24,9 @@ public:
     [[nodiscard]] bool finish(std::string& error);
 
 private:
-    std::filesystem::path file_;
-    std::filesystem::path part_;  // the name while it is written; empty before begin
-    std::ofstream out_;
+    std::filesystem::path name_;
+    std::optional<tzhost::SafeFile> file_;  // between begin and finish
+    std::string pending_;                   // lines that are not written yet
 };
 
 }  // namespace tzdraft

@@ -88,6 +88,18 @@ INSTANTIATE_TEST_SUITE_P(Rows, Result, testing::ValuesIn(kRows), [](auto const& 
     return row.param.name;
 });
 
+// The events used to be written to this file, whatever it held, until they were whole.
+TEST(Results, OfEventsLeaveOtherFilesAlone) {
+    auto const script = scratch("quit.scr", "QUIT\n");
+    auto const other = scratch("quit.jsonl.part", kOld);
+    auto const events = scratch("quit.jsonl");
+    tztest::ProgramRun const run =
+        tztest::runProgram({"--script", script.string(), "--events", events.string()});
+    EXPECT_EQ(run.status, 0) << run.errors;
+    EXPECT_EQ(tztest::bytesOf(other), kOld);
+    EXPECT_FALSE(tztest::eventsOf(events).empty());
+}
+
 TEST(Results, ThatCanBeWrittenAreAndTheLineNamesThem) {
     auto const script = scratch("quit.scr", "QUIT\n");
     std::string const saved = scratch("saved.json").string();
