@@ -45,6 +45,7 @@ private:
     bool openSource();
     bool openDrawing();
     bool planFaults();
+    void tellIdleFaults() const;
     bool loadModule();
     void readCommands();
     [[nodiscard]] std::vector<std::wstring> commandNames() const;
@@ -100,6 +101,14 @@ bool Run::planFaults() {
         if (auto const problem = faults_.add(rule)) return complain("--fail " + *problem);
     }
     return true;
+}
+
+// A fault that struck nothing is easily taken for one that was survived.
+void Run::tellIdleFaults() const {
+    for (auto const& [rule, calls] : faults_.idleRules()) {
+        complain("--fail \"" + rule + "\": " +
+                 localText("made nothing fail; calls of the operation: ") + std::to_string(calls));
+    }
 }
 
 bool Run::loadModule() {
@@ -247,6 +256,7 @@ void Run::saveSettings() {
 int Run::finish() {
     tzhost::commandLine().freshLine();
     faults_.remove();
+    tellIdleFaults();
     writeResults();
     saveSettings();
     bool const leftOver = !tzhost::worstAudit().clean();

@@ -29,6 +29,7 @@ std::string wrong(std::string_view rule, char const* what) {
 
 std::optional<std::string> FaultPlan::add(std::string_view rule) {
     Rule added;
+    added.text = rule;
     std::string_view left = rule;
     if (auto const equals = left.rfind('='); equals != std::string_view::npos) {
         added.status = readWhole<int>(left.substr(equals + 1));
@@ -55,7 +56,8 @@ std::optional<std::string> FaultPlan::add(std::string_view rule) {
 void FaultPlan::install() {
     installed = this;
     calls_.clear();
-    struck_ = false;
+    for (Rule& rule : rules_)
+        rule.struck = false;
     (void)setFaultHook(&FaultPlan::decide);
 }
 
@@ -68,7 +70,16 @@ void FaultPlan::remove() {
 void FaultPlan::clear() {
     rules_.clear();
     calls_.clear();
-    struck_ = false;
+}
+
+std::vector<FaultPlan::IdleRule> FaultPlan::idleRules() const {
+    std::vector<IdleRule> idle;
+    for (Rule const& rule : rules_) {
+        if (rule.struck) continue;
+        auto const calls = calls_.find(rule.name);
+        idle.push_back({rule.text, calls == calls_.end() ? 0 : calls->second});
+    }
+    return idle;
 }
 
 bool FaultPlan::decide(std::string_view operation, int& status) {
@@ -80,10 +91,10 @@ bool FaultPlan::decide(std::string_view operation, int& status) {
 bool FaultPlan::strike(std::string_view operation, int& status) {
     auto const at = calls_.try_emplace(std::string(operation), 0).first;
     long const call = ++at->second;
-    for (Rule const& rule : rules_) {
+    for (Rule& rule : rules_) {
         if (rule.name != operation || (rule.call != 0 && rule.call != call)) continue;
         if (rule.status) status = *rule.status;
-        struck_ = true;
+        rule.struck = true;
         return true;
     }
     return false;

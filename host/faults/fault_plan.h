@@ -41,13 +41,22 @@ public:
     // Calls met since install or clear, by operation.
     [[nodiscard]] std::map<std::string, long, std::less<>> const& calls() const { return calls_; }
     // Whether a rule has struck since then.
-    [[nodiscard]] bool hasStruck() const { return struck_; }
+    [[nodiscard]] bool hasStruck() const { return idleRules().size() < rules_.size(); }
+    // A rule that has made nothing fail since then, as it was added, and the calls of its
+    // operation.
+    struct IdleRule {
+        std::string rule;
+        long calls = 0;
+    };
+    [[nodiscard]] std::vector<IdleRule> idleRules() const;
 
 private:
     struct Rule {
+        std::string text;
         std::string name;
         long call = 1;  // 0: every one
         std::optional<int> status;
+        bool struck = false;
     };
 
     static bool decide(std::string_view operation, int& status);
@@ -55,7 +64,6 @@ private:
 
     std::vector<Rule> rules_;
     std::map<std::string, long, std::less<>> calls_;
-    bool struck_ = false;
 };
 
 }  // namespace tzhost

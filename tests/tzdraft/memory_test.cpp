@@ -1,4 +1,5 @@
-// Runs that want events while memory fails: the events are told whole, and the program goes on.
+// Runs with planned faults: events are told whole while memory fails, and a plan that struck
+// nothing is named.
 
 #include <gtest/gtest.h>
 
@@ -29,6 +30,20 @@ TEST(MemoryFaults, LeaveEventsWhole) {
         }
         EXPECT_EQ(audits, 4) << call << ": " << run.output;
     }
+}
+
+// A misspelt name used to look like a fault that was survived.
+TEST(Faults, ThatStruckNothingAreNamed) {
+    auto const script = scratch("ask.scr", "CIRCLE\n0,0\n1\nQUIT\n");
+    tztest::ProgramRun const run =
+        tztest::runProgram({"--script", script.string(), "--fail", "tzedGetPiont", "--fail",
+                            "tzedGetPoint:7", "--fail", "TzDbDatabase::setClayer:*"});
+    EXPECT_EQ(run.status, 0);
+    EXPECT_EQ(run.errors,
+              "tzdraft: --fail \"tzedGetPiont\": made nothing fail; calls of the operation: 0\n"
+              "tzdraft: --fail \"tzedGetPoint:7\": made nothing fail; calls of the operation: 1\n"
+              "tzdraft: --fail \"TzDbDatabase::setClayer:*\": made nothing fail; calls of the "
+              "operation: 0\n");
 }
 
 }  // namespace
