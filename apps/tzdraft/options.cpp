@@ -14,8 +14,12 @@ constexpr char kScripts[] =
     "Exit status: 0 done; 1 input ended inside a command; 2 wrong usage or an unusable file; 3 a command\n"
     "left something open.";
 
-void declareText(CLI::App& app, char const* name, std::string& value, char const* help) {
-    app.add_option(name, value, help)->type_name("");
+void declareText(CLI::App& app,
+                 char const* name,
+                 std::string& value,
+                 char const* metavariable,
+                 char const* help) {
+    app.add_option(name, value, help)->type_name(metavariable);
 }
 
 void declareFile(CLI::App& app, char const* name, std::filesystem::path& file, char const* help) {
@@ -39,15 +43,16 @@ void declare(CLI::App& app, Options& options) {
         ->expected(1);
     declareFile(app, "--font-map", options.fontMap, "the font map file");
     declareText(
-        app, "--locale", options.locale,
-        "LL  the language, such as de; the environment's (LC_ALL, LC_MESSAGES, LANG) without it");
+        app, "--locale", options.locale, "LL",
+        "the language, such as de; the environment's (LC_ALL, LC_MESSAGES, LANG) without it");
     declareFile(app, "--settings", options.settings, "the settings file");
     declareFile(app, "--module", options.module,
                 "the module to load; beside the program when left out");
     declareFile(app, "--resources", options.resources, "the resource library of the module");
-    declareText(app, "--rtf-editor", options.richTextEditor, "CMD  program for the dialog editor");
-    declareText(app, "--text-editor", options.textEditor,
-                "CMD  program for the in-place and raw editors");
+    declareText(app, "--rtf-editor", options.richTextEditor, "CMD",
+                "program for the dialog editor");
+    declareText(app, "--text-editor", options.textEditor, "CMD",
+                "program for the in-place and raw editors");
     declareFile(app, "--events", options.events,
                 "write what passes between module and host as JSON lines");
     app.add_option("--fail", options.faults,
