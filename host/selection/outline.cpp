@@ -84,27 +84,29 @@ bool FlatBox::holds(TzGePoint2d const& point) const {
 
 Outline Outline::of(TzDbEntity& entity, TzGeMatrix3d const& placed) {
     Outline outline;
+    if (entity.visibility() == TzDb::kInvisible) return outline;
     TzGeMatrix3d const toUser = currentUserSystem().matrix().inverse() * placed;
-    auto const add = [&](Corners const& corners, bool isArea) {
+    auto const add = [&](Corners const& corners, Inside inside) {
         Path path;
-        path.isArea = isArea;
+        path.inside = inside;
         for (TzGePoint3d const& each : corners)
             path.points.push_back((toUser * each).convert2d());
         if (!path.points.empty()) outline.paths_.push_back(std::move(path));
     };
     if (auto const* const text = dynamic_cast<TzDbMText const*>(&entity)) {
-        add(boxOf(*text), true);
+        add(boxOf(*text), Inside::belongs);
         return outline;
     }
     DrawPass pass(entity.database(), DrawPass::Entities::strokes);
     pass.draw(&entity);
     for (DrawOp const& op : pass.list()) {
-        if (auto const* const text = std::get_if<DrawnText>(&op.what)) add(boxOf(*text), true);
+        if (auto const* const text = std::get_if<DrawnText>(&op.what))
+            add(boxOf(*text), Inside::belongs);
         auto const* const lines = std::get_if<DrawnLines>(&op.what);
         if (lines == nullptr) continue;
         Corners points = lines->points;
         if (lines->closed) points.push_back(lines->points.front());
-        add(points, false);
+        add(points, Inside::empty);
     }
     return outline;
 }
@@ -133,7 +135,7 @@ bool Outline::isWithin(FlatBox const& box) const {
 
 bool Outline::touches(FlatBox const& box) const {
     for (Path const& path : paths_) {
-        if (path.isArea && areaHolds(path.points, box.low)) return true;
+        if (path.inside == Inside::belongs && areaHolds(path.points, box.low)) return true;
         if (path.points.size() == 1 && box.holds(path.points.front())) return true;
         for (std::size_t i = 1; i < path.points.size(); ++i) {
             if (segmentTouches(path.points[i - 1], path.points[i], box)) return true;

@@ -9,7 +9,7 @@
 class TzDbEntity;
 
 // Where an entity lies in the user system, for picks, windows and crossings: its lines, and the
-// boxes of its texts as they are turned. Nothing is opened.
+// boxes of its texts as they are turned. What is invisible lies nowhere. Nothing is opened.
 //
 //   Outline const outline = Outline::of(*entity);
 //   if (outline.boxHolds(pick)) ...
@@ -39,9 +39,11 @@ public:
     [[nodiscard]] bool touches(FlatBox const& box) const;
 
 private:
+    // What a path encloses; an inside that belongs to the entity makes the path a closed one.
+    enum class Inside { empty, belongs };
     struct Path {
         std::vector<TzGePoint2d> points;
-        bool isArea = false;  // closed, and its inside belongs to the entity
+        Inside inside = Inside::empty;
     };
 
     std::vector<Path> paths_;

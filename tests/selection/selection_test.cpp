@@ -115,6 +115,8 @@ constexpr SelectionRow kSelections[] = {
  // In the box around the turned text, but not in the text.
     {"CrossingByOutline",  "c 20.1,22 20.3,22.5\n$1\n\n",                     "5100 1"      },
     {"CrossingInsideText", "c 21,20.6 21.1,20.7\n\n",                         "5100 3"      },
+ // A refused answer leaves the last point, 0,0; the second corner is read from the first.
+    {"WindowFromLast",     "w 7,7 zz\nw @-1,-1 @4,4\n\n",                     "5100 1 4"    },
     {"Remove",             "all\nremove\n$1 $4\nadd\n$1\n\n",                 "5100 2 3 1"  },
     {"RemoveByCrossing",   "all\nR\nc 1,-1 6,6\n\n",                          "5100 3"      },
     {"Nothing",            "\n",                                              "-5001 none"  },
@@ -133,6 +135,15 @@ INSTANTIATE_TEST_SUITE_P(Answers,
                          SelectionTable,
                          testing::ValuesIn(kSelections),
                          [](auto const& row) { return row.param.name; });
+
+TEST_F(Selections, PassOverWhatIsInvisible) {
+    TzDbEntity* text = nullptr;
+    ASSERT_EQ(tzdbOpenObject(text, drawing_.id(names_[2]), TzDb::kForWrite), Tzad::eOk);
+    text->setVisibility(TzDb::kInvisible);
+    text->close();
+    EXPECT_EQ(select("21,20.65\nc 21,20.6 21.1,20.7\nw 0,0 90,90\n\n"), "5100 1 2 4");
+    EXPECT_EQ(select("$3\n\n"), "5100 3");
+}
 
 TEST_F(Selections, FollowTheirMode) {
     EXPECT_EQ(select("all\n\n", L"_:L"), "5100 1 2 3");
