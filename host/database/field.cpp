@@ -3,11 +3,11 @@
 #include <algorithm>
 #include <new>
 
-#include "host/base/event_sink.h"
 #include "host/database/drawing.h"
 #include "host/database/field_codes.h"
 #include "host/database/field_imp.h"
 #include "host/database/field_links.h"
+#include "host/runtime/notification.h"
 #include "tz/db/mtext.h"
 #include "tz/gi/draw.h"
 
@@ -128,10 +128,5 @@ bool tzdbFindField(wchar_t const* text, int start, int& first, int& end) {
 
 void tzedTextFieldModified(TzDbField* field) {
     if (!field) return;
-    tzhost::reportEvent([&] {
-        return tzhost::Event{
-            {"event", "notify"           },
-            {"name",  "textFieldModified"}
-        };
-    });
+    tzhost::reportNotification("textFieldModified");
 }

@@ -1,29 +1,20 @@
 #include "tz/db/host_services.h"
 
-#include "host/base/event_sink.h"
 #include "host/base/settings.h"
 #include "host/database/drawing.h"
 #include "host/database/user_system.h"
+#include "host/runtime/notification.h"
 
 namespace tzhost {
 namespace {
 
 Drawing* theWorkingDrawing = nullptr;
 
-void notify(char const* name) {
-    reportEvent([&] {
-        return Event{
-            {"event", "notify"},
-            {"name",  name    }
-        };
-    });
-}
-
 class Services final : public TzDbHostApplicationServices {
 public:
     [[nodiscard]] TzDbDatabase* workingDatabase() const override { return theWorkingDrawing; }
     [[nodiscard]] TzDbWorkingGlobals* workingGlobals() const override { return theWorkingDrawing; }
-    void textEditorStarting() override { notify("textEditorStarting"); }
+    void textEditorStarting() override { reportNotification("textEditorStarting"); }
     [[nodiscard]] TzString getProductRegistryKey() const override { return settings().productKey; }
 };
 

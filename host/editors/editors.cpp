@@ -7,6 +7,7 @@
 #include "host/base/variables.h"
 #include "host/editors/markup_session.h"
 #include "host/runtime/class_registry.h"
+#include "host/runtime/notification.h"
 #include "tz/ap/host_dialog.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/dialog_params.h"
@@ -16,15 +17,6 @@ namespace {
 
 constexpr int kLeft = 0;
 constexpr int kAccepted = 1;
-
-void notify(char const* name) {
-    reportEvent([&] {
-        return Event{
-            {"event", "notify"},
-            {"name",  name    }
-        };
-    });
-}
 
 // How one number of the in-place editor's record is read.
 enum class Field { byte, word, half, real };
@@ -152,20 +144,20 @@ int tzedEditMTextInteractive(TzDbMText* text, bool /*interactive*/, bool /*view*
 }
 
 void tzedSetExistingMText(bool existing) {
-    tzhost::notify(existing ? "existingMText" : "newMText");
+    tzhost::reportNotification(existing ? "existingMText" : "newMText");
 }
 
 int tzedInvokeAnnoSelectScaleDlg() {
-    tzhost::notify("annotationScaleDialog");
+    tzhost::reportNotification("annotationScaleDialog");
     return Tzad::ePromptNormal;
 }
 
 void tzedUpdateDisplay() {
-    tzhost::notify("updateDisplay");
+    tzhost::reportNotification("updateDisplay");
 }
 
 void tzedZoomToolHook(bool /*in*/, bool /*out*/, bool /*redraw*/) {
-    tzhost::notify("zoomTool");
+    tzhost::reportNotification("zoomTool");
 }
 
 void TzApHostDialogImp::run(TzApHostDialogParams& params) {

@@ -3,10 +3,10 @@
 #include <algorithm>
 
 #include "host/base/audit.h"
-#include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
 #include "host/base/memory_faults.h"
 #include "host/runtime/module_linker.h"
+#include "host/runtime/notification.h"
 #include "tz/rx/status.h"
 
 namespace tzhost {
@@ -28,12 +28,7 @@ bool GestureProcessor::removeOverruleHandler(Handler* handler) {
 }
 
 void Documents::redraw() {
-    reportEvent([&] {
-        return Event{
-            {"event", "notify"},
-            {"name",  "redraw"}
-        };
-    });
+    reportNotification("redraw");
 }
 
 int Documents::sendStringToExecute(TzApDocument* document,
