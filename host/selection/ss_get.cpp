@@ -75,16 +75,16 @@ private:
             commandLine().say(isRemoving_ ? selecting_.remove(answer->ids)
                                           : selecting_.add(answer->ids));
             break;
-        case SelectionAnswer::Kind::add: setRemoving(false); break;
-        case SelectionAnswer::Kind::remove: setRemoving(true); break;
+        case SelectionAnswer::Kind::add:
+            isRemoving_ = false;
+            question_.setPrompt(Prompts::shown(prompts_.add, kAddPrompt));
+            break;
+        case SelectionAnswer::Kind::remove:
+            isRemoving_ = true;
+            question_.setPrompt(Prompts::shown(prompts_.remove, kRemovePrompt));
+            break;
         }
         return Reply::goOn(Tzad::ePromptNormal);
-    }
-
-    void setRemoving(bool isRemoving) {
-        isRemoving_ = isRemoving;
-        question_.setPrompt(isRemoving ? Prompts::shown(prompts_.remove, kRemovePrompt)
-                                       : Prompts::shown(prompts_.add, kAddPrompt));
     }
 
     Prompts prompts_;
