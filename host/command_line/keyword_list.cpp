@@ -1,5 +1,6 @@
 #include "host/command_line/keyword_list.h"
 
+#include "host/runtime/words.h"
 #include "tz/text/string.h"
 
 namespace tzhost {
@@ -8,23 +9,9 @@ namespace {
 
 constexpr std::wstring_view kGlobalMark = L" _";
 
-std::vector<std::wstring> splitWords(std::wstring_view list) {
-    std::vector<std::wstring> words;
-    while (true) {
-        std::size_t const start = list.find_first_not_of(L' ');
-        if (start == std::wstring_view::npos) return words;
-        list.remove_prefix(start);
-        words.emplace_back(list.substr(0, list.find(L' ')));
-        list.remove_prefix(words.back().size());
-    }
-}
-
-bool isSame(std::wstring_view a, std::wstring_view b) {
-    if (a.size() != b.size()) return false;
-    for (std::size_t i = 0; i < a.size(); ++i) {
-        if (tzToLower(a[i]) != tzToLower(b[i])) return false;
-    }
-    return true;
+std::vector<std::wstring> wordsOf(std::wstring_view list) {
+    Words const words = splitWords(list);
+    return {words.begin(), words.end()};
 }
 
 bool isCapital(wchar_t c) {
@@ -32,7 +19,7 @@ bool isCapital(wchar_t c) {
 }
 
 bool isMeant(std::wstring_view answer, std::wstring_view word) {
-    if (isSame(answer, word)) return true;
+    if (isSameWord(answer, word)) return true;
     std::wstring capitals;
     std::size_t holdsAll = 0;  // the length of the shortest leading part with every capital
     for (std::size_t i = 0; i < word.size(); ++i) {
@@ -41,8 +28,8 @@ bool isMeant(std::wstring_view answer, std::wstring_view word) {
         holdsAll = i + 1;
     }
     if (capitals.empty()) return false;
-    if (isSame(answer, capitals)) return true;
-    return answer.size() >= holdsAll && isSame(answer, word.substr(0, answer.size()));
+    if (isSameWord(answer, capitals)) return true;
+    return answer.size() >= holdsAll && isSameWord(answer, word.substr(0, answer.size()));
 }
 
 std::optional<int> findMeant(std::wstring_view answer, std::vector<std::wstring> const& words) {
@@ -57,10 +44,10 @@ std::optional<int> findMeant(std::wstring_view answer, std::vector<std::wstring>
 std::optional<KeywordList> KeywordList::parse(std::wstring_view list) {
     KeywordList result;
     std::size_t const mark = list.find(kGlobalMark);
-    result.locals_ = splitWords(list.substr(0, mark));
+    result.locals_ = wordsOf(list.substr(0, mark));
     result.globals_ = mark == std::wstring_view::npos
                           ? result.locals_
-                          : splitWords(list.substr(mark + kGlobalMark.size()));
+                          : wordsOf(list.substr(mark + kGlobalMark.size()));
     if (result.locals_.size() != result.globals_.size()) return std::nullopt;
     return result;
 }

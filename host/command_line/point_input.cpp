@@ -78,4 +78,10 @@ void setLastPoint(TzGePoint3d const& user) {
     Variables::instance().set(kLastPoint, VariablePoint{user.x, user.y, user.z}, Writer::host);
 }
 
+std::optional<TzGePoint3d> takePoint(std::wstring_view answer) {
+    auto const point = readPoint(answer, lastPoint());
+    if (point) setLastPoint(*point);
+    return point;
+}
+
 }  // namespace tzhost

@@ -22,5 +22,7 @@ namespace tzhost {
 // event.
 [[nodiscard]] TzGePoint3d lastPoint();
 void setLastPoint(TzGePoint3d const& user);
+// A point as an answer, read from the last one: it becomes the last point itself.
+[[nodiscard]] std::optional<TzGePoint3d> takePoint(std::wstring_view answer);
 
 }  // namespace tzhost

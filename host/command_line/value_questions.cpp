@@ -21,13 +21,6 @@ namespace {
 constexpr wchar_t const* kNoPoint =
     tzhost::forLocalText(L"A point is needed: x,y or x,y,z, or one from the last point.");
 
-// A point as an answer: it becomes the last point.
-std::optional<TzGePoint3d> takePoint(std::wstring_view answer) {
-    auto const point = tzhost::readPoint(answer, tzhost::lastPoint());
-    if (point) tzhost::setLastPoint(*point);
-    return point;
-}
-
 std::optional<double> readPlainNumber(std::wstring_view text) {
     tzhost::UnitReader reader(text);
     double const sign = reader.readSign();
@@ -84,7 +77,7 @@ int askMeasure(Measure const& measure, double const* base, wchar_t const* prompt
         if (auto const number = measure.read(answer)) {
             return giveNumber(*number, question.armed(), result);
         }
-        auto const point = takePoint(answer);
+        auto const point = tzhost::takePoint(answer);
         if (!point) return Reply::unreadable(tzhost::localText(measure.complaint));
         if (from) return giveNumber(measure.between(*from, *point), question.armed(), result);
         from = point;
@@ -99,7 +92,7 @@ int tzedGetPoint(double const* /*base*/, wchar_t const* prompt, double* result) 
     if (auto const failed = tzhost::failsAt("tzedGetPoint")) return *failed;
     Question question(QuestionKind::point, prompt);
     return question.ask([&](std::wstring_view answer) {
-        auto const point = takePoint(answer);
+        auto const point = tzhost::takePoint(answer);
         if (!point) return Reply::unreadable(tzhost::localText(kNoPoint));
         for (int i = 0; i < 3; ++i)
             result[i] = (*point)[i];

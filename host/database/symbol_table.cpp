@@ -1,6 +1,5 @@
 #include "tz/db/symbol_table.h"
 
-#include <algorithm>
 #include <string_view>
 
 #include "host/database/drawing.h"

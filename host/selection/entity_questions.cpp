@@ -28,9 +28,8 @@ std::optional<PickedAt> readPick(std::wstring_view answer, Depth depth) {
         if (!picked) return std::nullopt;
         return PickedAt{std::move(picked), lastPoint()};
     }
-    auto const point = readPoint(answer, lastPoint());
+    auto const point = takePoint(answer);
     if (!point) return std::nullopt;
-    setLastPoint(*point);
     return PickedAt{pickAt(*point, depth), *point};
 }
 

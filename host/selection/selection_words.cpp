@@ -7,33 +7,14 @@
 
 #include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
+#include "host/runtime/words.h"
 #include "host/selection/pick.h"
-#include "tz/text/string.h"
 
 namespace tzhost {
 
 namespace {
 
-using Words = std::vector<std::wstring_view>;
 using Answered = std::optional<SelectionAnswer>;
-
-Words splitWords(std::wstring_view text) {
-    constexpr std::wstring_view kBlanks = L" \t";
-    Words words;
-    for (std::size_t start = text.find_first_not_of(kBlanks); start != text.npos;
-         start = text.find_first_not_of(kBlanks)) {
-        text.remove_prefix(start);
-        words.push_back(text.substr(0, text.find_first_of(kBlanks)));
-        text.remove_prefix(words.back().size());
-    }
-    return words;
-}
-
-std::optional<TzGePoint3d> takePoint(std::wstring_view text) {
-    auto const point = readPoint(text, lastPoint());
-    if (point) setLastPoint(*point);
-    return point;
-}
 
 Answered answerWith(EntityIds ids) {
     return SelectionAnswer{SelectionAnswer::Kind::entities, std::move(ids)};
@@ -41,9 +22,10 @@ Answered answerWith(EntityIds ids) {
 
 Answered readBox(Words const& words, Touch touch) {
     if (words.size() != 3) return std::nullopt;
-    auto const first = takePoint(words[1]);
-    auto const second = first ? takePoint(words[2]) : std::nullopt;
+    auto const first = readPoint(words[1], lastPoint());
+    auto const second = first ? readPoint(words[2], *first) : std::nullopt;
     if (!second) return std::nullopt;
+    setLastPoint(*second);  // a refused answer leaves the last point
     FlatBox const box = FlatBox::between(first->convert2d(), second->convert2d());
     return answerWith(entitiesIn(box, touch));
 }
@@ -92,19 +74,14 @@ constexpr WordRow kWords[] = {
     {forLocalText(L"remove r"),   readRemove,   1},
 };
 
-bool isSame(std::wstring_view a, std::wstring_view b) {
-    return a.size() == b.size() &&
-           std::equal(a.begin(), a.end(), b.begin(),
-                      [](wchar_t x, wchar_t y) { return tzToLower(x) == tzToLower(y); });
-}
-
 // The row of a word that stands on a line of `count` words.
 WordRow const*
 rowOf(std::wstring_view word, std::size_t count, wchar_t const* (*shown)(wchar_t const*)) {
     for (WordRow const& row : kWords) {
         Words const names = splitWords(shown(row.words));
-        bool const isWord = std::any_of(names.begin(), names.end(),
-                                        [&](std::wstring_view name) { return isSame(word, name); });
+        bool const isWord = std::any_of(names.begin(), names.end(), [&](std::wstring_view name) {
+            return isSameWord(word, name);
+        });
         if (isWord && row.count == count) return &row;
     }
     return nullptr;
