@@ -139,8 +139,8 @@ INSTANTIATE_TEST_SUITE_P(Answers,
 TEST_F(Selections, PassOverWhatIsInvisible) {
     TzDbEntity* text = nullptr;
     ASSERT_EQ(tzdbOpenObject(text, drawing_.id(names_[2]), TzDb::kForWrite), Tzad::eOk);
-    text->setVisibility(TzDb::kInvisible);
-    text->close();
+    EXPECT_EQ(text->setVisibility(TzDb::kInvisible), Tzad::eOk);
+    EXPECT_EQ(text->close(), Tzad::eOk);
     EXPECT_EQ(select("21,20.65\nc 21,20.6 21.1,20.7\nw 0,0 90,90\n\n"), "5100 1 2 4");
     EXPECT_EQ(select("$3\n\n"), "5100 3");
 }
