@@ -8,8 +8,8 @@ namespace {
 
 constexpr std::size_t kBlock = 1 << 16;
 
-std::string problemWith(std::filesystem::path const& file) {
-    return file.string() + ": " + localText("the events cannot be written");
+std::string problemWith(std::filesystem::path const& name, tzhost::SafeFile const& file) {
+    return name.string() + ": " + localText("the events cannot be written") + ": " + file.reason();
 }
 
 }  // namespace
@@ -18,7 +18,7 @@ bool EventFile::begin(std::filesystem::path const& file, std::string& error) {
     name_ = file;
     file_.emplace(file);
     if (!file_->isOpen()) {
-        error = problemWith(file);
+        error = problemWith(name_, *file_);
         file_.reset();
         return false;
     }
@@ -36,7 +36,7 @@ bool EventFile::finish(std::string& error) {
     if (!file_) return true;
     tzhost::setEventSink({});
     bool const written = file_->write(pending_) && file_->commit();
-    if (!written) error = problemWith(name_);
+    if (!written) error = problemWith(name_, *file_);
     file_.reset();
     return written;
 }

@@ -114,7 +114,7 @@ void Run::tellIdleFaults() const {
 bool Run::loadModule() {
     std::string error;
     if (tzhost::dynamicLinker().load(modulePath(options_), error)) return true;
-    if (!hasModuleResources())
+    if (std::filesystem::exists(modulePath(options_)) && !hasModuleResources())
         error += "; " + localText("its resource library is missing or damaged");
     return complain(error);
 }

@@ -43,8 +43,11 @@ bool loadSettings(Options const& options, SettingsState& state, std::string& err
         settingsFile(options), isNamed ? tzhost::IfMissing::fail : tzhost::IfMissing::useDefaults);
     state = problem ? SettingsState::unusable : SettingsState::usable;
     if (!problem) return true;
-    error = *problem;
-    if (!isNamed) tzhost::commandLine().say(tzhost::fromUtf8(*problem));
+    if (isNamed) {
+        error = "--settings " + *problem;
+    } else {
+        tzhost::commandLine().say(tzhost::fromUtf8(*problem));
+    }
     return !isNamed;
 }
 
@@ -102,14 +105,17 @@ bool findTexts(Options const& options, std::string& error) {
     search.locale = locale;
     search.file = options.resources.string();
     tzhost::setResourceSearch(search);
-    return true;
+    if (options.resources.empty() || hasModuleResources()) return true;
+    error = search.file + ": " + localText("the resource library is missing or damaged");
+    return false;
 }
 
 // The module makes do without a font map, so that a wrong name would go unnoticed.
 bool findFontMap(Options const& options, std::string& error) {
     tzhost::setFontMapFile(options.fontMap.string());
     if (options.fontMap.empty() || tzhost::readFile(options.fontMap.string())) return true;
-    error = options.fontMap.string() + ": " + localText("the font map file cannot be read");
+    error = options.fontMap.string() + ": " + localText("the font map file cannot be read") + ": " +
+            tzhost::systemReason();
     return false;
 }
 

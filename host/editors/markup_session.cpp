@@ -76,7 +76,7 @@ std::optional<TzString> editMarkup(TzString const& contents, std::string const& 
     }
     if (program.empty()) {
         commandLine().say(
-            localText(L"No editor is named: --text-editor, the settings or $EDITOR name one."));
+            localText(L"No editor is named: --text-editor, the settings, $VISUAL or $EDITOR do."));
         return std::nullopt;
     }
     return editWithProgram(contents, program);
