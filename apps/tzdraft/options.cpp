@@ -40,7 +40,7 @@ void declare(CLI::App& app, Options& options) {
     app.add_option("--var", options.variables,
                    "set a system variable for this run (repeatable; points as x,y,z)")
         ->type_name("NAME=VALUE")
-        ->expected(1);
+        ->allow_extra_args(false);  // one each time, so that it can be repeated
     declareFile(app, "--font-map", options.fontMap, "the font map file");
     declareText(
         app, "--locale", options.locale, "LL",
@@ -58,7 +58,7 @@ void declare(CLI::App& app, Options& options) {
     app.add_option("--fail", options.faults,
                    "let the K-th call of a host operation fail (repeatable)")
         ->type_name("NAME[:K][=STATUS]")
-        ->expected(1);
+        ->allow_extra_args(false);  // one each time, so that it can be repeated
 }
 
 }  // namespace

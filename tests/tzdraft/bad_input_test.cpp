@@ -222,4 +222,15 @@ TEST(LongLine, IsRefusedOnceAndTheQuestionAsksAgain) {
     EXPECT_NE(run.output.find("There is no command \"xxx"), std::string::npos);
 }
 
+// The second --var used to be refused.
+TEST(Options, TakeOneValueEachTime) {
+    constexpr char const* kWords[] = {"tzdraft",   "--var",  "A=1", "--var",  "B=2",
+                                      "plan.json", "--fail", "c",   "--fail", "d"};
+    tzdraft::ParsedOptions const parsed = tzdraft::parseOptions(std::size(kWords), kWords);
+    EXPECT_FALSE(parsed.exit);
+    EXPECT_EQ(parsed.options.variables, (std::vector<std::string>{"A=1", "B=2"}));
+    EXPECT_EQ(parsed.options.faults, (std::vector<std::string>{"c", "d"}));
+    EXPECT_EQ(parsed.options.drawing, "plan.json");
+}
+
 }  // namespace
