@@ -2,7 +2,6 @@
 
 #include <cstdlib>
 #include <ctime>
-#include <vector>
 
 #include "host/base/result_time.h"
 #include "host/base/utf8.h"
@@ -10,6 +9,7 @@
 #include "host/database/drawing.h"
 #include "host/database/field_properties.h"
 #include "host/database/open_state.h"
+#include "host/runtime/words.h"
 
 namespace tzhost {
 namespace {
@@ -19,18 +19,6 @@ constexpr std::wstring_view kEnd = L">%";
 constexpr std::wstring_view kFailed = L"####";
 
 using Value = std::optional<std::wstring>;
-using Words = std::vector<std::wstring_view>;
-
-Words splitWords(std::wstring_view text) {
-    Words words;
-    while (true) {
-        std::size_t const first = text.find_first_not_of(L' ');
-        if (first == text.npos) return words;
-        text.remove_prefix(first);
-        words.push_back(text.substr(0, text.find(L' ')));
-        text.remove_prefix(words.back().size());
-    }
-}
 
 Value variableValue(Words const& words, Drawing const* /*drawing*/) {
     if (words.size() != 2) return std::nullopt;
