@@ -111,8 +111,11 @@ bool DrawingReader::beginBlock(int line) {
     blockValue_.kind = JsonKind::object;
     blockValue_.line = line;
     if (pass_ == Pass::entitiesOnly) {
-        block_ = blocks_[blockIndex_++].record;
-        return true;
+        if (blockIndex_ < blocks_.size())
+            block_ = blocks_[blockIndex_++].record;
+        else
+            context_.complain(line, "blocks", localText("has changed while it was read"));
+        return !context_.failed;
     }
     block_ = &addTableRecord(context_.drawing, context_.drawing.blockTableId(),
                              std::make_unique<TzDbBlockTableRecord>());

@@ -62,6 +62,7 @@ public:
     // [write-open] The same, to be changed.
     [[nodiscard]] TzDbMText* getMTextAttributeDefinition();
     // [write-open] Takes a text over as its multi-line default; null makes it single-line.
+    // eInvalidInput for a text that another definition has, which keeps it.
     Tzad::ErrorStatus setMTextAttributeDefinition(TzDbMText* text);
 
     static TzRxClass* desc();
