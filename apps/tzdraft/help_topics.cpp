@@ -40,14 +40,14 @@ std::vector<std::filesystem::path> helpFilesOf(std::filesystem::path const& modu
 }  // namespace
 
 std::wstring helpFor(TzString const& name) {
-    tzhost::HelpTopic const* const help = tzhost::findHelp(name);
-    TzString const& topic = help ? help->topic : name;
+    TzString const* const registered = tzhost::findHelp(name);
+    TzString const& topic = registered ? *registered : name;
     for (auto const& module : tzhost::dynamicLinker().modules()) {
         for (std::filesystem::path const& file : helpFilesOf(module->file)) {
             if (auto const text = topicIn(file, topic.toUtf8())) return *text;
         }
     }
-    return help ? topic.str() : std::wstring();
+    return registered ? topic.str() : std::wstring();
 }
 
 }  // namespace tzdraft

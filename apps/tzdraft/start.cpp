@@ -12,7 +12,6 @@
 #include "host/base/utf8.h"
 #include "host/base/variables.h"
 #include "host/command_line/command_line.h"
-#include "host/database/user_system.h"
 #include "host/editors/markup_session.h"
 
 namespace tzdraft {
@@ -124,17 +123,7 @@ void chooseEditors(Options const& options) {
     tzhost::EditorConfiguration& editors = tzhost::editorConfiguration();
     editors.textEditor = firstOf({options.textEditor, tzhost::toUtf8(settings.textEditor),
                                   environment("VISUAL"), environment("EDITOR")});
-    editors.richTextEditor = firstOf({options.richTextEditor, tzhost::toUtf8(settings.rtfEditor)});
     editors.inPlaceEditors.assign(settings.inPlaceEditors.begin(), settings.inPlaceEditors.end());
-}
-
-// The view stands still in every run of this process.
-void watchViewOnce() {
-    static bool const isWatched = [] {
-        tzhost::watchUserSystem();
-        return true;
-    }();
-    (void)isWatched;
 }
 
 }  // namespace
@@ -154,7 +143,6 @@ bool hasModuleResources() {
 
 bool configureHost(Options const& options, SettingsState& settings, std::string& error) {
     tzhost::Variables::instance().reset();
-    watchViewOnce();
     if (!findTexts(options, error)) return false;
     if (!loadSettings(options, settings, error) || !setVariables(options, error)) return false;
     if (!findFontMap(options, error)) return false;

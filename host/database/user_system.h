@@ -14,7 +14,8 @@ namespace tzhost {
 bool setUserSystem(UserSystem const& system);
 
 // Keeps the view standing still while the user system changes: VIEWDIR is given in the user system
-// in force, so its numbers follow. Watches TILEMODE and CVPORT too; call once when the host starts.
+// in force, so its numbers follow. Watches TILEMODE and CVPORT too, from the first call on; further
+// calls change nothing.
 void watchUserSystem();
 // Takes the system in force for what the view stands in: after a drawing was opened or a command
 // taken back, whose VIEWDIR fits already.

@@ -14,7 +14,6 @@ public:
     [[nodiscard]] TzGePoint2d pixelOf(TzGePoint3d const& world) const;
     // In the plane through the middle of the view that faces the viewer.
     [[nodiscard]] TzGePoint3d worldOf(TzGePoint2d const& pixel) const;
-    [[nodiscard]] double pixelsPerUnit() const { return pixelsPerUnit_; }
 
 private:
     ViewAxes axes_;

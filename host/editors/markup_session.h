@@ -9,10 +9,9 @@
 // One session of an editor that holds markup: the in-place, the raw and the external one.
 namespace tzhost {
 
-// The program that serves for the in-place and raw editors or for the dialog, empty for none.
+// The program that serves for the in-place and raw editors, empty for none.
 struct EditorConfiguration {
     std::string textEditor;
-    std::string richTextEditor;
     std::vector<std::wstring> inPlaceEditors;  // values of MTEXTED that name an in-place editor
 };
 [[nodiscard]] EditorConfiguration& editorConfiguration();

@@ -34,11 +34,6 @@ std::wstring fileName(std::wstring const& path) {
     return lowerCase(path.substr(path.find_last_of(L"/\\") + 1));
 }
 
-bool endsWith(std::wstring const& text, std::wstring const& end) {
-    return text.size() >= end.size() &&
-           text.compare(text.size() - end.size(), end.size(), end) == 0;
-}
-
 std::wstring textOf(FcPattern* font, char const* property) {
     FcChar8* value = nullptr;
     if (FcPatternGetString(font, property, 0, &value) != FcResultMatch) {
@@ -77,7 +72,7 @@ std::map<std::wstring, LayoutFace> const& installedFiles() {
 
 LayoutFace faceOfFile(std::wstring const& path) {
     std::wstring const name = fileName(path);
-    if (!endsWith(name, L".shx") && name.find(L'.') != std::wstring::npos) {
+    if (!name.ends_with(L".shx") && name.find(L'.') != std::wstring::npos) {
         auto const file = installedFiles().find(name);
         if (file != installedFiles().end()) {
             return file->second;

@@ -97,10 +97,6 @@ TzRxClass* hostClass(wchar_t const* name, TzRxClass* parent, TzRxCreator creator
     return made;
 }
 
-int classCount() {
-    return static_cast<int>(classes().size());
-}
-
 }  // namespace tzhost
 
 TzRxClass* newTzRxClass(wchar_t const* name,

@@ -15,7 +15,4 @@ namespace tzhost {
 [[nodiscard]] TzRxClass*
 hostClass(wchar_t const* name, TzRxClass* parent, TzRxCreator creator = nullptr);
 
-// How many classes are registered, the host's included.
-[[nodiscard]] int classCount();
-
 }  // namespace tzhost

@@ -14,8 +14,8 @@ struct NoCaseLess {
     bool operator()(TzString const& a, TzString const& b) const { return a.compareNoCase(b) < 0; }
 };
 
-std::map<TzString, HelpTopic, NoCaseLess>& helpTopics() {
-    static std::map<TzString, HelpTopic, NoCaseLess> topics;
+std::map<TzString, TzString, NoCaseLess>& helpTopics() {
+    static std::map<TzString, TzString, NoCaseLess> topics;
     return topics;
 }
 
@@ -91,7 +91,7 @@ Command const* CommandStack::find(TzString const& typed) const {
     return firstWith(&Command::globalName);
 }
 
-HelpTopic const* findHelp(TzString const& name) {
+TzString const* findHelp(TzString const& name) {
     auto const at = helpTopics().find(name);
     return at == helpTopics().end() ? nullptr : &at->second;
 }
@@ -99,12 +99,12 @@ HelpTopic const* findHelp(TzString const& name) {
 }  // namespace tzhost
 
 int tzedSetFunHelp(wchar_t const* name,
-                   wchar_t const* file,
+                   wchar_t const* /*file*/,
                    wchar_t const* topic,
                    int /*command*/) {
     if (auto const fault = tzhost::faultAt("tzedSetFunHelp")) return *fault;
     if (!name || !*name) return Tzad::ePromptError;
-    tzhost::helpTopics()[name] = {file, topic};
+    tzhost::helpTopics()[name] = topic;
     tzhost::reportEvent([&] {
         return tzhost::Event{
             {"event", "register"         },

@@ -21,12 +21,6 @@ struct Command {
     static constexpr int kUsesImpliedSelection = 2;
 };
 
-// Help as it was registered.
-struct HelpTopic {
-    TzString file;
-    TzString topic;
-};
-
 // All commands, in the order in which they came.
 class CommandStack : public TzEdCommandStack {
 public:
@@ -53,7 +47,8 @@ private:
 
 [[nodiscard]] CommandStack& commandStack();
 
-// What tzedSetFunHelp registered under a name, without regard to case; null when nothing was.
-[[nodiscard]] HelpTopic const* findHelp(TzString const& name);
+// The topic that tzedSetFunHelp registered under a name, without regard to case; null when nothing
+// was.
+[[nodiscard]] TzString const* findHelp(TzString const& name);
 
 }  // namespace tzhost

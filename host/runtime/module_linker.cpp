@@ -49,9 +49,7 @@ bool DynamicLinker::allowUnload(void* appHandle) {
 }
 
 bool DynamicLinker::declareMultiDocument(void* appHandle) {
-    LoadedModule* const module = byHandle(appHandle);
-    if (module) module->servesDocuments = true;
-    return module != nullptr;
+    return byHandle(appHandle) != nullptr;  // one drawing is open at a time
 }
 
 int DynamicLinker::deliver(LoadedModule const& module,

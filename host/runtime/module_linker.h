@@ -17,7 +17,6 @@ struct LoadedModule {
     void* loaderHandle = nullptr;  // of dlopen
     TzRxEntryPoint entry = nullptr;
     bool mayUnload = false;
-    bool servesDocuments = false;
 };
 
 // Loads modules, sends them their messages, and unloads them.

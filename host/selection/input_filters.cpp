@@ -140,11 +140,10 @@ bool addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* 
     return true;
 }
 
-// Takes the filter back even when the plan makes it report a failure.
+// Takes the filter back even when the plan makes it report a failure; destructors call it.
 bool removeSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter) {
     tzhost::MemoryFaultPause const givesBack;
     bool const isFaulty = tzhost::faultAt("removeSSgetFilterInputContextReactor").has_value();
-    tzhost::MemoryFaultPause const pause;  // destructors call this
     tzhost::Document* const open = tzhost::asOpen(document);
     if (open == nullptr) return false;
     auto const at = tzhost::findFilter(open->filters, filter);

@@ -208,7 +208,6 @@ help L127 TEXTALIGN
 
 // What a load that came to nothing must leave as it was.
 struct Registered {
-    int classes = tzhost::classCount();
     std::size_t commands = tzhost::commandStack().commands().size();
     bool function = tzhost::documents().current()->functions.find(L"MTEDIT") != nullptr;
 

@@ -12,6 +12,13 @@
 namespace tzdraft {
 namespace {
 
+struct HostCommand {
+    wchar_t const* name;  // the global one; its local text is the local one
+    void (*body)();
+    int flags;            // as the command stack takes them
+    wchar_t const* help;  // one sentence, or several apart by line feeds
+};
+
 // Flags: whether the command sees the selection made before it.
 constexpr int kAlone = 0;
 constexpr int kSeesSelection = tzhost::Command::kUsesImpliedSelection;
@@ -74,10 +81,6 @@ constexpr std::array kCommands{
 };
 
 }  // namespace
-
-std::span<HostCommand const> hostCommands() {
-    return kCommands;
-}
 
 void registerHostCommands() {
     auto* const stack =
