@@ -24,6 +24,7 @@
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
 #include "host/selection/entity_list.h"
+#include "host/selection/selection_sets.h"
 
 namespace tzdraft {
 namespace {
@@ -184,6 +185,7 @@ void Run::runGuarded(std::wstring const& line) {
         tzhost::commandLine().say(line + localText(L" ended early: ") +
                                   tzhost::fromUtf8(problem.what()));
     }
+    tzhost::freeAllSets();  // the audit has counted them
 }
 
 // Enter alone repeats the line before it at a terminal; in a script it does nothing.

@@ -13,12 +13,10 @@
 
 #include "apps/tzdraft/program.h"
 #include "apps/tzdraft/session.h"
-#include "host/base/audit.h"
 #include "host/command_line/script_source.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/runtime/command_runner.h"
 #include "host/runtime/command_stack.h"
-#include "host/selection/selection_sets.h"
 
 namespace tztest {
 namespace {
@@ -212,11 +210,10 @@ void SweepSource::finishTry() {
     SweepTry done;
     done.command = TzString(command_.text).toUtf8();
     done.what = plan.what;
-    done.auditIsClean = tzhost::audit().clean();
+    done.auditIsClean = tzhost::worstAudit().clean();
     std::string const after = savedDrawing();
     done.drawingIsUntouched = after == before_;
     done.drawingIsValid = !after.empty() && tzhost::readDrawing(scratchFile()).drawing != nullptr;
-    tzhost::freeAllSets();
     tzhost::resetWorstAudit();
     takeBack();
     judge_(done);
