@@ -134,12 +134,12 @@ TzDbObject::getField(wchar_t const* key, TzDbField*& field, TzDb::OpenMode mode)
 }
 
 bool WritableTzDbObject::replaceObject(TzDbObject* object) {
-    if (!object) return false;
-    bool const wasWritable = object->isWriteEnabled();
-    if (!wasWritable && object->upgradeOpen() != Tzad::eOk) return false;
+    revertRead();
     object_ = object;
-    upgraded_ = !wasWritable;
-    return true;
+    if (!object) return false;
+    if (object->isWriteEnabled()) return true;
+    upgraded_ = object->upgradeOpen() == Tzad::eOk;
+    return upgraded_;
 }
 
 void WritableTzDbObject::revertWrite() {

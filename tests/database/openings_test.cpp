@@ -90,6 +90,41 @@ TEST_F(DrawingTest, ObjectOfAnotherClassIsClosedAgain) {
     EXPECT_EQ(layer, nullptr);
 }
 
+struct WritableRow {
+    char const* name;
+    TzDb::OpenMode mode;
+    bool locked;
+    bool writable;
+};
+constexpr WritableRow kWritableRows[] = {
+    {"OfReader",       TzDb::kForRead,  false, true },
+    {"OfWriter",       TzDb::kForWrite, false, true },
+    {"OfLockedReader", TzDb::kForRead,  true,  false},
+};
+
+class Writable : public testing::TestWithParam<WritableRow>, protected DrawingFixture {};
+TEST_P(Writable, GivesBackWhatItTook) {
+    TzDbObjectId const id = addText(L"abc");
+    TzDbObjectId const other = addText(L"def");
+    lock(drawing->clayer(), GetParam().locked);
+    TzDbMText* text = nullptr;
+    TzDbMText* next = nullptr;
+    ASSERT_EQ(tzdbOpenObject(text, id, GetParam().mode), Tzad::eOk);
+    ASSERT_EQ(tzdbOpenObject(next, other, GetParam().mode), Tzad::eOk);
+    {
+        WritableTzDbObject writable;
+        EXPECT_EQ(writable.replaceObject(text), GetParam().writable);
+        EXPECT_EQ(text->isWriteEnabled(), GetParam().writable);
+        EXPECT_EQ(writable.replaceObject(next), GetParam().writable);
+        EXPECT_FALSE(text->isReadEnabled());
+        EXPECT_EQ(tzhost::audit().openObjects, 1);
+    }
+    EXPECT_EQ(tzhost::audit().openObjects, 0);
+}
+INSTANTIATE_TEST_SUITE_P(Rows, Writable, testing::ValuesIn(kWritableRows), [](auto const& row) {
+    return row.param.name;
+});
+
 // Closing with a drawing still lends nothing to the next one.
 TEST_F(DrawingTest, DrawingThatGoesTakesItsOpeningsAlong) {
     {

@@ -88,21 +88,34 @@ tzdbOpenObject(T*& object, TzDbObjectId id, TzDb::OpenMode mode, bool erasedToo 
     if (status != Tzad::eOk) return status;
     object = tzrxCast<T>(static_cast<TzRxObject*>(opened));
     if (object) return Tzad::eOk;
-    opened->close();
+    (void)opened->close();  // what counts is that it is of another class
     return Tzad::eWrongObjectType;
 }
 
-// Opens the pointer's object for write in place of its opening for read, and gives that back at the
-// end: first the write, then the read.
+// Takes over an opening for read, makes it one for write, and gives both back at the end: first the
+// write, then the read.
+//
+//   TzDbMText* text = nullptr;
+//   if (tzdbOpenObject(text, id, TzDb::kForRead) != Tzad::eOk) return;
+//   WritableTzDbObject writable;
+//   if (writable.replaceObject(text)) (void)text->setRotation(0);  // nothing to undo
 class TZ_API WritableTzDbObject {
 public:
-    // [read-open] Makes `object` writable; false leaves the opening as it was.
-    [[nodiscard]] bool replaceObject(TzDbObject* object);
-    void revertWrite();
-    void revertRead();
+    WritableTzDbObject() = default;
+    WritableTzDbObject(WritableTzDbObject const&) = delete;
+    WritableTzDbObject& operator=(WritableTzDbObject const&) = delete;
     ~WritableTzDbObject();
 
+    // [read-open] Gives back what it holds, takes over the opening of `object` and makes it
+    // writable. False for null, or when it stays an opening for read, which is closed at the end
+    // all the same.
+    [[nodiscard]] bool replaceObject(TzDbObject* object);
+    // [any] Back to the opening for read; nothing when it is not writable.
+    void revertWrite();
+    // [any] The same, and closes the object; nothing when it holds none.
+    void revertRead();
+
 private:
-    TzDbObject* object_ = nullptr;
+    TzDbObject* object_ = nullptr;  // open; null when nothing is held
     bool upgraded_ = false;
 };
