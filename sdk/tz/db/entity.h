@@ -22,8 +22,9 @@ class TZ_API TzDbEntity : public TzDbObject {
 public:
     ~TzDbEntity() override;
 
-    // [write-open] Layer, colour, line type and text style from the database's current ones;
-    // `database()` stays null. A null database means the working one.
+    // [write-open] Layer and text style from the database's current ones, the layer's colour, and
+    // visible; `database()` stays null. A null database means the working one; without any the
+    // entity is left alone.
     void setDatabaseDefaults(TzDbDatabase* database = nullptr);
 
     // [any], setters [write-open]; a setter fails with a status for an id of another class.
@@ -58,7 +59,7 @@ protected:
     explicit TzDbEntity(TzDbObjectImp* imp = nullptr);
 
     [[nodiscard]] virtual Tzad::ErrorStatus subTransformBy(TzGeMatrix3d const& matrix);
-    // Passes colour, line type and so on to the traits; 0 or drawing flags.
+    // Passes colour, layer and so on to the traits: solid lines, outlines. 0.
     unsigned int subSetAttributes(TzGiDrawableTraits* traits) override;
     // Draws nothing: the base's part of a derived class's drawing.
     bool subWorldDraw(TzGiWorldDraw* draw) override = 0;

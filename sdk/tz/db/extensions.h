@@ -23,7 +23,9 @@ public:
 // Objects that keep upright on the sheet.
 class TZ_API TzDbPaperOrientationPE : public TzRxObject {
 public:
+    // [any] False also for null.
     [[nodiscard]] virtual bool paperOrientation(TzDbObject const* object) = 0;
+    // [write-open]
     virtual Tzad::ErrorStatus setPaperOrientation(TzDbObject* object, bool oriented) = 0;
 
     static TzRxClass* desc();

@@ -81,6 +81,9 @@ public:
     // The markup of a paragraph's end.
     [[nodiscard]] static wchar_t const* paragraphBreak();
 
+    // Widths, gutters and heights from 0, 1 to 1000 static columns, columns counted from 0 up to
+    // 999; eOutOfRange for others. A height holds for one column, with dynamic columns that have no
+    // automatic height.
     [[nodiscard]] ColumnType columnType() const;
     [[nodiscard]] TextEditorColumns columns() const;
     Tzad::ErrorStatus setStaticColumns(double width, double gutter, int count);

@@ -65,6 +65,7 @@ public:
     // [write-open] Takes an attribute over as appendTzDbEntity does.
     [[nodiscard]] Tzad::ErrorStatus appendAttribute(TzDbObjectId& id,
                                                     class TzDbAttribute* attribute);
+    // [any] Fills `ids` with the attributes in the order in which they came, without erased ones.
     void attributes(TzArray<TzDbObjectId>& ids) const;
 
     static TzRxClass* desc();

@@ -28,7 +28,8 @@ class TZ_API TzDbSymbolTableRecord : public TzDbObject {
 public:
     // [any] Valid until the record is renamed or erased; null never.
     [[nodiscard]] wchar_t const* getName() const;
-    // [write-open] Refuses an empty name, or one that the table has.
+    // [write-open] Refuses a name that isValidSymbolName of tz/ed/prompts.h refuses, with
+    // eInvalidSymbolName, and one that the table has.
     Tzad::ErrorStatus setName(wchar_t const* name);
 
     static TzRxClass* desc();
@@ -109,6 +110,7 @@ public:
     // The typeface with its description; an empty typeface for a style that names a font file.
     [[nodiscard]] Tzad::ErrorStatus
     font(TzString& typeface, bool& bold, bool& italic, int& charset, int& pitchAndFamily) const;
+    // Character set, and pitch with family, from 0 to 255; eOutOfRange for others.
     Tzad::ErrorStatus
     setFont(wchar_t const* typeface, bool bold, bool italic, int charset, int pitchAndFamily);
 

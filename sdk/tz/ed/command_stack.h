@@ -9,16 +9,16 @@ class TzRxResourceInstance;
 // "TZAD_REGISTERED_COMMANDS".
 //
 // Bits of a command's flags: 0x2 the command sees the selection that was made before it began
-// (without it the host drops that selection first), 0x800000 the command takes its answers from
-// scripts as a dialog-free command does. Other bits change nothing here.
+// (without it the host drops that selection first). The others, such as 0x800000 for a command
+// that opens no dialog, are kept and change nothing in the embedded host.
 class TZ_API TzEdCommandStack : public TzRxObject {
 public:
     using Callback = void (*)();
 
     // [any] Adds a command. The global name is the same in every language, the local name is the
     // translator's; either starts the command, without regard to case. `reactor` and `data` may be
-    // null; `sequence` -1 adds behind the group's commands. 0, or the failing status when the
-    // global name is empty or taken.
+    // null, and `sequence` is -1; the embedded host looks at none of the three and adds behind all
+    // other commands. 0, or the failing status when the global name is empty or taken.
     virtual int addCommand(wchar_t const* group,
                            wchar_t const* globalName,
                            wchar_t const* localName,
@@ -36,6 +36,7 @@ public:
 };
 
 // [any] Help of a command or function: `file` is the help file or null for the host's own, `topic`
-// the topic in it. HELP shows the topic. 5100, or -5001 for an empty name.
+// the topic in it, `command` 0. The embedded host's HELP looks the topic up in the help beside the
+// modules, whatever the file. 5100, or -5001 for an empty name.
 TZ_API int
 tzedSetFunHelp(wchar_t const* name, wchar_t const* file, wchar_t const* topic, int command);

@@ -60,8 +60,9 @@ public:
     // [command] Runs the drag to its decision.
     DragStatus drag();
 
-    // Called by the host during drag().
+    // Called by the host during drag(). Takes one sample, with acquirePoint.
     virtual DragStatus sampler() = 0;
+    // Brings the entity to the sample's state; false keeps the picture as it is, with no redraw.
     virtual bool update() = 0;
     // The entity to draw; may be null. The jig keeps it.
     [[nodiscard]] virtual TzDbEntity* entity() const = 0;

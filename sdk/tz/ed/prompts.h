@@ -7,8 +7,8 @@ class TzDbDatabase;
 
 // The questions of the command line. A question prints its prompt, reads one answer and gives back
 // a status: 5100 a value was given, 5000 an empty answer, -5001 a failure or a refused answer,
-// -5002 cancel, -5005 a keyword (its global word waits for tzedGetInput), -5008 a text that is too
-// long.
+// -5002 cancel, -5005 a keyword (its global word waits for tzedGetInput). A host may also give
+// -5008 for a line that is too long; the embedded one says so and asks again.
 //
 //   1. tzedInitGet with flags and keywords, for the next question alone
 //   2. the question
@@ -60,7 +60,8 @@ public:
     class TZ_API Services {
     public:
         virtual ~Services() = default;
-        // [any] Whether a text may be the name of a new symbol.
+        // [any] Whether a text may be the name of a new symbol: not empty, at most 255 characters,
+        // no blank at either end, no control character and none of < > / \ " : ; ? * | , = `
         [[nodiscard]] virtual bool isValidSymbolName(wchar_t const* name) const = 0;
         // [command] Asks for a name. `result` takes a text of the host's, null when there is none,
         // that the caller releases with tzutDelBuffer whatever the status. `database` may be null.

@@ -5,7 +5,8 @@
 struct resbuf;
 
 // Selections and picks. A selection set and an entity are named by pairs of 64-bit integers; a set
-// lives from tzedSSGet to tzedSSFree, at most to the end of the command. Statuses as in tz/ed/prompts.h.
+// lives from tzedSSGet to tzedSSFree, at most to the end of the command. Statuses as in
+// tz/ed/prompts.h.
 //
 // Modes of tzedSSGet, in one text, null as "": "_" nothing further; "I" the implied set; "X" all
 // entities of both spaces; "L" the newest entity; "P" the set that was selected last; "W" and "C"

@@ -41,6 +41,8 @@ public:
     [[nodiscard]] TzRxClass* isA() const override;
 };
 
+// The drawing itself. Its operations give true when the host took what was drawn; the embedded one
+// takes everything.
 class TZ_API TzGiGeometry {
 public:
     virtual ~TzGiGeometry() = default;
@@ -63,6 +65,7 @@ public:
                       TzGiTextStyle const& style) = 0;
     // Another drawable, with its own attributes.
     virtual bool draw(TzGiDrawable* drawable) = 0;
+    // What is drawn until the pop lies in coordinates that the matrix brings to those around.
     virtual void pushModelTransform(TzGeMatrix3d const& matrix) = 0;
     virtual void popModelTransform() = 0;
 };

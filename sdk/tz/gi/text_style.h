@@ -46,7 +46,8 @@ public:
     void setVertical(bool vertical) { vertical_ = vertical; }
 
     // [any] Width and height of a line of text in this style; `length` -1 means up to the zero.
-    // `penUps` counts the advance behind the last character. `draw` may be null.
+    // Without `raw` the codes of single-line texts in it are read. `penUps`, for hosts that draw
+    // with pens, and `draw`, which may be null, change nothing here.
     [[nodiscard]] TzGePoint2d extents(wchar_t const* text,
                                       bool penUps,
                                       int length,

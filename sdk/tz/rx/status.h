@@ -56,7 +56,7 @@ enum PromptStatus : int {
     ePromptCancel = -5002,   // the user cancelled
     ePromptReject = -5003,   // the host cannot do this now
     ePromptKeyword = -5005,  // a keyword, fetched with tzedGetInput
-    ePromptTooLong = -5008,  // the answer does not fit into the buffer
+    ePromptTooLong = -5008,  // the line is too long; the embedded host asks again instead
 };
 
 }  // namespace Tzad

@@ -1,7 +1,7 @@
 #pragma once
 
-// Numbers of character sets, as font tables and text styles hold them. Any 32-bit number may stand
-// here; these are the ones with a meaning of their own.
+// Numbers of character sets, as font tables and text styles hold them: 0 to 255 in the text styles
+// of a drawing, any 32-bit number elsewhere. These are the ones with a meaning of their own.
 enum Charset : int {
     kAnsiCharset = 0,
     kDefaultCharset = 1,
