@@ -182,9 +182,9 @@ void listCommand() {
     for (int index = 0; index < selection.length(); ++index) {
         EasyObject<TzDbMText> text;
         if (tzdbOpenObject(text.object, selection.at(index), TzDb::kForRead) != Tzad::eOk) continue;
-        text->highlight();
+        (void)text->highlight();  // the list is the same without
         listText(*text.object);
-        text->unhighlight();
+        (void)text->unhighlight();  // it ends in any case
     }
     tzDocManagerPtr()->redraw();
 }

@@ -94,32 +94,33 @@ bool askMark(Mark& mark) {
     return askDirection(mark) && askTarget(mark);
 }
 
+// The numbers come from questions that refuse what the host would; so in all three.
 void postCircle(Mark const& mark) {
     auto* const circle = new TzDbCircle;
     circle->setDatabaseDefaults();
-    circle->setNormal(mark.normal);
-    circle->setCenter(mark.centre);
-    circle->setRadius(mark.radius);
+    (void)circle->setNormal(mark.normal);
+    (void)circle->setCenter(mark.centre);
+    (void)circle->setRadius(mark.radius);
     (void)post(circle);  // the rest of the mark stands without it
 }
 
 void postLine(Mark const& mark) {
     auto* const line = new TzDbLine;
     line->setDatabaseDefaults();
-    line->setStartPoint(mark.lineStart());
-    line->setEndPoint(mark.target);
+    (void)line->setStartPoint(mark.lineStart());
+    (void)line->setEndPoint(mark.target);
     (void)post(line);  // the rest of the mark stands without it
 }
 
 TzDbObjectId postNumber(Mark const& mark) {
     auto* const text = new TzDbMText;
     text->setDatabaseDefaults();
-    text->setNormal(mark.normal);
-    text->setDirection(mark.direction);
-    text->setAttachment(TzDbMText::kMiddleCenter);
-    text->setLocation(mark.centre);
-    text->setTextHeight(mark.radius);
-    text->setContents(mark.number);
+    (void)text->setNormal(mark.normal);
+    (void)text->setDirection(mark.direction);
+    (void)text->setAttachment(TzDbMText::kMiddleCenter);
+    (void)text->setLocation(mark.centre);
+    (void)text->setTextHeight(mark.radius);
+    (void)text->setContents(mark.number);
     return post(text);
 }
 

@@ -42,10 +42,11 @@ std::unique_ptr<TzDbMText> askLooseText() {
     if (status == Tzad::ePromptNormal) {
         double world[3]{};
         if (!tzdbUcs2Wcs(user, world, false)) return nullptr;
-        text->setLocation({world[0], world[1], world[2]});
+        (void)text->setLocation({world[0], world[1], world[2]});
     }
-    text->setWidth(20);
-    text->setContents(L"NOTE");
+    // The values are within what a text takes.
+    (void)text->setWidth(20);
+    (void)text->setContents(L"NOTE");
     return text;
 }
 
@@ -66,8 +67,9 @@ void writeDefinition() {
     if (result != kAccepted) return;
     auto* const definition = new TzDbAttributeDefinition;
     definition->setDatabaseDefaults();
-    definition->setTag(L"NOTE");
-    definition->setPosition(text->location());
+    // A tag of letters and a place that a text has already.
+    (void)definition->setTag(L"NOTE");
+    (void)definition->setPosition(text->location());
     if (definition->setMTextAttributeDefinition(text.get()) == Tzad::eOk) (void)text.release();
     (void)post(definition);  // a drawing that takes no definition has none
 }

@@ -37,7 +37,7 @@ bool append(TzDbEntity* entity, TzDbObjectId& id) {
 TzDbObjectId post(TzDbEntity* entity) {
     TzDbObjectId id;
     if (append(entity, id)) {
-        entity->close();
+        (void)entity->close();  // closes in any case
     } else {
         delete entity;
         id.setNull();
