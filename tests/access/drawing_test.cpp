@@ -50,12 +50,12 @@ protected:
         EasyTable<TzDbTextStyleTable> table;
         EXPECT_EQ(drawing_->getTextStyleTable(table.object, TzDb::kForWrite), Tzad::eOk);
         EasyObject<TzDbTextStyleTableRecord> style(new TzDbTextStyleTableRecord);
-        style->setName(name);
-        style->setTextSize(height);
+        EXPECT_EQ(style->setName(name), Tzad::eOk);
+        EXPECT_EQ(style->setTextSize(height), Tzad::eOk);
         TzDbObjectId id;
         EXPECT_EQ(table->addRecord(style.object, id), Tzad::eOk);
-        if (annotative)
-            tzrxQuery<TzDbAnnotativeObjectPE>(style.object)->setAnnotative(style.object, true);
+        auto* const extension = tzrxQuery<TzDbAnnotativeObjectPE>(style.object);
+        EXPECT_EQ(extension->setAnnotative(style.object, annotative), Tzad::eOk);
         return id;
     }
 
@@ -134,10 +134,10 @@ TEST_F(InDrawing, VerticalStylesHaveAnAtSignBeforeTheirTypeface) {
     EXPECT_FALSE(IsVerticalTTF(style));
     ASSERT_EQ(tzdbOpenObject(style.object, drawing_->textstyle(), TzDb::kForWrite), Tzad::eOk);
     EXPECT_FALSE(IsVerticalTTF(style));
-    style->setFont(L"@DejaVu Sans", false, false, 0, 0);
+    EXPECT_EQ(style->setFont(L"@DejaVu Sans", false, false, 0, 0), Tzad::eOk);
     EXPECT_TRUE(IsVerticalTTF(style));
     EXPECT_FALSE(IsVerticalTTF()) << "it is open for write here";
-    style->setFont(L"DejaVu Sans", false, false, 0, 0);
+    EXPECT_EQ(style->setFont(L"DejaVu Sans", false, false, 0, 0), Tzad::eOk);
     EXPECT_FALSE(IsVerticalTTF(style));
 }
 
@@ -147,13 +147,13 @@ TEST_F(InDrawing, ColoursComeFromTheLayer) {
     {
         EasyObject<TzDbLayerTableRecord> layer;
         ASSERT_EQ(tzdbOpenObject(layer.object, drawing_->clayer(), TzDb::kForWrite), Tzad::eOk);
-        layer->setColor(TzCmColor(0x12, 0x34, 0x56));
+        EXPECT_EQ(layer->setColor(TzCmColor(0x12, 0x34, 0x56)), Tzad::eOk);
     }
     EXPECT_EQ(GetCurrentDrawingByLayerColor(), 0x563412U);
     {
         EasyObject<TzDbLayerTableRecord> layer;
         ASSERT_EQ(tzdbOpenObject(layer.object, drawing_->clayer(), TzDb::kForWrite), Tzad::eOk);
-        layer->setColor(TzCmColor(TzCmEntityColor::fromIndex(5)));
+        EXPECT_EQ(layer->setColor(TzCmColor(TzCmEntityColor::fromIndex(5))), Tzad::eOk);
     }
     EXPECT_EQ(GetCurrentDrawingByLayerColor(), 0xFF0000U);
 }
@@ -161,7 +161,7 @@ TEST_F(InDrawing, ColoursComeFromTheLayer) {
 TzDbLine* newLine() {
     auto* const line = new TzDbLine;
     line->setDatabaseDefaults();
-    line->setEndPoint(TzGePoint3d(1, 0, 0));
+    EXPECT_EQ(line->setEndPoint(TzGePoint3d(1, 0, 0)), Tzad::eOk);
     return line;
 }
 
@@ -208,7 +208,7 @@ TEST_F(InDrawing, LocksAreThoseOfTheLayerAndOfTheWorkingSet) {
     {
         EasyObject<TzDbLayerTableRecord> layer;
         ASSERT_EQ(tzdbOpenObject(layer.object, drawing_->clayer(), TzDb::kForWrite), Tzad::eOk);
-        layer->setIsLocked(true);
+        EXPECT_EQ(layer->setIsLocked(true), Tzad::eOk);
     }
     EXPECT_TRUE(IsOnLockedLayer(line.object));
     failAt("tzdbOpenObject", 1);

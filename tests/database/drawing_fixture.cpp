@@ -21,8 +21,8 @@ TzDbObjectId DrawingFixture::add(TzDbEntity* entity) {
     EXPECT_EQ(tzdbOpenObject(space, drawing->modelSpace(), TzDb::kForWrite), Tzad::eOk);
     TzDbObjectId id;
     EXPECT_EQ(space->appendTzDbEntity(id, entity), Tzad::eOk);
-    space->close();
-    entity->close();
+    EXPECT_EQ(space->close(), Tzad::eOk);
+    EXPECT_EQ(entity->close(), Tzad::eOk);
     return id;
 }
 
@@ -40,8 +40,8 @@ TzDbObjectId DrawingFixture::addLayer(wchar_t const* name) {
     EXPECT_EQ(record->setName(name), Tzad::eOk);
     TzDbObjectId id;
     EXPECT_EQ(table->addRecord(record, id), Tzad::eOk);
-    record->close();
-    table->close();
+    EXPECT_EQ(record->close(), Tzad::eOk);
+    EXPECT_EQ(table->close(), Tzad::eOk);
     return id;
 }
 
@@ -53,8 +53,8 @@ TzDbObjectId DrawingFixture::addStyle(wchar_t const* name, wchar_t const* typefa
     EXPECT_EQ(record->setFont(typeface, false, false, 0, 0), Tzad::eOk);
     TzDbObjectId id;
     EXPECT_EQ(table->addRecord(record, id), Tzad::eOk);
-    record->close();
-    table->close();
+    EXPECT_EQ(record->close(), Tzad::eOk);
+    EXPECT_EQ(table->close(), Tzad::eOk);
     return id;
 }
 
@@ -62,7 +62,7 @@ void DrawingFixture::lock(TzDbObjectId layer, bool locked) {
     TzDbLayerTableRecord* record = nullptr;
     ASSERT_EQ(tzdbOpenObject(record, layer, TzDb::kForWrite), Tzad::eOk);
     EXPECT_EQ(record->setIsLocked(locked), Tzad::eOk);
-    record->close();
+    EXPECT_EQ(record->close(), Tzad::eOk);
 }
 
 std::string DrawingFixture::list() const {

@@ -193,12 +193,12 @@ TEST_F(DrawingTest, ReferenceCarriesItsAttributes) {
     (void)block->setName(L"DOOR");
     TzDbObjectId blockId;
     ASSERT_EQ(blocks->addRecord(block, blockId), Tzad::eOk);
-    blocks->close();
+    EXPECT_EQ(blocks->close(), Tzad::eOk);
     auto* const own = new TzDbBlockReference;
     ASSERT_EQ(own->setBlockTableRecord(blockId), Tzad::eOk);
     TzDbObjectId none;
     EXPECT_EQ(block->appendTzDbEntity(none, own), Tzad::eInvalidInput) << "a block in itself";
-    block->close();
+    EXPECT_EQ(block->close(), Tzad::eOk);
 
     TzDbObjectId const id = add(own);
     TzDbBlockReference* reference = nullptr;
@@ -206,14 +206,14 @@ TEST_F(DrawingTest, ReferenceCarriesItsAttributes) {
     auto* const attribute = new TzDbAttribute;
     TzDbObjectId attributeId;
     ASSERT_EQ(reference->appendAttribute(attributeId, attribute), Tzad::eOk);
-    attribute->close();
+    EXPECT_EQ(attribute->close(), Tzad::eOk);
     ASSERT_EQ(reference->transformBy(TzGeMatrix3d::translation({1, 0, 0})), Tzad::eOk);
     EXPECT_EQ(at<TzDbAttribute>(attributeId).position(), TzGePoint3d(1, 0, 0));
     std::unique_ptr<TzDbObject> const copy(reference->clone());
     ASSERT_TRUE(copy);
     EXPECT_EQ(copy->database(), nullptr);
-    reference->erase();
-    reference->close();
+    EXPECT_EQ(reference->erase(), Tzad::eOk);
+    EXPECT_EQ(reference->close(), Tzad::eOk);
     EXPECT_TRUE(attributeId.isErased());
 }
 
@@ -239,7 +239,7 @@ TEST_F(DrawingTest, NewRecordsLeaveTheIndexOfNamesAsItIs) {
     TzDbLayerTableRecord* record = nullptr;
     ASSERT_EQ(tzdbOpenObject(record, added, TzDb::kForWrite), Tzad::eOk);
     EXPECT_EQ(record->setName(L"C"), Tzad::eOk);
-    record->close();
+    EXPECT_EQ(record->close(), Tzad::eOk);
     EXPECT_EQ(drawing->find(drawing->layerTableId(), L"c"), added);
     EXPECT_TRUE(drawing->find(drawing->layerTableId(), L"B").isNull());
 }
@@ -251,12 +251,12 @@ TEST_F(DrawingTest, RecordsInUseAreNotErased) {
     TzDbMText* text = nullptr;
     ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
     EXPECT_EQ(text->setLayer(used), Tzad::eOk);
-    text->close();
+    EXPECT_EQ(text->close(), Tzad::eOk);
     for (TzDbObjectId const layer : {drawing->clayer(), used, unused}) {
         TzDbLayerTableRecord* record = nullptr;
         ASSERT_EQ(tzdbOpenObject(record, layer, TzDb::kForWrite), Tzad::eOk);
         EXPECT_EQ(record->erase(), layer == unused ? Tzad::eOk : Tzad::eInUse);
-        record->close();
+        EXPECT_EQ(record->close(), Tzad::eOk);
     }
     TzDbLayerTable* table = nullptr;
     ASSERT_EQ(drawing->getLayerTable(table, TzDb::kForRead), Tzad::eOk);
@@ -268,7 +268,7 @@ TEST_F(DrawingTest, RecordsInUseAreNotErased) {
     for (; !walk->done(); walk->step())
         order.push_back(walk->getRecordId());
     delete walk;
-    table->close();
+    EXPECT_EQ(table->close(), Tzad::eOk);
     EXPECT_EQ(order, (std::vector{drawing->clayer(), used}));
 }
 

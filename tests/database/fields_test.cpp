@@ -77,11 +77,11 @@ TEST_F(DrawingTest, FieldLivesFromAppendingToErasing) {
     EXPECT_EQ(field->evaluate(0x20, drawing.get()), Tzad::eOk);
     EXPECT_EQ(text->contents(), L"[4]") << "the text follows, though it is open for read";
     EXPECT_EQ(field->erase(), Tzad::eOk);
-    field->close();
+    EXPECT_EQ(field->close(), Tzad::eOk);
     EXPECT_EQ(text->getField(L"TEXT", field, TzDb::kForRead), Tzad::eKeyNotFound);
     EXPECT_EQ(field, nullptr);
     EXPECT_EQ(text->contents(), L"[4]");
-    text->close();
+    EXPECT_EQ(text->close(), Tzad::eOk);
 }
 
 TEST_F(DrawingTest, FieldNeedsADrawing) {
@@ -104,9 +104,9 @@ TEST_F(DrawingTest, NewTextTakesThePlaceOfAField) {
     EXPECT_EQ(next->setFieldCode(L"%<\\Nothing>%", 0x100, nullptr), Tzad::eOk);
     TzDbObjectId fieldId;
     EXPECT_EQ(text->setField(L"TEXT", next, fieldId), Tzad::eOk);
-    next->close();
+    EXPECT_EQ(next->close(), Tzad::eOk);
     EXPECT_EQ(text->contents(), L"####");
-    text->close();
+    EXPECT_EQ(text->close(), Tzad::eOk);
 }
 
 TEST_F(DrawingTest, FieldsAreFoundFromWhereOneAsks) {

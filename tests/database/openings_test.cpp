@@ -168,14 +168,14 @@ TEST_F(DrawingTest, ChangedEntitiesAreReportedWhenTheyClose) {
     TzDbObjectId const id = addText(L"abc");
     TzDbMText* text = nullptr;
     ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
-    text->close();  // unchanged
+    EXPECT_EQ(text->close(), Tzad::eOk);  // unchanged
     ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForRead), Tzad::eOk);
-    text->highlight();
+    EXPECT_EQ(text->highlight(), Tzad::eOk);
     ASSERT_EQ(text->upgradeOpen(), Tzad::eOk);
-    text->setWidth(5);
-    text->downgradeOpen();
-    text->unhighlight();
-    text->close();
+    EXPECT_EQ(text->setWidth(5), Tzad::eOk);
+    EXPECT_EQ(text->downgradeOpen(), Tzad::eOk);
+    EXPECT_EQ(text->unhighlight(), Tzad::eOk);
+    EXPECT_EQ(text->close(), Tzad::eOk);
     tzhost::setEventSink(before);
     std::vector<std::string> const expected = {
         R"({"event":"write","handle":"1"})", R"({"event":"highlight","handle":"1","on":true})",

@@ -49,7 +49,7 @@ TEST_F(DrawingTest, ChangedStyleIsMeasuredAnew) {
     TzDbTextStyleTableRecord* style = nullptr;
     ASSERT_EQ(tzdbOpenObject(style, drawing->textstyle(), TzDb::kForWrite), Tzad::eOk);
     ASSERT_EQ(style->setXScale(2), Tzad::eOk);
-    style->close();
+    EXPECT_EQ(style->close(), Tzad::eOk);
     EXPECT_NEAR(at<TzDbMText>(id).actualWidth(), 2 * before, before * 1e-6);
 }
 
@@ -101,7 +101,7 @@ TEST_F(DrawingTest, BoxOfADefinitionHoldsItsLines) {
     Box const plain = boxOf(id);
     EXPECT_EQ(definition->downgradeOpen(), Tzad::eOk);
     EXPECT_EQ(lines->setWidth(1), Tzad::eNotOpenForWrite);
-    definition->close();
+    EXPECT_EQ(definition->close(), Tzad::eOk);
     EXPECT_GT(plain.high[0], single);
     EXPECT_GT(plain.high[0], wrapped.high[0]);
     EXPECT_NEAR(wrapped.high[1] - wrapped.low[1], 0.2 * (1 + 5.0 / 3.0), 1e-9);

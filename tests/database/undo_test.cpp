@@ -18,11 +18,11 @@ struct Deed {
 };
 
 template <class T>
-void change(TzDbObjectId id, void (*act)(T& object)) {
+void change(TzDbObjectId id, Tzad::ErrorStatus (*act)(T& object)) {
     T* object = nullptr;
     ASSERT_EQ(tzdbOpenObject(object, id, TzDb::kForWrite), Tzad::eOk);
-    act(*object);
-    object->close();
+    EXPECT_EQ(act(*object), Tzad::eOk);
+    EXPECT_EQ(object->close(), Tzad::eOk);
 }
 
 Deed const kDeeds[] = {
@@ -34,30 +34,31 @@ Deed const kDeeds[] = {
      }                                                 },
     {"Erase",
      [](DrawingFixture&,                     TzDbObjectId id) {
-         change<TzDbMText>(id, [](TzDbMText& text) { text.erase(); });
+         change<TzDbMText>(id, [](TzDbMText& text) { return text.erase(); });
      }                                                   },
     {"ChangeTwice",
      [](DrawingFixture&,                     TzDbObjectId id) {
-         change<TzDbMText>(id, [](TzDbMText& text) { text.setContents(L"one"); });
+         change<TzDbMText>(id, [](TzDbMText& text) { return text.setContents(L"one"); });
          change<TzDbMText>(id, [](TzDbMText& text) {
-             text.setContents(L"two");
-             text.setStaticColumns(3, 1, 2);
-             text.setBackgroundFill(true);
+             EXPECT_EQ(text.setContents(L"two"), Tzad::eOk);
+             EXPECT_EQ(text.setStaticColumns(3, 1, 2), Tzad::eOk);
+             return text.setBackgroundFill(true);
          });
      }                                                   },
     {"Move",
      [](DrawingFixture&,                     TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) {
-             text.transformBy(TzGeMatrix3d::translation({1, 2, 3}));
+             return text.transformBy(TzGeMatrix3d::translation({1, 2, 3}));
          });
      }                                                   },
     {"AppendAndErase",
      [](DrawingFixture& f,                   TzDbObjectId) {
-         change<TzDbMText>(f.addText(L"new"), [](TzDbMText& text) { text.erase(); });
+         change<TzDbMText>(f.addText(L"new"), [](TzDbMText& text) { return text.erase(); });
      }                                                 },
     {"Field",
      [](DrawingFixture&,                     TzDbObjectId id) {
-         change<TzDbMText>(id, [](TzDbMText& text) { text.setContents(L"%<\\Var LUNITS>%"); });
+         change<TzDbMText>(id,
+                           [](TzDbMText& text) { return text.setContents(L"%<\\Var LUNITS>%"); });
      }                                                   },
     {"Layer",
      [](DrawingFixture& f,                   TzDbObjectId id) {
@@ -65,18 +66,20 @@ Deed const kDeeds[] = {
          TzDbMText* text = nullptr;
          ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
          EXPECT_EQ(text->setLayer(layer), Tzad::eOk);
-         text->close();
+         EXPECT_EQ(text->close(), Tzad::eOk);
          EXPECT_EQ(f.drawing->setClayer(layer), Tzad::eOk);
      }                                                 },
     {"Rename",
      [](DrawingFixture& f,                   TzDbObjectId) {
-         change<TzDbLayerTableRecord>(f.drawing->clayer(),
-                                      [](TzDbLayerTableRecord& layer) { layer.setName(L"Walls"); });
+         change<TzDbLayerTableRecord>(f.drawing->clayer(), [](TzDbLayerTableRecord& layer) {
+             return layer.setName(L"Walls");
+         });
      }                                                 },
     {"Style",
      [](DrawingFixture& f,                   TzDbObjectId) {
          change<TzDbTextStyleTableRecord>(
-             f.drawing->textstyle(), [](TzDbTextStyleTableRecord& style) { style.setXScale(2.0); });
+             f.drawing->textstyle(),
+             [](TzDbTextStyleTableRecord& style) { return style.setXScale(2.0); });
      }                                                 },
     {"Variables",
      [](DrawingFixture&,                     TzDbObjectId) {
@@ -103,7 +106,9 @@ protected:
                 std::to_string(lines.actualWidth()) + '\n';
         TzDbField* field = nullptr;
         text += std::to_string(lines.getField(L"TEXT", field, TzDb::kForRead));
-        if (field) field->close();
+        if (field) {
+            EXPECT_EQ(field->close(), Tzad::eOk);
+        }
         for (auto const& [name, value] : Variables::instance().kept(tzhost::KeptIn::drawing))
             text += '\n' + TzString(name).toUtf8() + TzString(tzhost::writeValue(value)).toUtf8();
         text += '\n' + std::to_string(drawing->ucsydir().z);
@@ -111,7 +116,7 @@ protected:
             TzDbLayerTable* table = nullptr;
             EXPECT_EQ(drawing->getLayerTable(table, TzDb::kForRead), Tzad::eOk);
             text += table->has(layer) ? " yes" : " no";
-            table->close();
+            EXPECT_EQ(table->close(), Tzad::eOk);
         }
         return text;
     }

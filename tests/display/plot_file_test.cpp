@@ -56,8 +56,8 @@ protected:
         EXPECT_EQ(layer->setColor(TzCmEntityColor::fromIndex(1)), Tzad::eOk);
         TzDbObjectId id;
         EXPECT_EQ(table->addRecord(layer, id), Tzad::eOk);
-        layer->close();
-        table->close();
+        EXPECT_EQ(layer->close(), Tzad::eOk);
+        EXPECT_EQ(table->close(), Tzad::eOk);
         return id;
     }
 
@@ -68,8 +68,8 @@ protected:
         EXPECT_EQ(block->setName(name.c_str()), Tzad::eOk);
         TzDbObjectId id;
         EXPECT_EQ(table->addRecord(block, id), Tzad::eOk);
-        block->close();
-        table->close();
+        EXPECT_EQ(block->close(), Tzad::eOk);
+        EXPECT_EQ(table->close(), Tzad::eOk);
         return id;
     }
 
@@ -78,12 +78,12 @@ protected:
         ASSERT_EQ(drawing_->getBlockTable(table, TzDb::kForRead), Tzad::eOk);
         TzDbBlockTableRecord* record = nullptr;
         ASSERT_EQ(table->getAt(space, record, TzDb::kForWrite), Tzad::eOk);
-        table->close();
+        EXPECT_EQ(table->close(), Tzad::eOk);
         TzDbObjectId id;
         TzDbEntity* const posted = entity.release();
         ASSERT_EQ(record->appendTzDbEntity(id, posted), Tzad::eOk);
-        posted->close();
-        record->close();
+        EXPECT_EQ(posted->close(), Tzad::eOk);
+        EXPECT_EQ(record->close(), Tzad::eOk);
     }
 
     [[nodiscard]] Picture plotted() const {
@@ -109,7 +109,7 @@ TEST_F(PlotFiles, OpenNothing) {
     TzDbBlockTable* table = nullptr;
     ASSERT_EQ(drawing_->getBlockTable(table, TzDb::kForWrite), Tzad::eOk);
     EXPECT_GT(plotted().countShades(kRed), 500);
-    table->close();
+    EXPECT_EQ(table->close(), Tzad::eOk);
 }
 
 TEST_F(PlotFiles, ShowTextsOnTheirBackground) {

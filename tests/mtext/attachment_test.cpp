@@ -10,13 +10,13 @@ namespace {
 
 void describe(TzDbMText& text, TzDbMText::AttachmentPoint attachment, double width) {
     text.setDatabaseDefaults();
-    text.setNormal({0, -1, 0});
-    text.setDirection({0.6, 0, 0.8});
-    text.setLocation({3, 4, 5});
-    text.setTextHeight(2);
-    text.setWidth(width);
-    text.setContents(L"One\\PTwo and three");
-    text.setAttachment(attachment);
+    EXPECT_EQ(text.setNormal({0, -1, 0}), Tzad::eOk);
+    EXPECT_EQ(text.setDirection({0.6, 0, 0.8}), Tzad::eOk);
+    EXPECT_EQ(text.setLocation({3, 4, 5}), Tzad::eOk);
+    EXPECT_EQ(text.setTextHeight(2), Tzad::eOk);
+    EXPECT_EQ(text.setWidth(width), Tzad::eOk);
+    EXPECT_EQ(text.setContents(L"One\\PTwo and three"), Tzad::eOk);
+    EXPECT_EQ(text.setAttachment(attachment), Tzad::eOk);
 }
 
 TzDbMText::AttachmentPoint point(int number) {
@@ -31,7 +31,7 @@ void expectStays(int from, int to, double width) {
     EasyObject<TzDbMText> held(&text, EasyFlags::kNone);
     UpdateAttachPoint(held, point(to), kMeasureHeight);
     EXPECT_EQ(text.attachment(), point(from));
-    text.setAttachment(point(to));
+    EXPECT_EQ(text.setAttachment(point(to)), Tzad::eOk);
     TzArray<TzGePoint3d> after;
     text.getBoundingPoints(after);
     ASSERT_EQ(before.length(), 4);
@@ -81,9 +81,9 @@ TEST(Attachment, MovesTheLocationInAGivenBox) {
         SCOPED_TRACE(std::to_string(row.from) + " to " + std::to_string(row.to));
         TzDbMText text;
         text.setDatabaseDefaults();
-        text.setContents(L"Text");
-        text.setWidth(10);
-        text.setAttachment(point(row.from));
+        EXPECT_EQ(text.setContents(L"Text"), Tzad::eOk);
+        EXPECT_EQ(text.setWidth(10), Tzad::eOk);
+        EXPECT_EQ(text.setAttachment(point(row.from)), Tzad::eOk);
         EasyObject<TzDbMText> held(&text, EasyFlags::kNone);
         UpdateAttachPoint(held, point(row.to), row.height);
         EXPECT_TRUE(text.location().isEqualTo(row.location));

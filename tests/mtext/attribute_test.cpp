@@ -24,11 +24,11 @@ struct AttributeRow {
 
 void describe(TzDbMText& text, TzGePoint3d const& location) {
     text.setDatabaseDefaults();
-    text.setTextHeight(2);
-    text.setLocation(location);
-    text.setWidth(7);
-    text.setAttachment(TzDbMText::kMiddleCenter);
-    text.setContents(L"before");
+    EXPECT_EQ(text.setTextHeight(2), Tzad::eOk);
+    EXPECT_EQ(text.setLocation(location), Tzad::eOk);
+    EXPECT_EQ(text.setWidth(7), Tzad::eOk);
+    EXPECT_EQ(text.setAttachment(TzDbMText::kMiddleCenter), Tzad::eOk);
+    EXPECT_EQ(text.setContents(L"before"), Tzad::eOk);
 }
 
 void expectText(TzDbMText const& text, AttributeRow const& row) {
@@ -109,7 +109,7 @@ TEST(Options, ReadTheWorkingAngleAndNeverTakeItAway) {
     tzhost::workingDrawing()->setSettings(settings);
     TzDbMText text;
     describe(text, {1, 2, 3});
-    text.setRotation(0.5);
+    EXPECT_EQ(text.setRotation(0.5), Tzad::eOk);
     TzxMtextCommand command;
     command.setMTextOptionsFrom(&text);
     EXPECT_DOUBLE_EQ(command.rotation, 0.75);

@@ -23,7 +23,7 @@ TzDbObjectId post(TzDbEntity* entity) {
 
 TzDbObjectId postText() {
     auto* const text = new TzDbMText;
-    text->setContents(L"before");
+    EXPECT_EQ(text->setContents(L"before"), Tzad::eOk);
     return post(text);
 }
 
@@ -37,7 +37,7 @@ void lockLayerZero() {
     EasyObject<TzDbLayerTableRecord> layer;
     ASSERT_EQ(tzdbOpenObject(layer.object, tzhost::workingDrawing()->clayer(), TzDb::kForWrite),
               Tzad::eOk);
-    layer->setIsLocked(true);
+    EXPECT_EQ(layer->setIsLocked(true), Tzad::eOk);
 }
 
 void activateWorkingSet(TzDbObjectId left) {
@@ -59,7 +59,9 @@ int editByPointer(TzDbObjectId id) {
     int const result = InvokeEditorOn(text, kMTETabText, 0, true, true, false, false);
     Tzad::ErrorStatus const status = tzdbOpenObject(text, id, TzDb::kForWrite);
     EXPECT_TRUE(status == Tzad::eOk || status == Tzad::eOnLockedLayer) << status;
-    if (text) text->close();
+    if (text) {
+        EXPECT_EQ(text->close(), Tzad::eOk);
+    }
     return result;
 }
 

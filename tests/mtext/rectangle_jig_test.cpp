@@ -12,7 +12,7 @@ namespace {
 
 TEST(RectangleJig, GivesItsSizeAndLeavesOrthoModeAsItWas) {
     OpenDrawing const drawing("~3,4\n-20,10\n");
-    tzhost::workingDrawing()->setOrthomode(true);
+    EXPECT_EQ(tzhost::workingDrawing()->setOrthomode(true), Tzad::eOk);
     CTzsMtextJig jig(TzGePoint3d::kOrigin);
     jig.SetAttachment(0);
     CKeywordTable none;

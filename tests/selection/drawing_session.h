@@ -38,10 +38,12 @@ public:
         TzDbObjectId id;
         if (drawing_->getBlockTable(table, TzDb::kForRead) != Tzad::eOk) return "no table";
         if (table->getAt(block, record, TzDb::kForWrite) == Tzad::eOk) {
-            if (record->appendTzDbEntity(id, entity) == Tzad::eOk) entity->close();
-            record->close();
+            if (record->appendTzDbEntity(id, entity) == Tzad::eOk) {
+                EXPECT_EQ(entity->close(), Tzad::eOk);
+            }
+            EXPECT_EQ(record->close(), Tzad::eOk);
         }
-        table->close();
+        EXPECT_EQ(table->close(), Tzad::eOk);
         return handle(id);
     }
     std::string addLine(TzGePoint3d const& from,
@@ -49,17 +51,17 @@ public:
                         wchar_t const* block = kModelSpaceName) {
         auto* const line = new TzDbLine;
         line->setDatabaseDefaults();
-        line->setStartPoint(from);
-        line->setEndPoint(to);
+        EXPECT_EQ(line->setStartPoint(from), Tzad::eOk);
+        EXPECT_EQ(line->setEndPoint(to), Tzad::eOk);
         return add(line, block);
     }
     std::string addText(TzGePoint3d const& at, wchar_t const* contents, double degrees = 0) {
         auto* const text = new TzDbMText;
         text->setDatabaseDefaults();
-        text->setLocation(at);
-        text->setTextHeight(1);
-        text->setContents(contents);
-        text->setRotation(degrees * 3.14159265358979323846 / 180);
+        EXPECT_EQ(text->setLocation(at), Tzad::eOk);
+        EXPECT_EQ(text->setTextHeight(1), Tzad::eOk);
+        EXPECT_EQ(text->setContents(contents), Tzad::eOk);
+        EXPECT_EQ(text->setRotation(degrees * 3.14159265358979323846 / 180), Tzad::eOk);
         return add(text);
     }
     // An empty block.
@@ -67,21 +69,25 @@ public:
         TzDbBlockTable* table = nullptr;
         TzDbObjectId id;
         auto* const record = new TzDbBlockTableRecord;
-        record->setName(name);
+        EXPECT_EQ(record->setName(name), Tzad::eOk);
         if (drawing_->getBlockTable(table, TzDb::kForWrite) != Tzad::eOk) return id;
-        if (table->addRecord(record, id) == Tzad::eOk) record->close();
-        table->close();
+        if (table->addRecord(record, id) == Tzad::eOk) {
+            EXPECT_EQ(record->close(), Tzad::eOk);
+        }
+        EXPECT_EQ(table->close(), Tzad::eOk);
         return id;
     }
     std::string addLayer(wchar_t const* name, bool isLocked) {
         TzDbLayerTable* table = nullptr;
         TzDbObjectId id;
         auto* const record = new TzDbLayerTableRecord;
-        record->setName(name);
-        record->setIsLocked(isLocked);
+        EXPECT_EQ(record->setName(name), Tzad::eOk);
+        EXPECT_EQ(record->setIsLocked(isLocked), Tzad::eOk);
         if (drawing_->getLayerTable(table, TzDb::kForWrite) != Tzad::eOk) return "no table";
-        if (table->addRecord(record, id) == Tzad::eOk) record->close();
-        table->close();
+        if (table->addRecord(record, id) == Tzad::eOk) {
+            EXPECT_EQ(record->close(), Tzad::eOk);
+        }
+        EXPECT_EQ(table->close(), Tzad::eOk);
         return handle(id);
     }
 

@@ -32,21 +32,21 @@ protected:
         auto* const entity = new TzDbBlockReference;
         entity->setDatabaseDefaults();
         EXPECT_EQ(entity->setBlockTableRecord(block), Tzad::eOk);
-        entity->setPosition(at);
+        EXPECT_EQ(entity->setPosition(at), Tzad::eOk);
         return entity;
     }
     std::string addAttribute() {
         auto* const attribute = new TzDbAttribute;
         attribute->setDatabaseDefaults();
-        attribute->setHeight(1);
-        attribute->setPosition({100, 50, 0});
-        attribute->setTextString(L"WW");
+        EXPECT_EQ(attribute->setHeight(1), Tzad::eOk);
+        EXPECT_EQ(attribute->setPosition({100, 50, 0}), Tzad::eOk);
+        EXPECT_EQ(attribute->setTextString(L"WW"), Tzad::eOk);
         TzDbBlockReference* owner = nullptr;
         TzDbObjectId id;
         EXPECT_EQ(tzdbOpenObject(owner, drawing_.id(reference_), TzDb::kForWrite), Tzad::eOk);
         EXPECT_EQ(owner->appendAttribute(id, attribute), Tzad::eOk);
-        attribute->close();
-        owner->close();
+        EXPECT_EQ(attribute->close(), Tzad::eOk);
+        EXPECT_EQ(owner->close(), Tzad::eOk);
         return OpenDrawing::handle(id);
     }
 

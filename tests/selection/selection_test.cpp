@@ -35,13 +35,13 @@ protected:
         drawing_.addLayer(L"Frozen", true);
         auto* const line = new TzDbLine;
         line->setDatabaseDefaults();
-        line->setEndPoint({1, 1, 0});
+        EXPECT_EQ(line->setEndPoint({1, 1, 0}), Tzad::eOk);
         TzDbLayerTable* table = nullptr;
         TzDbObjectId layer;
         EXPECT_EQ(drawing_.drawing().getLayerTable(table, TzDb::kForRead), Tzad::eOk);
         EXPECT_EQ(table->getIdAt(L"frozen", layer), Tzad::eOk);
-        table->close();
-        line->setLayer(layer);
+        EXPECT_EQ(table->close(), Tzad::eOk);
+        EXPECT_EQ(line->setLayer(layer), Tzad::eOk);
         return drawing_.add(line);
     }
 
@@ -169,8 +169,8 @@ TEST_F(Selections, RememberThePreviousOne) {
     EXPECT_EQ(select("$3\n^C"), "-5002 none");
     TzDbEntity* line = nullptr;
     ASSERT_EQ(tzdbOpenObject(line, drawing_.id(names_[1]), TzDb::kForWrite), Tzad::eOk);
-    line->erase();
-    line->close();
+    EXPECT_EQ(line->erase(), Tzad::eOk);
+    EXPECT_EQ(line->close(), Tzad::eOk);
     EXPECT_EQ(select("previous\n\n"), "5100 1");
 }
 
