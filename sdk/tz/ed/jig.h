@@ -28,7 +28,7 @@ struct TzEdJigInputData {
 // Points are world coordinates. The jig is the caller's and outlives the drag.
 class TZ_API TzEdJig {
 public:
-    enum DragStatus : int {
+    enum [[nodiscard]] DragStatus : int{
         kCancel = -4,    // the user cancelled
         kNoChange = -6,  // the sample is as the one before; nothing is drawn
         kOther = -5,     // the host failed

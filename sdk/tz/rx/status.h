@@ -11,7 +11,7 @@ namespace Tzad {
 
 // Success is 0. The numbers up to 100 are those that a user meets in messages; those from 1001 are
 // this host's own and are only told apart by their names.
-enum ErrorStatus : int {
+enum [[nodiscard]] ErrorStatus : int{
     eOk = 0,
     eWasOpenForRead = 15,       // another holder has the object open for read
     eWasOpenForWrite = 45,      // another holder has the object open for write
