@@ -7,6 +7,7 @@ Each round runs every program once. What counts is the median of the processor's
 work on the machine does not. Prints one line for each ratio with its bound, as ratios.py does, and
 the times and peaks of memory behind them; exit status 1 when one is over. A program that is not
 installed is left out, with a line that says so."""
+import argparse
 import os
 import shutil
 import statistics
@@ -102,8 +103,12 @@ def measure_letters(report, convert, file):
 
 
 def main():
-    build = os.path.abspath(sys.argv[1])
-    rounds = int(sys.argv[2]) if len(sys.argv) > 2 else 9
+    arguments = argparse.ArgumentParser(description=__doc__,
+                                        formatter_class=argparse.RawDescriptionHelpFormatter)
+    arguments.add_argument("build", metavar="BUILD", type=os.path.abspath)
+    arguments.add_argument("rounds", metavar="ROUNDS", nargs="?", type=int, default=9)
+    options = arguments.parse_args()
+    build, rounds = options.build, options.rounds
     convert = os.path.join(build, "bin", "tzconvert")
     report = Report()
     with tempfile.TemporaryDirectory() as folder:

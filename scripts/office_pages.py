@@ -10,6 +10,7 @@ form is for the module's own editor, and for unrtf words with characters above 0
 that stands behind one, up to the next blank, for its substitute. Needs soffice, unrtf, pdftotext and pdftoppm
 (scripts/setup.sh pages); without one of them nothing is done and the exit status is 77.
 """
+import argparse
 import html
 import os
 import re
@@ -59,12 +60,16 @@ def missing(words, page):
 
 
 def main():
+    arguments = argparse.ArgumentParser(description=__doc__,
+                                        formatter_class=argparse.RawDescriptionHelpFormatter)
+    arguments.add_argument("folder", metavar="FOLDER", type=Path)
+    arguments.add_argument("build", metavar="BUILD", nargs="?", type=Path, default=ROOT / "build/release")
+    options = arguments.parse_args()
     absent = [program for program in PROGRAMS if not shutil.which(program)]
     if absent:
         print("not installed:", ", ".join(absent))
         return 77
-    folder = Path(sys.argv[1])
-    build = Path(sys.argv[2]) if len(sys.argv) > 2 else ROOT / "build/release"
+    folder, build = options.folder, options.build
     folder.mkdir(parents=True, exist_ok=True)
     texts = office_texts()
     names = [f"{number:03}" for number in range(1, len(texts) + 1)]
