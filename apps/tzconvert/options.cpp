@@ -153,7 +153,7 @@ void declareFiles(CLI::App& app, Options& options) {
                              ->check(aName());
     app.add_option("--output-dir", options.outputDir, "write each FILE's result into that folder")
         ->type_name("DIR")
-        ->check(aName())
+        ->check(CLI::ExistingDirectory)
         ->excludes(output);
     app.add_option("--report", options.report, "write what the conversion found as JSON")
         ->type_name("FILE")
