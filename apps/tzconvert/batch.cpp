@@ -17,6 +17,7 @@
 #include "host/base/file_bytes.h"
 #include "host/base/file_reader.h"
 #include "host/base/font_map_path.h"
+#include "host/base/safe_file.h"
 #include "host/base/variables.h"
 
 namespace tzconvert {
@@ -131,7 +132,7 @@ private:
     [[nodiscard]] static fs::path placeOf(std::string const& file) {
         std::error_code unreadable;  // will be named when it is read
         fs::path const named = fs::absolute(file, unreadable);
-        fs::path const real = fs::weakly_canonical(named, unreadable);
+        fs::path const real = fs::weakly_canonical(tzhost::followLinks(named), unreadable);
         return unreadable ? named : real;
     }
 

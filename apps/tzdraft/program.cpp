@@ -165,8 +165,12 @@ void Run::runCall(std::wstring const& line) {
     session_.endCommand();
 }
 
+bool isCall(std::wstring const& line) {
+    return line.front() == L'(';
+}
+
 void Run::runTyped(std::wstring const& line) {
-    if (line.front() == L'(') return runCall(line);
+    if (isCall(line)) return runCall(line);
     tzhost::Command const* const command = tzhost::commandStack().find(TzString(line));
     if (!command) {
         return tzhost::commandLine().say(
@@ -185,7 +189,8 @@ void Run::runGuarded(std::wstring const& line) {
         tzhost::commandLine().say(line + localText(L" ended early: ") +
                                   tzhost::fromUtf8(problem.what()));
     }
-    tzhost::freeAllSets();  // the audit has counted them
+    // The command's audit has counted them; a call has none, so the next command's does.
+    if (!isCall(line)) tzhost::freeAllSets();
 }
 
 // Enter alone repeats the line before it at a terminal; in a script it does nothing.

@@ -48,17 +48,6 @@ void flushFolder(std::filesystem::path const& folder) {
     (void)close(handle);
 }
 
-// The file that a symbolic link leads to, be it there yet or not; else the path itself.
-std::filesystem::path followed(std::filesystem::path const& target) {
-    namespace fs = std::filesystem;
-    std::error_code error;
-    if (!fs::is_symlink(target, error)) return target;
-    if (fs::path real = fs::canonical(target, error); !error) return real;
-    fs::path next = fs::read_symlink(target, error);
-    bool const isMissing = fs::status(target, error).type() == fs::file_type::not_found;
-    return isMissing ? target.parent_path() / next : target;
-}
-
 // A descriptor for the file when the program's own output goes there ("/dev/stdout"), which must
 // not be replaced, since others write to it too. -1 when it does not.
 int ownOutput(std::filesystem::path const& target) {
@@ -74,8 +63,25 @@ int ownOutput(std::filesystem::path const& target) {
 
 }  // namespace
 
+std::filesystem::path followLinks(std::filesystem::path const& path) {
+    namespace fs = std::filesystem;
+    constexpr int kMostLinks = 40;
+    std::error_code error;
+    if (!fs::is_symlink(path, error)) return path;
+    if (fs::exists(path, error)) {
+        fs::path real = fs::canonical(path, error);
+        return error ? path : real;
+    }
+    fs::path file = path;
+    for (int links = 0; fs::is_symlink(file, error); ++links) {
+        if (links == kMostLinks) return path;
+        file = file.parent_path() / fs::read_symlink(file, error);
+    }
+    return file;
+}
+
 SafeFile::SafeFile(std::filesystem::path const& target)
-    : target_(followed(target)), file_(ownOutput(target_)) {
+    : target_(followLinks(target)), file_(ownOutput(target_)) {
     namespace fs = std::filesystem;
     if (isOpen()) return;
     std::error_code error;

@@ -6,6 +6,11 @@
 
 namespace tzhost {
 
+// The file that a symbolic link leads to over any number of links, be it there yet or not. The path
+// itself when it is no link, when its links form a ring, and when what it leads to has no path, as
+// a pipe has none.
+[[nodiscard]] std::filesystem::path followLinks(std::filesystem::path const& path);
+
 // A file that is written piece by piece and takes the place of the old one only when it is whole:
 // the pieces go to a temporary file in the same folder, which `commit` flushes to the disk and
 // renames, so that a crash leaves the old file or the new one. A symbolic link is followed; an old

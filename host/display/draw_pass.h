@@ -30,7 +30,7 @@ public:
     DrawPass(DrawPass const&) = delete;
     DrawPass& operator=(DrawPass const&) = delete;
 
-    static constexpr int kMostNested = 500'000;
+    static constexpr int kMostNested = 2'000'000;
 
     // Draws one drawable behind what was drawn before: its attributes, then itself. Null draws
     // nothing.

@@ -25,8 +25,7 @@ plotDrawing(TzDbDatabase& database, PlotFormat format, std::string const& file) 
     if (faultAt("plotDrawing")) return file + ": " + localText("cannot be plotted");
     DrawPass pass(&database, DrawPass::Entities::strokes);
     drawActiveSpace(pass, database);
-    if (!pass.isWhole())
-        return file + ": " + localText("blocks within blocks hold too much to plot");
+    if (!pass.isWhole()) return file + ": " + localText("its blocks stand for too much to plot");
     PlotScene const scene = makeScene(pass.list(), viewAxes(activeSpace()));
     std::string const bytes = paintPlot(scene, format);
     if (bytes.empty()) return file + ": " + localText("the picture could not be made");

@@ -59,7 +59,7 @@ bool boxHolds(TzDbObjectRecord* record, TzGeMatrix3d const& placed, TzGePoint3d 
 }
 
 // Blocks within blocks can stand for more than one can look at: `looks` says at how many entities
-// the search may look yet.
+// of blocks within the first one the search may look yet.
 std::optional<Picked>
 pickInside(Picked const& outer, TzGePoint3d const& user, int depth, int& looks) {
     if (objectOf<TzDbBlockReference>(outer.id) == nullptr) return outer;
@@ -67,7 +67,7 @@ pickInside(Picked const& outer, TzGePoint3d const& user, int depth, int& looks) 
     for (Inside const& inside : insidesOf(outer)) {
         if (inside.items == nullptr) continue;
         for (auto at = inside.items->rbegin(); at != inside.items->rend(); ++at) {
-            if (--looks < 0) return std::nullopt;
+            if (depth > 0 && --looks < 0) return std::nullopt;
             if (!boxHolds(*at, inside.placed, user)) continue;
             auto const found = pickInside(stepInto(outer, inside, *at), user, depth + 1, looks);
             if (found) return found;

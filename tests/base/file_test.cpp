@@ -61,12 +61,13 @@ TEST_F(FileBytes, KeepPermissionsAndLinks) {
     EXPECT_EQ(status.st_mode & 07777U, 0640U);
 }
 
-// It used to put a file in the place of a link whose file was not there yet.
-TEST_F(FileBytes, FollowALinkThatLeadsToNoFileYet) {
+// They used to put a file in the place of a link whose file was not there yet.
+TEST_F(FileBytes, FollowLinksThatLeadToNoFileYet) {
     fs::create_directory(path("folder"));
-    fs::create_symlink("folder/real", path("link"));
+    fs::create_symlink("inner", path("link"));
+    fs::create_symlink("folder/real", path("inner"));
     ASSERT_TRUE(tzhost::writeFileSafely(path("link"), "new"));
-    EXPECT_TRUE(fs::is_symlink(path("link")));
+    EXPECT_TRUE(fs::is_symlink(path("link")) && fs::is_symlink(path("inner")));
     EXPECT_EQ(tzhost::readFile(path("folder/real")), "new");
 }
 

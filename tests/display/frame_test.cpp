@@ -157,14 +157,14 @@ TEST(Passes, EndWhereDrawablesDrawEachOther) {
     EXPECT_LE(pass.list().size(), 100U);
 }
 
-// Each drawable draws the next one twice, 2^20 in all. With a few more such a pass never ended.
+// Each drawable draws the next one twice, 2^22 in all. With a few more such a pass never ended.
 TEST(Passes, EndWhereDrawablesMultiply) {
     int level = 0;
     int drawn = 0;
     TzDbEntity* self = nullptr;
     Preview doubling([&](TzGiWorldDraw& draw) {
         ++drawn;
-        if (++level < 20) {
+        if (++level < 22) {
             draw.geometry().draw(self);
             draw.geometry().draw(self);
         }

@@ -220,6 +220,7 @@ TEST(Reports, TakeThePlaceOfNothingElse) {
         {"--output-dir made --report $PWD/a.mtext b a.mtext", "it is an input"     },
         {"--report own.ini --font-map ./own.ini a.mtext",     "it is an input"     },
         {"--output ./text.rtf --report text.rtf a.mtext",     "a result goes there"},
+        {"--output text.rtf --report nowhere.json a.mtext",   "a result goes there"},
         {"--output-dir made --report ./made/a.rtf b a.mtext", "a result goes there"},
         {"--output-dir made --report made/stdin.rtf",         "a result goes there"},
     };
@@ -228,6 +229,7 @@ TEST(Reports, TakeThePlaceOfNothingElse) {
     write("reports/a.mtext", "x");
     write("reports/own.ini", "[SHX Map]\n");
     fs::create_symlink("a.mtext", "reports/link.json");
+    fs::create_symlink("text.rtf", "reports/nowhere.json");
     for (Row const& row : kRows) {
         Outcome const result = run(std::string("to-rtf ") + row.arguments, "", "cd reports; ");
         EXPECT_EQ(result.status, 2) << row.arguments;
