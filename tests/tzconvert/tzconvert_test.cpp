@@ -66,7 +66,8 @@ constexpr RunCase kRuns[] = {
      "~{\\f0\\froman\\fprq2\\fcharset204 Some;}",                                                                                                                               ""                                                 },
     {"FaceStyle",             "to-rtf --font Some --bold",                                               "x"sv,                              0, "~\\fs32\\b \\deftab0 x",       ""                                                 },
     {"Size",                  "to-mtext --size 2.5 --twips 280",                                         "\\fs56 x"sv,                       0, "{\\H2x;x}",                    ""                                                 },
- // {\H0.9846x;abc \Ld\l e}, {\H1x;ABC} and {\H1x;a \H1.4x;\Le\H0.7143x;f\l g}
+
+ // Used to be {\H0.9846x;abc \Ld\l e}, {\H1x;ABC} and {\H1x;a \H1.4x;\Le\H0.7143x;f\l g}.
     {"SizeBetweenHalfPoints", "round-trip --twips 325",                                                  "abc {\\Ld} e"sv,                   0, "abc {\\Ld} e",                 ""                                                 },
     {"SizeBesideTheStyles",   "round-trip",                                                              "A{\\H0.20001;B}C"sv,               0, "ABC",                          ""                                                 },
     {"SecondTrip",            "round-trip",                                                              "a {\\H1.4x;\\Le\\H0.7143x;f} g"sv, 0,
