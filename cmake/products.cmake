@@ -1,5 +1,10 @@
 # The products, made of the layers that exist.
 
+# The ground of the host for programs without libtz: archives that call each other through the
+# operations of sdk/, so the linker reads them until nothing is missing.
+add_library(tz_ground INTERFACE)
+target_link_libraries(tz_ground INTERFACE $<LINK_GROUP:RESCAN,host_base,host_geometry,host_text,host_files,host_settings,host_code_pages,host_fonts,host_resources,host_platform>)
+
 # The embedded host: every host layer whole, so that what only the module calls is in it too.
 tz_layers_in("^host/" layers)
 if(layers)
@@ -46,7 +51,4 @@ if(TARGET app_tzdraft AND TARGET tz AND EXISTS ${PROJECT_SOURCE_DIR}/apps/tzdraf
     tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
 endif()
 # Archives only, so that no drawing database and no display library comes along.
-if(TARGET app_tzconvert AND TARGET module_markup AND TARGET host_base
-        AND EXISTS ${PROJECT_SOURCE_DIR}/apps/tzconvert/main.cpp)
-    tz_program(tzconvert module_markup module_fonts module_access host_base)
-endif()
+tz_program(tzconvert module_markup module_fonts module_access tz_ground)

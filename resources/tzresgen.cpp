@@ -14,9 +14,9 @@
 #include <string>
 #include <vector>
 
-#include "host/base/file_bytes.h"
-#include "host/base/resource_file.h"
-#include "host/base/resource_table.h"
+#include "host/files/file_bytes.h"
+#include "host/resources/resource_file.h"
+#include "host/resources/resource_table.h"
 
 namespace {
 

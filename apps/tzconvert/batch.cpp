@@ -13,12 +13,12 @@
 #include "apps/tzconvert/conversion.h"
 #include "apps/tzconvert/report.h"
 #include "apps/tzconvert/streams.h"
-#include "host/base/code_page_table.h"
-#include "host/base/file_bytes.h"
-#include "host/base/file_reader.h"
-#include "host/base/font_map_path.h"
-#include "host/base/safe_file.h"
-#include "host/base/variables.h"
+#include "host/code_pages/code_page_table.h"
+#include "host/files/file_bytes.h"
+#include "host/files/file_reader.h"
+#include "host/files/safe_file.h"
+#include "host/fonts/font_map_path.h"
+#include "host/settings/variables.h"
 
 namespace tzconvert {
 namespace {

@@ -4,8 +4,8 @@
 #include <cstdio>
 
 #include "apps/tzconvert/text_codec.h"
-#include "host/base/file_bytes.h"
-#include "host/base/file_reader.h"
+#include "host/files/file_bytes.h"
+#include "host/files/file_reader.h"
 
 namespace tzconvert {
 namespace {

@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <array>
 
-#include "host/base/utf8.h"
+#include "host/text/utf8.h"
 
 namespace tzconvert {
 namespace {

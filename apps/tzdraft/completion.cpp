@@ -4,8 +4,8 @@
 #include <filesystem>
 #include <iterator>
 
-#include "host/base/case_table.h"
-#include "host/base/utf8.h"
+#include "host/text/case_table.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

@@ -4,7 +4,7 @@
 #include <optional>
 #include <string>
 
-#include "host/base/safe_file.h"
+#include "host/files/safe_file.h"
 
 // The file of events: one JSON object a line, in the order in which they happened. It gets its name
 // when it is finished; a run that ends early leaves none.

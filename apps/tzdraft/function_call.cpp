@@ -5,10 +5,10 @@
 
 #include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
-#include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/database/open_state.h"
 #include "host/runtime/functions.h"
+#include "host/text/utf8.h"
 #include "tz/rx/app.h"
 #include "tz/rx/resbuf.h"
 

@@ -4,11 +4,11 @@
 #include <optional>
 #include <vector>
 
-#include "host/base/language.h"
-#include "host/base/resource_search.h"
-#include "host/base/utf8.h"
+#include "host/resources/language.h"
+#include "host/resources/resource_search.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

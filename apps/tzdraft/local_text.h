@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/base/local_text.h"
+#include "host/text/local_text.h"
 
 // The program's texts are looked up among the host's.
 namespace tzdraft {

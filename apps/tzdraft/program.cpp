@@ -14,9 +14,6 @@
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
 #include "host/base/audit.h"
-#include "host/base/local_text.h"
-#include "host/base/settings.h"
-#include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/script_source.h"
 #include "host/faults/fault_plan.h"
@@ -25,6 +22,9 @@
 #include "host/runtime/module_linker.h"
 #include "host/selection/entity_list.h"
 #include "host/selection/selection_sets.h"
+#include "host/settings/settings.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

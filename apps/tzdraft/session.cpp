@@ -6,12 +6,12 @@
 
 #include "apps/tzdraft/local_text.h"
 #include "host/base/memory_faults.h"
-#include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/display/plot.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/runtime/documents.h"
 #include "host/runtime/module_linker.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

@@ -7,9 +7,9 @@
 #include <string>
 #include <vector>
 
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/display/plot.h"
+#include "host/settings/variables.h"
 
 // One run of the program: the drawing that is open, and what the commands of the program do with
 // it. Every operation that can fail says why in one line, with the file in it.

@@ -3,16 +3,16 @@
 #include <cstdlib>
 
 #include "apps/tzdraft/local_text.h"
-#include "host/base/file_bytes.h"
-#include "host/base/font_map_path.h"
-#include "host/base/install_paths.h"
-#include "host/base/language.h"
-#include "host/base/resource_search.h"
-#include "host/base/settings.h"
-#include "host/base/utf8.h"
-#include "host/base/variables.h"
 #include "host/command_line/command_line.h"
 #include "host/editors/markup_session.h"
+#include "host/files/file_bytes.h"
+#include "host/files/install_paths.h"
+#include "host/fonts/font_map_path.h"
+#include "host/resources/language.h"
+#include "host/resources/resource_search.h"
+#include "host/settings/settings.h"
+#include "host/settings/variables.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

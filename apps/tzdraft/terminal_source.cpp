@@ -8,8 +8,8 @@
 #include <unistd.h>
 
 #include "apps/tzdraft/completion.h"
-#include "host/base/install_paths.h"
-#include "host/base/utf8.h"
+#include "host/files/install_paths.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

@@ -9,8 +9,8 @@
 #include <string>
 
 #include "bench/support/against_floor.h"
-#include "host/base/font_map_path.h"
-#include "host/base/install_paths.h"
+#include "host/files/install_paths.h"
+#include "host/fonts/font_map_path.h"
 #include "host/runtime/module_linker.h"
 #include "tz/rx/resource.h"
 

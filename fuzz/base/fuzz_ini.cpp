@@ -6,7 +6,7 @@
 #include <string>
 #include <unordered_map>
 
-#include "host/base/ini_data.h"
+#include "host/files/ini_data.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
     std::string const bytes(data, data + size);

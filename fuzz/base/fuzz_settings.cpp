@@ -7,7 +7,7 @@
 #include <cstdlib>
 #include <string>
 
-#include "host/base/settings.h"
+#include "host/settings/settings.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
     std::string const bytes(data, data + size);

@@ -6,10 +6,10 @@
 #include <string>
 #include <string_view>
 
-#include "host/base/utf8.h"
 #include "host/layout/markup_reader.h"
 #include "host/layout/mtext_layout.h"
 #include "host/layout/text_outline.h"
+#include "host/text/utf8.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {
     constexpr std::size_t kOptions = 4;

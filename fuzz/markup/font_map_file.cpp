@@ -5,7 +5,7 @@
 #include <cstdlib>
 
 #include "fuzz/markup/memory_file.h"
-#include "host/base/font_map_path.h"
+#include "host/fonts/font_map_path.h"
 #include "tz/mte/font_map_database.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {

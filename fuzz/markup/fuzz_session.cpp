@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "host/base/utf8.h"
+#include "host/text/utf8.h"
 
 namespace markupfuzz {
 

@@ -3,10 +3,10 @@
 #include <utility>
 
 #include "host/base/event_sink.h"
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/command_line/jig_driver.h"
 #include "host/runtime/documents.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 #include "tz/rx/status.h"
 
 namespace tzhost {

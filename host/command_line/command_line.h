@@ -17,11 +17,11 @@
 #include <string_view>
 #include <vector>
 
-#include "host/base/output.h"
 #include "host/command_line/answer_source.h"
 #include "host/command_line/keyword_list.h"
 #include "host/command_line/sent_strings.h"
 #include "host/command_line/transcript.h"
+#include "host/platform/output.h"
 
 namespace tzhost {
 

@@ -3,11 +3,11 @@
 #include <cmath>
 #include <utility>
 
-#include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
 #include "host/database/drawing.h"
 #include "host/database/user_system.h"
 #include "host/display/frame.h"
+#include "host/text/local_text.h"
 #include "tz/ge/matrix3d.h"
 
 using tzhost::Reply;

@@ -3,8 +3,8 @@
 #include <array>
 #include <cmath>
 
-#include "host/base/variables.h"
 #include "host/command_line/unit_text.h"
+#include "host/settings/variables.h"
 
 namespace tzhost {
 

@@ -4,8 +4,8 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzhost {
 

@@ -7,8 +7,8 @@
 #include <sstream>
 #include <utility>
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzhost {
 

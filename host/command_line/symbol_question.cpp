@@ -1,9 +1,9 @@
 // The question for the name of a style, a layer or a block.
 
 #include "host/base/fault_point.h"
-#include "host/base/local_text.h"
 #include "host/command_line/question.h"
 #include "host/database/symbol_name.h"
+#include "host/text/local_text.h"
 #include "tz/ed/prompts.h"
 #include "tz/rx/resbuf.h"
 

@@ -4,11 +4,11 @@
 #include <cmath>
 #include <numbers>
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
 #include "host/command_line/unit_reader.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 #include "tz/ed/prompts.h"
 
 using tzhost::Armed;

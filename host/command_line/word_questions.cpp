@@ -1,9 +1,9 @@
 // The questions for words and texts, and what arms and follows a question.
 
 #include "host/base/fault_point.h"
-#include "host/base/local_text.h"
-#include "host/base/variables.h"
 #include "host/command_line/question.h"
+#include "host/settings/variables.h"
+#include "host/text/local_text.h"
 #include "tz/ed/prompts.h"
 
 using tzhost::commandLine;

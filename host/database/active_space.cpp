@@ -1,6 +1,6 @@
 #include "host/database/active_space.h"
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 
 namespace tzhost {
 

@@ -18,8 +18,8 @@
 //   tzhost::setWorkingDrawing(drawing.get());
 //   drawing->undoLog().begin(); ... a command ...; drawing->undoLog().end();
 //
-// Drawing variables live in the process's one store (host/base/variables.h), since one drawing is
-// worked on at a time; the log takes them back with the rest. Objects die with their drawing.
+// Drawing variables live in the process's one store (host/settings/variables.h), since one drawing
+// is worked on at a time; the log takes them back with the rest. Objects die with their drawing.
 namespace tzhost {
 
 // Origin and unit axes of a user system, world coordinates.

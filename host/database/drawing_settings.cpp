@@ -1,7 +1,7 @@
 #include "host/base/memory_faults.h"
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/database/symbol_imp.h"
+#include "host/settings/variables.h"
 #include "tz/ge/matrix3d.h"
 
 // What a drawing holds beside its objects: current style and layer, user systems, the working set.

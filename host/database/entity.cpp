@@ -3,12 +3,12 @@
 #include "host/base/audit.h"
 #include "host/base/event_sink.h"
 #include "host/base/memory_faults.h"
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/database/entity_imp.h"
 #include "host/database/geometry.h"
 #include "host/database/open_state.h"
 #include "host/database/symbol_imp.h"
+#include "host/settings/variables.h"
 #include "tz/db/host_services.h"
 #include "tz/gi/draw.h"
 

@@ -4,12 +4,12 @@
 #include <ctime>
 
 #include "host/base/result_time.h"
-#include "host/base/utf8.h"
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/database/field_properties.h"
 #include "host/database/open_state.h"
 #include "host/runtime/words.h"
+#include "host/settings/variables.h"
+#include "host/text/utf8.h"
 
 namespace tzhost {
 namespace {

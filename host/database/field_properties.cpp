@@ -1,9 +1,9 @@
 #include "host/database/field_properties.h"
 
-#include "host/base/variables.h"
 #include "host/database/classes.h"
 #include "host/database/open_state.h"
 #include "host/database/symbol_imp.h"
+#include "host/settings/variables.h"
 #include "tz/db/mtext.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"

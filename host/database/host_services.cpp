@@ -1,9 +1,9 @@
 #include "tz/db/host_services.h"
 
-#include "host/base/settings.h"
 #include "host/database/drawing.h"
 #include "host/database/user_system.h"
 #include "host/runtime/notification.h"
+#include "host/settings/settings.h"
 
 namespace tzhost {
 namespace {

@@ -4,8 +4,8 @@
 #include <memory>
 #include <vector>
 
-#include "host/base/variables.h"
 #include "host/database/object_imp.h"
+#include "host/settings/variables.h"
 
 // What each command changed in a drawing, so that it can be taken back. An object costs something
 // only when a command changes it: its values are copied once per command, before the first change.

@@ -1,11 +1,11 @@
 #include "host/display/plot.h"
 
 #include "host/base/fault_point.h"
-#include "host/base/file_bytes.h"
-#include "host/base/local_text.h"
 #include "host/database/drawing.h"
 #include "host/display/draw_pass.h"
 #include "host/display/record_access.h"
+#include "host/files/file_bytes.h"
+#include "host/text/local_text.h"
 
 namespace tzhost {
 namespace {

@@ -4,8 +4,8 @@
 #include <variant>
 
 #include "host/base/fault_point.h"
-#include "host/base/screen.h"
-#include "host/base/variables.h"
+#include "host/platform/desktop.h"
+#include "host/settings/variables.h"
 #include "tz/ed/view.h"
 
 namespace tzhost {

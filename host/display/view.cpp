@@ -2,8 +2,8 @@
 
 #include <variant>
 
-#include "host/base/variables.h"
 #include "host/database/active_space.h"
+#include "host/settings/variables.h"
 #include "tz/ed/ucs.h"
 #include "tz/ge/arbitrary_axis.h"
 

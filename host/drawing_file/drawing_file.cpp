@@ -3,11 +3,11 @@
 #include <cerrno>
 #include <cstdio>
 
-#include "host/base/file_bytes.h"
-#include "host/base/local_text.h"
-#include "host/base/safe_file.h"
 #include "host/drawing_file/drawing_reader.h"
 #include "host/drawing_file/drawing_writer.h"
+#include "host/files/file_bytes.h"
+#include "host/files/safe_file.h"
+#include "host/text/local_text.h"
 
 namespace tzhost {
 namespace drawingfile {

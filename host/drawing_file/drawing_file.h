@@ -5,8 +5,8 @@
 #include <string>
 #include <vector>
 
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
+#include "host/settings/variables.h"
 
 // Drawings in files, in the JSON form that docs/drawing-file.md describes. Both directions work
 // entity by entity, so that a large drawing costs little more than its objects.

@@ -2,9 +2,9 @@
 
 #include <utility>
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/drawing_file/members.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzhost::drawingfile {
 namespace {

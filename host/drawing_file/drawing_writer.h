@@ -1,7 +1,7 @@
 #pragma once
 
-#include "host/base/safe_file.h"
 #include "host/database/drawing.h"
+#include "host/files/safe_file.h"
 
 namespace tzhost::drawingfile {
 

@@ -3,11 +3,11 @@
 #include <map>
 #include <type_traits>
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/database/field_imp.h"
 #include "host/database/open_state.h"
 #include "host/drawing_file/members.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 #include "tz/db/field.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"

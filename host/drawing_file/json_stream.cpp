@@ -8,9 +8,9 @@
 
 #include <nlohmann/json.hpp>
 
-#include "host/base/file_bytes.h"
-#include "host/base/local_text.h"
 #include "host/drawing_file/json_source.h"
+#include "host/files/file_bytes.h"
+#include "host/text/local_text.h"
 
 namespace tzhost::drawingfile {
 namespace {

@@ -1,6 +1,6 @@
 #include "host/drawing_file/json_value.h"
 
-#include "host/base/local_text.h"
+#include "host/text/local_text.h"
 
 #include <algorithm>
 #include <array>

@@ -1,6 +1,6 @@
 #include "host/drawing_file/limits.h"
 
-#include "host/base/local_text.h"
+#include "host/text/local_text.h"
 
 namespace tzhost::drawingfile {
 

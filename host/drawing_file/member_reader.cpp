@@ -2,10 +2,10 @@
 
 #include <cmath>
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/database/geometry.h"
 #include "host/database/true_color.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzhost::drawingfile {
 namespace {

@@ -1,9 +1,9 @@
 #include "host/drawing_file/member_writer.h"
 
-#include "host/base/utf8.h"
 #include "host/database/symbol_imp.h"
 #include "host/database/true_color.h"
 #include "host/drawing_file/json_value.h"
+#include "host/text/utf8.h"
 
 namespace tzhost::drawingfile {
 namespace {

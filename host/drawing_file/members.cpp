@@ -1,7 +1,7 @@
 #include "host/drawing_file/members.h"
 
-#include "host/base/local_text.h"
 #include "host/database/geometry.h"
+#include "host/text/local_text.h"
 #include "tz/db/mtext.h"
 
 namespace tzhost::drawingfile {

@@ -4,10 +4,10 @@
 #include <memory>
 #include <set>
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/database/geometry.h"
 #include "host/drawing_file/members.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzhost::drawingfile {
 namespace {

@@ -2,8 +2,8 @@
 
 #include <string>
 
-#include "host/base/variables.h"
 #include "host/drawing_file/read_context.h"
+#include "host/settings/variables.h"
 
 // Reads what a drawing holds beside its entities.
 namespace tzhost::drawingfile {

@@ -4,10 +4,10 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
-#include "host/base/variables.h"
 #include "host/editors/markup_session.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/notification.h"
+#include "host/settings/variables.h"
 #include "tz/ap/host_dialog.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/dialog_params.h"

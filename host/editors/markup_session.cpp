@@ -1,11 +1,11 @@
 #include "host/editors/markup_session.h"
 
-#include "host/base/local_text.h"
-#include "host/base/utf8.h"
 #include "host/command_line/command_line.h"
 #include "host/editors/markup_lines.h"
 #include "host/editors/private_file.h"
 #include "host/editors/program.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 
 namespace tzhost {
 namespace {

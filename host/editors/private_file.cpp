@@ -4,7 +4,7 @@
 #include <fstream>
 #include <system_error>
 
-#include "host/base/file_bytes.h"
+#include "host/files/file_bytes.h"
 
 namespace tzhost {
 

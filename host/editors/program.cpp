@@ -8,7 +8,7 @@
 #include <termios.h>
 #include <unistd.h>
 
-#include "host/base/local_text.h"
+#include "host/text/local_text.h"
 #include "tz/text/string.h"
 
 namespace tzhost {

@@ -3,8 +3,8 @@
 #include <charconv>
 
 #include "host/base/fault_point.h"
-#include "host/base/local_text.h"
 #include "host/base/memory_faults.h"
+#include "host/text/local_text.h"
 
 namespace tzhost {
 namespace {

@@ -3,7 +3,7 @@
 #include <hb-ot.h>
 #include <hb.h>
 
-#include "host/base/utf8.h"
+#include "host/text/utf8.h"
 
 namespace tzhost {
 namespace {

@@ -2,8 +2,8 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/memory_faults.h"
-#include "host/base/variables.h"
 #include "host/runtime/command_stack.h"
+#include "host/settings/variables.h"
 
 namespace tzhost {
 namespace {

@@ -7,10 +7,10 @@
 #include <utility>
 
 #include "host/base/fault_point.h"
-#include "host/base/local_text.h"
 #include "host/base/memory_faults.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/documents.h"
+#include "host/text/local_text.h"
 
 namespace tzhost {
 namespace {

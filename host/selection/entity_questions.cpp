@@ -2,10 +2,10 @@
 
 #include <utility>
 
-#include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
 #include "host/selection/pick.h"
+#include "host/text/local_text.h"
 #include "tz/ed/selection.h"
 #include "tz/rx/resbuf.h"
 

@@ -4,13 +4,13 @@
 #include <cstdint>
 #include <string>
 
-#include "host/base/utf8.h"
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
 #include "host/database/open_state.h"
 #include "host/database/user_system.h"
 #include "host/display/record_access.h"
 #include "host/selection/outline.h"
+#include "host/text/utf8.h"
 #include "tz/db/shapes.h"
 
 namespace tzhost {

@@ -2,8 +2,8 @@
 
 #include <utility>
 
-#include "host/base/local_text.h"
 #include "host/selection/input_filters.h"
+#include "host/text/local_text.h"
 #include "tz/rx/status.h"
 #include "tz/text/string.h"
 

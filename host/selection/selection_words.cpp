@@ -5,10 +5,10 @@
 #include <string>
 #include <vector>
 
-#include "host/base/local_text.h"
 #include "host/command_line/point_input.h"
 #include "host/runtime/words.h"
 #include "host/selection/pick.h"
+#include "host/text/local_text.h"
 
 namespace tzhost {
 

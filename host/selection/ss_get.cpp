@@ -4,13 +4,13 @@
 
 #include "host/base/audit.h"
 #include "host/base/fault_point.h"
-#include "host/base/local_text.h"
 #include "host/base/memory_faults.h"
 #include "host/command_line/question.h"
 #include "host/selection/pick.h"
 #include "host/selection/selecting.h"
 #include "host/selection/selection_sets.h"
 #include "host/selection/selection_words.h"
+#include "host/text/local_text.h"
 #include "tz/ed/selection.h"
 
 namespace tzhost {

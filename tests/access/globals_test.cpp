@@ -4,7 +4,7 @@
 
 #include <cwchar>
 
-#include "host/base/output.h"
+#include "host/platform/output.h"
 #include "module/access/attachment_ids.h"
 #include "module/access/mtext_versioner.h"
 #include "tz/mte/globals.h"

@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "host/base/output.h"
+#include "host/platform/output.h"
 #include "module/access/class_id.h"
 #include "module/access/elapsed_time.h"
 #include "module/access/handle_object.h"

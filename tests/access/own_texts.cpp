@@ -4,7 +4,7 @@
 #include <fstream>
 #include <string>
 
-#include "host/base/resource_search.h"
+#include "host/resources/resource_search.h"
 
 int ownTexts(tzhost::ResourceTexts const& texts) {
     std::string const file = std::filesystem::absolute("own-texts.dll").string();

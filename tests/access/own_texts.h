@@ -5,7 +5,7 @@
 //
 //   int const texts = ownTexts({{1, L"a {LUNITS}"}});   // at namespace scope
 
-#include "host/base/resource_file.h"
+#include "host/resources/resource_file.h"
 
 // Writes the library and makes the host find it. Returns how many texts it holds.
 int ownTexts(tzhost::ResourceTexts const& texts);

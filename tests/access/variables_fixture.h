@@ -4,7 +4,7 @@
 
 #include <string_view>
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 
 // Each test begins with the defaults of a fresh process, and leaves them behind.
 class WithVariables : public testing::Test {

@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tz/text/code_page.h"
 #include "tz/text/text_editor.h"
 

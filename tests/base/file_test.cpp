@@ -10,8 +10,8 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
-#include "host/base/file_bytes.h"
-#include "host/base/install_paths.h"
+#include "host/files/file_bytes.h"
+#include "host/files/install_paths.h"
 
 namespace {
 

@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tz/pal/font_enumeration.h"
 #include "tz/text/font_info.h"
 

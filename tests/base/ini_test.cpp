@@ -4,8 +4,8 @@
 
 #include <filesystem>
 
-#include "host/base/file_bytes.h"
-#include "host/base/font_map_path.h"
+#include "host/files/file_bytes.h"
+#include "host/fonts/font_map_path.h"
 #include "tz/pal/ini_file.h"
 
 namespace {

@@ -2,8 +2,8 @@
 
 #include <gtest/gtest.h>
 
-#include "host/base/language.h"
-#include "host/base/local_text.h"
+#include "host/resources/language.h"
+#include "host/text/local_text.h"
 
 namespace {
 

@@ -5,8 +5,8 @@
 #include <string>
 
 #include "host/base/event_sink.h"
-#include "host/base/output.h"
-#include "host/base/variables.h"
+#include "host/platform/output.h"
+#include "host/settings/variables.h"
 #include "tz/ed/print.h"
 #include "tz/ed/variables.h"
 #include "tz/ed/warning.h"

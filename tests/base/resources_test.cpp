@@ -6,11 +6,11 @@
 #include <filesystem>
 
 #include "host/base/fault_point.h"
-#include "host/base/file_bytes.h"
-#include "host/base/resource_file.h"
-#include "host/base/resource_search.h"
-#include "host/base/resource_table.h"
-#include "host/base/text_escapes.h"
+#include "host/files/file_bytes.h"
+#include "host/resources/resource_file.h"
+#include "host/resources/resource_search.h"
+#include "host/resources/resource_table.h"
+#include "host/text/text_escapes.h"
 #include "tz/rx/resource.h"
 
 namespace {

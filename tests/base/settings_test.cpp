@@ -4,9 +4,9 @@
 
 #include <filesystem>
 
-#include "host/base/file_bytes.h"
-#include "host/base/settings.h"
-#include "host/base/variables.h"
+#include "host/files/file_bytes.h"
+#include "host/settings/settings.h"
+#include "host/settings/variables.h"
 #include "tz/pal/registry.h"
 #include "tz/pal/settings.h"
 

@@ -5,7 +5,7 @@
 #include <clocale>
 #include <limits>
 
-#include "host/base/utf8.h"
+#include "host/text/utf8.h"
 #include "tz/text/std_str.h"
 #include "tz/text/string.h"
 

@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "host/base/fault_point.h"
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tz/ed/variables.h"
 #include "tz/rx/resbuf.h"
 #include "tz/rx/status.h"

@@ -4,9 +4,9 @@
 
 #include <fstream>
 
-#include "host/base/utf8.h"
 #include "host/command_line/script_source.h"
 #include "host/command_line/sent_strings.h"
+#include "host/text/utf8.h"
 
 namespace {
 

@@ -7,9 +7,9 @@
 #include <string_view>
 
 #include "host/base/event_sink.h"
-#include "host/base/variables.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/script_source.h"
+#include "host/settings/variables.h"
 
 namespace tzhost::test {
 

@@ -1,6 +1,6 @@
 #include <cstdlib>
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tests/database/drawing_fixture.h"
 #include "tz/db/field.h"
 

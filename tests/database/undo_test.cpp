@@ -1,4 +1,4 @@
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tests/database/drawing_fixture.h"
 #include "tz/db/field.h"
 #include "tz/db/shapes.h"

@@ -2,7 +2,7 @@
 #include <numbers>
 
 #include "host/base/audit.h"
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tests/database/drawing_fixture.h"
 #include "tz/ed/ucs.h"
 

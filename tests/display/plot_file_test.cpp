@@ -6,9 +6,9 @@
 #include <memory>
 #include <string>
 
-#include "host/base/file_bytes.h"
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
+#include "host/files/file_bytes.h"
+#include "host/settings/variables.h"
 #include "tests/display/picture.h"
 #include "tz/db/mtext.h"
 #include "tz/db/shapes.h"

@@ -6,7 +6,7 @@
 #include <string>
 #include <string_view>
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tz/ed/view.h"
 
 namespace {

@@ -5,7 +5,7 @@
 
 #include <fstream>
 
-#include "host/base/install_paths.h"
+#include "host/files/install_paths.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
 #include "tests/support/session_cases.h"

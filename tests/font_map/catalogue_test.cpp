@@ -7,7 +7,7 @@
 #include <fstream>
 #include <iterator>
 
-#include "host/base/settings.h"
+#include "host/settings/settings.h"
 #include "module/fonts/font_locations.h"
 #include "tz/mte/font_catalogue.h"
 

@@ -5,8 +5,8 @@
 #include <memory>
 #include <string>
 
-#include "host/base/font_map_path.h"
-#include "host/base/output.h"
+#include "host/fonts/font_map_path.h"
+#include "host/platform/output.h"
 #include "module/access/string_table.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"

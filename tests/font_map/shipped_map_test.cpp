@@ -10,7 +10,7 @@
 #include <string>
 #include <vector>
 
-#include "host/base/font_map_path.h"
+#include "host/fonts/font_map_path.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/pal/ini_file.h"
 #include "tz/text/font_info.h"

@@ -4,7 +4,7 @@
 #include <cmath>
 #include <cstdio>
 
-#include "host/base/utf8.h"
+#include "host/text/utf8.h"
 
 namespace tztest {
 namespace {

@@ -6,7 +6,7 @@
 #include <string_view>
 #include <utility>
 
-#include "host/base/utf8.h"
+#include "host/text/utf8.h"
 
 namespace tztest {
 namespace {

@@ -2,7 +2,7 @@
 
 #include <cstdlib>
 
-#include "host/base/font_map_path.h"
+#include "host/fonts/font_map_path.h"
 
 namespace markuptest {
 

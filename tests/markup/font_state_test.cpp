@@ -2,7 +2,7 @@
 
 #include <gtest/gtest.h>
 
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "module/markup/font_state.h"
 #include "tests/markup/conversions.h"
 #include "tz/gi/color.h"

@@ -3,9 +3,9 @@
 #include <memory>
 #include <string_view>
 
-#include "host/base/variables.h"
 #include "host/database/drawing.h"
 #include "host/runtime/documents.h"
+#include "host/settings/variables.h"
 #include "tests/command_line/session.h"
 
 // An open drawing with a script's answers, for tests that hold a text of their own and call the

@@ -7,8 +7,8 @@
 #include <cstdlib>
 #include <set>
 
-#include "host/base/resource_search.h"
 #include "host/command_line/keyword_list.h"
+#include "host/resources/resource_search.h"
 #include "module/access/resources.h"
 #include "module/access/string_table.h"
 #include "module/prompt/input.h"

@@ -7,8 +7,8 @@
 #include <map>
 #include <regex>
 
-#include "host/base/text_escapes.h"
-#include "host/base/utf8.h"
+#include "host/text/text_escapes.h"
+#include "host/text/utf8.h"
 
 namespace {
 

@@ -10,12 +10,12 @@
 #include <map>
 #include <set>
 
-#include "host/base/file_bytes.h"
-#include "host/base/format_conversions.h"
-#include "host/base/local_text.h"
-#include "host/base/resource_table.h"
-#include "host/base/utf8.h"
 #include "host/command_line/keyword_list.h"
+#include "host/files/file_bytes.h"
+#include "host/resources/resource_table.h"
+#include "host/text/format_conversions.h"
+#include "host/text/local_text.h"
+#include "host/text/utf8.h"
 #include "tests/resources/texts_in_code.h"
 #include "tz/text/string.h"
 

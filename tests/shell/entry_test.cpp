@@ -11,14 +11,14 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
-#include "host/base/output.h"
-#include "host/base/resource_search.h"
-#include "host/base/settings.h"
 #include "host/database/drawing.h"
+#include "host/platform/output.h"
+#include "host/resources/resource_search.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
 #include "host/runtime/functions.h"
 #include "host/runtime/module_linker.h"
+#include "host/settings/settings.h"
 #include "tz/rx/class.h"
 #include "tz/rx/resbuf.h"
 

@@ -11,13 +11,13 @@
 #include <utility>
 
 #include "host/base/event_sink.h"
-#include "host/base/file_bytes.h"
-#include "host/base/install_paths.h"
 #include "host/base/memory_faults.h"
-#include "host/base/resource_search.h"
 #include "host/command_line/command_line.h"
 #include "host/database/drawing.h"
 #include "host/faults/fault_plan.h"
+#include "host/files/file_bytes.h"
+#include "host/files/install_paths.h"
+#include "host/resources/resource_search.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"

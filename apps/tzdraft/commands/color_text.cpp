@@ -2,8 +2,8 @@
 
 #include <charconv>
 
-#include "host/base/utf8.h"
 #include "host/database/true_color.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {

@@ -5,7 +5,7 @@
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/local_text.h"
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"

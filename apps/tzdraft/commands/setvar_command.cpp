@@ -1,8 +1,8 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/local_text.h"
-#include "host/base/variable_table.h"
-#include "host/base/variables.h"
+#include "host/settings/variable_table.h"
+#include "host/settings/variables.h"
 #include "tz/ed/print.h"
 
 namespace tzdraft {

@@ -4,7 +4,7 @@
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
-#include "host/base/variables.h"
+#include "host/settings/variables.h"
 #include "tz/db/host_services.h"
 #include "tz/db/symbol_table.h"
 

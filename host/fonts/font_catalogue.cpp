@@ -1,0 +1,169 @@
+#include "host/fonts/font_catalogue.h"
+
+#include <algorithm>
+#include <cstdlib>
+#include <tuple>
+#include <unordered_map>
+
+#include "host/files/ini_data.h"
+#include "host/text/utf8.h"
+
+namespace tzhost {
+
+namespace {
+
+int integerOf(FcPattern* pattern, char const* property, int otherwise) {
+    int value = otherwise;
+    return FcPatternGetInteger(pattern, property, 0, &value) == FcResultMatch ? value : otherwise;
+}
+
+bool flagOf(FcPattern* pattern, char const* property) {
+    FcBool value = FcFalse;
+    return FcPatternGetBool(pattern, property, 0, &value) == FcResultMatch && value == FcTrue;
+}
+
+std::string textOf(FcPattern* pattern, char const* property, int index) {
+    FcChar8* value = nullptr;
+    if (FcPatternGetString(pattern, property, index, &value) != FcResultMatch) return {};
+    return reinterpret_cast<char const*>(value);  // fontconfig's characters are unsigned
+}
+
+struct FamilyName {
+    std::wstring name;
+    bool isEnglish;
+};
+
+// The family names of a pattern. A font with one name only has it in English, whatever it says.
+std::vector<FamilyName> namesOf(FcPattern* pattern) {
+    std::vector<FamilyName> names;
+    for (int i = 0;; ++i) {
+        std::wstring name = fromUtf8(textOf(pattern, FC_FAMILY, i));
+        if (name.empty()) break;
+        names.push_back({std::move(name), textOf(pattern, FC_FAMILYLANG, i) == "en"});
+    }
+    bool const hasEnglish = std::any_of(names.begin(), names.end(),
+                                        [](FamilyName const& each) { return each.isEnglish; });
+    if (!hasEnglish && !names.empty()) names[0].isEnglish = true;
+    return names;
+}
+
+std::wstring withoutFolder(std::wstring_view path) {
+    std::size_t const slash = path.find_last_of(L"/\\");
+    return std::wstring(slash == path.npos ? path : path.substr(slash + 1));
+}
+
+FontForm formOf(FcPattern* pattern) {
+    FontForm form;
+    form.path = textOf(pattern, FC_FILE, 0);
+    form.fileName = withoutFolder(fromUtf8(form.path));
+    form.index = integerOf(pattern, FC_INDEX, 0);
+    form.weight = integerOf(pattern, FC_WEIGHT, FC_WEIGHT_REGULAR);
+    form.slant = integerOf(pattern, FC_SLANT, FC_SLANT_ROMAN);
+    form.width = integerOf(pattern, FC_WIDTH, FC_WIDTH_NORMAL);
+    form.isFixedPitch = integerOf(pattern, FC_SPACING, FC_PROPORTIONAL) >= FC_MONO;
+    FcCharSet* characters = nullptr;
+    if (FcPatternGetCharSet(pattern, FC_CHARSET, 0, &characters) == FcResultMatch) {
+        form.characters = characters;
+    }
+    return form;
+}
+
+// How far a form is from the one that is asked for; the file's name makes the order the same on
+// every machine with the same files.
+auto distance(FontForm const& form, bool bold, bool italic) {
+    int const wanted = bold ? FC_WEIGHT_BOLD : FC_WEIGHT_REGULAR;
+    return std::tuple(form.isItalic() != italic, form.isBold() != bold,
+                      std::abs(form.width - FC_WIDTH_NORMAL), std::abs(form.weight - wanted),
+                      std::wstring_view(form.fileName), form.index);
+}
+
+}  // namespace
+
+FontForm const& FontFamilyRow::nearest(bool bold, bool italic) const {
+    return **std::min_element(forms.begin(), forms.end(),
+                              [=](FontForm const* a, FontForm const* b) {
+                                  return distance(*a, bold, italic) < distance(*b, bold, italic);
+                              });
+}
+
+bool FontFamilyRow::has(bool bold, bool italic) const {
+    FontForm const& form = nearest(bold, italic);
+    return form.isBold() == bold && form.isItalic() == italic;
+}
+
+FontCatalogue const& FontCatalogue::instance() {
+    static FontCatalogue const catalogue;
+    return catalogue;
+}
+
+FontCatalogue::FontCatalogue() : config_(FcInitLoadConfigAndFonts(), &FcConfigDestroy) {
+    FcFontSet const* const fonts = config_ ? FcConfigGetFonts(config_.get(), FcSetSystem) : nullptr;
+    for (int i = 0; fonts != nullptr && i < fonts->nfont; ++i)
+        add(fonts->fonts[i]);
+    nameForms();
+}
+
+void FontCatalogue::add(FcPattern* pattern) {
+    // Bitmap fonts cannot be drawn at any size; a variable font is listed once more as each of its
+    // named forms.
+    if (!flagOf(pattern, FC_SCALABLE) || flagOf(pattern, FC_VARIABLE)) return;
+    auto const names = namesOf(pattern);
+    if (names.empty()) return;
+    FontForm const& form = forms_.emplace_back(formOf(pattern));
+    auto const english = std::find_if(names.begin(), names.end(),
+                                      [](FamilyName const& each) { return each.isEnglish; });
+    auto const native = std::find_if(names.begin(), names.end(),
+                                     [](FamilyName const& each) { return !each.isEnglish; });
+    for (FamilyName const& each : names) {
+        FontFamilyRow& row = byName_[lowered(each.name)];
+        row.forms.push_back(&form);
+        if (!row.english.empty()) continue;
+        row.english = each.isEnglish ? each.name : english->name;
+        row.native = native == names.end() ? row.english : native->name;
+    }
+    auto const [at, isNew] = byFile_.try_emplace(lowered(form.fileName), &form);
+    if (!isNew && form.index < at->second->index) at->second = &form;
+}
+
+// Gives each form the English family name whose nearest form it is, so that going from the file to
+// the face and back ends at the same file: a condensed cut may also stand under its family's plain
+// name.
+void FontCatalogue::nameForms() {
+    struct Name {
+        std::wstring const* english = nullptr;
+        bool leadsBack = false;
+    };
+    std::unordered_map<FontForm const*, Name> names;
+    for (FontFamilyRow const* const row : families()) {
+        for (FontForm const* const form : row->forms) {
+            Name& name = names[form];
+            if (name.leadsBack) continue;
+            name.leadsBack = &row->nearest(form->isBold(), form->isItalic()) == form;
+            if (!name.english || name.leadsBack) name.english = &row->english;
+        }
+    }
+    for (FontForm& form : forms_) {
+        if (auto const at = names.find(&form); at != names.end())
+            form.english = *at->second.english;
+    }
+}
+
+FontFamilyRow const* FontCatalogue::family(std::wstring_view name) const {
+    auto const at = byName_.find(lowered(name));
+    return at == byName_.end() ? nullptr : &at->second;
+}
+
+FontForm const* FontCatalogue::file(std::wstring_view name) const {
+    auto const at = byFile_.find(lowered(withoutFolder(name)));
+    return at == byFile_.end() ? nullptr : at->second;
+}
+
+std::vector<FontFamilyRow const*> FontCatalogue::families() const {
+    std::vector<FontFamilyRow const*> rows;
+    for (auto const& [key, row] : byName_) {
+        if (lowered(row.english) == key) rows.push_back(&row);
+    }
+    return rows;
+}
+
+}  // namespace tzhost

@@ -1,0 +1,22 @@
+#include "host/text/number_locale.h"
+
+namespace tzhost {
+
+namespace {
+
+// Lives as long as the process; null, when the C library is out of memory, leaves the locale as it
+// is.
+locale_t plainLocale() noexcept {
+    static locale_t const locale = newlocale(LC_ALL_MASK, "C", locale_t{});
+    return locale;
+}
+
+}  // namespace
+
+NumberLocale::NumberLocale() noexcept : before_(uselocale(plainLocale())) {}
+
+NumberLocale::~NumberLocale() {
+    uselocale(before_);
+}
+
+}  // namespace tzhost
