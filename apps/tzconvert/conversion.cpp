@@ -4,8 +4,8 @@
 
 #include "module/markup/mtext_to_rtf.h"
 #include "module/markup/rtf_to_mtext.h"
-#include "module/markup/scale_correction.h"
 #include "tz/mte/font_map_database.h"
+#include "tz/mte/scale_correction.h"
 #include "tz/text/string.h"
 
 namespace tzconvert {

@@ -7,8 +7,8 @@
 #include <span>
 #include <string>
 
-#include "module/markup/scale_correction.h"
 #include "tz/mte/font_map_database.h"
+#include "tz/mte/scale_correction.h"
 
 namespace tzbench {
 

@@ -1,12 +1,9 @@
 #pragma once
 
-#include <cstdint>
+#include "tz/mte/stack_alignment.h"
 
 // How stacked text (fractions and tolerances) begins: its size and place, as the drawing keeps
 // them.
-
-// Where a stack stands against its line.
-enum VerticalAlignment : std::int32_t { kAlignBottom = 0, kAlignMiddle = 1, kAlignTop = 2 };
 
 // Per cent of the text height, the variable TSTACKSIZE; the setter gives false when the host
 // refused.

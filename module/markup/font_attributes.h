@@ -1,7 +1,7 @@
 #pragma once
 
-#include "module/access/stack_defaults.h"
 #include "module/markup/font_name.h"
+#include "tz/mte/stack_alignment.h"
 #include "tz/text/charset.h"
 #include "tz/text/string.h"
 

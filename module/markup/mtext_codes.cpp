@@ -3,7 +3,7 @@
 #include "module/markup/markup_reading.h"
 #include "module/markup/mtext_to_rtf.h"
 #include "module/markup/rtf_writing.h"
-#include "module/markup/scale_correction.h"
+#include "tz/mte/scale_correction.h"
 #include "tz/pal/windows_calls.h"
 #include "tz/text/code_page.h"
 

@@ -4,9 +4,9 @@
 
 #include "module/markup/markup_reading.h"
 #include "module/markup/mtext_to_rtf.h"
-#include "module/markup/scale_correction.h"
 #include "module/markup/wrapping.h"
 #include "tz/mte/globals.h"
+#include "tz/mte/scale_correction.h"
 
 namespace {
 

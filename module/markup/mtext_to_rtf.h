@@ -6,11 +6,11 @@
 #include <string_view>
 #include <unordered_map>
 
-#include "module/access/stack_defaults.h"
 #include "module/markup/paragraph_settings.h"
 #include "module/markup/rtf_color_table.h"
 #include "module/markup/rtf_font_table.h"
 #include "module/markup/string_stream.h"
+#include "tz/mte/stack_alignment.h"
 
 class CMTextFontMapDatabase;
 class CScaleCorrection;

@@ -2,9 +2,9 @@
 
 #include "module/markup/number_text.h"
 #include "module/markup/rtf_to_mtext.h"
-#include "module/markup/scale_correction.h"
 #include "module/markup/wrapping.h"
 #include "tz/mte/globals.h"
+#include "tz/mte/scale_correction.h"
 
 namespace {
 

@@ -8,8 +8,8 @@
 #include "module/markup/rtf_reading.h"
 #include "module/markup/rtf_to_mtext.h"
 #include "module/markup/rtf_tokens.h"
-#include "module/markup/scale_correction.h"
 #include "module/markup/wrapping.h"
+#include "tz/mte/scale_correction.h"
 
 // The words in alphabetical order; what is not among them is unknown.
 struct RtfWords {

@@ -1,4 +1,4 @@
-#include "module/markup/scale_correction.h"
+#include "tz/mte/scale_correction.h"
 
 #include "module/access/truncate.h"
 #include "module/markup/wrapping.h"

@@ -5,8 +5,8 @@
 
 #include <gtest/gtest.h>
 
-#include "module/markup/scale_correction.h"
 #include "module/markup/string_stream.h"
+#include "tz/mte/scale_correction.h"
 
 namespace {
 
