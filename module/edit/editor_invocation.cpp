@@ -1,3 +1,5 @@
+#include <utility>
+
 #include "module/access/easy_upgrade.h"
 #include "module/access/lock_tests.h"
 #include "module/access/string_table.h"
@@ -54,13 +56,17 @@ int runRawEditor(EasyObject<TzDbMText>& text) {
     return params.returnCode();
 }
 
-// Tells the world which text is being edited, for the length of the session.
-class EditedText {
+// Tells the world which text is being edited, for the length of the session. An editor may open
+// another one: the outer text is then the edited one again.
+class [[nodiscard]] EditedText {
 public:
-    explicit EditedText(EasyObject<TzDbMText>& text) { gpText = &text; }
+    explicit EditedText(EasyObject<TzDbMText>& text) : outer_(std::exchange(gpText, &text)) {}
     EditedText(EditedText const&) = delete;
     EditedText& operator=(EditedText const&) = delete;
-    ~EditedText() { gpText = nullptr; }
+    ~EditedText() { gpText = outer_; }
+
+private:
+    EasyObject<TzDbMText>* outer_;
 };
 
 }  // namespace
