@@ -1,19 +1,65 @@
-#include "module/commands/edit_mtext.h"
+// MTEDIT and MTPROP: one text, selected before or picked, goes to the editor.
+
+#include "tz/mte/edit_mtext.h"
 
 #include "module/access/class_registration.h"
-#include "module/commands/placeholder.h"
+#include "module/access/scope_guard.h"
+#include "module/access/string_table.h"
+#include "module/commands/edit_report.h"
+#include "module/commands/mtext_selection.h"
 #include "module/edit/editor_result.h"
+#include "tz/ed/print.h"
+#include "tz/ed/selection.h"
 #include "tz/mte/entry_points.h"
-#include "tz/mte/globals.h"
 
 namespace {
+
+constexpr unsigned kPickPrompt = 160;
+constexpr unsigned kOnlyTheFirst = 161;
+
+// How the command passes its arguments on to the gate.
+struct EditorSide {
+    MTETabType tab;
+    bool interactive;
+    bool view;
+};
 
 TzRxObject* makeEditMtext() {
     return newTzxEditMtext();
 }
 
-wchar_t const* commandOf(MTETabType tab) {
-    return tab == kMTETabText ? gsEditMtext_GlobalName : gsMtprop_GlobalName;
+// Reports the begin of a session, runs it, and reports a success.
+template <class Edit>
+void runReported(EditReport const& report, Edit edit) {
+    report.begin();
+    if (edit() == kEditorAccepted) report.success();
+}
+
+// Edits the first text of the set. A set whose length the host does not tell is left alone, and
+// freed neither: the host does that when the command ends.
+void editSelected(long long* set, EditReport const& report, EditorSide const& side) {
+    int length = 0;
+    if (tzedSSLength(set, &length) != Tzad::ePromptNormal) return;
+    TzScopeGuard const freed(nullptr, [set] { tzedSSFree(set); });
+    runReported(report, [&] {
+        if (length != 1) tzutPrintf(L"%ls", gStringTable[kOnlyTheFirst].kwszPtr());
+        return EditMtextInSelectionSet(set, side.tab, side.interactive, side.view);
+    });
+}
+
+// Asks until something or nothing was hit; false when the user cancelled. A pick at nothing leaves
+// the name zero, which is no object's, so the editor is not reached.
+bool pickOne(long long* name) {
+    TzString const prompt = gStringTable[kPickPrompt];
+    for (;;) {
+        double point[3] = {};
+        switch (tzedEntSel(prompt, name, point)) {
+        case Tzad::ePromptCancel: return false;
+        case Tzad::ePromptNormal:
+        case Tzad::ePromptError: return true;
+        default: break;
+        }
+    }
 }
 
 }  // namespace
@@ -36,11 +82,28 @@ TzxEditMtext* newTzxEditMtext() {
     return new TzxEditMtext;
 }
 
-void TzxEditMtext::EditMtext(MTETabType tab, bool, bool) {
-    printNotYetAvailable(commandOf(tab));
+void TzxEditMtext::EditMtext(MTETabType tab, bool interactive, bool view) {
+    EditReport const report(L"MTEDIT");
+    EditorSide const side{tab, interactive, view};
+    long long set[2] = {};
+    int const status = selectMText(set, L"_I", KindCode::group);
+    if (status == Tzad::ePromptNormal) editSelected(set, report, side);
+    if (status != Tzad::ePromptError) return;
+    tzedSSFree(set);
+    long long name[2] = {};
+    if (!pickOne(name)) return;
+    runReported(report, [&] { return EditMtextByAdsName(name, tab, interactive, view); });
 }
 
-int EditMtextByAdsName(long long const*, MTETabType tab, bool, bool) {
-    printNotYetAvailable(commandOf(tab));
-    return kNoEditor;
+int EditMtextByAdsName(long long* name, MTETabType tab, bool interactive, bool view) {
+    TzDbObjectId id;
+    if (tzdbGetObjectId(id, name) != Tzad::eOk) return kNoEditor;
+    return InvokeEditorOn(id, tab, 0, interactive, view);
+}
+
+int EditMtextInSelectionSet(long long* set, MTETabType tab, bool interactive, bool view) {
+    long long name[2] = {};
+    // Without a first entity the name stays that of no object.
+    (void)tzedSSName(set, 0, name);
+    return EditMtextByAdsName(name, tab, interactive, view);
 }

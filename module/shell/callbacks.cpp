@@ -2,15 +2,23 @@
 
 #include <memory>
 
+#include "module/access/scope_guard.h"
+#include "module/access/string_table.h"
 #include "module/access/sys_var.h"
-#include "module/commands/placeholder.h"
+#include "module/commands/mtext_height.h"
+#include "module/commands/mtext_properties.h"
+#include "module/commands/mtext_selection.h"
+#include "tz/ed/print.h"
 #include "tz/ed/prompts.h"
+#include "tz/ed/selection.h"
 #include "tz/mte/edit_mtext.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/globals.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
+
+constexpr unsigned kNotYetAvailable = 1024;
 
 // Bits of CMDACTIVE: the answers come from a script or from a program.
 constexpr int kAnsweredWithoutUser = 4 | 32;
@@ -60,13 +68,16 @@ void MtpropCallback() {
 }
 
 void CompatibleEditMtextCallback() {
-    printNotYetAvailable(gsCompatibleEditMtext_GlobalName);
+    long long set[2] = {};
+    TzScopeGuard const freed(nullptr, [&set] { tzedSSFree(set); });
+    if (selectMText(set, nullptr, KindCode::group) == Tzad::ePromptNormal)
+        setHeightForSelectedMText(set);
 }
 
 void AlignTextCallback() {
-    printNotYetAvailable(gsAlignText_GlobalName);
+    tzutPrintf(gStringTable[kNotYetAvailable], gsAlignText_GlobalName.kwszPtr());
 }
 
 void MtextPropertiesCallback() {
-    printNotYetAvailable(gsMtextProperties_GlobalName);
+    changeMtextProperties();
 }

@@ -1,11 +1,11 @@
 #include <array>
 
 #include "module/access/string_table.h"
-#include "module/commands/edit_mtext.h"
 #include "module/shell/registration.h"
 #include "tz/ed/command_stack.h"
 #include "tz/ed/functions.h"
 #include "tz/ed/print.h"
+#include "tz/mte/edit_mtext.h"
 #include "tz/rx/resbuf.h"
 #include "tz/rx/status.h"
 
@@ -55,8 +55,9 @@ bool invokeFunction() {
     resbuf const* const first = tzedGetArgs();
     if (first && first->restype == Tzad::eResultEntityName) {
         MTETabType const tab = code == kEdit ? kMTETabText : kMTETabProperties;
+        long long name[] = {first->resval.rlname[0], first->resval.rlname[1]};
         // The gate has told what there is to tell; the call itself has worked.
-        (void)EditMtextByAdsName(first->resval.rlname, tab, true, true);
+        (void)EditMtextByAdsName(name, tab, true, true);
     } else {
         tzutPrintf(gStringTable[kNeedsEntityMessage]);
     }

@@ -62,3 +62,10 @@ InvokeEditorOn(TzDbObjectId id, MTETabType tab, unsigned int flags, bool interac
                                         bool view,
                                         bool option13,
                                         bool option14);
+
+// [command] The same by the older name of an entity, or of a set whose first entity is edited. 3,
+// without a message, for a name of no object.
+[[nodiscard]] TZ_API int
+EditMtextByAdsName(long long* name, MTETabType tab, bool interactive, bool view);
+[[nodiscard]] TZ_API int
+EditMtextInSelectionSet(long long* set, MTETabType tab, bool interactive, bool view);

@@ -1,0 +1,168 @@
+#include "module/commands/mtext_properties.h"
+
+#include <cmath>
+#include <functional>
+#include <iterator>
+#include <numbers>
+
+#include "module/access/attachment_ids.h"
+#include "module/access/resources.h"
+#include "module/access/scope_guard.h"
+#include "module/access/string_table.h"
+#include "module/access/style_rules.h"
+#include "module/commands/locked_warning_filter.h"
+#include "module/commands/mtext_selection.h"
+#include "module/prompt/keyword_input.h"
+#include "tz/ap/document.h"
+#include "tz/db/host_services.h"
+#include "tz/db/mtext.h"
+#include "tz/ed/print.h"
+#include "tz/ed/prompt_objects.h"
+#include "tz/ed/prompts.h"
+#include "tz/ed/selection.h"
+#include "tz/mte/easy_object.h"
+#include "tz/rx/class.h"
+
+namespace {
+
+constexpr unsigned kJustificationPrompt = 0x430;
+constexpr unsigned kPropertyPrompt = 0x63F1;
+constexpr unsigned kRotationPrompt = 0x8A03;
+constexpr unsigned kStylePrompt = 0x8A72;
+constexpr unsigned kUnknownStyle = 0x81C8;
+
+// The warning about locked layers: a line for each text, the number found, the number locked.
+constexpr unsigned kLockedLine = 0x2F87;
+constexpr unsigned kFound = 0xF039;
+constexpr unsigned kOneLocked = 0xA9C5;
+constexpr unsigned kManyLocked = 0xDA9B;
+
+constexpr double kDegrees = 180.0;
+
+// What the questions offer: the rotation and the attachment of the first text.
+struct FirstText {
+    double rotation = 0;
+    TzDbMText::AttachmentPoint attachment = TzDbMText::kTopLeft;
+};
+
+bool isMtext(long long const* set, int index, TzDbObjectId& id) {
+    return entityAt(set, index, id) && id.objectClass()->isDerivedFrom(TzDbMText::desc());
+}
+
+bool holdsMtext(long long const* set) {
+    TzDbObjectId id;
+    for (int index = 0, length = lengthOf(set); index < length; ++index)
+        if (isMtext(set, index, id)) return true;
+    return false;
+}
+
+FirstText firstText(long long const* set) {
+    for (int index = 0, length = lengthOf(set); index < length; ++index) {
+        TzDbObjectId id;
+        if (!isMtext(set, index, id)) continue;
+        EasyObject<TzDbMText> text;
+        if (tzdbOpenObject(text.object, id, TzDb::kForRead) == Tzad::eOk)
+            return {text->rotation(), text->attachment()};
+    }
+    return {};
+}
+
+// A text that cannot be opened, or not for write, is passed over.
+void changeTextPropery(long long const (&set)[2], std::function<void(TzDbMText*)> const& change) {
+    for (int index = 0, length = lengthOf(set); index < length; ++index) {
+        TzDbObjectId id;
+        if (!entityAt(set, index, id)) continue;
+        TzDbMText* text = nullptr;
+        if (tzdbOpenObject(text, id, TzDb::kForRead) != Tzad::eOk) continue;
+        WritableTzDbObject writable;
+        if (writable.replaceObject(text)) change(text);
+    }
+}
+
+void changeTextStyle(long long const (&set)[2]) {
+    TzString name;
+    if (tzedGetString(1, gStringTable[kStylePrompt], name) != Tzad::ePromptNormal) return;
+    TzDbObjectId const style = GetTextStyleID(name);
+    if (style.isNull()) {
+        tzutPrintf(L"%ls", gStringTable[kUnknownStyle].kwszPtr());
+        return;
+    }
+    changeTextPropery(set, [style](TzDbMText* text) { (void)text->setTextStyle(style); });
+}
+
+// An empty answer is none: the angle in the question only tells how the first text stands.
+void changeTextRotate(long long const (&set)[2]) {
+    int const degrees =
+        static_cast<int>(std::lround(firstText(set).rotation * kDegrees / std::numbers::pi));
+    TzEdPromptAngle prompt(TzString::formatted(gStringTable[kRotationPrompt], degrees));
+    if (prompt.getAngle() != Tzad::ePromptNormal) return;
+    double const angle = prompt.value();
+    changeTextPropery(set, [angle](TzDbMText* text) { (void)text->setRotation(angle); });
+}
+
+void changeTextJustify(long long const (&set)[2]) {
+    unsigned int ids[] = {1048, 1049, 1050, 1051, 1052, 1053, 1054, 1055, 1056};
+    CKeywordTable keywords(ids, static_cast<int>(std::size(ids)));
+    CTzsKeywordInput input(0, keywords, gStringTable[kJustificationPrompt]);
+    input.SetDefault(MapAttachmentToIDS(firstText(set).attachment));
+    int const status = input.Prompt();
+    if (status != statusNormal && status != statusNone) return;
+    unsigned int const chosen = status == statusNone ? input.GetDefault() : input.GetKeyword();
+    TzDbMText::AttachmentPoint const point = MapAttachment(chosen);
+    changeTextPropery(set,
+                      [point](TzDbMText* text) { (void)text->setAttachmentMovingLocation(point); });
+}
+
+struct Property {
+    wchar_t keyword;  // first letter of the global word
+    void (*change)(long long const (&set)[2]);
+};
+constexpr Property kProperties[] = {
+    {L'R', changeTextRotate },
+    {L'S', changeTextStyle  },
+    {L'J', changeTextJustify},
+};
+
+// Alike in every language; the text of the question shows them.
+constexpr wchar_t kPropertyWords[] = L"Style Rotate Justify";
+
+void report(FilterCount counts) {
+    if (counts.locked > 0)
+        TzLockedWarningFilter::sendWarning(getWarningId(kLockedLine), gStringTable[kLockedLine],
+                                           gStringTable[kFound], gStringTable[kOneLocked],
+                                           gStringTable[kManyLocked], counts);
+    tzutPrintf(gStringTable[kFound], counts.found);
+}
+
+// The texts selected before the command, without those on locked layers; false when the user
+// cancelled.
+bool takeImplied(long long* set) {
+    TzLockedWarningFilter const filter(tzDocManagerPtr()->curDocument());
+    if (selectMText(set, L"_I", KindCode::result) == Tzad::ePromptCancel) return false;
+    report(filter.counts());
+    return true;
+}
+
+// An implied selection without a text is dropped and the user asked for another one.
+bool selectTexts(long long* set) {
+    if (!takeImplied(set)) return false;
+    if (holdsMtext(set)) return true;
+    tzedSSFree(set);
+    tzedSSSetFirst(nullptr, nullptr);
+    return selectMText(set, L"_:l:c:p", KindCode::result) == Tzad::ePromptNormal;
+}
+
+}  // namespace
+
+void changeMtextProperties() {
+    if (!tzdbHostApplicationServices()->workingDatabase()) return;
+    long long set[2] = {};
+    TzScopeGuard const freed(nullptr, [&set] { tzedSSFree(set); });
+    if (!selectTexts(set)) return;
+
+    TzEdPromptKeyword prompt;
+    prompt.setMessageAndKeywords(gStringTable[kPropertyPrompt], kPropertyWords);
+    if (prompt.getKeyword() != Tzad::ePromptNormal) return;
+    for (Property const& property : kProperties)
+        if (*prompt.resultString().kwszPtr() == property.keyword) property.change(set);
+}
