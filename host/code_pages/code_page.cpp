@@ -17,7 +17,7 @@ Charset TzCodePage::CodePageIdToCharSet(code_page_id page) {
 }
 
 bool TzCharacterCheck::IsLeadByte(code_page_id page, unsigned char byte) {
-    return tzhost::isLeadByte(page, byte);
+    return tzhost::isLeadByte(tzhost::usablePage(page), byte);
 }
 
 bool UnicodeConvert::multibyteToWide(code_page_id_ex page,

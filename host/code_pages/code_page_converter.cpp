@@ -100,14 +100,6 @@ Page const& pageOf(int number) {
     return pages.try_emplace(number, number).first->second;
 }
 
-// The page that is read when this one is asked for.
-int usablePage(int number) {
-    auto const isUsable = [](int page) { return page != kUtf8CodePage && pageOf(page).isKnown(); };
-    if (number > 0 && isUsable(number)) return number;
-    int const system = systemCodePage();
-    return isUsable(system) ? system : kDefaultCodePage;
-}
-
 bool isAscii(char byte) {
     return static_cast<unsigned char>(byte) < 0x80;
 }
@@ -124,6 +116,13 @@ std::size_t lengthOfCharacters(int page, std::string_view bytes) {
 }
 
 }  // namespace
+
+int usablePage(int codePage) {
+    auto const isUsable = [](int page) { return page != kUtf8CodePage && pageOf(page).isKnown(); };
+    if (codePage > 0 && isUsable(codePage)) return codePage;
+    int const system = systemCodePage();
+    return isUsable(system) ? system : kDefaultCodePage;
+}
 
 std::optional<std::wstring> decode(int codePage, std::string_view bytes) {
     int const number = usablePage(codePage);

@@ -10,6 +10,9 @@
 
 namespace tzhost {
 
+// The page that is read when this one is asked for.
+[[nodiscard]] int usablePage(int codePage);
+
 // Nothing when some bytes are no character of the page.
 [[nodiscard]] std::optional<std::wstring> decode(int codePage, std::string_view bytes);
 
