@@ -1,6 +1,5 @@
 #include "tz/text/font_info.h"
 
-#include <algorithm>
 #include <string_view>
 
 #include "host/base/fault_point.h"
@@ -121,11 +120,7 @@ bool CatalogueFontInfo::FontInfoFromTypeFaceName(CStdStrW const& face, CFontInfo
     return true;
 }
 
-// A name in plain letters is taken for an English one, so that most texts are written without the
-// catalogue, which takes a while to open.
 CStdStrW CatalogueFontInfo::TypefaceNativeToEnglish(CStdStrW const& face) const {
-    if (std::all_of(face.begin(), face.end(), [](wchar_t c) { return c > 0 && c < 0x80; }))
-        return face;
     FontFamilyRow const* const family = findFamily("CFontInfo::TypefaceNativeToEnglish", face);
     if (family == nullptr || tzCompareNoCase(family->english.c_str(), face.c_str()) == 0)
         return face;
