@@ -26,6 +26,7 @@ void appendSwitch(CStdStrW& codes, bool isOn, bool wasOn, wchar_t const* on, wch
 }  // namespace
 
 CStdStrW CFontState::EmitStateInMText() {
+    forgetFaceCodes();  // the caller may have lent a proxy since the last call
     CStdStrW codes;
     appendState(codes);
     return codes;

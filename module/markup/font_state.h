@@ -19,7 +19,9 @@ class CMTextFontMapDatabase;
 //   if (state.IsEmissionPending()) { out += state.EmitStateInMText(); state.Reset(); }   // {\L
 //   out += state.EmitTerminatingStateInMText();                                          // }
 //
-// The font map must outlive the state; one state serves one conversion.
+// The font map must outlive the state; one state serves one conversion. InitializeFontName writes
+// process-wide state, the name of the text style's face (g_sStyleFontName), so that states are not
+// used side by side.
 class CFontState {
 public:
     explicit CFontState(CMTextFontMapDatabase* fontMap) : m_pFontMap(fontMap) {}
@@ -64,8 +66,10 @@ public:
     [[nodiscard]] CStdStrW EmitTerminatingStateInMText();
 
 protected:
-    // The same as EmitStateInMText, behind what `codes` holds.
+    // The same as EmitStateInMText, after what `codes` holds, with the codes of faces that are
+    // known. The font tables may not change between two calls unless the codes are forgotten.
     void appendState(CStdStrW& codes);
+    void forgetFaceCodes() { faceCodes_.clear(); }
     [[nodiscard]] CFontAttributes const& base() const { return m_base; }
     [[nodiscard]] CFontAttributes const& current() const { return m_current; }
     // Back to a look that was kept.

@@ -2,6 +2,7 @@
 
 #include "module/markup/markup_reading.h"
 #include "module/markup/mtext_to_rtf.h"
+#include "module/markup/rtf_units.h"
 #include "module/markup/rtf_writing.h"
 #include "tz/mte/scale_correction.h"
 #include "tz/pal/windows_calls.h"
@@ -10,7 +11,6 @@
 namespace {
 
 constexpr int kRgbMask = 0xFFFFFF;
-constexpr int kTwipsPerHalfPoint = 10;
 constexpr std::size_t kMultibyteLength = 8;  // `\M+nXXXX`
 
 }  // namespace

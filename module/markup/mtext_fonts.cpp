@@ -1,123 +1,72 @@
 // Fonts of the markup: by file and by face.
 
+#include "module/markup/font_code.h"
 #include "module/markup/mtext_to_rtf.h"
-#include "module/markup/wrapping.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/text/font_info.h"
 
-// What a font code says. A code that the text cuts off says what there was of it.
-struct CMTextToRichTextContext::FontFields {
-    CStdStrW name;  // with every backslash doubled
-    bool hasFields = false;
-    bool bold = false;
-    bool italic = false;
-    bool hasCharset = false;
-    Charset charset = kDefaultCharset;
-    int pitch = 0;
-};
-
 namespace {
 
-constexpr int kMostDigits = 16;
-
-int readDigits(wchar_t const*& cursor) {
-    int value = 0;
-    for (int i = 0; i < kMostDigits && isDigit(*cursor); ++i, ++cursor)
-        value = withDigit(value, *cursor - L'0');
-    return value;
-}
-
-// One character, whatever it is; true only when that is a "1".
-bool readFlag(wchar_t const*& cursor) {
-    if (*cursor == 0) return false;
-    return *cursor++ == L'1';
-}
-
-// The name, up to the "|" or ";" behind it.
-CStdStrW readName(wchar_t const*& cursor) {
-    CStdStrW name;
-    for (; *cursor != 0 && *cursor != L';' && *cursor != L'|'; ++cursor) {
-        if (*cursor == L'\\') name += L'\\';
-        name += *cursor;
-    }
-    return name;
+std::wstring_view between(wchar_t const* start, wchar_t const* end) {
+    return {start, static_cast<std::size_t>(end - start)};
 }
 
 }  // namespace
 
-// Without fields the ";" is consumed, and the one field is the set.
 void CMTextToRichTextContext::onFontFile(wchar_t const*& cursor) {
     wchar_t const* const start = cursor - 1;
-    FontFields fields;
-    fields.name = readName(cursor);
-    while (*cursor != 0 && *cursor != L';') {
-        if (*cursor++ != L'c') continue;
-        fields.hasCharset = true;
-        fields.charset = static_cast<Charset>(readDigits(cursor));
-    }
-    if (*cursor == L';') ++cursor;
-    std::wstring_view const code(start, static_cast<std::size_t>(cursor - start));
-    if (auto const known = fontCodes_.find(code); known != fontCodes_.end())
+    FontCode const code = readFileCode(cursor);
+    std::wstring_view const text = between(start, cursor);
+    if (auto const known = fontCodes_.find(text); known != fontCodes_.end())
         return takeFont(known->second);
-    ResolvedFont const font = resolveFile(fields);
+    ResolvedFont const font = resolveFile(code);
     takeFont(font);
-    // A file that no face was left for asks for one again each time.
-    bool const isLent = (font.incidents & kFontByProxy) != 0;
-    if (!isLent || !m_pFontMap->ProxiesExhausted()) fontCodes_.emplace(code, font);
+    if (font.incidents != 0)
+        fontCodes_.clear();
+    else if (!CMTextFontMapDatabase::IsBigfontFilespec(code.name))
+        fontCodes_.emplace(text, font);
 }
 
-// Without fields the ";" is not consumed and comes out as text, unlike that of a font file.
 void CMTextToRichTextContext::onFontFace(wchar_t const*& cursor) {
     wchar_t const* const start = cursor - 1;
-    FontFields fields;
-    fields.name = readName(cursor);
-    bool const hasFields = *cursor == L'|';
-    while (hasFields && *cursor != 0 && *cursor != L';') {
-        switch (*cursor++) {
-        case L'b': fields.bold = readFlag(cursor); break;
-        case L'i': fields.italic = readFlag(cursor); break;
-        case L'c': fields.charset = static_cast<Charset>(readDigits(cursor)); break;
-        case L'p': fields.pitch = readDigits(cursor); break;
-        default: break;
-        }
-    }
-    std::wstring_view const code(start, static_cast<std::size_t>(cursor - start));
+    bool hasFields = false;
+    FontCode const code = readFaceCode(cursor, hasFields);
+    std::wstring_view const text = between(start, cursor);
     if (hasFields && *cursor == L';') ++cursor;
-    auto known = fontCodes_.find(code);
-    if (known == fontCodes_.end()) known = fontCodes_.emplace(code, resolveFace(fields)).first;
+    auto known = fontCodes_.find(text);
+    if (known == fontCodes_.end()) known = fontCodes_.emplace(text, resolveFace(code)).first;
     takeFont(known->second);
 }
 
-CMTextToRichTextContext::ResolvedFont
-CMTextToRichTextContext::resolveFile(FontFields const& fields) {
+CMTextToRichTextContext::ResolvedFont CMTextToRichTextContext::resolveFile(FontCode const& code) {
     ResolvedFont font;
     auto type = CMTextFontMapDatabase::MapTypeSystem;
-    CStdStrW const face = m_pFontMap->MapFileToFont(type, fields.name, font.bold, font.italic,
+    CStdStrW const face = m_pFontMap->MapFileToFont(type, code.name, font.bold, font.italic,
                                                     font.charset, font.pitchAndFamily);
     if (type == CMTextFontMapDatabase::MapTypeProxy) font.incidents = kFontByProxy;
-    if (fields.hasCharset) font.charset = fields.charset;
+    if (code.hasCharset) font.charset = code.charset;
     font.slot = AddFont(face.c_str(), font.charset, font.pitchAndFamily);
     font.font = face;
     return font;
 }
 
-// The document's font has the set that the machine's face has, the state the one that was written.
-CMTextToRichTextContext::ResolvedFont
-CMTextToRichTextContext::resolveFace(FontFields const& fields) {
+// The RTF font gets the charset of the installed face; the state keeps the charset written in the
+// code.
+CMTextToRichTextContext::ResolvedFont CMTextToRichTextContext::resolveFace(FontCode const& code) {
     ResolvedFont font;
-    font.bold = fields.bold;
-    font.italic = fields.italic;
-    CStdStrW const face = tzFontInfo().TypefaceEnglishToNative(fields.name);
+    font.bold = code.bold;
+    font.italic = code.italic;
+    CStdStrW const face = tzFontInfo().TypefaceEnglishToNative(code.name);
     auto type = CMTextFontMapDatabase::MapTypeSystem;
-    CStdStrW const file = m_pFontMap->MapFontToFile(type, face, fields.bold, fields.italic,
-                                                    fields.charset, fields.pitch);
+    CStdStrW const file =
+        m_pFontMap->MapFontToFile(type, face, code.bold, code.italic, code.charset, code.pitch);
     if (file.empty()) font.incidents = kFaceWithoutFile;
     CFontInfoItem item;
     bool const isKnown = tzFontInfo().FontInfoFromTypeFaceName(face, item);
-    font.slot = AddFont(face.c_str(), isKnown ? item.charset : fields.charset, fields.pitch);
-    font.font = fields.name;
-    font.pitchAndFamily = fields.pitch;
-    font.charset = fields.charset;
+    font.slot = AddFont(face.c_str(), isKnown ? item.charset : code.charset, code.pitch);
+    font.font = code.name;
+    font.pitchAndFamily = code.pitch;
+    font.charset = code.charset;
     return font;
 }
 

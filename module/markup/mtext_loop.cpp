@@ -70,7 +70,6 @@ bool isPlain(wchar_t c) {
 }  // namespace
 
 void CMTextToRichTextContext::convert(wchar_t const* cursor) {
-    text_ = cursor;
     AppendToken(L"deftab", g_nDefaultTabTwips);
     while (*cursor != 0) {
         if (*cursor == L'\\') {

@@ -4,15 +4,9 @@
 #include "module/markup/markup_reading.h"
 #include "module/markup/mtext_to_rtf.h"
 #include "module/markup/number_text.h"
+#include "module/markup/rtf_units.h"
 #include "module/markup/stack_look_ahead.h"
 #include "tz/mte/globals.h"
-
-namespace {
-
-constexpr int kStackMarker =
-    1234;  // a baseline shift that only the two converters and the editor know
-
-}  // namespace
 
 void CMTextToRichTextContext::onStack(wchar_t const*& cursor) {
     m_bStacksSeen = true;

@@ -8,6 +8,7 @@
 #include "module/access/stack_defaults.h"
 #include "module/fonts/font_entry.h"
 #include "module/markup/number_text.h"
+#include "module/markup/rtf_units.h"
 #include "module/markup/stack_look_ahead.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
@@ -17,7 +18,6 @@ namespace {
 
 constexpr double kSizeInPlaceOfZero = 2.0;
 constexpr double kFirstSize = 0.2;
-constexpr int kTwipsPerHalfPoint = 10;  // in this system
 
 }  // namespace
 
@@ -88,25 +88,38 @@ void CMTextToRichTextContext::SetInitialFontColor(unsigned int rgb) {
 }
 
 CStdStrW CMTextToRichTextContext::Parse(wchar_t const* text) {
-    return parse(text, std::wcslen(text));
+    run(text, std::wcslen(text));
+    return documentHead() + Close() + L"}";
 }
 
-CStdStrW CMTextToRichTextContext::Parse(std::wstring const& text) {
-    return parse(text.c_str(), text.size());
-}
-
-CStdStrW CMTextToRichTextContext::parse(wchar_t const* text, std::size_t length) {
-    updateSizes(m_nInitialFontSize);
-    // Only an empty text keeps the system's stack alignment.
-    if (*text != 0) m_eBaseAlignment = kAlignBottom;
-    // Memory that is not written to costs nothing, a copy of what was written does.
-    reserve(length + length / 2);
-    convert(text);
+CStdStrW CMTextToRichTextContext::parseOnce(std::wstring const& text) {
+    run(text.c_str(), text.size());
     CStdStrW const head = documentHead();
     CStdStrW& body = Close();
     body += L'}';
     body.insert(0, head);
     return std::move(body);
+}
+
+void CMTextToRichTextContext::run(wchar_t const* text, std::size_t length) {
+    startRun(text);
+    updateSizes(m_nInitialFontSize);
+    // Only an empty text keeps the system's stack alignment.
+    if (*text != 0) m_eBaseAlignment = kAlignBottom;
+    // More than needed: untouched pages cost nothing, while growing would copy the text.
+    reserve(length + length / 2);
+    convert(text);
+}
+
+// Nothing that was learned of another text serves this one.
+void CMTextToRichTextContext::startRun(wchar_t const* text) {
+    if (!isOpen()) Grow();
+    chars_ = 0;
+    lastFactor_ = 1.0;
+    fontCodes_.clear();
+    fontChanged();
+    text_ = text;
+    stacks_.reset();
 }
 
 // Everything ahead of the text. Font 0 and colour 0 are the initial ones.

@@ -15,6 +15,7 @@
 class CMTextFontMapDatabase;
 class CScaleCorrection;
 class StackLookAhead;
+struct FontCode;
 
 // What of a markup the rich text could not carry over, as bits of the incident word.
 enum ConversionIncident : unsigned int {
@@ -40,10 +41,12 @@ enum ConversionIncident : unsigned int {
 //   context.SetInitialFontColor(0xFFFFFF);
 //   CStdStrW const rtf = context.Parse(L"{\\LA}\\P");
 //
-// Set up in this order, with the colours of ByLayer and ByBlock last, then parsed once. The font
-// map and the scales must outlive it. Sizes of the markup are drawing units, those of the document
-// half-points, which are tens of twips. Nothing fails: what cannot be carried over is an incident,
-// and malformed codes come out as text.
+// Set up in this order, with the colours of ByLayer and ByBlock last: one context, one conversion.
+// Set-up writes process-wide state: the initial font (g_sInitialFont), and the font tables when a
+// file is lent a proxy. So contexts are not used side by side. The font map and the scales must
+// outlive the context. Sizes of the markup are drawing units, those of the document half-points,
+// which are tens of twips. Nothing fails: what cannot be carried over is an incident, and malformed
+// codes come out as text.
 class CMTextToRichTextContext : public CStringStream,
                                 public CRichTextColorTable,
                                 public CRichTextFontTable {
@@ -62,10 +65,11 @@ public:
     // Colour 0 of the document, 0x00BBGGRR.
     void SetInitialFontColor(unsigned int rgb);
 
-    // The whole document.
+    // The whole document. The tables, the text written so far and the whole-text values stay, so
+    // that a second document holds the text of the first too.
     [[nodiscard]] CStdStrW Parse(wchar_t const* text);
-    // The same, without counting the characters first.
-    [[nodiscard]] CStdStrW Parse(std::wstring const& text);
+    // The same for the only text of the context, whose stream gives its memory to the result.
+    [[nodiscard]] CStdStrW parseOnce(std::wstring const& text);
 
     [[nodiscard]] unsigned int GetIncidents() const { return m_nIncidents; }
     // Whether all bits of the mask are set.
@@ -113,7 +117,7 @@ private:
         int pitchAndFamily = 0;
         Charset charset = kAnsiCharset;
     };
-    // What a font code came to; the same code comes to the same again.
+    // What a font code came to.
     struct ResolvedFont {
         int slot = 0;
         bool bold = false;
@@ -123,8 +127,6 @@ private:
         int pitchAndFamily = 0;
         Charset charset = kAnsiCharset;
     };
-    // The parts of a font code.
-    struct FontFields;
     struct TextHash {
         using is_transparent = void;
         std::size_t operator()(std::wstring_view text) const {
@@ -135,7 +137,8 @@ private:
 
     // Set-up and results.
     void updateSizes(int halfPoints);
-    [[nodiscard]] CStdStrW parse(wchar_t const* text, std::size_t length);
+    void run(wchar_t const* text, std::size_t length);
+    void startRun(wchar_t const* text);
     [[nodiscard]] CStdStrW documentHead() const;
 
     // The loop.
@@ -174,8 +177,8 @@ private:
     void onUnknown(wchar_t const*& cursor);
 
     // Fonts.
-    [[nodiscard]] ResolvedFont resolveFile(FontFields const& fields);
-    [[nodiscard]] ResolvedFont resolveFace(FontFields const& fields);
+    [[nodiscard]] ResolvedFont resolveFile(FontCode const& code);
+    [[nodiscard]] ResolvedFont resolveFace(FontCode const& code);
     void takeFont(ResolvedFont const& font);
     void fontChanged() { swapState_ = SwapState::unknown; }
 
@@ -213,10 +216,15 @@ private:
     std::array<State, kMostStates> m_aStates;
     int m_nState = 0;
 
-    // The run of the loop.
+    // The run of the loop; all of it begins anew with each text.
     long long chars_ = 0;      // plain characters so far
     double lastFactor_ = 1.0;  // of the last relative height
     wchar_t const* text_ = nullptr;
+    // The font codes that would be looked up with the same result again. What the font tables say
+    // changes during a run only when a code lends a proxy, and one entry may then take another's
+    // place, also of another file or face. So a code that was lent a proxy is not kept and makes
+    // all others be forgotten; nor is a pair of files kept, as each of its codes may be lent again.
+    // A map file that changes on the disk during a run is not looked at.
     FontCodes fontCodes_;
     enum class SwapState { unknown, no, yes } swapState_ = SwapState::unknown;
     std::unique_ptr<StackLookAhead> stacks_;

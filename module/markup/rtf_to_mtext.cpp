@@ -52,19 +52,27 @@ void CRichTextToMTextContext::SetInitialColor(unsigned int rgb) {
 }
 
 CStdStrW CRichTextToMTextContext::Parse(wchar_t const* text) {
-    return parse(text, std::wcslen(text));
+    run(text, std::wcslen(text));
+    return finished(Close());
 }
 
-CStdStrW CRichTextToMTextContext::Parse(std::wstring const& text) {
-    return parse(text.c_str(), text.size());
+CStdStrW CRichTextToMTextContext::parseOnce(std::wstring const& text) {
+    run(text.c_str(), text.size());
+    return finished(std::move(Close()));
 }
 
-CStdStrW CRichTextToMTextContext::parse(wchar_t const* text, std::size_t length) {
+// Nothing that was learned of another document serves this one.
+void CRichTextToMTextContext::run(wchar_t const* text, std::size_t length) {
+    if (!isOpen()) Grow();
+    forgetFaceCodes();
+    paragraphs_ = {};
     m_bStackSeen = false;
-    // Memory that is not written to costs nothing, a copy of what was written does.
+    // More than needed: untouched pages cost nothing, while growing would copy the text.
     reserve(length + length / 2);
     Convert(text);
-    CStdStrW markup = std::move(Close());
+}
+
+CStdStrW CRichTextToMTextContext::finished(CStdStrW markup) {
     if (CStdStrW const defaults = InitialDefaults(); !defaults.empty()) markup.insert(0, defaults);
     // Looks at the letters alone, so that a backslash and a "P" of the text go too.
     while ((m_nOptions & kKeepTrailingParagraphs) == 0 && endsInParagraph(markup))

@@ -23,9 +23,12 @@ class CScaleCorrection;
 //   context.SetBaseAlignment(kAlignBottom, 0);
 //   CStdStrW const markup = context.Parse(rtf);
 //
-// Set up in this order, with the colours of ByLayer and ByBlock ahead of the initial one, then
-// parsed once. The font map and the scales must outlive it. Nothing fails: malformed text is read
-// as far as it goes. Groups nest without limit; each takes a record of its own and no call stack.
+// Set up in this order, with the colours of ByLayer and ByBlock before the initial one: one
+// context, one conversion. Set-up writes process-wide state: the name of the text style's face
+// (g_sStyleFontName), and the font tables when a file is lent a proxy. So contexts are not used
+// side by side. The font map and the scales must outlive the context. Nothing fails: malformed text
+// is read as far as it goes. Groups nest without limit; each takes a record of its own and no call
+// stack.
 class CRichTextToMTextContext : public CStringStream,
                                 public CRichTextColorTable,
                                 public CRichTextFontTable,
@@ -52,10 +55,11 @@ public:
     // The page of bytes ahead of any font or `\ansicpg`; the system's without this.
     void SetCodePage(code_page_id_ex page) { m_nCodePage = page; }
 
-    // The whole markup.
+    // The whole markup. The tables, the text written so far and the look stay, so that the markup
+    // of a second document begins with that of the first.
     [[nodiscard]] CStdStrW Parse(wchar_t const* text);
-    // The same, without counting the characters first.
-    [[nodiscard]] CStdStrW Parse(std::wstring const& text);
+    // The same for the only document of the context, whose stream gives its memory to the result.
+    [[nodiscard]] CStdStrW parseOnce(std::wstring const& text);
 
     // Whether the text held a `\S`, which stacks begin with.
     [[nodiscard]] bool StackSeen() const { return m_bStackSeen; }
@@ -76,7 +80,9 @@ private:
     struct Replacement;
     struct FontEntry;
 
-    [[nodiscard]] CStdStrW parse(wchar_t const* text, std::size_t length);
+    void run(wchar_t const* text, std::size_t length);
+    // The markup around what was written.
+    [[nodiscard]] CStdStrW finished(CStdStrW markup);
 
     // Groups.
     void Convert(wchar_t const* cursor);

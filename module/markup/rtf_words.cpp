@@ -8,6 +8,7 @@
 #include "module/markup/rtf_reading.h"
 #include "module/markup/rtf_to_mtext.h"
 #include "module/markup/rtf_tokens.h"
+#include "module/markup/rtf_units.h"
 #include "module/markup/wrapping.h"
 #include "tz/mte/scale_correction.h"
 
@@ -69,9 +70,7 @@ namespace {
 
 static_assert(RtfWords::isSorted());
 
-constexpr int kStackMarker = 1234;
 constexpr int kUsualBaseline = 6;
-constexpr int kTwipsPerHalfPoint = 10;
 
 enum ReplacementPlace : std::size_t {
     kEmDash,

@@ -125,6 +125,18 @@ TEST_F(FontState, GivesALookBack) {
     EXPECT_EQ(other.GetBaseAlignment(1), kAlignBottom);
 }
 
+// The second code used to be the first again.
+TEST_F(FontState, WritesAFaceByTheTablesOfTheMoment) {
+    state.SetPitchAndFamily(0);
+    state.SetFontName(L"Lent One");
+    EXPECT_EQ(emitted(), L"{\\fLent One|b0|i0|c0|p0;");
+    state.SetFontName(L"Other");
+    EXPECT_EQ(emitted(), L"\\fOther|b0|i0|c0|p0;");
+    fonts.AddProxy(L"none.shx");
+    state.SetFontName(L"Lent One");
+    EXPECT_EQ(emitted(), L"\\Fnone.shx|c0;");
+}
+
 TEST_F(FontState, TellsTypefacesApart) {
     SystemPage const chinese(L"ANSI_936");
     struct Row {

@@ -329,4 +329,29 @@ TEST(Alignment, OfTheSystemIsKeptByAnEmptyTextAlone) {
     EXPECT_EQ(full.context.GetBaseAlignment(), kAlignBottom);
 }
 
+// The second code of the file used to come to the face of the machine again.
+TEST(Fonts, AreLookedUpAgainOnceAProxyIsLent) {
+    Session session;
+    EXPECT_EQ(shown(bodyOf(session.toRtf(L"\\FDejaVuSans.ttf|c0;a\\FDejaVuSans.ttf.shx|c0;b"
+                                         L"\\FDejaVuSans.ttf|c0;c"))),
+              "\\f1 \\b0 \\i0 a\\f2 \\b0 \\i0 b\\f2 \\b0 \\i0 c");
+}
+
+// What the first text taught used to serve the second: "late" tracking, the end of a stack, and a
+// face that had a file.
+TEST(SecondText, BeginsAnewButForTablesAndTheTextSoFar) {
+    RtfWriter writer;
+    CMTextToRichTextContext& context = writer.context;
+    markuptest::setUp(context);
+    writer.fonts().AddProxy(L"none.shx");
+    EXPECT_EQ(shown(bodyOf(context.Parse(L"\\fLent One|c0;ab\\S/"))),
+              "\\f1 \\b0 \\i0 ab{\\dn1234 \\\\S<0,100>}/{\\dn1234 \\\\s}");
+    EXPECT_EQ(context.GetIncidents(), 0U);
+    { CMTextFontMapDatabase const other(0); }  // takes the proxies away
+    EXPECT_EQ(shown(bodyOf(context.Parse(L"\\T2;\\fLent One|c0;\\Sab"))),
+              "\\f1 \\b0 \\i0 ab{\\dn1234 \\\\S<0,100>}/{\\dn1234 \\\\s}\\par \\deftab0 "
+              "\\f1 \\b0 \\i0 \\\\Sab");
+    EXPECT_EQ(context.GetIncidents(), kFaceWithoutFile | kStackWithoutSign);
+}
+
 }  // namespace

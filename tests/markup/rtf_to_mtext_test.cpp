@@ -325,4 +325,13 @@ TEST(InitialFont, MayBeAFile) {
     EXPECT_STREQ(context.Parse(L"a\\b0 b\\i0\\f7 c").c_str(), L"a{\\fSlanted|b0|i1|c0|p18;b}c");
 }
 
+// The settings of the first document's paragraphs used to serve those of the second.
+TEST(SecondDocument, BeginsAnewButForTheTextSoFar) {
+    MtextWriter writer;
+    markuptest::setUp(writer.context);
+    constexpr wchar_t kBoth[] = L"\\pard\\li100 a\0\\pard\\li200 b";
+    EXPECT_EQ(shown(writer.context.Parse(kBoth + 14)), "\\pl0.198413;b");
+    EXPECT_EQ(shown(writer.context.Parse(kBoth)), "\\pl0.198413;b\\pl0.0992063;a");
+}
+
 }  // namespace
