@@ -5,30 +5,18 @@
 #include <string>
 
 #include "apps/tzconvert/options.h"
+#include "module/markup/conversion_session.h"
 
 namespace tzconvert {
 
-// What a conversion found; sizes in half-points of the document. Of markup that is written, what
-// the options said.
-struct Results {
-    unsigned int incidents = 0;
-    double tracking = 1.0;
-    double widthFactor = 1.0;
-    double oblique = 0.0;
-    int baseAlignment = 0;
-    int minFontSize = 0;
-    int maxFontSize = 0;
-    int initialFontSize = 0;
-    int currentFontSize = 0;
-    bool stacksSeen = false;
-};
-
 struct Converted {
     std::wstring text;
-    Results results;
+    // Of markup that is written: what the options said, and whether stacks were seen.
+    MarkupFindings found;
 };
 
-// Gives `text` up as soon as it is read.
+// Gives `text` up as soon as it is read. The result is that of a new session: the font tables are
+// emptied first, and the scales know no sizes yet.
 [[nodiscard]] Converted convert(Options const& options, std::wstring text);
 
 }  // namespace tzconvert

@@ -7,18 +7,18 @@
 namespace tzconvert {
 namespace {
 
-nlohmann::ordered_json resultsOf(Results const& results) {
+nlohmann::ordered_json resultsOf(MarkupFindings const& found) {
     return {
-        {"incidents",       results.incidents      },
-        {"tracking",        results.tracking       },
-        {"widthFactor",     results.widthFactor    },
-        {"oblique",         results.oblique        },
-        {"baseAlignment",   results.baseAlignment  },
-        {"minFontSize",     results.minFontSize    },
-        {"maxFontSize",     results.maxFontSize    },
-        {"initialFontSize", results.initialFontSize},
-        {"currentFontSize", results.currentFontSize},
-        {"stacksSeen",      results.stacksSeen     },
+        {"incidents",       found.incidents              },
+        {"tracking",        found.wholeText.tracking     },
+        {"widthFactor",     found.wholeText.charWidth    },
+        {"oblique",         found.wholeText.oblique      },
+        {"baseAlignment",   found.wholeText.baseAlignment},
+        {"minFontSize",     found.minFontSize            },
+        {"maxFontSize",     found.maxFontSize            },
+        {"initialFontSize", found.initialFontSize        },
+        {"currentFontSize", found.currentFontSize        },
+        {"stacksSeen",      found.stacksSeen             },
     };
 }
 
@@ -28,14 +28,14 @@ std::string reportText(Options const& options, std::vector<FileReport> const& re
     nlohmann::ordered_json root;
     if (options.outputDir.empty()) {
         assert(reports.size() == 1);
-        root = resultsOf(reports.front().results);
+        root = resultsOf(reports.front().found);
     } else {
         root = nlohmann::ordered_json::array();
         for (FileReport const& report : reports) {
             nlohmann::ordered_json entry = {
                 {"file", report.file}
             };
-            entry.update(resultsOf(report.results));
+            entry.update(resultsOf(report.found));
             root.push_back(entry);
         }
     }

@@ -11,7 +11,7 @@ namespace tzconvert {
 
 struct FileReport {
     std::string file;
-    Results results;
+    MarkupFindings found;
 };
 
 // One object, of the only report, which must be there; when results go into a folder, a list of

@@ -77,7 +77,7 @@ struct Measure {
 Measure measured(TextKind const& kind, std::size_t size, int turns) {
     std::wstring const text = tzbench::textOf(kind, size);
     std::size_t const again = std::max<std::size_t>(1, kLeastPerTurn / size);
-    tzbench::Session session;
+    ConversionSession session(tzbench::startOfTexts());
     std::size_t written = 0;
     Measure least{1e9, 1e9};
     for (int turn = 0; turn <= turns; ++turn) {
@@ -87,7 +87,7 @@ Measure measured(TextKind const& kind, std::size_t size, int turns) {
         });
         double const work = secondsOf([&] {
             for (std::size_t i = 0; i < again; ++i)
-                written = session.converted(kind.way, text).size();
+                written = tzbench::converted(session, kind.way, text).size();
         });
         if (turn == 0) continue;
         auto const characters = static_cast<double>(text.size() * again);
@@ -102,12 +102,13 @@ void speed(benchmark::State& state, TextKind const& kind) {
     constexpr int kTurns = 5;
     while (state.KeepRunning()) {
         std::wstring const text = tzbench::textOf(kind, kSpeedSize);
-        tzbench::Session session;
+        ConversionSession session(tzbench::startOfTexts());
         double work = 1e9;
         double floor = 1e9;
         for (int turn = 0; turn < kTurns; ++turn) {
             floor = std::min(floor, secondsOf([&] { appendAll(text); }));
-            work = std::min(work, secondsOf([&] { (void)session.converted(kind.way, text); }));
+            work = std::min(work,
+                            secondsOf([&] { (void)tzbench::converted(session, kind.way, text); }));
         }
         state.counters["work"] = work;
         state.counters["floor"] = floor;

@@ -1,19 +1,10 @@
 #include "bench/markup/texts.h"
 
-#include <type_traits>
-
-#include "module/markup/mtext_to_rtf.h"
-#include "module/markup/rtf_to_mtext.h"
-
 namespace tzbench {
 
 namespace {
 
-constexpr wchar_t kFace[] = L"Liberation Sans";
 constexpr wchar_t kPlain[] = L"a run of text that no code interrupts, it";
-constexpr double kSize = 0.2;
-constexpr int kTwips = 280;
-constexpr int kPitch = 34;
 constexpr std::size_t kLongName = 60;
 
 // A change of the look every 40 characters.
@@ -43,6 +34,7 @@ std::span<TextKind const> textKinds() {
         L"}\\f1 a"},
         {"fontsOfHighNumbers", Sort::entries, Way::toMtext, L"{\\fonttbl",
         L"{\\f#\\fcharset0 Font #;}", L"}\\f2000000001 a", 2000000000},
+        {"pairsOfFiles", Sort::other, Way::toRtf, L"", L"\\Fqa,qb|c0;x", L""},
         {"colorsOfMarkup", Sort::entries, Way::toRtf, L"", L"\\c#;a", L""},
         {"colorsOfRtf", Sort::other, Way::toMtext, L"{\\colortbl", L"\\red#\\green1\\blue2;",
         L"}\\cf1 a"},
@@ -71,28 +63,15 @@ std::wstring textOf(TextKind const& kind, std::size_t size) {
     return text += kind.tail;
 }
 
-Session::Session() {
-    for (CScaleCorrection* scale : {&fontScale_, &marginScale_}) {
-        scale->SetScaleUnits(kSize);
-        scale->SetScaleTwips(kTwips);
-    }
+TextStart startOfTexts() {
+    TextStart start;
+    start.font = {L"Liberation Sans", false, false, kAnsiCharset, 34, {}};
+    return start;
 }
 
-template <class Context>
-std::wstring Session::parsed(Context&& context, std::wstring const& text) {
-    context.SetInitialFontName(kFace, false, false, kAnsiCharset, kPitch);
-    context.SetInitialFontSize(kSize, kTwips);
-    if constexpr (std::is_same_v<Context, CMTextToRichTextContext>)
-        context.SetInitialFontColor(0);
-    else
-        context.SetInitialColor(0);
-    return context.Parse(text);
-}
-
-std::wstring Session::converted(Way way, std::wstring const& text) {
-    return way == Way::toRtf
-               ? parsed(CMTextToRichTextContext(&fonts_, &fontScale_, &marginScale_), text)
-               : parsed(CRichTextToMTextContext(&fonts_, &fontScale_, &marginScale_), text);
+std::wstring converted(ConversionSession& session, Way way, std::wstring const& text) {
+    if (way == Way::toRtf) return session.toRtf(text).rtf;
+    return session.toMarkup(text).markup;
 }
 
 }  // namespace tzbench

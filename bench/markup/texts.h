@@ -7,8 +7,7 @@
 #include <span>
 #include <string>
 
-#include "tz/mte/font_map_database.h"
-#include "tz/mte/scale_correction.h"
+#include "module/markup/conversion_session.h"
 
 namespace tzbench {
 
@@ -38,19 +37,10 @@ struct TextKind {
 // The text of that many characters, or a unit more.
 [[nodiscard]] std::wstring textOf(TextKind const& kind, std::size_t size);
 
-// Converts with one font map and the same scales, as an editor does.
-class Session {
-public:
-    Session();
-    [[nodiscard]] std::wstring converted(Way way, std::wstring const& text);
+// How the texts start.
+[[nodiscard]] TextStart startOfTexts();
 
-private:
-    template <class Context>
-    [[nodiscard]] std::wstring parsed(Context&& context, std::wstring const& text);
-
-    CMTextFontMapDatabase fonts_{0};
-    CScaleCorrection fontScale_{1};
-    CScaleCorrection marginScale_{0};
-};
+// Converted in a session that may have seen other texts.
+[[nodiscard]] std::wstring converted(ConversionSession& session, Way way, std::wstring const& text);
 
 }  // namespace tzbench

@@ -17,52 +17,28 @@ OwnFontMap::~OwnFontMap() {
     CMTextFontMapDatabase(0).ResetContents();
 }
 
-Conversions::Conversions() {
-    for (CScaleCorrection* scale : {&fontScale_, &marginScale_}) {
-        scale->SetScaleUnits(kSize);
-        scale->SetScaleTwips(kTwips);
-    }
-}
-
-CStdStrW Conversions::toRtf(std::wstring const& markup) {
-    CMTextToRichTextContext context(&fonts_, &fontScale_, &marginScale_);
-    setUp(context);
-    return context.Parse(markup.c_str());
-}
-
-CStdStrW Conversions::toMtext(std::wstring const& rtf) {
-    CRichTextToMTextContext context(&fonts_, &fontScale_, &marginScale_);
-    setUp(context);
-    return context.Parse(rtf.c_str());
-}
-
 CStdStrW Conversions::roundTrip(std::wstring const& markup) {
-    CMTextToRichTextContext there(&fonts_, &fontScale_, &marginScale_);
-    setUp(there);
-    CStdStrW const rtf = there.Parse(markup.c_str());
-    CRichTextToMTextContext back(&fonts_, &fontScale_, &marginScale_);
-    setUp(back);
-    back.SetTracking(there.GetTracking());
-    back.SetCharWidth(there.GetCharWidth());
-    back.SetOblique(there.GetOblique());
-    back.SetBaseAlignment(there.GetBaseAlignment(), 0);
-    return back.Parse(rtf.c_str());
+    WrittenRtf const document = session_.toRtf(markup);
+    return session_.toMarkup(document.rtf, document.found.wholeText).markup;
+}
+
+TextStart startOfTests() {
+    TextStart start;
+    start.font = {L"Liberation Sans", false, false, kAnsiCharset, 34, {}};
+    start.size = kSize;
+    start.twips = kTwips;
+    start.color = 0xFFFFFF;
+    start.byLayer = 0x0000FF;
+    start.byBlock = 0x00FF00;
+    return start;
 }
 
 void setUp(CMTextToRichTextContext& context) {
-    context.SetInitialFontName(L"Liberation Sans", false, false, kAnsiCharset, 34);
-    context.SetInitialFontSize(kSize, kTwips);
-    context.SetInitialFontColor(0xFFFFFF);
-    context.SetByLayerColor(0x0000FF);
-    context.SetByBlockColor(0x00FF00);
+    ::setUp(context, startOfTests());
 }
 
 void setUp(CRichTextToMTextContext& context) {
-    context.SetInitialFontName(L"Liberation Sans", false, false, kAnsiCharset, 34);
-    context.SetInitialFontSize(kSize, kTwips);
-    context.SetByLayerColor(0x0000FF);
-    context.SetByBlockColor(0x00FF00);
-    context.SetInitialColor(0xFFFFFF);
+    ::setUp(context, startOfTests(), {});
 }
 
 std::wstring bodyOf(std::wstring const& document) {

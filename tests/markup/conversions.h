@@ -4,10 +4,7 @@
 
 #include <string>
 
-#include "module/markup/mtext_to_rtf.h"
-#include "module/markup/rtf_to_mtext.h"
-#include "tz/mte/font_map_database.h"
-#include "tz/mte/scale_correction.h"
+#include "module/markup/conversion_session.h"
 
 namespace markuptest {
 
@@ -27,27 +24,27 @@ private:
     std::string before_;
 };
 
-// Scales and a font database that see several conversions, over the font map that is in force. The
-// style's font is "Liberation Sans".
+// How the tests' texts start: in "Liberation Sans".
+[[nodiscard]] TextStart startOfTests();
+
+// One session over the font map that is in force.
 class Conversions {
 public:
-    Conversions();
-
-    CMTextFontMapDatabase& fonts() { return fonts_; }
-    CScaleCorrection& fontScale() { return fontScale_; }
-    CScaleCorrection& marginScale() { return marginScale_; }
+    CMTextFontMapDatabase& fonts() { return *session_.tables().fonts; }
+    CScaleCorrection& fontScale() { return *session_.tables().fontScale; }
+    CScaleCorrection& marginScale() { return *session_.tables().marginScale; }
 
     // The whole document.
-    [[nodiscard]] CStdStrW toRtf(std::wstring const& markup);
+    [[nodiscard]] CStdStrW toRtf(std::wstring const& markup) { return session_.toRtf(markup).rtf; }
     // The whole markup.
-    [[nodiscard]] CStdStrW toMtext(std::wstring const& rtf);
+    [[nodiscard]] CStdStrW toMtext(std::wstring const& rtf) {
+        return session_.toMarkup(rtf).markup;
+    }
     // To rich text and back, with the whole-text values carried over as an editor does.
     [[nodiscard]] CStdStrW roundTrip(std::wstring const& markup);
 
 private:
-    CMTextFontMapDatabase fonts_{0};
-    CScaleCorrection fontScale_{1};
-    CScaleCorrection marginScale_{0};
+    ConversionSession session_{startOfTests()};
 };
 
 // Conversions over the suite's own font map, which goes when they do.
