@@ -17,12 +17,13 @@ constexpr char kFooter[] =
 struct DirectionRow {
     char const* name;
     Direction direction;
+    char const* ending;  // of the result's file
     char const* help;
 };
 constexpr DirectionRow kDirections[] = {
-    {"to-rtf",     Direction::toRtf,     "markup to RTF"                             },
-    {"to-mtext",   Direction::toMtext,   "RTF to markup"                             },
-    {"round-trip", Direction::roundTrip, "markup to RTF to markup within one session"},
+    {"to-rtf",     Direction::toRtf,     ".rtf",   "markup to RTF"                             },
+    {"to-mtext",   Direction::toMtext,   ".mtext", "RTF to markup"                             },
+    {"round-trip", Direction::roundTrip, ".mtext", "markup to RTF to markup within one session"},
 };
 
 // What an RTF size can say: half-points of 10 twips.
@@ -144,7 +145,7 @@ void declareText(CLI::App& app, Options& options) {
 }
 
 void declareFiles(CLI::App& app, Options& options) {
-    app.add_option("FILE", options.files, "what to convert")->type_name("");
+    app.add_option("FILE", options.files, "what to convert")->type_name("")->check(aName());
     app.add_option("--font-map", options.fontMap, "a font map file in place of the shipped one")
         ->type_name("FILE")
         ->check(aName());
@@ -153,6 +154,7 @@ void declareFiles(CLI::App& app, Options& options) {
                              ->check(aName());
     app.add_option("--output-dir", options.outputDir, "write each FILE's result into that folder")
         ->type_name("DIR")
+        ->check(aName())
         ->check(CLI::ExistingDirectory)
         ->excludes(output);
     app.add_option("--report", options.report, "write what the conversion found as JSON")
@@ -196,6 +198,12 @@ std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
 }
 
 }  // namespace
+
+char const* endingOf(Direction direction) {
+    for (DirectionRow const& row : kDirections)
+        if (row.direction == direction) return row.ending;
+    return "";
+}
 
 ParsedOptions parseOptions(int count, char const* const* arguments) {
     CLI::App app(kPurpose, "tzconvert");

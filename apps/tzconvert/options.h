@@ -13,6 +13,9 @@ inline constexpr int kUnusable = 2;  // wrong usage, an unusable file, or input 
 
 enum class Direction { toRtf, toMtext, roundTrip };
 
+// The ending of the name of a result, with its dot.
+[[nodiscard]] char const* endingOf(Direction direction);
+
 struct Options {
     Direction direction = Direction::toRtf;
     std::vector<std::string> files;  // at least one; "-" is standard input

@@ -12,10 +12,6 @@ namespace {
 
 constexpr std::size_t kPiece = 1 << 16;
 
-std::string shownName(std::string const& file) {
-    return file == "-" ? "standard input" : file;
-}
-
 std::string faultAt(std::size_t offset, char const* reason) {
     return "byte " + std::to_string(offset) + ": " + reason;
 }
@@ -47,6 +43,10 @@ Failure writeStandardOutput(std::string_view bytes) {
 }
 
 }  // namespace
+
+std::string shownName(std::string const& file) {
+    return file == "-" ? "standard input" : file;
+}
 
 Failure readText(std::string const& file, std::wstring& text) {
     Failure fault;

@@ -11,6 +11,9 @@ namespace tzconvert {
 // What is read or written failed: one line saying what and why.
 using Failure = std::optional<std::string>;
 
+// An input's name in messages: "-" is standard input.
+[[nodiscard]] std::string shownName(std::string const& file);
+
 // Takes a whole file, or standard input for "-", as text. A file that cannot be read, is no UTF-8
 // or holds a zero character is refused.
 [[nodiscard]] Failure readText(std::string const& file, std::wstring& text);

@@ -67,11 +67,23 @@ constexpr RunCase kRuns[] = {
     {"FaceStyle",             "to-rtf --font Some --bold",                                               "x"sv,                              0, "~\\fs32\\b \\deftab0 x",       ""                                                 },
     {"Size",                  "to-mtext --size 2.5 --twips 280",                                         "\\fs56 x"sv,                       0, "{\\H2x;x}",                    ""                                                 },
 
- // Used to be {\H0.9846x;abc \Ld\l e}, {\H1x;ABC} and {\H1x;a \H1.4x;\Le\H0.7143x;f\l g}.
-    {"SizeBetweenHalfPoints", "round-trip --twips 325",                                                  "abc {\\Ld} e"sv,                   0, "abc {\\Ld} e",                 ""                                                 },
-    {"SizeBesideTheStyles",   "round-trip",                                                              "A{\\H0.20001;B}C"sv,               0, "ABC",                          ""                                                 },
+ // A size that the markup names at the style's own twips comes back as itself.
+    {"SizeBesideTheStyles",   "round-trip",                                                              "\\H0.2001;a"sv,                    0, "{\\H1x;a}",                    ""                                                 },
+    {"SizeBetweenHalfPoints", "round-trip --twips 325",                                                  "abc {\\Ld} e"sv,                   0,
+     "{\\H0.9846x;abc \\Ld\\l e}",                                                                                                                                              ""                                                 },
+    {"DeviceAsMap",           "to-rtf --font-map /dev/null",                                             "a"sv,                              2, "",
+     "/dev/null: cannot be read: it is a device"                                                                                                                                                                                   },
+    {"EmptyFile",             "to-rtf \"\"",                                                             "a"sv,                              2, "",                             "an empty name"                                    },
+    {"EmptyOutputDir",        "to-rtf --output-dir \"\"",                                                "a"sv,                              2, "",                             "an empty name"                                    },
+    {"OutputOverItsInput",    "to-rtf --output in",                                                      "a"sv,                              2, "",
+     "standard input: its result would take the place of in"                                                                                                                                                                       },
+ // The lead byte is one of the page that decodes it, the system's.
+    {"LeadByteOfNoPage",      "to-mtext --code-page 936",                                                "\\ansicpg65001 \\'b0\\'a1"sv,      0,
+     "\xE5\x95\x8A",                                                                                                                                                            ""                                                 },
+    {"LeadByteOfSymbols",     "to-mtext --code-page 936 --font S --charset 2",
+     "{\\fonttbl{\\f0\\fcharset2 S;}}\\f0 \\'b0\\'a1"sv,                                                                                     0, "\xE5\x95\x8A",                 ""                                                 },
     {"SecondTrip",            "round-trip",                                                              "a {\\H1.4x;\\Le\\H0.7143x;f} g"sv, 0,
-     "a {\\H1.4x;\\Le\\H0.7143x;f} g",                                                                                                                                          ""                                                 },
+     "{\\H1x;a \\H1.4x;\\Le\\H0.7143x;f\\l g}",                                                                                                                                 ""                                                 },
     {"Color",                 "to-rtf --color 112233",                                                   "x"sv,                              0, "~\\red17\\green34\\blue51;",   ""                                                 },
     {"ByLayer",               "to-mtext --by-layer FF0000 --by-block ff0000",
      "{\\colortbl\\red255\\green0\\blue0;\\red254\\green0\\blue0;}\\cf0 a\\cf1 b"sv,                                                         0,
@@ -197,8 +209,41 @@ TEST(Files, ThatMemoryCannotHoldAreNamed) {
     EXPECT_EQ(contentsOf("batch/one.mtext"), "1");
 }
 
+// The second file's font used to come back as the face that the first had lent to another.
+TEST(Files, OfABatchGiveWhatTheyGiveAlone) {
+    fs::create_directories("batch");
+    write("own.ini", "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\n[Proxy Fonts]\nProxy 1=Drawn\n");
+    write("lends.txt", "\\Fnone;a");
+    write("mapped.txt", "{\\Fhouse|c0;b}");
+    for (char const* files : {"mapped.txt", "lends.txt mapped.txt"}) {
+        EXPECT_EQ(run("round-trip --font Arial --font-map own.ini --output-dir batch " +
+                          std::string(files),
+                      "")
+                      .status,
+                  0);
+        EXPECT_EQ(contentsOf("batch/mapped.mtext"), "{\\Fhouse.shx|c0;b}") << files;
+    }
+}
+
+// A name in plain letters used to be taken for an English one.
+TEST(Faces, AreWrittenInEnglish) {
+    fs::path const fonts = fs::path(std::getenv("FONTCONFIG_FILE")).parent_path() / "files";
+    write("native.conf",
+          "<fontconfig><dir>" + fonts.string() + "</dir><cachedir>" +
+              fs::absolute("cache").string() +
+              "</cachedir><match target=\"scan\"><test name=\"family\"><string>DejaVu Sans Mono"
+              "</string></test><edit name=\"family\" mode=\"append\"><string>Gewohnt</string>"
+              "</edit><edit name=\"familylang\" mode=\"append\"><string>de</string></edit>"
+              "</match></fontconfig>");
+    Outcome const result = run("to-mtext", "{\\fonttbl{\\f1\\fcharset0 gewohnt;}}\\f1 x",
+                               "export FONTCONFIG_FILE=$PWD/native.conf; ");
+    EXPECT_EQ(result.out, "{\\fDejaVu Sans Mono|b0|i0|c0|p0;x}") << result.err;
+}
+
 TEST(Files, DoNotOverwriteInputs) {
     write("trip.mtext", "x");
+    EXPECT_EQ(run("round-trip --output ./trip.mtext trip.mtext", "").status, 2);
+    EXPECT_EQ(contentsOf("trip.mtext"), "x");
     EXPECT_EQ(run("round-trip --output-dir . trip.mtext", "").status, 2);
     EXPECT_EQ(contentsOf("trip.mtext"), "x");
     write("trip.rtf", "y");

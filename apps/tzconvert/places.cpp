@@ -1,0 +1,58 @@
+#include "apps/tzconvert/places.h"
+
+#include <algorithm>
+
+#include "host/files/safe_file.h"
+
+namespace tzconvert {
+
+namespace fs = std::filesystem;
+
+std::string targetOf(Options const& options, std::string const& file) {
+    if (options.outputDir.empty()) return options.output;
+    fs::path name = file == "-" ? fs::path("stdin") : fs::path(file).filename();
+    name.replace_extension(endingOf(options.direction));
+    return (fs::path(options.outputDir) / name).string();
+}
+
+Places::Places(Options const& options) : options_(options) {
+    for (std::string const& file : options.files)
+        inputs_.insert(placeOf(file == "-" ? "/dev/stdin" : file));
+    if (!options.fontMap.empty()) inputs_.insert(placeOf(options.fontMap));
+}
+
+// The file itself, links followed, from the root even when it is not there.
+Places::Place Places::placeOf(std::string const& file) {
+    std::error_code unreadable;  // will be named when it is read
+    Place const named = fs::absolute(file, unreadable);
+    Place const real = fs::weakly_canonical(tzhost::followLinks(named), unreadable);
+    return unreadable ? named : real;
+}
+
+Failure Places::checkReport() const {
+    if (options_.report.empty() || options_.report == "-") return {};
+    Place const place = placeOf(options_.report);
+    if (inputs_.count(place) != 0) return "--report " + options_.report + ": it is an input";
+    bool const isTarget =
+        std::any_of(options_.files.begin(), options_.files.end(), [&](std::string const& file) {
+            return placeOf(targetOf(options_, file)) == place;
+        });
+    if (isTarget) return "--report " + options_.report + ": a result goes there";
+    return {};
+}
+
+Failure Places::checkTarget(std::string const& file, std::string const& target) const {
+    if (target.empty()) return {};
+    std::string const name = shownName(file);
+    Place const place = placeOf(target);
+    if (inputs_.count(place) != 0) return name + ": its result would take the place of " + target;
+    if (targets_.count(place) != 0)
+        return name + ": " + target + " is another file's result already";
+    return {};
+}
+
+void Places::keepTarget(std::string const& target) {
+    if (!target.empty()) targets_.insert(placeOf(target));
+}
+
+}  // namespace tzconvert

@@ -1,0 +1,39 @@
+#pragma once
+
+// Where results go, and what they may not take the place of.
+
+#include <filesystem>
+#include <set>
+#include <string>
+
+#include "apps/tzconvert/options.h"
+#include "apps/tzconvert/streams.h"
+
+namespace tzconvert {
+
+// Where a file's result goes: in a folder, under its own name with the ending of the result. Empty
+// for standard output.
+[[nodiscard]] std::string targetOf(Options const& options, std::string const& file);
+
+// What a run reads and has written. Nothing takes the place of an input, whatever its name there:
+// of a file that is converted, of what standard input comes from, or of the font map. No result
+// takes the place of another, and the report of none.
+class Places {
+public:
+    explicit Places(Options const& options);
+
+    [[nodiscard]] Failure checkReport() const;
+    [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) const;
+    // A result that was not made keeps no place.
+    void keepTarget(std::string const& target);
+
+private:
+    using Place = std::filesystem::path;
+    [[nodiscard]] static Place placeOf(std::string const& file);
+
+    Options const& options_;
+    std::set<Place> inputs_;
+    std::set<Place> targets_;  // the results that were written
+};
+
+}  // namespace tzconvert
