@@ -198,12 +198,13 @@ endfunction()
 # Every test sees the same fonts, locale, folders and (empty) user configuration on each machine.
 function(tz_test_environment test name)
     set(scratch ${CMAKE_BINARY_DIR}/tests/scratch/${name})
-    file(MAKE_DIRECTORY ${scratch}/config)
+    file(MAKE_DIRECTORY ${scratch}/config ${scratch}/tmp)
     set(environment
         LC_ALL=C.UTF-8
         TZ=UTC
         FONTCONFIG_FILE=${TZ_TEST_FONTS_CONF}
         XDG_CONFIG_HOME=${scratch}/config
+        TMPDIR=${scratch}/tmp
         TZ_TEST_LIB=${CMAKE_BINARY_DIR}/lib
         TZ_TEST_BIN=${CMAKE_BINARY_DIR}/bin
         TZ_TEST_SOURCE=${PROJECT_SOURCE_DIR}

@@ -4,7 +4,7 @@
 
 #include "apps/tzdraft/local_text.h"
 #include "host/command_line/command_line.h"
-#include "host/editors/markup_session.h"
+#include "host/editors/editor_programs.h"
 #include "host/files/file_bytes.h"
 #include "host/files/install_paths.h"
 #include "host/fonts/font_map_path.h"
@@ -13,6 +13,7 @@
 #include "host/settings/settings.h"
 #include "host/settings/variables.h"
 #include "host/text/utf8.h"
+#include "tz/text/string.h"
 
 namespace tzdraft {
 namespace {
@@ -129,7 +130,8 @@ void chooseEditors(Options const& options) {
 }  // namespace
 
 std::filesystem::path modulePath(Options const& options) {
-    if (!options.module.empty()) return std::filesystem::absolute(options.module);
+    std::error_code gone;  // of a working folder: the loader then says that nothing is there
+    if (!options.module.empty()) return std::filesystem::absolute(options.module, gone);
     return std::filesystem::path(tzhost::libraryFolder()) / kModuleName;
 }
 

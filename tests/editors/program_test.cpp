@@ -4,12 +4,15 @@
 
 #include <unistd.h>
 
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <new>
 #include <string>
 
 #include "host/base/memory_faults.h"
+#include "host/command_line/command_line.h"
+#include "host/editors/editor_programs.h"
 #include "host/editors/program.h"
 #include "host/faults/fault_plan.h"
 
@@ -46,6 +49,37 @@ TEST(Programs, LeaveOneHostWhicheverAllocationFails) {
     }
     EXPECT_FALSE(struck) << "the sweep came to its end";
     EXPECT_FALSE(std::filesystem::exists(kSecond)) << "at allocation " << call;
+}
+
+// A session at a terminal, which asks nothing here.
+class Terminal : public tzhost::AnswerSource {
+public:
+    tzhost::Answer next(tzhost::AnswerRequest const&) override { return {}; }
+    [[nodiscard]] bool isTerminal() const override { return true; }
+};
+
+// There used to be no editor without a word of the user's.
+TEST(Editors, AreLookedForAtATerminalAlone) {
+    namespace fs = std::filesystem;
+    std::string const before = std::getenv("PATH");
+    fs::path const folder = fs::absolute("programs");
+    fs::create_directories(folder);
+    setenv("PATH", ("programs:" + folder.string()).c_str(), 1);
+    EXPECT_EQ(tzhost::textEditorProgram(), "") << "a script";
+    Terminal terminal;
+    tzhost::commandLine().setSource(&terminal);
+    EXPECT_EQ(tzhost::textEditorProgram(), "") << "nothing is there";
+    for (char const* const name : {"vi", "editor"}) {
+        std::ofstream(folder / name) << "#!/bin/sh\n";
+        fs::permissions(folder / name, fs::perms::owner_all);
+        EXPECT_EQ(tzhost::textEditorProgram(), (folder / name).string());
+    }
+    tzhost::editorConfiguration().textEditor = "nano";
+    EXPECT_EQ(tzhost::textEditorProgram(), "nano");
+    tzhost::editorConfiguration().textEditor.clear();
+    tzhost::commandLine().reset();
+    fs::remove_all(folder);
+    setenv("PATH", before.c_str(), 1);
 }
 
 }  // namespace

@@ -6,9 +6,11 @@
 
 #include "module/access/space_posting.h"
 #include "tests/mtext/held_text.h"
+#include "tz/db/field.h"
 #include "tz/db/mtext.h"
 #include "tz/db/shapes.h"
 #include "tz/ed/variables.h"
+#include "tz/mte/dialog_params.h"
 #include "tz/mte/edit_mtext.h"
 #include "tz/mte/globals.h"
 
@@ -145,6 +147,73 @@ TEST(Gate, RefusesWhatItCannotWrite) {
     ASSERT_EQ(tzdbOpenObject(text.object, id, TzDb::kForRead), Tzad::eOk);
     EXPECT_EQ(InvokeEditorOn(text, kMTETabText, 0, true, true, false, false, false), 3);
     EXPECT_NE(drawing.events().find("cannot be opened for writing"), std::string::npos);
+}
+
+TzString fieldCodeOf(TzDbObjectId id) {
+    EasyObject<TzDbMText> text;
+    EasyObject<TzDbField> field;
+    bool const has = tzdbOpenObject(text.object, id, TzDb::kForRead) == Tzad::eOk &&
+                     text->getField(L"TEXT", field.object, TzDb::kForRead) == Tzad::eOk;
+    return has ? field->getFieldCode(0) : TzString();
+}
+
+struct ContentsRow {
+    char const* name;
+    wchar_t const* before;
+    char const* left;     // in the editor
+    wchar_t const* code;  // of the field behind the session; empty for none
+    wchar_t const* contents;
+    bool written;
+};
+constexpr ContentsRow kContents[] = {
+    {"FieldKept",      L"n=%<\\Var LUNITS>%", "m=%<\\Var LUNITS>%\nb", L"m=%<\\Var LUNITS>%\\Pb",
+     L"m=2\\Pb",                                                                                            true },
+ // The editors used to show "n=2" and to set it, which dropped the field.
+    {"FieldUnchanged", L"n=%<\\Var LUNITS>%", "n=%<\\Var LUNITS>%",    L"n=%<\\Var LUNITS>%",     L"n=2",
+     false                                                                                                       },
+    {"FieldDropped",   L"n=%<\\Var LUNITS>%", "n=2",                   L"",                       L"n=2",   true },
+ // It used to be set, which made a step for undo.
+    {"Unchanged",      L"a\\Pb",              "a\nb",                  L"",                       L"a\\Pb", false},
+};
+class EditedContents : public testing::TestWithParam<std::tuple<char const*, ContentsRow>> {};
+TEST_P(EditedContents, KeepTheirFields) {
+    auto const& [editor, row] = GetParam();
+    OpenDrawing const drawing("<<<\n" + std::string(row.left) + "\n>>>\n");
+    ASSERT_TRUE(tzhost::Variables::instance()
+                    .overrideFromText(L"MTEXTED", TzString::fromUtf8(editor).str())
+                    .isDone());
+    auto* const text = new TzDbMText;
+    ASSERT_EQ(text->setContents(row.before), Tzad::eOk);
+    TzDbObjectId const id = post(text);
+    std::size_t const posted = drawing.events().size();
+    MteCoreDialogParamsRXInit();
+    EXPECT_EQ(editById(id), 1);
+    MteCoreDialogParamsRXUninit();
+    EXPECT_EQ(contentsOf(id).str(), row.contents);
+    EXPECT_EQ(fieldCodeOf(id).str(), row.code);
+    bool const isWritten = drawing.events().find("\"write\"", posted) != std::string::npos;
+    EXPECT_EQ(isWritten, row.written);
+}
+INSTANTIATE_TEST_SUITE_P(Editors,
+                         EditedContents,
+                         testing::Combine(testing::Values("Internal", "Internal-", "myeditor"),
+                                          testing::ValuesIn(kContents)));
+
+// A new text would have dropped the field unseen.
+TEST(Gate, LeavesATextWhoseFieldIsOpenElsewhere) {
+    OpenDrawing const drawing(kBlock);
+    auto* const made = new TzDbMText;
+    ASSERT_EQ(made->setContents(L"%<\\Var LUNITS>%"), Tzad::eOk);
+    TzDbObjectId const id = post(made);
+    {
+        EasyObject<TzDbMText> text;
+        ASSERT_EQ(tzdbOpenObject(text.object, id, TzDb::kForRead), Tzad::eOk);
+        EasyObject<TzDbField> field;
+        ASSERT_EQ(text->getField(L"TEXT", field.object, TzDb::kForWrite), Tzad::eOk);
+        EXPECT_EQ(InvokeEditorOn(text, kMTETabText, 0, true, true, false, false, false), 2);
+    }
+    EXPECT_EQ(fieldCodeOf(id), L"%<\\Var LUNITS>%");
+    EXPECT_NE(drawing.transcript().find(L"has a field that cannot be opened"), std::wstring::npos);
 }
 
 struct RecordRow {

@@ -94,8 +94,8 @@ TEST_P(Translations, SayEachModuleTextInTheirOwnWords) {
 // What the system says is looked up too.
 std::set<std::wstring> reasonsOfTheSystem() {
     std::set<std::wstring> reasons;
-    for (int const reason :
-         {ENOENT, EACCES, EISDIR, ENOTDIR, ENOSPC, EFBIG, EROFS, EIO, ENOEXEC, EMFILE, ENOMEM})
+    for (int const reason : {ENOENT, EACCES, EISDIR, ENOTDIR, ENOSPC, EFBIG, EROFS, EIO, ENOEXEC,
+                             EMFILE, ENOMEM, ELOOP, ENAMETOOLONG})
         reasons.insert(tzhost::fromUtf8(std::strerror(reason)));
     return reasons;
 }

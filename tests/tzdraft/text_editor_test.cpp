@@ -19,18 +19,22 @@ struct EditorRow {
     char const* made;
 };
 constexpr EditorRow kRows[] = {
-    {"Missing",     nullptr,                          "cannot be run: No such file",               ""    },
-    {"Killed",      "kill -9 $$",                     "was killed by signal 9; the text stays",    ""    },
-    {"Failing",     "exit 3",                         "ended with exit status 3; the text stays",  ""    },
-    {"Emptying",    ": > \"$1\"",                     "left an empty file; the text stays",        ""    },
-    {"Removing",    "rm \"$1\"",                      "left a file that cannot be read; the text", ""    },
-    {"Folder",      "rm \"$1\"; mkdir \"$1\"",        "left a file that cannot be read; the text", ""    },
-    {"NoUtf8",      "printf 'a\\377' > \"$1\"",       "left a file that is no UTF-8; the text",    ""    },
-    {"Zero",        "printf 'a\\000b' > \"$1\"",      "left a file with a zero character",         ""    },
-    {"Silent",      ":",                              "Nothing was written in the editor.",        ""    },
-    {"Slow",        "sleep 1; echo late > \"$1\"",    "Command: QUIT",                             "late"},
-    {"Replacing",   "echo new > n; mv n \"$1\"",      "Command: QUIT",                             "new" },
-    {"WroteFailed", "echo kept > \"$1\"; kill -9 $$", "What was edited is kept in ",               ""    },
+    {"Missing",     nullptr,                                   "cannot be run: No such file",               ""    },
+    {"Killed",      "kill -9 $$",                              "was killed by signal 9; the text stays",    ""    },
+    {"Failing",     "exit 3",                                  "ended with exit status 3; the text stays",  ""    },
+    {"Emptying",    ": > \"$1\"",                              "left an empty file; the text stays",        ""    },
+    {"Removing",    "rm \"$1\"",                               "left a file that cannot be read; the text", ""    },
+    {"Folder",      "rm \"$1\"; mkdir \"$1\"",                 "left a file that cannot be read; the text", ""    },
+    {"NoUtf8",      "printf 'a\\377' > \"$1\"",                "left a file that is no UTF-8; the text",    ""    },
+    {"Zero",        "printf 'a\\000b' > \"$1\"",               "left a file with a zero character",         ""    },
+    {"Silent",      ":",                                       "Nothing was written in the editor.",        ""    },
+    {"Slow",        "sleep 1; echo late > \"$1\"",             "Command: QUIT",                             "late"},
+    {"Replacing",   "echo new > n; mv n \"$1\"",               "Command: QUIT",                             "new" },
+ // It used to become part of the text.
+    {"ByteOrder",   "printf '\\357\\273\\277new\\n' > \"$1\"", "Command: QUIT",                             "new" },
+ // It used to wait for a writer.
+    {"Pipe",        "rm \"$1\"; mkfifo \"$1\"",                "left a file that cannot be read; the text", ""    },
+    {"WroteFailed", "echo kept > \"$1\"; kill -9 $$",          "What was edited is kept in ",               ""    },
 };
 void PrintTo(EditorRow const& row, std::ostream* out) {
     *out << row.name;
@@ -46,9 +50,32 @@ std::vector<std::string> textsOf(fs::path const& drawing) {
     return texts;
 }
 
+// An empty temporary directory for the length of a test.
+class TemporaryFolder {
+public:
+    TemporaryFolder() {
+        fs::remove_all(folder_);
+        fs::create_directories(folder_);
+        setenv("TMPDIR", folder_.c_str(), 1);
+    }
+    TemporaryFolder(TemporaryFolder const&) = delete;
+    TemporaryFolder& operator=(TemporaryFolder const&) = delete;
+    ~TemporaryFolder() {
+        unsetenv("TMPDIR");
+        fs::remove_all(folder_);
+    }
+    [[nodiscard]] std::ptrdiff_t files() const {
+        return std::distance(fs::directory_iterator(folder_), {});
+    }
+
+private:
+    fs::path folder_ = scratch("temporary");
+};
+
 class TextEditor : public testing::TestWithParam<EditorRow> {};
 
 TEST_P(TextEditor, IsSurvived) {
+    TemporaryFolder const temporary;
     std::string editor = scratch("nosuch").string();
     if (GetParam().editor)
         editor = "/bin/sh " + scratch("editor.sh", GetParam().editor + std::string("\n")).string();
@@ -61,10 +88,13 @@ TEST_P(TextEditor, IsSurvived) {
     std::vector<std::string> made;
     if (*GetParam().made) made.emplace_back(GetParam().made);
     EXPECT_EQ(textsOf(drawing), made);
+    bool const isKept = run.output.find("What was edited is kept in ") != std::string::npos;
+    EXPECT_EQ(temporary.files(), isKept ? 1 : 0);
 }
 
 // What was written before the editor died lies where the line says.
 TEST(TextEditorKept, LiesWhereTheLineSays) {
+    TemporaryFolder const temporary;
     std::string const editor =
         "/bin/sh " + scratch("editor.sh", "echo kept > \"$1\"; exit 1\n").string();
     fs::path const script = scratch("note.scr", "MTEXT\n0,0\n40,-20\nQUIT\n");
@@ -76,7 +106,6 @@ TEST(TextEditorKept, LiesWhereTheLineSays) {
     std::size_t const first = at + lead.size();
     fs::path const file = run.output.substr(first, run.output.find('\n', first) - first);
     EXPECT_EQ(tztest::bytesOf(file), "kept\n") << file;
-    fs::remove_all(file.parent_path());
 }
 
 INSTANTIATE_TEST_SUITE_P(Rows, TextEditor, testing::ValuesIn(kRows), [](auto const& row) {
