@@ -1,11 +1,11 @@
 #include "host/drawing_file/drawing_file.h"
 
-#include <cerrno>
 #include <cstdio>
 
 #include "host/drawing_file/drawing_reader.h"
 #include "host/drawing_file/drawing_writer.h"
 #include "host/files/file_bytes.h"
+#include "host/files/file_kind.h"
 #include "host/files/safe_file.h"
 #include "host/text/local_text.h"
 
@@ -43,11 +43,8 @@ DrawingRead readDrawing(std::filesystem::path const& file) {
         result.error = file.string() + ": " + localText("cannot be read");
         return result;
     }
-    std::error_code ignored;
-    bool const isFolder = std::filesystem::is_directory(file, ignored);
-    if (isFolder) errno = EISDIR;
-    std::unique_ptr<std::FILE, FileCloser> const stream(isFolder ? nullptr
-                                                                 : std::fopen(file.c_str(), "rb"));
+    std::unique_ptr<std::FILE, FileCloser> const stream(
+        isFile(file.string()) ? std::fopen(file.c_str(), "rb") : nullptr);
     if (!stream) {
         result.error = file.string() + ": " + localText("cannot be read") + ": " + systemReason();
         return result;
@@ -57,12 +54,7 @@ DrawingRead readDrawing(std::filesystem::path const& file) {
     DrawingReader reader(context);
     bool good = runOver(stream.get(), reader, context);
     if (good && reader.needsSecondPass()) {
-        if (std::fseek(stream.get(), 0, SEEK_SET) != 0) {
-            result.error = file.string() + ": " +
-                           localText("can be read only once, expected layers and textStyles ahead "
-                                     "of blocks and entities");
-            return result;
-        }
+        std::rewind(stream.get());
         reader.startPass(Pass::entitiesOnly);
         good = runOver(stream.get(), reader, context);
     }
@@ -87,11 +79,12 @@ void setKeptVariables(Variables::Values const& values) {
         (void)store.setKept(name, value);  // checked when they were read
 }
 
-std::string writeDrawing(Drawing& drawing, std::filesystem::path const& file) {
+std::string
+writeDrawing(Drawing& drawing, std::filesystem::path const& file, IfReadOnly ifReadOnly) {
     using namespace drawingfile;
     if (faultStatus("writeDrawing", Tzad::eFileError))
         return file.string() + ": " + localText("cannot be written");
-    SafeFile target(file);
+    SafeFile target(file, ifReadOnly);
     if (target.isOpen() && writeWhole(drawing, target) && target.commit()) return {};
     return file.string() + ": " + localText("cannot be written") + ": " + target.reason();
 }

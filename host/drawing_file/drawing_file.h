@@ -6,6 +6,7 @@
 #include <vector>
 
 #include "host/database/drawing.h"
+#include "host/files/safe_file.h"
 #include "host/settings/variables.h"
 
 // Drawings in files, in the JSON form that docs/drawing-file.md describes. Both directions work
@@ -30,16 +31,18 @@ struct DrawingRead {
     bool isNewer = false;               // the error is that the file is of a newer version
 };
 
-// Reads a drawing; its file is set to `file`.
+// Reads a drawing; its file is set to `file`. Devices and pipes are refused at once.
 [[nodiscard]] DrawingRead readDrawing(std::filesystem::path const& file);
 
 // Puts the variables of the drawing kind to their defaults, then to these values. An empty list is
 // what a new drawing starts with.
 void setKeptVariables(Variables::Values const& values);
 
-// Writes a drawing with the variables in force: to a temporary file in the same folder, flushed to
-// the disk and renamed over the old file, so that a crash leaves the one or the other. Empty, or
-// one line that says what went wrong; the old file is then as it was.
-[[nodiscard]] std::string writeDrawing(Drawing& drawing, std::filesystem::path const& file);
+// Writes a drawing with the variables in force, whole or not at all (host/files/safe_file.h).
+// Empty, or one line that says what went wrong; the old file is then as it was. A read-only file is
+// refused unless the user was asked; isReadOnly (host/files/file_kind.h) tells it beforehand.
+[[nodiscard]] std::string writeDrawing(Drawing& drawing,
+                                       std::filesystem::path const& file,
+                                       IfReadOnly ifReadOnly = IfReadOnly::refuse);
 
 }  // namespace tzhost

@@ -3,6 +3,7 @@
 #include <cerrno>
 #include <cstring>
 
+#include "host/files/file_kind.h"
 #include "host/files/file_reader.h"
 #include "host/files/safe_file.h"
 #include "host/text/local_text.h"
@@ -11,6 +12,7 @@ namespace tzhost {
 
 std::optional<std::string> readFile(std::string const& path) {
     constexpr std::size_t kPiece = 1 << 16;
+    if (!isFile(path)) return std::nullopt;
     FileReader reader(path);
     std::string bytes;
     for (std::size_t room = reader.expectedSize() + 1;; room = kPiece) {
@@ -31,7 +33,8 @@ bool writeFileSafely(std::string const& path, std::string_view bytes) {
 }
 
 std::string systemReason() {
-    return localText(std::strerror(errno));
+    return errno == kNoFile ? localText("it is a device or a pipe")
+                            : localText(std::strerror(errno));
 }
 
 }  // namespace tzhost

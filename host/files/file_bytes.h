@@ -8,16 +8,15 @@
 
 namespace tzhost {
 
-// Nothing when the file cannot be opened or read to its end; folders are no files. A file over 1
-// GiB is not read.
+// Nothing when the file cannot be opened or read to its end; errno then says why. Folders, devices
+// and pipes are refused at once, and so is a file over 1 GiB.
 [[nodiscard]] std::optional<std::string> readFile(std::string const& path);
 
-// Writes beside the file, flushes to the disk and renames over it, so that a crash leaves the old
-// file or the new one. A symbolic link is followed, and an old file's permissions stay. False, with
-// the old file as it was, when any of it fails.
+// Writes the file as SafeFile does (safe_file.h), whole or not at all. False when that fails: the
+// old file is as it was, and errno says why.
 [[nodiscard]] bool writeFileSafely(std::string const& path, std::string_view bytes);
 
-// What the system says about the last failed call, in words.
+// What errno says about the last failed call, in words.
 [[nodiscard]] std::string systemReason();
 
 }  // namespace tzhost

@@ -9,6 +9,8 @@
 #include <unistd.h>
 #include <utility>
 
+#include "host/files/file_kind.h"
+#include "host/files/part_file.h"
 #include "host/text/local_text.h"
 
 namespace tzhost {
@@ -30,10 +32,8 @@ private:
     struct sigaction before_ {};
 };
 
-// The permissions of the old file, else those of a new one.
-mode_t permissionsFor(std::filesystem::path const& target) {
-    struct stat old {};
-    if (stat(target.c_str(), &old) == 0) return old.st_mode & 07777;
+// The permissions of a new file.
+mode_t newPermissions() {
     mode_t const mask = umask(0);
     umask(mask);
     return 0666 & ~mask;
@@ -80,46 +80,60 @@ std::filesystem::path followLinks(std::filesystem::path const& path) {
     return file;
 }
 
-SafeFile::SafeFile(std::filesystem::path const& target)
+SafeFile::SafeFile(std::filesystem::path const& target, IfReadOnly ifReadOnly)
     : target_(followLinks(target)), file_(ownOutput(target_)) {
-    namespace fs = std::filesystem;
     if (isOpen()) return;
-    std::error_code error;
-    fs::file_status const old = fs::status(target_, error);
-    if (fs::is_directory(old)) {
-        errno = EISDIR;
-        (void)fail();
-    } else if (fs::exists(old) && !fs::is_regular_file(old)) {
+    struct stat old {};
+    bool const isThere = stat(target_.c_str(), &old) == 0;
+    if (!isThere && errno != ENOENT) {
+        (void)fail();  // a ring of links, a name that is too long, a folder that is none
+    } else if (isThere && S_ISDIR(old.st_mode)) {
+        (void)fail(EISDIR);
+    } else if (isThere && !S_ISREG(old.st_mode)) {
         file_ = open(target_.c_str(), O_WRONLY | O_CLOEXEC);
         if (file_ < 0) (void)fail();
+    } else if (isThere && ifReadOnly == IfReadOnly::refuse && isReadOnly(target_.string())) {
+        words_ = forLocalText("it is read-only");
+        (void)fail(EACCES);
     } else {
-        makeTemporary();
+        makePart(isThere ? &old : nullptr);
     }
 }
 
-void SafeFile::makeTemporary() {
-    temporary_ = (target_.parent_path() / ("." + target_.filename().string() + ".XXXXXX")).string();
-    file_ = mkostemp(temporary_.data(), O_CLOEXEC);
+void SafeFile::makePart(struct stat const* old) {
+    removeLeftPartFiles(target_);
+    file_ = makePartFile(target_, part_);
     if (file_ < 0) {
-        temporary_.clear();
         (void)fail();
-    } else if (fchmod(file_, permissionsFor(target_)) != 0) {
+        return;
+    }
+    struct stat made {};
+    bool const isOwned = !old || (fstat(file_, &made) == 0 && made.st_uid == old->st_uid &&
+                                  made.st_gid == old->st_gid);
+    if (!isOwned && fchown(file_, old->st_uid, old->st_gid) != 0) {
+        words_ = forLocalText("its owner and group cannot be kept");
+        (void)fail();
+    } else if (fchmod(file_, old ? old->st_mode & 07777 : newPermissions()) != 0) {
         (void)fail();
     }
 }
 
 SafeFile::~SafeFile() {
-    if (file_ >= 0) (void)close(file_);  // nothing is lost: the file goes away
-    if (!temporary_.empty()) (void)unlink(temporary_.c_str());
+    if (!part_.empty()) (void)unlink(part_.c_str());
+    if (file_ >= 0) (void)close(file_);  // last, since it is locked up to here
 }
 
-bool SafeFile::fail() {
-    if (problem_ == 0) problem_ = errno;
+bool SafeFile::fail(int problem) {
+    if (problem_ == 0) problem_ = problem;
     return false;
 }
 
+bool SafeFile::fail() {
+    return fail(errno);
+}
+
 std::string SafeFile::reason() const {
-    return localText(std::strerror(problem_));
+    return localText(words_ ? words_ : std::strerror(problem_));
 }
 
 bool SafeFile::write(std::string_view bytes) {
@@ -137,13 +151,14 @@ bool SafeFile::write(std::string_view bytes) {
 
 bool SafeFile::commit() {
     if (problem_ != 0) return false;
-    bool const isDevice = temporary_.empty();
-    if (!isDevice && fsync(file_) != 0) return fail();
-    int const handle = std::exchange(file_, -1);
-    if (close(handle) != 0) return fail();
-    if (isDevice) return true;
-    if (rename(temporary_.c_str(), target_.c_str()) != 0) return fail();
-    temporary_.clear();
+    if (!part_.empty()) return takePlace();
+    return close(std::exchange(file_, -1)) == 0 || fail();
+}
+
+bool SafeFile::takePlace() {
+    if (fsync(file_) != 0 || rename(part_.c_str(), target_.c_str()) != 0) return fail();
+    part_.clear();
+    (void)close(std::exchange(file_, -1));  // it was flushed, so that nothing is left to fail
     flushFolder(target_.parent_path());
     return true;
 }

@@ -4,19 +4,25 @@
 #include <string>
 #include <string_view>
 
+struct stat;
+
 namespace tzhost {
 
-// The file that a symbolic link leads to over any number of links, be it there yet or not. The path
-// itself when it is no link, when its links form a ring, and when what it leads to has no path, as
-// a pipe has none.
+// The file that a symbolic link leads to over any number of links, whether it is there or not. The
+// path itself when it is no link, when its links form a ring, and when what it leads to has no
+// path, such as a pipe.
 [[nodiscard]] std::filesystem::path followLinks(std::filesystem::path const& path);
 
-// A file that is written piece by piece and takes the place of the old one only when it is whole:
-// the pieces go to a temporary file in the same folder, which `commit` flushes to the disk and
-// renames, so that a crash leaves the old file or the new one. A symbolic link is followed; an old
-// file's permissions stay. Without `commit` the temporary file goes away and the old one stays.
-// What is no file (a device, a pipe) is written to as it is, and so is the file that the program's
-// own output or messages go to: what stands in it stays.
+// What becomes of a file that may not be written to.
+enum class IfReadOnly { refuse, replace };
+
+// A file that is written piece by piece and takes the place of the old one only when it is whole.
+// The pieces go to an unfinished file in the same folder (part_file.h), which `commit` flushes to
+// the disk and renames, so that a crash leaves the old file or the new one; the next save removes
+// the unfinished file. A symbolic link is followed. The old file's owner and permissions stay: a
+// save that could not keep them fails. Without `commit` the old file stays. What is no file (a
+// device, a pipe) is written to as it is. So is the file that the program's own output or messages
+// go to: what stands in it stays.
 //
 //   SafeFile file("plan.json");
 //   if (!file.isOpen() || !file.write(bytes) || !file.commit()) complain(file.reason());
@@ -24,7 +30,8 @@ namespace tzhost {
 // A limit on the size of files is a failure like any other and raises no signal.
 class SafeFile {
 public:
-    explicit SafeFile(std::filesystem::path const& target);
+    explicit SafeFile(std::filesystem::path const& target,
+                      IfReadOnly ifReadOnly = IfReadOnly::refuse);
     SafeFile(SafeFile const&) = delete;
     SafeFile& operator=(SafeFile const&) = delete;
     ~SafeFile();
@@ -37,13 +44,18 @@ public:
     [[nodiscard]] std::string reason() const;
 
 private:
-    void makeTemporary();
-    [[nodiscard]] bool fail();
+    // Makes the unfinished file; `old` is the file that it will replace, null for none.
+    void makePart(struct stat const* old);
+    // Flushes the unfinished file and renames it over the target.
+    [[nodiscard]] bool takePlace();
+    [[nodiscard]] bool fail();  // with errno
+    [[nodiscard]] bool fail(int problem);
 
     std::filesystem::path target_;
-    std::string temporary_;
+    std::string part_;  // path of the unfinished file; empty for none
     int file_ = -1;
     int problem_ = 0;
+    char const* words_ = nullptr;  // in place of the system's words for the problem
 };
 
 }  // namespace tzhost

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <cstddef>
+#include <cstdlib>
 #include <filesystem>
 #include <string>
 
@@ -11,7 +12,9 @@
 #include <unistd.h>
 
 #include "host/files/file_bytes.h"
+#include "host/files/file_kind.h"
 #include "host/files/install_paths.h"
+#include "host/files/safe_file.h"
 
 namespace {
 
@@ -44,13 +47,19 @@ TEST_F(FileBytes, ComeBackAsTheyWere) {
 }
 
 TEST_F(FileBytes, OfWhatIsNoFileAreNothing) {
+    ASSERT_EQ(::mkfifo(path("pipe").c_str(), 0600), 0);
+    EXPECT_FALSE(tzhost::readFile(path("pipe")));
+    EXPECT_EQ(tzhost::systemReason(), "it is a device or a pipe");
     EXPECT_FALSE(tzhost::readFile(path("none")));
     EXPECT_FALSE(tzhost::systemReason().empty());
     EXPECT_FALSE(tzhost::readFile(folder_.string()));
 }
 
-TEST_F(FileBytes, KeepPermissionsAndLinks) {
+// Those of another user used to become the writer's own.
+TEST_F(FileBytes, KeepOwnerPermissionsAndLinks) {
     ASSERT_TRUE(tzhost::writeFileSafely(path("real"), "old"));
+    uid_t const owner = ::geteuid() == 0 ? 65534 : ::geteuid();  // only root gives files away
+    ASSERT_EQ(::chown(path("real").c_str(), owner, ::getegid()), 0);
     ASSERT_EQ(::chmod(path("real").c_str(), 0640), 0);
     fs::create_symlink("real", path("link"));
     ASSERT_TRUE(tzhost::writeFileSafely(path("link"), "new"));
@@ -59,6 +68,7 @@ TEST_F(FileBytes, KeepPermissionsAndLinks) {
     struct stat status {};
     ASSERT_EQ(::stat(path("real").c_str(), &status), 0);
     EXPECT_EQ(status.st_mode & 07777U, 0640U);
+    EXPECT_EQ(status.st_uid, owner);
 }
 
 // They used to put a file in the place of a link whose file was not there yet.
@@ -71,12 +81,48 @@ TEST_F(FileBytes, FollowLinksThatLeadToNoFileYet) {
     EXPECT_EQ(tzhost::readFile(path("folder/real")), "new");
 }
 
+// A ring of links and a read-only file used to be replaced.
 TEST_F(FileBytes, StayOldWhenTheyCannotBeWritten) {
-    EXPECT_FALSE(tzhost::writeFileSafely(path("no/such/file"), "new"));
     fs::create_directory(path("folder"));
-    EXPECT_FALSE(tzhost::writeFileSafely(path("folder"), "new"));
-    EXPECT_TRUE(fs::is_directory(path("folder")));
-    EXPECT_EQ(filesThere(), 1);  // no temporary file is left
+    fs::create_symlink("b", path("a"));
+    fs::create_symlink("a", path("b"));
+    ASSERT_TRUE(tzhost::writeFileSafely(path("locked"), "old"));
+    ASSERT_EQ(::chmod(path("locked").c_str(), 0444), 0);
+    std::string const longName(300, 'n');
+    for (auto const& [name, problem] : {
+             std::pair{"no/such/file",   "No such file or directory"        },
+             {"folder",         "Is a directory"                   },
+             {"a",              "Too many levels of symbolic links"},
+             {"locked",         "it is read-only"                  },
+             {longName.c_str(), "File name too long"               }
+    }) {
+        EXPECT_EQ(tzhost::SafeFile(path(name)).reason(), problem) << name;
+        EXPECT_FALSE(tzhost::writeFileSafely(path(name), "new")) << name;
+    }
+    EXPECT_TRUE(fs::is_symlink(path("a")));
+    EXPECT_EQ(tzhost::readFile(path("locked")), "old");
+    EXPECT_EQ(filesThere(), 4);  // no unfinished file is left
+    EXPECT_TRUE(tzhost::isReadOnly(path("locked")));
+    EXPECT_FALSE(tzhost::isReadOnly(path("folder")));
+    tzhost::SafeFile asked(path("locked"), tzhost::IfReadOnly::replace);
+    EXPECT_TRUE(asked.write("new") && asked.commit());
+    EXPECT_EQ(tzhost::readFile(path("locked")), "new");
+}
+
+// The longest name that a file can have used to have no room for the unfinished one beside it. What
+// a killed save left used to stay for ever.
+TEST_F(FileBytes, LeaveNoUnfinishedFileButThatOfAnotherSave) {
+    std::string const longest(255, 'n');
+    for (std::string const& name : {std::string("plan.json"), longest}) {
+        std::string const left = path(('.' + name.substr(0, 239) + ".tz-part-aaaaaa").c_str());
+        ASSERT_TRUE(tzhost::writeFileSafely(left, "unfinished"));
+        tzhost::SafeFile other(path(name.c_str()));
+        EXPECT_FALSE(fs::exists(left));
+        EXPECT_TRUE(tzhost::writeFileSafely(path(name.c_str()), "new"));
+        EXPECT_TRUE(other.write("other") && other.commit());
+        EXPECT_EQ(tzhost::readFile(path(name.c_str())), "other");
+    }
+    EXPECT_EQ(filesThere(), 2);
 }
 
 // It used to put a file in the place of the pipe, and of a device.
@@ -109,5 +155,39 @@ TEST_F(FileBytes, JoinTheProgramsOwnOutput) {
 TEST(InstallPaths, LeadToTheLibraries) {
     EXPECT_TRUE(fs::exists(fs::path(tzhost::libraryFolder()) / "libtz.so.1"));
 }
+
+struct FolderRow {
+    char const* name;
+    char const* configuration;  // XDG_CONFIG_HOME; null for none
+    char const* home;
+    char const* folder;
+};
+// A relative folder used to be looked for in the working folder, where a stranger's settings chose
+// the editor.
+constexpr FolderRow kFolders[] = {
+    {"Given",        "/x",    "/h",    "/x/tzdraft"        },
+    {"Home",         nullptr, "/h",    "/h/.config/tzdraft"},
+    {"Relative",     "x",     "/h",    "/h/.config/tzdraft"},
+    {"NoHome",       nullptr, nullptr, ""                  },
+    {"RelativeHome", "",      ".",     ""                  },
+};
+class ConfigurationFolder : public testing::TestWithParam<FolderRow> {};
+TEST_P(ConfigurationFolder, IsNeverRelative) {
+    auto const set = [](char const* name, char const* value) {
+        value ? setenv(name, value, 1) : unsetenv(name);
+    };
+    char const* const given = getenv("XDG_CONFIG_HOME");
+    std::string const home = getenv("HOME") ? getenv("HOME") : "";
+    std::string const before = given ? given : "";
+    set("XDG_CONFIG_HOME", GetParam().configuration);
+    set("HOME", GetParam().home);
+    EXPECT_EQ(tzhost::configurationFolder(), GetParam().folder);
+    setenv("XDG_CONFIG_HOME", before.c_str(), 1);
+    setenv("HOME", home.c_str(), 1);
+}
+INSTANTIATE_TEST_SUITE_P(Rows,
+                         ConfigurationFolder,
+                         testing::ValuesIn(kFolders),
+                         [](auto const& row) { return row.param.name; });
 
 }  // namespace

@@ -84,7 +84,6 @@ std::string textsFor(int count) {
     return text + "]}\n";
 }
 
-// Temporary files of killed saves stay beside, and are in nobody's way.
 TEST_F(Saving, KilledAtAnyMomentLeavesAWholeFile) {
     writeBytes(file_, textsFor(300));
     auto const read = tzhost::readDrawing(file_);
@@ -106,6 +105,7 @@ TEST_F(Saving, KilledAtAnyMomentLeavesAWholeFile) {
     }
     EXPECT_EQ(tzhost::writeDrawing(*read.drawing, file_), "");
     EXPECT_TRUE(bytesOf(file_) == whole);
+    EXPECT_EQ(filesIn(folder_), 1);  // the killed saves' files used to stay
 }
 
 }  // namespace

@@ -186,11 +186,13 @@ TEST(Files, OfABatchAreConvertedThoughOneFails) {
 }
 
 // They are read once more for each conversion: the second time it was empty.
-TEST(Files, OfFontsAreNoPipes) {
+TEST(Files, OfFontsAreNoPipesAndNoDevices) {
     write("one.txt", "{\\Fhouse;x}");
-    Outcome const result = run("to-rtf --font-map /dev/stdin one.txt", "[SHX Map]", "cat | ");
-    EXPECT_EQ(result.status, 2);
-    EXPECT_EQ(result.err, "tzconvert: /dev/stdin: cannot be read: it is a pipe\n");
+    for (std::string const& map : {std::string("/dev/stdin"), std::string("/dev/zero")}) {
+        Outcome const result = run("to-rtf --font-map " + map + " one.txt", "[SHX Map]", "cat | ");
+        EXPECT_EQ(result.status, 2);
+        EXPECT_EQ(result.err, "tzconvert: " + map + ": cannot be read: it is a device or a pipe\n");
+    }
 }
 
 TEST(Files, ThatMemoryCannotHoldAreNamed) {
