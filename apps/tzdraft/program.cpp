@@ -115,7 +115,8 @@ void Run::tellIdleFaults() const {
 bool Run::loadModule() {
     std::string error;
     if (tzhost::dynamicLinker().load(modulePath(options_), error)) return true;
-    if (std::filesystem::exists(modulePath(options_)) && !hasModuleResources())
+    std::error_code unseen;  // the loader has said what is wrong with the name
+    if (std::filesystem::exists(modulePath(options_), unseen) && !hasModuleResources())
         error += "; " + localText("its resource library is missing or damaged");
     return complain(error);
 }

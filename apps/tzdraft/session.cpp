@@ -138,9 +138,10 @@ TzString Session::moduleName() const {
 }
 
 void Session::loadLater(std::filesystem::path file) {
-    if (!file.has_parent_path() && !std::filesystem::exists(file))
-        file = module_.parent_path() / file;
-    postponed_.emplace_back([file = std::filesystem::absolute(file)] {
+    std::error_code gone;  // of a working folder: the loader then says that nothing is there
+    file = file.has_parent_path() ? std::filesystem::absolute(file, gone)
+                                  : module_.parent_path() / file;
+    postponed_.emplace_back([file = std::move(file)] {
         std::string error;
         if (!tzhost::dynamicLinker().load(file, error)) sayError(error);
     });

@@ -51,8 +51,8 @@ public:
     void setModule(std::filesystem::path module) { module_ = std::move(module); }
     [[nodiscard]] TzString moduleName() const;
     // Modules come and go between commands, since the one that asks for it may be a module's. A
-    // name without a folder that is not in the working folder is looked for beside the proposed
-    // module.
+    // name without a slash is looked for beside the proposed module alone: the working folder may
+    // hold a stranger's files.
     void loadLater(std::filesystem::path file);
     void unloadLater();
 

@@ -17,8 +17,10 @@ namespace {
 constexpr int kKeptLines = 1000;
 constexpr char kHistoryName[] = "history";
 
+// Empty when the user has no folder for it: then nothing is kept.
 std::filesystem::path historyFile() {
-    return std::filesystem::path(tzhost::configurationFolder()) / kHistoryName;
+    std::filesystem::path const folder = tzhost::configurationFolder();
+    return folder.empty() ? folder : folder / kHistoryName;
 }
 
 // The editor reads characters as the locale of the environment says, and UTF-8 without one. Numbers
@@ -91,10 +93,12 @@ void TerminalSource::Editor::bindKeys() {
 }
 
 TerminalSource::Editor::~Editor() {
-    std::error_code problem;  // a session without a history is no failure
-    std::filesystem::create_directories(historyFile().parent_path(), problem);
-    HistEventW event;
-    history_w(history_, &event, H_SAVE, historyFile().c_str());
+    if (auto const file = historyFile(); !file.empty()) {
+        std::error_code problem;  // a session without a history is no failure
+        std::filesystem::create_directories(file.parent_path(), problem);
+        HistEventW event;
+        history_w(history_, &event, H_SAVE, file.c_str());
+    }
     el_end(line_);
     history_wend(history_);
     sigaction(SIGINT, &interruptBefore_, nullptr);

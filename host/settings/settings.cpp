@@ -38,10 +38,12 @@ Settings& settings() {
 }
 
 std::string defaultSettingsFile() {
-    return (fs::path(configurationFolder()) / "settings.json").string();
+    std::string const folder = configurationFolder();
+    return folder.empty() ? folder : (fs::path(folder) / "settings.json").string();
 }
 
 std::optional<std::string> loadSettings(std::string const& path, IfMissing ifMissing) {
+    if (path.empty() && ifMissing == IfMissing::useDefaults) return std::nullopt;
     auto const bytes = readFile(path);
     if (!bytes) {
         bool const isMissing = errno == ENOENT || errno == ENOTDIR;
@@ -58,6 +60,7 @@ std::optional<std::string> loadSettings(std::string const& path, IfMissing ifMis
 }
 
 std::optional<std::string> saveUserVariables(std::string const& path) {
+    if (path.empty()) return std::nullopt;
     auto const old = readFile(path);
     Json document = Json::object();
     if (old) {

@@ -51,16 +51,17 @@ struct SettingsResult {
 
 enum class IfMissing { useDefaults, fail };
 
-// Loads the file into settings(), and its variables beneath their overrides into the store. The
-// line to show when it cannot be read or is wrong; then nothing has changed.
+// Loads the file into settings(), and its variables beneath their overrides into the store; an
+// empty path is a missing file. The line to show when it cannot be read or is wrong; then nothing
+// has changed.
 [[nodiscard]] std::optional<std::string> loadSettings(std::string const& path, IfMissing ifMissing);
 
-// Writes the user's variables back into the file, with everything else in it as it was; one that
-// has its default and is not in the file stays out of it, and an unchanged file is not touched. The
-// line to show when it cannot be written.
+// Writes the user's variables back into the file, with everything else in it as it was. A variable
+// that has its default and is not in the file stays out of it, and a file that would not change is
+// not touched. With an empty path nothing is written. The line to show when it cannot be written.
 [[nodiscard]] std::optional<std::string> saveUserVariables(std::string const& path);
 
-// The file that is used when none is named.
+// The file that is used when none is named. Empty when the user has no folder for it.
 [[nodiscard]] std::string defaultSettingsFile();
 
 }  // namespace tzhost

@@ -85,41 +85,45 @@ std::vector<InputFile> const& inputFiles() {
 
 // Nothing runs: neither drawing, nor plots, nor events are written.
 constexpr BadRow kUnusable[] = {
-    {"ScriptMissing",    "--script {}/nosuch.scr",      2, "{}/nosuch.scr: the script cannot be read"},
-    {"ScriptFolder",     "--script {}",                 2, "{}: the script cannot be read"           },
-    {"ScriptNotUtf8",    "--script {}/latin.scr",       2, "{}/latin.scr:2: this line is not UTF-8"  },
-    {"DrawingMissing",   "{}/nosuch.json",              2, "{}/nosuch.json: cannot be read"          },
-    {"DrawingCut",       "{}/cut.json",                 2, "{}/cut.json:3: "                         },
-    {"DrawingNewer",     "{}/newer.json",               2, "{}/newer.json:2: member \"version\": "   },
-    {"MemberType",       "{}/type.json",                2, "{}/type.json:3: member \"textHeight\": " },
-    {"MemberHuge",       "{}/huge.json",                2, "{}/huge.json:3: member \"radius\": "     },
-    {"LayerUnknown",     "{}/layer.json",               2, "{}/layer.json:3: member \"layer\": "     },
-    {"StyleUnknown",     "{}/style.json",               2, "{}/style.json:3: member \"style\": "     },
-    {"DrawingNotUtf8",   "{}/latin.json",               2, "{}/latin.json:3: member \"contents\": "  },
-    {"HandleTwice",      "{}/twice.json",               2, "{}/twice.json:4: member \"handle\": "    },
-    {"SettingsMissing",  "--settings {}/nosuch.json",   2, "--settings {}/nosuch.json: No such file" },
-    {"SettingsWrong",    "--settings {}/settings.json", 2, "--settings {}/settings.json:1: "         },
+    {"ScriptMissing",    "--script {}/nosuch.scr",      2, "{}/nosuch.scr: the script cannot be read"           },
+    {"ScriptFolder",     "--script {}",                 2, "{}: the script cannot be read"                      },
+    {"ScriptNotUtf8",    "--script {}/latin.scr",       2, "{}/latin.scr:2: this line is not UTF-8"             },
+    {"DrawingMissing",   "{}/nosuch.json",              2, "{}/nosuch.json: cannot be read"                     },
+    {"DrawingCut",       "{}/cut.json",                 2, "{}/cut.json:3: "                                    },
+    {"DrawingNewer",     "{}/newer.json",               2, "{}/newer.json:2: member \"version\": "              },
+    {"MemberType",       "{}/type.json",                2, "{}/type.json:3: member \"textHeight\": "            },
+    {"MemberHuge",       "{}/huge.json",                2, "{}/huge.json:3: member \"radius\": "                },
+    {"LayerUnknown",     "{}/layer.json",               2, "{}/layer.json:3: member \"layer\": "                },
+    {"StyleUnknown",     "{}/style.json",               2, "{}/style.json:3: member \"style\": "                },
+    {"DrawingNotUtf8",   "{}/latin.json",               2, "{}/latin.json:3: member \"contents\": "             },
+    {"HandleTwice",      "{}/twice.json",               2, "{}/twice.json:4: member \"handle\": "               },
+    {"SettingsMissing",  "--settings {}/nosuch.json",   2, "--settings {}/nosuch.json: No such file"            },
+    {"SettingsWrong",    "--settings {}/settings.json", 2, "--settings {}/settings.json:1: "                    },
     {"FontMapMissing",   "--font-map {}/nosuch.ini",    2,
-     "{}/nosuch.ini: the font map file cannot be read: No such"                                      },
-    {"VariableUnknown",  "--var NOSUCH=1",              2, "--var NOSUCH=1: There is no system"      },
-    {"VariableType",     "--var LUNITS=two",            2, "--var LUNITS=two: LUNITS takes a whole"  },
-    {"VariableOutside",  "--var LUNITS=6",              2, "--var LUNITS=6: LUNITS takes a whole"    },
-    {"VariableHuge",     "--var TEXTSIZE=1e999",        2, "--var TEXTSIZE=1e999: TEXTSIZE takes a"  },
-    {"VariablePoint",    "--var VIEWCTR=1",             2, "--var VIEWCTR=1: VIEWCTR takes a point"  },
-    {"VariableNoValue",  "--var LUNITS",                2, "--var LUNITS: expected NAME=VALUE"       },
+     "{}/nosuch.ini: the font map file cannot be read: No such"                                                 },
+    {"ModuleLong",       "--module {}/{long}",          2, "{}/{long}: the module cannot be loaded"             },
+    {"FontMapDevice",    "--font-map /dev/zero",        2,
+     "/dev/zero: the font map file cannot be read: it is a device or a pipe"                                    },
+    {"DrawingDevice",    "/dev/zero",                   2, "/dev/zero: cannot be read: it is a device or a pipe"},
+    {"VariableUnknown",  "--var NOSUCH=1",              2, "--var NOSUCH=1: There is no system"                 },
+    {"VariableType",     "--var LUNITS=two",            2, "--var LUNITS=two: LUNITS takes a whole"             },
+    {"VariableOutside",  "--var LUNITS=6",              2, "--var LUNITS=6: LUNITS takes a whole"               },
+    {"VariableHuge",     "--var TEXTSIZE=1e999",        2, "--var TEXTSIZE=1e999: TEXTSIZE takes a"             },
+    {"VariablePoint",    "--var VIEWCTR=1",             2, "--var VIEWCTR=1: VIEWCTR takes a point"             },
+    {"VariableNoValue",  "--var LUNITS",                2, "--var LUNITS: expected NAME=VALUE"                  },
     {"ModuleMissing",    "--module {}/nosuch.tzx",      2,
      "{}/nosuch.tzx: the module cannot be loaded: {}/nosuch.tzx: cannot open shared object file: "
-     "No such file or directory\n"                                                                   },
-    {"ModuleDamaged",    "--module {}/text.txt",        2, "{}/text.txt: the module cannot be loaded"},
-    {"ModuleOther",      "--module {lib}/libtz.so.1",   2, "{lib}/libtz.so.1: this is no module"     },
-    {"ResourcesMissing", "--resources {}/nosuch.dll",   2, "{}/nosuch.dll: the resource library is"  },
-    {"ResourcesDamaged", "--resources {}/text.txt",     2, "{}/text.txt: the resource library is"    },
-    {"FaultCall",        "--fail tzedGetPoint:x",       2, "--fail \"tzedGetPoint:x\": the call is"  },
-    {"FaultCallZero",    "--fail tzedGetPoint:0",       2, "--fail \"tzedGetPoint:0\": the call is"  },
-    {"FaultStatus",      "--fail tzedGetPoint=no",      2, "--fail \"tzedGetPoint=no\": the status"  },
-    {"FaultNameless",    "--fail :2",                   2, "--fail \":2\": the operation has no name"},
+     "No such file or directory\n"                                                                              },
+    {"ModuleDamaged",    "--module {}/text.txt",        2, "{}/text.txt: the module cannot be loaded"           },
+    {"ModuleOther",      "--module {lib}/libtz.so.1",   2, "{lib}/libtz.so.1: this is no module"                },
+    {"ResourcesMissing", "--resources {}/nosuch.dll",   2, "{}/nosuch.dll: the resource library is"             },
+    {"ResourcesDamaged", "--resources {}/text.txt",     2, "{}/text.txt: the resource library is"               },
+    {"FaultCall",        "--fail tzedGetPoint:x",       2, "--fail \"tzedGetPoint:x\": the call is"             },
+    {"FaultCallZero",    "--fail tzedGetPoint:0",       2, "--fail \"tzedGetPoint:0\": the call is"             },
+    {"FaultStatus",      "--fail tzedGetPoint=no",      2, "--fail \"tzedGetPoint=no\": the status"             },
+    {"FaultNameless",    "--fail :2",                   2, "--fail \":2\": the operation has no name"           },
     {"EventsNowhere",    "--events {}/nosuch/e.jsonl",  2,
-     "{}/nosuch/e.jsonl: the events cannot be written: No such"                                      },
+     "{}/nosuch/e.jsonl: the events cannot be written: No such"                                                 },
 };
 
 // The run goes on or had its effect; the drawing is written as it then is.
@@ -144,8 +148,9 @@ protected:
 
     static std::string filled(std::string text) {
         std::pair<std::string, std::string> const places[] = {
-            {"{}",    scratch(".").parent_path().string()},
-            {"{lib}", tztest::libraryFolder().string()   }
+            {"{}",                              scratch(".").parent_path().string()},
+            {        "{lib}", tztest::libraryFolder().string()                                   },
+            { "{long}",                             std::string(300,                                                                'n')}
         };
         for (auto const& [mark, path] : places) {
             for (std::size_t at; (at = text.find(mark)) != std::string::npos;)

@@ -104,4 +104,34 @@ TEST(ForeignDrawing, DecidesNoVariableOfTheUser) {
     EXPECT_FALSE(exists(configuration.file()));
 }
 
+// The program used to be kept in the settings, and ran in every later session.
+TEST(ForeignScript, ChoosesTheEditorForItsRunAlone) {
+    Configuration const configuration;
+    auto const script =
+        scratch("set.scr", "SETVAR\nmtexted\nevil\nSETVAR\nMTEXTED\n\nSETVAR\nATTIPE\n1\nQUIT\n");
+    tztest::ProgramRun const run = tztest::runProgram({"--script", script.string()});
+    EXPECT_EQ(run.status, 0) << run.errors;
+    EXPECT_EQ(countOf("<evil>", run.output), 1) << run.output;
+    std::string const kept = tztest::bytesOf(configuration.file());
+    EXPECT_EQ(kept.find("MTEXTED"), std::string::npos) << kept;
+    EXPECT_NE(kept.find("\"ATTIPE\": 1"), std::string::npos) << kept;
+}
+
+// A module in the working folder used to be loaded by its bare name. A name that is too long used
+// to end the command.
+TEST(ForeignModule, IsLoadedByAPathAlone) {
+    fs::path const here = fs::current_path();
+    fs::current_path(scratch(""));
+    scratch("stray.tzx", "no module");
+    auto const script = scratch("load.scr", "LOAD\nstray.tzx\nLOAD\n./stray.tzx\nLOAD\n" +
+                                                std::string(300, 'n') + "\nQUIT\n");
+    tztest::ProgramRun const run = tztest::runProgram({"--script", script.string()});
+    fs::current_path(here);
+    fs::path const beside = tztest::libraryFolder() / "stray.tzx";
+    EXPECT_EQ(countOf("\n" + beside.string() + ": the module cannot be loaded", run.output), 1)
+        << run.output;
+    EXPECT_EQ(countOf("/./stray.tzx: the module cannot be loaded", run.output), 1) << run.output;
+    EXPECT_EQ(countOf("n: the module cannot be loaded", run.output), 1) << run.output;
+}
+
 }  // namespace

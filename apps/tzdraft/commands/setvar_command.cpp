@@ -1,6 +1,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/local_text.h"
+#include "host/command_line/command_line.h"
 #include "host/settings/variable_table.h"
 #include "host/settings/variables.h"
 #include "tz/ed/print.h"
@@ -18,6 +19,16 @@ void listVariables() {
                    each.access == tzhost::Access::readOnly ? localText(L" (read only)") : L"");
     }
     tzutPrintf(L"\n");
+}
+
+// What a script sets of MTEXTED holds for this run, so that no script decides which program runs in
+// later sessions.
+tzhost::WriteResult write(TzString const& name, std::wstring const& value) {
+    tzhost::Variables& variables = tzhost::Variables::instance();
+    bool const choosesProgram = name.compareNoCase(L"MTEXTED") == 0;
+    if (choosesProgram && tzhost::commandLine().isScripted())
+        return variables.overrideFromText(name.str(), value);
+    return variables.setFromText(name.str(), value, tzhost::Writer::user);
 }
 
 }  // namespace
@@ -39,8 +50,7 @@ void setvarCommand() {
     if (value.asked != Asked::given) return;
     // "." stands for the empty text, which Enter cannot give.
     std::wstring const text = value.value == L"." ? std::wstring() : value.value.str();
-    tzhost::WriteResult const written =
-        variables.setFromText(name.value.str(), text, tzhost::Writer::user);
+    tzhost::WriteResult const written = write(name.value, text);
     if (!written.isDone()) tzutPrintf(L"\n%ls\n", written.reason.c_str());
 }
 
