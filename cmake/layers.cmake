@@ -13,14 +13,20 @@
 
 tz_row(sdk)
 
-tz_row(module/access       USES sdk)
-tz_row(module/fonts        USES sdk module/access)
-tz_row(module/prompt       USES sdk module/access)
-tz_row(module/markup       USES sdk module/access module/fonts)
-tz_row(module/edit         USES sdk module/access module/fonts module/markup)
-tz_row(module/mtext        USES sdk module/access module/prompt module/edit)
-tz_row(module/commands     USES sdk module/access module/prompt module/edit module/mtext)
-tz_row(module/shell        USES sdk module/access module/fonts module/prompt module/markup module/edit module/mtext module/commands)
+# module/globals has no header of its own: sdk/tz/mte/globals.h declares what it defines.
+tz_row(module/globals      USES sdk)
+tz_row(module/holders      USES sdk)
+tz_row(module/host_calls   USES sdk)
+tz_row(module/texts        USES sdk module/host_calls)
+tz_row(module/styles       USES sdk module/host_calls module/texts)
+tz_row(module/uncalled     USES sdk module/holders module/host_calls module/texts)
+tz_row(module/fonts        USES sdk module/globals module/host_calls module/texts)
+tz_row(module/prompt       USES sdk module/globals module/host_calls module/texts)
+tz_row(module/markup       USES sdk module/globals module/host_calls module/texts module/styles module/fonts)
+tz_row(module/edit         USES sdk module/globals module/holders module/host_calls module/texts)
+tz_row(module/mtext        USES sdk module/globals module/holders module/host_calls module/texts module/styles module/prompt module/edit)
+tz_row(module/commands     USES sdk module/globals module/holders module/host_calls module/texts module/styles module/prompt module/edit)
+tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/styles module/fonts module/prompt module/markup module/edit module/mtext module/commands)
 
 tz_row(host/base           USES sdk LIBRARIES json)
 tz_row(host/geometry       USES sdk)
@@ -42,6 +48,6 @@ tz_row(host/selection      USES sdk host/base host/text host/settings host/platf
 tz_row(host/editors        USES sdk host/base host/text host/files host/settings host/platform host/runtime host/command_line LIBRARIES json)
 
 tz_row(apps/tzdraft        USES sdk host/base host/text host/files host/settings host/fonts host/resources host/platform host/faults host/runtime host/layout host/database host/drawing_file host/display host/command_line host/selection host/editors LIBRARIES json cli editline)
-tz_row(apps/tzconvert      USES sdk host/base host/text host/files host/settings host/code_pages host/fonts module/access module/fonts module/markup LIBRARIES json cli)
+tz_row(apps/tzconvert      USES sdk host/base host/text host/files host/settings host/code_pages host/fonts module/globals module/host_calls module/texts module/styles module/fonts module/markup LIBRARIES json cli)
 
 tz_row(examples            USES sdk)

@@ -51,4 +51,5 @@ if(TARGET app_tzdraft AND TARGET tz AND EXISTS ${PROJECT_SOURCE_DIR}/apps/tzdraf
     tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
 endif()
 # Archives only, so that no drawing database and no display library comes along.
-tz_program(tzconvert module_markup module_fonts module_access tz_ground)
+tz_link_closure(layers module_markup)
+tz_program(tzconvert ${layers} tz_ground)

@@ -2,12 +2,12 @@
 
 #include "tz/mte/edit_mtext.h"
 
-#include "module/access/class_registration.h"
-#include "module/access/scope_guard.h"
-#include "module/access/string_table.h"
 #include "module/commands/edit_report.h"
 #include "module/commands/mtext_selection.h"
 #include "module/edit/editor_result.h"
+#include "module/holders/scope_guard.h"
+#include "module/host_calls/class_registration.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/print.h"
 #include "tz/ed/selection.h"
 #include "tz/mte/entry_points.h"

@@ -5,14 +5,14 @@
 #include <iterator>
 #include <numbers>
 
-#include "module/access/attachment_ids.h"
-#include "module/access/resources.h"
-#include "module/access/scope_guard.h"
-#include "module/access/string_table.h"
-#include "module/access/style_rules.h"
 #include "module/commands/locked_warning_filter.h"
 #include "module/commands/mtext_selection.h"
+#include "module/holders/scope_guard.h"
 #include "module/prompt/keyword_input.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/attachment_ids.h"
+#include "module/texts/resources.h"
+#include "module/texts/string_table.h"
 #include "tz/ap/document.h"
 #include "tz/db/host_services.h"
 #include "tz/db/mtext.h"

@@ -1,6 +1,6 @@
 #include "tz/mte/dialog_params.h"
 
-#include "module/access/class_registration.h"
+#include "module/host_calls/class_registration.h"
 
 namespace {
 

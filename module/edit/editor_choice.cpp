@@ -1,7 +1,7 @@
 #include "module/edit/editor_choice.h"
 
-#include "module/access/resources.h"
-#include "module/access/sys_var.h"
+#include "module/host_calls/sys_var.h"
+#include "module/texts/resources.h"
 #include "tz/ed/editors.h"
 #include "tz/pal/settings.h"
 

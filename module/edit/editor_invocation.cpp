@@ -1,14 +1,14 @@
 #include <utility>
 
-#include "module/access/easy_upgrade.h"
-#include "module/access/lock_tests.h"
-#include "module/access/string_table.h"
-#include "module/access/sys_var.h"
 #include "module/edit/editor_choice.h"
 #include "module/edit/editor_result.h"
 #include "module/edit/in_place_settings.h"
 #include "module/edit/old_editor.h"
 #include "module/edit/session_field.h"
+#include "module/holders/easy_upgrade.h"
+#include "module/host_calls/lock_tests.h"
+#include "module/host_calls/sys_var.h"
+#include "module/texts/string_table.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/editors.h"
 #include "tz/ed/print.h"

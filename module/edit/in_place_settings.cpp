@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <iterator>
 
-#include "module/access/sys_var.h"
+#include "module/host_calls/sys_var.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/settings.h"
 

@@ -1,7 +1,7 @@
 #include "module/edit/old_editor.h"
 
-#include "module/access/string_table.h"
 #include "module/edit/editor_result.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/print.h"
 #include "tz/mte/globals.h"
 

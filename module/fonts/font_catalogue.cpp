@@ -2,8 +2,8 @@
 
 #include <system_error>
 
-#include "module/access/resources.h"
-#include "module/access/string_table.h"
+#include "module/texts/resources.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/print.h"
 
 namespace {

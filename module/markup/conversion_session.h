@@ -2,9 +2,9 @@
 
 #include <string>
 
-#include "module/access/stack_defaults.h"
 #include "module/markup/mtext_to_rtf.h"
 #include "module/markup/rtf_to_mtext.h"
+#include "module/styles/stack_defaults.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/scale_correction.h"
 #include "tz/text/charset.h"

@@ -1,6 +1,6 @@
 // Stacked text of the markup.
 
-#include "module/access/truncate.h"
+#include "module/host_calls/truncate.h"
 #include "module/markup/markup_reading.h"
 #include "module/markup/mtext_to_rtf.h"
 #include "module/markup/number_text.h"

@@ -5,11 +5,11 @@
 #include <algorithm>
 #include <cwchar>
 
-#include "module/access/stack_defaults.h"
 #include "module/fonts/font_entry.h"
 #include "module/markup/number_text.h"
 #include "module/markup/rtf_units.h"
 #include "module/markup/stack_look_ahead.h"
+#include "module/styles/stack_defaults.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
 #include "tz/mte/scale_correction.h"

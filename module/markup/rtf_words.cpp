@@ -3,13 +3,13 @@
 #include <algorithm>
 #include <array>
 
-#include "module/access/resources.h"
 #include "module/markup/number_text.h"
 #include "module/markup/rtf_reading.h"
 #include "module/markup/rtf_to_mtext.h"
 #include "module/markup/rtf_tokens.h"
 #include "module/markup/rtf_units.h"
 #include "module/markup/wrapping.h"
+#include "module/texts/resources.h"
 #include "tz/mte/scale_correction.h"
 
 // The words in alphabetical order; what is not among them is unknown.

@@ -1,6 +1,6 @@
 #include "tz/mte/scale_correction.h"
 
-#include "module/access/truncate.h"
+#include "module/host_calls/truncate.h"
 #include "module/markup/wrapping.h"
 
 namespace {

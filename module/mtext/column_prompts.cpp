@@ -3,12 +3,12 @@
 
 #include <iterator>
 
-#include "module/access/string_table.h"
 #include "module/mtext/column_outcome.h"
 #include "module/mtext/question.h"
 #include "module/prompt/integer_input.h"
 #include "module/prompt/keyword_input.h"
 #include "module/prompt/real_input.h"
+#include "module/texts/string_table.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/mtext_command.h"
 

@@ -3,17 +3,17 @@
 #include <memory>
 #include <new>
 
-#include "module/access/attachment_ids.h"
-#include "module/access/line_spacing.h"
-#include "module/access/space_posting.h"
-#include "module/access/style_rules.h"
-#include "module/access/sys_var.h"
 #include "module/edit/attachment.h"
 #include "module/edit/editor_result.h"
 #include "module/edit/session_field.h"
+#include "module/host_calls/space_posting.h"
+#include "module/host_calls/sys_var.h"
 #include "module/mtext/entity_fields.h"
 #include "module/mtext/points.h"
 #include "module/mtext/user_axes.h"
+#include "module/styles/line_spacing.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/attachment_ids.h"
 #include "tz/db/database.h"
 #include "tz/db/extensions.h"
 #include "tz/db/host_services.h"

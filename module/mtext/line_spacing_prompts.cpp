@@ -3,10 +3,10 @@
 #include <cwchar>
 #include <iterator>
 
-#include "module/access/line_spacing.h"
-#include "module/access/string_table.h"
 #include "module/prompt/distance_input.h"
 #include "module/prompt/keyword_input.h"
+#include "module/styles/line_spacing.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/print.h"
 #include "tz/mte/mtext_command.h"
 

@@ -1,11 +1,11 @@
 #include "tz/mte/mtext_command.h"
 
-#include "module/access/attachment_ids.h"
-#include "module/access/class_registration.h"
-#include "module/access/line_spacing.h"
-#include "module/access/style_rules.h"
+#include "module/host_calls/class_registration.h"
 #include "module/mtext/points.h"
 #include "module/mtext/user_axes.h"
+#include "module/styles/line_spacing.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/attachment_ids.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/variables.h"
 

@@ -2,14 +2,14 @@
 
 #include <iterator>
 
-#include "module/access/string_table.h"
-#include "module/access/style_rules.h"
-#include "module/access/sys_var.h"
+#include "module/host_calls/sys_var.h"
 #include "module/mtext/question.h"
 #include "module/prompt/angle_input.h"
 #include "module/prompt/distance_input.h"
 #include "module/prompt/keyword_input.h"
 #include "module/prompt/string_input.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/string_table.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {

@@ -1,8 +1,8 @@
 #include "module/mtext/rectangle_jig.h"
 
-#include "module/access/style_rules.h"
-#include "module/access/sys_var.h"
+#include "module/host_calls/sys_var.h"
 #include "module/mtext/sample_text.h"
+#include "module/styles/style_rules.h"
 #include "tz/db/database.h"
 #include "tz/db/host_services.h"
 #include "tz/mte/easy_object.h"

@@ -1,7 +1,7 @@
 #include "module/mtext/sample_text.h"
 
-#include "module/access/style_rules.h"
-#include "module/access/sys_var.h"
+#include "module/host_calls/sys_var.h"
+#include "module/styles/style_rules.h"
 
 namespace {
 

@@ -2,14 +2,14 @@
 
 #include <array>
 
-#include "module/access/attachment_ids.h"
-#include "module/access/string_table.h"
-#include "module/access/style_rules.h"
 #include "module/mtext/column_outcome.h"
 #include "module/mtext/points.h"
 #include "module/mtext/question.h"
 #include "module/mtext/rectangle_jig.h"
 #include "module/prompt/jig_input.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/attachment_ids.h"
+#include "module/texts/string_table.h"
 #include "tz/mte/globals.h"
 #include "tz/mte/mtext_command.h"
 

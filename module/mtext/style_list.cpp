@@ -1,9 +1,9 @@
 // The list of the drawing's text styles.
 
-#include "module/access/string_table.h"
-#include "module/access/style_rules.h"
-#include "module/access/unit_converter.h"
+#include "module/host_calls/unit_converter.h"
 #include "module/prompt/string_input.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/string_table.h"
 #include "tz/db/database.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/print.h"

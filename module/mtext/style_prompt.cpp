@@ -1,7 +1,7 @@
 // The question for the text style.
 
-#include "module/access/string_table.h"
 #include "module/prompt/string_input.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/print.h"
 #include "tz/mte/mtext_command.h"
 

@@ -1,6 +1,6 @@
 #include "module/mtext/user_axes.h"
 
-#include "module/access/sys_var.h"
+#include "module/host_calls/sys_var.h"
 #include "tz/db/database.h"
 #include "tz/db/host_services.h"
 

@@ -1,6 +1,6 @@
 #include "module/prompt/angle_input.h"
 
-#include "module/access/unit_converter.h"
+#include "module/host_calls/unit_converter.h"
 #include "tz/ed/prompts.h"
 
 CTzsAngleInput::CTzsAngleInput(unsigned int theFlags,

@@ -2,7 +2,7 @@
 
 #include <cassert>
 
-#include "module/access/resources.h"
+#include "module/texts/resources.h"
 #include "tz/mte/globals.h"
 
 CKeywordTable::CKeywordTable(unsigned int const* ids, int count)

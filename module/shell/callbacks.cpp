@@ -2,12 +2,12 @@
 
 #include <memory>
 
-#include "module/access/scope_guard.h"
-#include "module/access/string_table.h"
-#include "module/access/sys_var.h"
 #include "module/commands/mtext_height.h"
 #include "module/commands/mtext_properties.h"
 #include "module/commands/mtext_selection.h"
+#include "module/holders/scope_guard.h"
+#include "module/host_calls/sys_var.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/print.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/selection.h"

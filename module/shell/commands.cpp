@@ -1,8 +1,8 @@
 #include <array>
 
-#include "module/access/resources.h"
 #include "module/shell/callbacks.h"
 #include "module/shell/registration.h"
+#include "module/texts/resources.h"
 #include "tz/ed/command_stack.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/diagnostics.h"

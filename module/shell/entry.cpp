@@ -1,7 +1,7 @@
 #include "module/shell/entry.h"
 
-#include "module/access/resources.h"
 #include "module/shell/registration.h"
+#include "module/texts/resources.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/access/handle_object.h"
+#include "module/holders/handle_object.h"
 #include "tz/rx/app.h"
 
 // The module's front door: the host sends every message through tzrxEntryPoint, which hands it on.

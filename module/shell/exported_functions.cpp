@@ -1,10 +1,10 @@
 #include <memory>
 
-#include "module/access/attachment_ids.h"
-#include "module/access/style_rules.h"
 #include "module/edit/editor_result.h"
 #include "module/edit/session_field.h"
 #include "module/mtext/points.h"
+#include "module/styles/style_rules.h"
+#include "module/texts/attachment_ids.h"
 #include "tz/mte/entry_points.h"
 #include "tz/mte/globals.h"
 #include "tz/mte/mtext_command.h"

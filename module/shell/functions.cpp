@@ -1,7 +1,7 @@
 #include <array>
 
-#include "module/access/string_table.h"
 #include "module/shell/registration.h"
+#include "module/texts/string_table.h"
 #include "tz/ed/command_stack.h"
 #include "tz/ed/functions.h"
 #include "tz/ed/print.h"

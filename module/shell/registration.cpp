@@ -1,6 +1,6 @@
 #include "module/shell/registration.h"
 
-#include "module/access/class_registration.h"
+#include "module/host_calls/class_registration.h"
 #include "tz/mte/dialog_params.h"
 #include "tz/mte/edit_mtext.h"
 #include "tz/mte/entry_points.h"

@@ -4,7 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "host/selection/entity_list.h"
-#include "module/access/space_posting.h"
+#include "module/host_calls/space_posting.h"
 #include "module/shell/callbacks.h"
 #include "tests/mtext/held_text.h"
 #include "tz/db/mtext.h"

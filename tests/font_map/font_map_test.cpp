@@ -7,7 +7,7 @@
 
 #include "host/fonts/font_map_path.h"
 #include "host/platform/output.h"
-#include "module/access/string_table.h"
+#include "module/texts/string_table.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
 

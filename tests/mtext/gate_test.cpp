@@ -4,7 +4,7 @@
 
 #include <utility>
 
-#include "module/access/space_posting.h"
+#include "module/host_calls/space_posting.h"
 #include "tests/mtext/held_text.h"
 #include "tz/db/field.h"
 #include "tz/db/mtext.h"

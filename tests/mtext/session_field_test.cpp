@@ -9,7 +9,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/base/memory_faults.h"
-#include "module/access/space_posting.h"
+#include "module/host_calls/space_posting.h"
 #include "tests/mtext/held_text.h"
 #include "tz/db/block_table.h"
 #include "tz/db/field.h"

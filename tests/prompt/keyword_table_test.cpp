@@ -4,7 +4,7 @@
 
 #include <gtest/gtest.h>
 
-#include "tests/access/own_texts.h"
+#include "tests/module_ground/own_texts.h"
 #include "tests/prompt/texts.h"
 
 namespace {

@@ -9,9 +9,9 @@
 
 #include "host/command_line/keyword_list.h"
 #include "host/resources/resource_search.h"
-#include "module/access/resources.h"
-#include "module/access/string_table.h"
 #include "module/prompt/input.h"
+#include "module/texts/resources.h"
+#include "module/texts/string_table.h"
 #include "tests/resources/texts_in_code.h"
 
 namespace {

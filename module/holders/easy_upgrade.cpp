@@ -1,0 +1,19 @@
+#include "module/holders/easy_upgrade.h"
+
+#include "tz/db/object.h"
+
+CEasyUpgrade::~CEasyUpgrade() {
+    CEasyUpgrade::Downgrade();
+}
+
+bool CEasyUpgrade::Upgrade(TzDbObject* toUpgrade) {
+    if (toUpgrade->isWriteEnabled()) return upgraded;
+    upgraded = toUpgrade->upgradeOpen() == Tzad::eOk;
+    if (upgraded) object = toUpgrade;
+    return upgraded;
+}
+
+void CEasyUpgrade::Downgrade() {
+    if (object) (void)object->downgradeOpen();  // refused, it is open for write until it is closed
+    object = nullptr;
+}
