@@ -4,7 +4,6 @@ module, with the bodies that carry the export mark and with the headers that dec
 status 77 when there is no module."""
 import argparse
 import fnmatch
-import glob
 import os
 import re
 import subprocess
@@ -60,7 +59,7 @@ def marked(folder):
     """What the layers of the module define with the export mark. Weak names are inline functions of
     the interface, which every user of it holds."""
     names = set()
-    for archive in glob.glob(os.path.join(folder, "libmodule_*.a")):
+    for archive in tree.module_archives(folder):
         for line in output_of("readelf", "-sW", archive).splitlines():
             fields = line.split()
             if len(fields) == 8 and fields[3] in ("FUNC", "OBJECT") and fields[6] != "UND" \

@@ -2,11 +2,12 @@
 """Finds source files of the module whose objects are initialised at load time, in an optimised build.
 Exit status 77 when no module layer was built."""
 import argparse
-import glob
 import os
 import re
 import subprocess
 import sys
+
+import tree
 
 
 def initialised(archive):
@@ -22,7 +23,7 @@ def main():
     parser.add_argument("--archives", required=True)
     parser.add_argument("--list", required=True)
     options = parser.parse_args()
-    archives = glob.glob(os.path.join(options.archives, "libmodule_*.a"))
+    archives = tree.module_archives(options.archives)
     if not archives:
         print("no layer of the module was built")
         return 77

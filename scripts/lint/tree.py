@@ -42,3 +42,10 @@ def rows():
             at = words.index("LIBRARIES") if "LIBRARIES" in words else len(words)
             table[match.group(1)] = (set(words[1:at]), set(words[at + 1:]))
     return table
+
+
+def module_archives(folder):
+    """The archives of the module's layers, by their rows: those of a layer that is gone are left out."""
+    paths = [os.path.join(folder, f"lib{row.replace('/', '_')}.a")
+             for row in rows() if row.startswith("module/")]
+    return [path for path in paths if os.path.exists(path)]
