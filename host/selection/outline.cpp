@@ -19,8 +19,11 @@ Corners boxOf(TzGePoint3d const& corner, TzGeVector3d const& along, TzGeVector3d
 
 Corners boxOf(DrawnText const& drawn) {
     TzGePoint2d const size = drawn.style.extents(drawn.text, true, -1, drawn.raw);
-    TzGeVector3d const along = drawn.direction.normal() * size.x;
-    TzGeVector3d const up = drawn.normal.crossProduct(drawn.direction).normal() * size.y;
+    // Backward and upside-down texts are turned over about their position.
+    double const x = drawn.style.isBackward() ? -size.x : size.x;
+    double const y = drawn.style.isUpsideDown() ? -size.y : size.y;
+    TzGeVector3d const along = drawn.direction.normal() * x;
+    TzGeVector3d const up = drawn.normal.crossProduct(drawn.direction).normal() * y;
     // A vertical text runs down from its position, about its middle.
     if (drawn.style.isVertical()) return boxOf(drawn.position - along * 0.5 - up, along, up);
     return boxOf(drawn.position, along, up);

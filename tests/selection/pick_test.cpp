@@ -139,6 +139,20 @@ INSTANTIATE_TEST_SUITE_P(Answers, PickTable, testing::ValuesIn(kPicks), [](auto 
     return row.param.name;
 });
 
+// A backward text was picked to the right of its position, where nothing is drawn.
+TEST_F(Picks, BackwardTextsAreWhereTheyAreDrawn) {
+    TzDbTextStyleTableRecord* style = nullptr;
+    TzDbObjectId const id = tzhost::workingDrawing()->textstyle();
+    ASSERT_EQ(tzdbOpenObject(style, id, TzDb::kForWrite), Tzad::eOk);
+    EXPECT_EQ(style->setFlagBits(2), Tzad::eOk);
+    EXPECT_EQ(style->close(), Tzad::eOk);
+    Session const session("99,50.5\n");
+    long long name[2] = {};
+    double point[3] = {};
+    EXPECT_EQ(tzedEntSel(nullptr, name, point), Tzad::ePromptNormal);
+    EXPECT_EQ(OpenDrawing::handleOf(name), reference_);
+}
+
 TEST_F(Picks, AtAGivenPointAskNothing) {
     Session const session("");
     long long name[2] = {};
