@@ -2,7 +2,8 @@
 # - DejaVu: wide coverage (Latin, Greek, Cyrillic and more), serif, mono and a bold;
 # - Liberation Sans: a second Latin family of other widths, with true bold and italic cuts;
 # - Droid Sans Fallback: one small file with the Chinese, Japanese and Korean characters;
-# - Noto Sans Hebrew, Arabic, Thai and Armenian: faces that hold one script and no Latin letters.
+# - Noto Sans Hebrew, Arabic, Thai and Armenian: faces that hold one script and no Latin letters;
+# - Noto Sans Yi: a face with marks of Chinese, such as the comma, and none of its letters.
 # The files are linked into a folder of the build tree, which a fontconfig file of its own names.
 set(TZ_TEST_FONTS
     dejavu/DejaVuSans.ttf
@@ -17,7 +18,8 @@ set(TZ_TEST_FONTS
     noto/NotoSansArabic-Regular.ttf
     noto/NotoSansArmenian-Regular.ttf
     noto/NotoSansHebrew-Regular.ttf
-    noto/NotoSansThai-Regular.ttf)
+    noto/NotoSansThai-Regular.ttf
+    noto/NotoSansYi-Regular.ttf)
 set(TZ_TEST_FONTS_CONF ${CMAKE_BINARY_DIR}/tests/fonts/fonts.conf)
 file(MAKE_DIRECTORY ${CMAKE_BINARY_DIR}/tests/fonts/files)
 foreach(font IN LISTS TZ_TEST_FONTS)

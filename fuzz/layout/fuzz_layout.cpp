@@ -33,7 +33,8 @@ extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size
     if (layout.lines.empty()) std::abort();
     for (tzhost::GlyphRun const& run : layout.runs) {
         if (run.text.empty()) std::abort();
-        (void)tzhost::textOutline(run);  // only that it ends counts
+        tzhost::outlineLetters(run,
+                               [](tzhost::OutlinedLetter const&) {});  // only that it ends counts
     }
     return 0;
 }

@@ -50,7 +50,7 @@ void DrawPass::draw(TzGiDrawable* drawable) {
 }
 
 void DrawPass::drawNested(TzGiDrawable& drawable) {
-    if (depth_ >= kDeepest || isInvisible(drawable)) return;
+    if (depth_ >= kDeepest || !isWhole() || isInvisible(drawable)) return;
     ++depth_;
     DrawPen const outer = traits_.pen();
     traits_.setPen(penWithin(outer));
@@ -128,6 +128,9 @@ bool DrawPass::Geometry::text(TzGePoint3d const& position,
     TzString const whole(text);
     DrawnText drawn{
         length < 0 ? whole : whole.left(length), position, normal, direction, style, raw};
+    pass_.letters_ =
+        std::min(pass_.letters_ + std::min(drawn.text.length(), kMostLetters), kMostLetters + 1);
+    if (pass_.hasTooManyLetters()) return true;
     pass_.place(drawn);
     pass_.list_.push_back({pass_.traits_.pen(), std::move(drawn)});
     return true;
@@ -136,7 +139,7 @@ bool DrawPass::Geometry::text(TzGePoint3d const& position,
 bool DrawPass::Geometry::draw(TzGiDrawable* drawable) {
     if (!drawable) return true;
     pass_.nested_ = std::min(pass_.nested_ + 1, kMostNested + 1);
-    if (pass_.isWhole()) pass_.drawNested(*drawable);
+    pass_.drawNested(*drawable);
     return true;
 }
 

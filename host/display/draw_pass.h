@@ -1,5 +1,6 @@
 #pragma once
 
+#include <utility>
 #include <vector>
 
 #include "host/base/entity_drawing.h"
@@ -16,7 +17,8 @@ class TzDbDatabase;
 //   use(pass.list());
 //
 // Entities that say they are invisible are left out, whoever draws them. Blocks within blocks can
-// stand for more than any memory holds, so a pass takes no more nested drawables than kMostNested.
+// stand for more than any memory holds, so a pass takes no more nested drawables than kMostNested
+// and no more letters than kMostLetters.
 namespace tzhost {
 
 class DrawPass {
@@ -31,13 +33,17 @@ public:
     DrawPass& operator=(DrawPass const&) = delete;
 
     static constexpr int kMostNested = 2'000'000;
+    static constexpr int kMostLetters = 5'000'000;
 
     // Draws one drawable behind what was drawn before: its attributes, then itself. Null draws
     // nothing.
     void draw(TzGiDrawable* drawable);
     [[nodiscard]] DrawList const& list() const { return list_; }
+    // The list for good; the pass begins a new one.
+    [[nodiscard]] DrawList takeList() { return std::exchange(list_, {}); }
     // Whether nothing was left out for its number.
-    [[nodiscard]] bool isWhole() const { return nested_ <= kMostNested; }
+    [[nodiscard]] bool isWhole() const { return nested_ <= kMostNested && !hasTooManyLetters(); }
+    [[nodiscard]] bool hasTooManyLetters() const { return letters_ > kMostLetters; }
 
 private:
     class Context : public TzGiContext {
@@ -110,7 +116,8 @@ private:
     std::vector<TzGeMatrix3d> transforms_;  // each from its own coordinates to the world
     TzGiDrawable const* top_ = nullptr;     // what `draw` was given, while it draws
     int depth_ = 0;
-    int nested_ = 0;  // drawables that others drew; kMostNested + 1 when there were more
+    int nested_ = 0;   // drawables that others drew; kMostNested + 1 when there were more
+    int letters_ = 0;  // of all texts; kMostLetters + 1 when there were more
     DrawList list_;
 };
 

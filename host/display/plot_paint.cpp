@@ -10,6 +10,7 @@
 #include <cstdlib>
 #include <ctime>
 #include <memory>
+#include <new>
 #include <numeric>
 #include <string_view>
 
@@ -41,9 +42,27 @@ constexpr Page kPages[] = {
 };
 constexpr double kMargin = 0.05;  // of the page's smaller side
 
+// What Cairo writes to. Nothing may be thrown through Cairo, so that a failure is kept instead.
+class Output {
+public:
+    explicit Output(ByteTaker const& take) : take_(take) {}
+
+    [[nodiscard]] bool isGood() const { return good_; }
+    void write(std::string_view bytes) noexcept try {
+        good_ = good_ && take_(bytes);
+    } catch (std::bad_alloc const&) {
+        good_ = false;
+    }
+
+private:
+    ByteTaker const& take_;
+    bool good_ = true;
+};
+
 cairo_status_t takeBytes(void* closure, unsigned char const* data, unsigned int length) {
-    static_cast<std::string*>(closure)->append(reinterpret_cast<char const*>(data), length);
-    return CAIRO_STATUS_SUCCESS;
+    auto& output = *static_cast<Output*>(closure);
+    output.write({reinterpret_cast<char const*>(data), length});
+    return output.isGood() ? CAIRO_STATUS_SUCCESS : CAIRO_STATUS_WRITE_ERROR;
 }
 
 std::string dateText() {
@@ -64,17 +83,17 @@ void unnumber(std::string& svg) {
     svg.erase(digits, svg.find('"', digits) - digits);
 }
 
-Surface makeSurface(PlotFormat format, Page const& page, std::string& bytes) {
+Surface makeSurface(PlotFormat format, Page const& page, Output& output) {
     switch (format) {
     case PlotFormat::svg: {
         Surface surface(
-            cairo_svg_surface_create_for_stream(takeBytes, &bytes, page.width, page.height));
+            cairo_svg_surface_create_for_stream(takeBytes, &output, page.width, page.height));
         cairo_svg_surface_set_document_unit(surface.get(), CAIRO_SVG_UNIT_PX);
         return surface;
     }
     case PlotFormat::pdf: {
         Surface surface(
-            cairo_pdf_surface_create_for_stream(takeBytes, &bytes, page.width, page.height));
+            cairo_pdf_surface_create_for_stream(takeBytes, &output, page.width, page.height));
         // Left alone, Cairo takes the clock and writes it with its zone.
         if (std::getenv("SOURCE_DATE_EPOCH")) {
             cairo_pdf_surface_set_metadata(surface.get(), CAIRO_PDF_METADATA_CREATE_DATE,
@@ -125,6 +144,8 @@ public:
 
 private:
     [[nodiscard]] bool addPath(std::vector<OutlineStep> const& path);
+    [[nodiscard]] bool isTooSmall(PlotShape const& letters) const;
+    void paintBaseline(PlotShape const& letters);
     void addStep(OutlineKind kind, std::array<LayoutPoint, 3> const& at);
     void setStroke(PlotShape const& shape);
 
@@ -173,10 +194,27 @@ void Painter::setStroke(PlotShape const& shape) {
     cairo_set_dash(cairo_, dashes.data(), isVisible ? static_cast<int>(dashes.size()) : 0, 0.0);
 }
 
+// Cairo draws on a grid of 1/256 page unit, where such letters vanish.
+bool Painter::isTooSmall(PlotShape const& letters) const {
+    constexpr double kLeastLetter = 1.0 / 64.0;  // page units
+    return letters.letterHeight > 0.0 && letters.letterHeight * mapping_.scale() < kLeastLetter;
+}
+
+void Painter::paintBaseline(PlotShape const& letters) {
+    std::vector<OutlineStep> const line{
+        {OutlineKind::move, {letters.from}},
+        {OutlineKind::line, {letters.to}  },
+    };
+    if (!addPath(line)) return;
+    setStroke(letters);
+    cairo_stroke(cairo_);
+}
+
 void Painter::paint(PlotShape const& shape) {
-    if (!addPath(shape.path)) return;
     PlotColor const& color = shape.color;
     cairo_set_source_rgba(cairo_, color.red, color.green, color.blue, color.alpha);
+    if (isTooSmall(shape)) return paintBaseline(shape);
+    if (!addPath(shape.path)) return;
     if (shape.kind == PlotKind::fill) {
         cairo_fill(cairo_);
         return;
@@ -185,28 +223,36 @@ void Painter::paint(PlotShape const& shape) {
     cairo_stroke(cairo_);
 }
 
-}  // namespace
-
-std::string paintPlot(PlotScene const& scene, PlotFormat format) {
+bool paintPage(PlotScene const& scene, PlotFormat format, ByteTaker const& take) {
     Page const& page = kPages[static_cast<std::size_t>(format)];
-    std::string bytes;
-    Surface const surface = makeSurface(format, page, bytes);
+    PageMapping const mapping(page, extentsOf(scene).value_or(LayoutBox{}));
+    Output output(take);
+    Surface const surface = makeSurface(format, page, output);
     Cairo cairo(cairo_create(surface.get()));
     cairo_set_source_rgb(cairo.get(), 1.0, 1.0, 1.0);
     cairo_paint(cairo.get());
-    PageMapping const mapping(page, scene.extents().value_or(LayoutBox{}));
     Painter painter(cairo.get(), page, mapping);
-    for (PlotShape const& shape : scene.shapes)
-        painter.paint(shape);
-    bool good = cairo_status(cairo.get()) == CAIRO_STATUS_SUCCESS;
+    scene([&](PlotShape const& shape) { painter.paint(shape); });
+    bool const good = cairo_status(cairo.get()) == CAIRO_STATUS_SUCCESS;
     cairo.reset();
     if (format == PlotFormat::png) {
-        cairo_surface_write_to_png_stream(surface.get(), takeBytes, &bytes);
+        (void)cairo_surface_write_to_png_stream(surface.get(), takeBytes, &output);
     }
     cairo_surface_finish(surface.get());
-    good = good && cairo_surface_status(surface.get()) == CAIRO_STATUS_SUCCESS;
-    if (format == PlotFormat::svg) unnumber(bytes);
-    return good ? bytes : std::string();
+    return good && output.isGood() && cairo_surface_status(surface.get()) == CAIRO_STATUS_SUCCESS;
+}
+
+}  // namespace
+
+bool paintPlot(PlotScene const& scene, PlotFormat format, ByteTaker const& take) {
+    if (format != PlotFormat::svg) return paintPage(scene, format, take);
+    std::string svg;
+    bool const good = paintPage(scene, format, [&](std::string_view bytes) {
+        svg += bytes;
+        return true;
+    });
+    unnumber(svg);
+    return good && take(svg);
 }
 
 }  // namespace tzhost

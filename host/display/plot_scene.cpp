@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <memory>
 #include <utility>
 
 #include "host/base/entity_drawing.h"
@@ -22,10 +23,10 @@ LayoutPoint flat(TzGePoint2d const& point) {
     return {point.x, point.y};
 }
 
-void addShapes(PlotScene& scene,
+void eachShape(DrawnLines const& lines,
                ViewAxes const& axes,
                DrawPen const& pen,
-               DrawnLines const& lines) {
+               ShapeTaker const& take) {
     PlotShape shape;
     shape.kind = lines.closed && pen.fill != kFillNothing ? PlotKind::fill : PlotKind::stroke;
     OutlineKind next = OutlineKind::move;
@@ -37,7 +38,7 @@ void addShapes(PlotScene& scene,
     shape.color = inkOf(pen, shape.kind);
     shape.lineWeight = lineWeightOf(pen);
     shape.dashes = dashesOf(pen);
-    scene.shapes.push_back(std::move(shape));
+    take(shape);
 }
 
 LineLayoutInput layoutInputOf(DrawnText const& text) {
@@ -79,22 +80,65 @@ private:
     TzGeVector2d up_;
 };
 
-void addShapes(PlotScene& scene, ViewAxes const& axes, DrawPen const& pen, DrawnText const& text) {
-    TextFrame const frame(text, axes);
-    PlotShape shape;
-    shape.kind = PlotKind::fill;
-    for (GlyphRun const& run : layOutLine(layoutInputOf(text)).runs) {
-        for (OutlineStep step : textOutline(run)) {
-            for (std::size_t i = 0; i < pointsOf(step); ++i) {
-                step.points[i] = frame.place(step.points[i]);
-            }
-            shape.path.push_back(step);
-        }
+// Collects the letters of a run into shapes.
+class LetterShapes {
+public:
+    LetterShapes(TextFrame const& frame, DrawPen const& pen, ShapeTaker const& take)
+        : frame_(frame), take_(take) {
+        shape_.kind = PlotKind::fill;
+        // Letters are strokes as far as colours go, whatever the fill type for outlines is.
+        shape_.color = inkOf(pen, PlotKind::stroke);
     }
-    // Letters are strokes as far as colours go, whatever the fill type for outlines is.
-    shape.color = inkOf(pen, PlotKind::stroke);
-    if (!shape.path.empty()) scene.shapes.push_back(std::move(shape));
+
+    void startRun(GlyphRun const& run) { shape_.letterHeight = run.height; }
+    void add(OutlinedLetter const& letter);
+    void flush();
+
+private:
+    // A run of any length goes to the page in shapes of so many letters.
+    static constexpr int kLettersOfAShape = 1000;
+
+    TextFrame const& frame_;
+    ShapeTaker const& take_;
+    PlotShape shape_;
+    int letters_ = 0;
+};
+
+void LetterShapes::add(OutlinedLetter const& letter) {
+    if (letters_ == 0) shape_.from = frame_.place(letter.start);
+    shape_.to = frame_.place(letter.end);
+    for (OutlineStep step : letter.steps) {
+        for (std::size_t i = 0; i < pointsOf(step); ++i)
+            step.points[i] = frame_.place(step.points[i]);
+        shape_.path.push_back(step);
+    }
+    if (++letters_ == kLettersOfAShape) flush();
 }
+
+void LetterShapes::flush() {
+    if (!shape_.path.empty()) take_(shape_);
+    shape_.path.clear();
+    letters_ = 0;
+}
+
+void eachShape(DrawnText const& text,
+               ViewAxes const& axes,
+               DrawPen const& pen,
+               ShapeTaker const& take) {
+    TextFrame const frame(text, axes);
+    LetterShapes shapes(frame, pen, take);
+    for (GlyphRun const& run : layOutLine(layoutInputOf(text)).runs) {
+        shapes.startRun(run);
+        outlineLetters(run, [&](OutlinedLetter const& letter) { shapes.add(letter); });
+    }
+    shapes.flush();
+}
+
+// A plot draws entities stroke by stroke, so none comes whole.
+void eachShape(DrawnEntity const& /*entity*/,
+               ViewAxes const& /*axes*/,
+               DrawPen const& /*pen*/,
+               ShapeTaker const& /*take*/) {}
 
 struct BoxBuilder {
     std::optional<LayoutBox> box;
@@ -108,40 +152,36 @@ struct BoxBuilder {
     }
 };
 
-// A plot draws entities stroke by stroke, so none comes whole.
-void addShapes(PlotScene& /*scene*/,
-               ViewAxes const& /*axes*/,
-               DrawPen const& /*pen*/,
-               DrawnEntity const& /*entity*/) {}
+void addTo(BoxBuilder& builder, PlotShape const& shape) {
+    // A move counts when something is drawn from there: outlines of letters hold idle ones. But a
+    // path that is no more than a move is a dot.
+    std::optional<LayoutPoint> start;
+    for (OutlineStep const& step : shape.path) {
+        if (step.kind == OutlineKind::move) {
+            start = step.points[0];
+            continue;
+        }
+        if (start) builder.add(*std::exchange(start, std::nullopt));
+        for (std::size_t i = 0; i < pointsOf(step); ++i)
+            builder.add(step.points[i]);
+    }
+    if (start && shape.path.size() == 1) builder.add(*start);
+}
 
 }  // namespace
 
-std::optional<LayoutBox> PlotScene::extents() const {
+std::optional<LayoutBox> extentsOf(PlotScene const& scene) {
     BoxBuilder builder;
-    for (PlotShape const& shape : shapes) {
-        // A move counts when something is drawn from there: outlines of letters hold idle ones. But
-        // a path that is no more than a move is a dot.
-        std::optional<LayoutPoint> start;
-        for (OutlineStep const& step : shape.path) {
-            if (step.kind == OutlineKind::move) {
-                start = step.points[0];
-                continue;
-            }
-            if (start) builder.add(*std::exchange(start, std::nullopt));
-            for (std::size_t i = 0; i < pointsOf(step); ++i)
-                builder.add(step.points[i]);
-        }
-        if (start && shape.path.size() == 1) builder.add(*start);
-    }
+    scene([&](PlotShape const& shape) { addTo(builder, shape); });
     return builder.box;
 }
 
-PlotScene makeScene(DrawList const& list, ViewAxes const& axes) {
-    PlotScene scene;
-    for (DrawOp const& op : list) {
-        std::visit([&](auto const& what) { addShapes(scene, axes, op.pen, what); }, op.what);
-    }
-    return scene;
+PlotScene makeScene(DrawList list, ViewAxes const& axes) {
+    auto const kept = std::make_shared<DrawList const>(std::move(list));
+    return [kept, axes](ShapeTaker const& take) {
+        for (DrawOp const& op : *kept)
+            std::visit([&](auto const& what) { eachShape(what, axes, op.pen, take); }, op.what);
+    };
 }
 
 }  // namespace tzhost

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <optional>
 #include <vector>
 
@@ -7,8 +8,9 @@
 #include "host/display/view.h"
 #include "host/layout/text_outline.h"
 
-// A drawing list turned into flat shapes in the colours of a page: all that remains is to scale and
-// paint them. Coordinates are those of the view, in drawing units, y up.
+// A drawing list as flat shapes in the colours of a page: all that remains is to scale and paint
+// them. Coordinates are those of the view, in drawing units, y up. The shapes are made each time
+// they are asked for and not kept, since letters as outlines take much room.
 namespace tzhost {
 
 // Components from 0 to 1.
@@ -27,15 +29,18 @@ struct PlotShape {
     PlotColor color;
     double lineWeight = 0.0;     // millimetres on the page; 0 draws the thinnest line
     std::vector<double> dashes;  // drawing units, dash and gap in turn; empty is solid
+    double letterHeight = 0.0;   // of letters; 0 for other shapes
+    LayoutPoint from;            // the baseline of letters
+    LayoutPoint to;
 };
 
-struct PlotScene {
-    std::vector<PlotShape> shapes;
+// Hands over the shapes from the lowest to the topmost, the same ones at each call.
+using ShapeTaker = std::function<void(PlotShape const& shape)>;
+using PlotScene = std::function<void(ShapeTaker const& take)>;
 
-    // The box around all shapes; nothing for a scene without any, or with none that is finite.
-    [[nodiscard]] std::optional<LayoutBox> extents() const;
-};
+[[nodiscard]] PlotScene makeScene(DrawList list, ViewAxes const& axes);
 
-[[nodiscard]] PlotScene makeScene(DrawList const& list, ViewAxes const& axes);
+// The box around all shapes; nothing for a scene without any, or with none that is finite.
+[[nodiscard]] std::optional<LayoutBox> extentsOf(PlotScene const& scene);
 
 }  // namespace tzhost

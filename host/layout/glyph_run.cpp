@@ -2,8 +2,6 @@
 
 #include <cmath>
 
-#include "host/layout/shaper.h"
-
 namespace tzhost {
 
 double usableFactor(double factor) {
@@ -18,6 +16,11 @@ double trackingOf(WholeText const& whole) {
 }
 
 }  // namespace
+
+Ligatures ligaturesOf(WholeText const& whole) {
+    bool const isParted = whole.flow == TextFlow::down || whole.tracking != 1.0;
+    return isParted ? Ligatures::off : Ligatures::on;
+}
 
 double advanceScale(LineFormat const& format, WholeText const& whole) {
     return format.height * whole.widthFactor * trackingOf(whole);
@@ -37,7 +40,7 @@ GlyphRun makeGlyphRun(std::wstring const& text, LineFormat const& format, WholeT
 
 GlyphRun shapeGlyphRun(std::wstring const& text, LineFormat const& format, WholeText const& whole) {
     GlyphRun run = makeGlyphRun(text, format, whole);
-    ShapedLine const line = shapeLine(text, format.face);
+    ShapedLine const line = shapeLine(text, format.face, ligaturesOf(whole));
     run.advance = line.advance * advanceScale(format, whole);
     run.rightToLeft = line.rightToLeft;
     return run;

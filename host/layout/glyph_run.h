@@ -2,6 +2,7 @@
 
 #include <string>
 
+#include "host/layout/shaper.h"
 #include "host/layout/text_line.h"
 
 // The step from a look to a run of letters.
@@ -12,6 +13,9 @@ inline constexpr double kVerticalStep = 3.0 / 2.0;
 
 // A factor that letters can be drawn with: the given one, or 1 when it is not above 0 and finite.
 [[nodiscard]] double usableFactor(double factor);
+
+// Whether the letters of a text may join.
+[[nodiscard]] Ligatures ligaturesOf(WholeText const& whole);
 
 // What an advance in heights of capitals is multiplied by.
 [[nodiscard]] double advanceScale(LineFormat const& format, WholeText const& whole);

@@ -4,22 +4,6 @@
 
 namespace tzhost {
 
-AttachmentShares attachmentShares(int attachment) {
-    int const index = attachment >= 1 && attachment <= 9 ? attachment - 1 : 0;
-    int const row = index / 3;
-    int const column = index % 3;
-    return {column / 2.0, row / 2.0};
-}
-
-LayoutBox boxAt(AttachmentShares const& shares, double width, double height) {
-    LayoutBox box;
-    box.left = -shares.along * width;
-    box.right = box.left + width;
-    box.top = shares.down * height;
-    box.bottom = box.top - height;
-    return box;
-}
-
 LineFrame frameOf(BrokenText const& broken, double share) {
     LineFrame frame{share, broken.wrapWidth};
     if (broken.wrapWidth <= 0.0) {

@@ -13,17 +13,6 @@ namespace tzhost {
 // the wrap width is a height.
 [[nodiscard]] MTextLayout placeDown(MTextLayoutInput const& input, BrokenText const& broken);
 
-// What an attachment from 1 to 9 says, any other number counting as 1: the share of the width that
-// lies left of it (0, 0.5, 1) and the share of the height above which it does not reach.
-struct AttachmentShares {
-    double along = 0.0;
-    double down = 0.0;
-};
-[[nodiscard]] AttachmentShares attachmentShares(int attachment);
-
-// A box of that size about the attachment point.
-[[nodiscard]] LayoutBox boxAt(AttachmentShares const& shares, double width, double height);
-
 // Where lines stand in their frame, whose width is the wrap width or that of the longest line.
 struct LineFrame {
     double share = 0.0;  // of the room that a line leaves, what lies ahead of it

@@ -1,5 +1,6 @@
 #include <algorithm>
 
+#include "host/layout/attachment_box.h"
 #include "host/layout/column_rule.h"
 #include "host/layout/line_drawing.h"
 #include "host/layout/line_placing.h"
@@ -47,7 +48,7 @@ MTextLayout placeAlong(MTextLayoutInput const& input, BrokenText const& broken) 
     SpacingRule const spacing = spacingRuleOf(input);
     PlacedLines const placed = placeLines(metrics, spacing, columnRuleOf(input, metrics, spacing));
 
-    AttachmentShares const shares = attachmentShares(input.attachment);
+    AttachmentShares const shares = attachmentShares(input.attachment, input.style);
     LineFrame const frame = frameOf(broken, shares.along);
     bool const hasColumns = input.columns.type != 0;
     MTextLayout layout;

@@ -1,9 +1,9 @@
 #include <algorithm>
 
+#include "host/layout/attachment_box.h"
 #include "host/layout/column_rule.h"
 #include "host/layout/glyph_run.h"
 #include "host/layout/line_drawing.h"
-#include "host/layout/line_layout.h"
 #include "host/layout/line_placing.h"
 
 namespace tzhost {
@@ -57,14 +57,6 @@ void drawDown(BrokenText const& broken,
     }
 }
 
-// The shares across and down the page. An attachment of a typeface with "@" counts in a frame
-// turned by 270 degrees, as its previews do: left is the head of the page, top its right side.
-AttachmentShares pageShares(MTextLayoutInput const& input) {
-    AttachmentShares const shares = attachmentShares(input.attachment);
-    if (!hasVerticalMark(input.style)) return shares;
-    return {1.0 - shares.down, shares.along};
-}
-
 }  // namespace
 
 MTextLayout placeDown(MTextLayoutInput const& input, BrokenText const& broken) {
@@ -75,7 +67,7 @@ MTextLayout placeDown(MTextLayoutInput const& input, BrokenText const& broken) {
     }
     PlacedLines const placed = placeLines(metrics, spacingRuleOf(input), {{}, 0.0, 1});
 
-    AttachmentShares const shares = pageShares(input);
+    AttachmentShares const shares = attachmentShares(input.attachment, input.style);
     LineFrame const frame = frameOf(broken, shares.down);
     MTextLayout layout;
     layout.width = placed.height;

@@ -103,7 +103,7 @@ void Builder::shape() {
         }
         ++spans.back().length;
     }
-    ShapedText const shaped = shapeText(segment_.text, spans);
+    ShapedText const shaped = shapeText(segment_.text, spans, ligaturesOf(whole_));
     for (std::size_t i = 0; i < cells.size(); ++i) {
         measure(cells[i], shaped.characters[i]);
     }

@@ -93,12 +93,11 @@ EngineFace const& ShapeEngine::face(LayoutFace const& face) {
     pango_font_description_set_style(made.description,
                                      face.italic ? PANGO_STYLE_ITALIC : PANGO_STYLE_NORMAL);
     pango_font_description_set_absolute_size(made.description, kReferenceSize);
-    PangoFont* const font = pango_context_load_font(context_, made.description);
+    made.font = pango_context_load_font(context_, made.description);
     made.capHeight = kUsualCapHeight * kReferenceSize;
-    if (font != nullptr) {
+    if (made.font != nullptr) {
         made.capHeight =
-            capHeightOf(hb_font_get_face(pango_font_get_hb_font(font))) * kReferenceSize;
-        g_object_unref(font);
+            capHeightOf(hb_font_get_face(pango_font_get_hb_font(made.font))) * kReferenceSize;
     }
     return made;
 }

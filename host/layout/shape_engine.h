@@ -24,9 +24,11 @@ struct Utf8Text {
 
 [[nodiscard]] Utf8Text utf8Of(std::wstring const& text);
 
-// A face at the reference size. `capHeight` is its height of capitals in Pango units.
+// A face at the reference size. `capHeight` is its height of capitals in Pango units; `font` is
+// null when the font library has none at all.
 struct EngineFace {
     PangoFontDescription* description = nullptr;
+    PangoFont* font = nullptr;
     double capHeight = 0.0;
 };
 

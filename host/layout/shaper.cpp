@@ -5,41 +5,16 @@
 #include <algorithm>
 #include <memory>
 
+#include "host/layout/itemizer.h"
 #include "host/layout/shape_engine.h"
 
 namespace tzhost {
 namespace {
 
-struct AttributesFree {
-    void operator()(PangoAttrList* list) const { pango_attr_list_unref(list); }
-};
-using Attributes = std::unique_ptr<PangoAttrList, AttributesFree>;
-
 struct GlyphsFree {
     void operator()(PangoGlyphString* glyphs) const { pango_glyph_string_free(glyphs); }
 };
 using Glyphs = std::unique_ptr<PangoGlyphString, GlyphsFree>;
-
-// The faces of a paragraph as Pango wants them, and the height of capitals behind each character.
-struct PreparedFaces {
-    Attributes attributes{pango_attr_list_new()};
-    std::vector<double> capHeights;  // by span
-};
-
-PreparedFaces prepareFaces(Utf8Text const& utf8, std::vector<ShapeSpan> const& spans) {
-    PreparedFaces prepared;
-    std::size_t start = 0;
-    for (ShapeSpan const& span : spans) {
-        EngineFace const& face = ShapeEngine::instance().face(span.face);
-        PangoAttribute* const attribute = pango_attr_font_desc_new(face.description);
-        attribute->start_index = static_cast<guint>(utf8.starts[start]);
-        start += span.length;
-        attribute->end_index = static_cast<guint>(utf8.starts[start]);
-        pango_attr_list_insert(prepared.attributes.get(), attribute);
-        prepared.capHeights.push_back(face.capHeight);
-    }
-    return prepared;
-}
 
 void markBreaks(Utf8Text const& utf8, ShapedText& result) {
     std::size_t const count = result.characters.size();
@@ -73,7 +48,8 @@ void addAdvances(PangoGlyphString const& glyphs,
 
 }  // namespace
 
-ShapedText shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spans) {
+ShapedText
+shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spans, Ligatures ligatures) {
     ShapedText result;
     result.characters.resize(text.size());
     if (text.empty()) {
@@ -81,36 +57,31 @@ ShapedText shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spa
     }
     Utf8Text const utf8 = utf8Of(text);
     int const size = static_cast<int>(utf8.bytes.size());
-    PreparedFaces const faces = prepareFaces(utf8, spans);
     // The first strong letter decides the direction of the whole.
-    GList* const items =
-        pango_itemize_with_base_dir(ShapeEngine::instance().context(), PANGO_DIRECTION_WEAK_LTR,
-                                    utf8.bytes.c_str(), 0, size, faces.attributes.get(), nullptr);
+    std::vector<TextItem> const items = itemize(utf8, spans, PANGO_DIRECTION_WEAK_LTR, ligatures);
     Glyphs const glyphs{pango_glyph_string_new()};
     std::size_t first = 0;
-    std::size_t span = 0;
-    std::size_t spanEnd = spans.empty() ? text.size() : spans.front().length;
-    for (GList* node = items; node != nullptr; node = node->next) {
-        auto* const item = static_cast<PangoItem*>(node->data);
-        while (first >= spanEnd && span + 1 < spans.size()) {
-            spanEnd += spans[++span].length;
-        }
-        pango_shape_full(utf8.bytes.c_str() + item->offset, item->length, utf8.bytes.c_str(), size,
-                         &item->analysis, glyphs.get());
-        addAdvances(*glyphs, utf8, first, faces.capHeights[span], result);
-        first += static_cast<std::size_t>(item->num_chars);
-        result.items.push_back({first, item->analysis.level});
-        pango_item_free(item);
+    for (std::size_t i = 0; i < items.size(); ++i) {
+        PangoItem const& item = *items[i].item;
+        double const capHeight = ShapeEngine::instance().face(spans[items[i].span].face).capHeight;
+        pango_shape_full(utf8.bytes.c_str() + item.offset, item.length, utf8.bytes.c_str(), size,
+                         &item.analysis, glyphs.get());
+        addAdvances(*glyphs, utf8, first, capHeight, result);
+        first += static_cast<std::size_t>(item.num_chars);
+        if (i > 0 && items[i].continues(items[i - 1]))
+            result.items.back().end = first;
+        else
+            result.items.push_back({first, item.analysis.level});
     }
-    g_list_free(items);
     markBreaks(utf8, result);
     return result;
 }
 
-ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face) {
-    ShapedText const shaped = shapeText(text, {
-                                                  {text.size(), face}
-    });
+ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face, Ligatures ligatures) {
+    std::vector<ShapeSpan> const whole{
+        {text.size(), face}
+    };
+    ShapedText const shaped = shapeText(text, whole, ligatures);
     ShapedLine line;
     for (ShapedCharacter const& character : shaped.characters) {
         line.advance += character.advance;
@@ -124,13 +95,12 @@ ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face) {
 
 std::vector<std::wstring> splitLetters(std::wstring const& text, LayoutFace const& face) {
     std::vector<std::wstring> letters;
-    std::vector<ShapedCharacter> const characters = shapeText(text,
-                                                              {
-                                                                  {text.size(), face}
-    })
-                                                        .characters;
+    std::vector<ShapeSpan> const whole{
+        {text.size(), face}
+    };
+    ShapedText const shaped = shapeText(text, whole, Ligatures::off);
     for (std::size_t i = 0; i < text.size(); ++i) {
-        if (letters.empty() || characters[i].opensLetter) {
+        if (letters.empty() || shaped.characters[i].opensLetter) {
             letters.emplace_back();
         }
         letters.back() += text[i];

@@ -39,8 +39,13 @@ struct ShapedText {
     std::vector<ShapedItem> items;
 };
 
+// Whether letters may join into one shape, such as f and i. They may not where each letter has its
+// own place: down the page, and when tracking parts them.
+enum class Ligatures { off, on };
+
 // Shapes a paragraph. Values in `text` that are no Unicode scalars show as U+FFFD.
-[[nodiscard]] ShapedText shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spans);
+[[nodiscard]] ShapedText
+shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spans, Ligatures ligatures);
 
 // A text of one face that is never broken: its advance in heights of capitals, and which way it
 // reads as a whole, by its first strong letter.
@@ -48,7 +53,8 @@ struct ShapedLine {
     double advance = 0.0;
     bool rightToLeft = false;
 };
-[[nodiscard]] ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face);
+[[nodiscard]] ShapedLine
+shapeLine(std::wstring const& text, LayoutFace const& face, Ligatures ligatures);
 
 // The letters of a text, each with the accents and joiners that belong to it.
 [[nodiscard]] std::vector<std::wstring> splitLetters(std::wstring const& text,

@@ -1,13 +1,14 @@
 #pragma once
 
 #include <array>
+#include <functional>
 #include <vector>
 
 #include "host/layout/layout_types.h"
 
 // The letters of a run as outlines, for plots.
 //
-//   for (OutlineStep const& step : textOutline(run)) ... // cairo_move_to and its kin, then a fill
+//   outlineLetters(run, [&](OutlinedLetter const& letter) { ... letter.steps ... });
 //
 // Points are in the frame of the layout that the run came from. The outlines of a run are closed
 // and are filled by the non-zero winding rule. Main thread only, as all shaping.
@@ -21,6 +22,15 @@ struct OutlineStep {
     std::array<LayoutPoint, 3> points;
 };
 
-[[nodiscard]] std::vector<OutlineStep> textOutline(GlyphRun const& run);
+// One letter, with the part of the baseline that it takes. Blanks have no steps.
+struct OutlinedLetter {
+    std::vector<OutlineStep> steps;
+    LayoutPoint start;
+    LayoutPoint end;
+};
+using LetterTaker = std::function<void(OutlinedLetter const& letter)>;
+
+// Hands over the letters one by one, from left to right, so that a long run takes little memory.
+void outlineLetters(GlyphRun const& run, LetterTaker const& take);
 
 }  // namespace tzhost

@@ -48,8 +48,17 @@ DrawOp text(wchar_t const* string, double size) {
     return op;
 }
 
+std::string painted(PlotScene const& scene, PlotFormat format) {
+    std::string bytes;
+    bool const good = paintPlot(scene, format, [&](std::string_view part) {
+        bytes += part;
+        return true;
+    });
+    return good ? bytes : std::string();
+}
+
 Picture plotted(DrawList const& list, ViewAxes const& axes = ViewAxes()) {
-    return Picture(paintPlot(makeScene(list, axes), PlotFormat::png));
+    return Picture(painted(makeScene(list, axes), PlotFormat::png));
 }
 
 struct InkCase {
@@ -151,16 +160,18 @@ TEST(Plots, DrawAsWideAsTheWeightSays) {
 }
 
 TEST(Plots, DashWhatIsNotTooFine) {
-    PlotScene scene = makeScene(
+    PlotShape line;
+    makeScene(
         {
             lines(1, kFillNothing, {{0, 0, 0}, {10, 0, 0}}
               )
     },
-        ViewAxes());
+        ViewAxes())([&](PlotShape const& shape) { line = shape; });
     auto const inked = [&](std::vector<double> dashes) {
-        scene.shapes[0].dashes = std::move(dashes);
-        scene.shapes[0].lineWeight = 1.0;
-        return Picture(paintPlot(scene, PlotFormat::png)).count(0xFF0000);
+        line.dashes = std::move(dashes);
+        line.lineWeight = 1.0;
+        PlotScene const scene = [&](ShapeTaker const& take) { take(line); };
+        return Picture(painted(scene, PlotFormat::png)).count(0xFF0000);
     };
     int const solid = inked({});
     EXPECT_LT(inked({0.5, 0.5}), solid * 2 / 3);
@@ -180,7 +191,7 @@ TEST(Plots, ShowLettersOfAnySizeAlike) {
 std::string boxOf(void (*change)(DrawnText&)) {
     DrawOp op = text(L"HHHH", 1);
     change(std::get<DrawnText>(op.what));
-    LayoutBox const box = makeScene({op}, ViewAxes()).extents().value_or(LayoutBox{});
+    LayoutBox const box = extentsOf(makeScene({op}, ViewAxes())).value_or(LayoutBox{});
     auto const part = [](double value) { return std::to_string(std::lround(value * 10)) + ' '; };
     return part(box.left) + part(box.bottom) + part(box.right) + part(box.top);
 }
@@ -209,18 +220,18 @@ TEST(Plots, SurviveShapesOfNoUse) {
         text(L"edge", kNan)
     };
     for (PlotFormat const format : {PlotFormat::svg, PlotFormat::png, PlotFormat::pdf}) {
-        EXPECT_FALSE(paintPlot(makeScene(list, ViewAxes()), format).empty());
-        EXPECT_FALSE(paintPlot(PlotScene(), format).empty());
+        EXPECT_FALSE(painted(makeScene(list, ViewAxes()), format).empty());
+        EXPECT_FALSE(painted([](ShapeTaker const&) {}, format).empty());
     }
 }
 
 TEST(Plots, NeedNoFontsOfTheViewer) {
     PlotScene const scene = makeScene({text(L"Plan", 1)}, ViewAxes());
-    std::string const svg = paintPlot(scene, PlotFormat::svg);
+    std::string const svg = painted(scene, PlotFormat::svg);
     EXPECT_NE(svg.find("<path"), std::string::npos);
     EXPECT_EQ(svg.find("<text"), std::string::npos);
     EXPECT_EQ(svg.find("font"), std::string::npos);
-    std::string const pdf = paintPlot(scene, PlotFormat::pdf);
+    std::string const pdf = painted(scene, PlotFormat::pdf);
     EXPECT_EQ(pdf.substr(0, 5), "%PDF-");
     EXPECT_EQ(pdf.find("/FontFile"), std::string::npos);
 }
@@ -230,10 +241,15 @@ TEST(Plots, OfOneSceneAreTheSameFile) {
     PlotScene const scene = makeScene({text(L"Plan", 1)}, ViewAxes());
     ASSERT_EQ(setenv("SOURCE_DATE_EPOCH", "86400", 1), 0);
     for (PlotFormat const format : {PlotFormat::svg, PlotFormat::png, PlotFormat::pdf}) {
-        EXPECT_EQ(paintPlot(scene, format), paintPlot(scene, format));
+        EXPECT_EQ(painted(scene, format), painted(scene, format));
     }
-    EXPECT_NE(paintPlot(scene, PlotFormat::pdf).find("(19700102000000Z)"), std::string::npos);
+    EXPECT_NE(painted(scene, PlotFormat::pdf).find("(19700102000000Z)"), std::string::npos);
     unsetenv("SOURCE_DATE_EPOCH");
+}
+
+// Letters below the grid of the page left it empty.
+TEST(Plots, ShowTooSmallLettersAsALine) {
+    EXPECT_GT(plotted({text(std::wstring(200'000, L'x').c_str(), 1)}).countShades(0), 500);
 }
 
 }  // namespace

@@ -4,13 +4,24 @@
 #include <cmath>
 
 #include "host/layout/line_layout.h"
+#include "host/layout/mtext_layout.h"
+#include "host/layout/shaper.h"
 #include "host/layout/text_outline.h"
 #include "tests/layout/layout_printer.h"
+#include "tz/text/string.h"
 
 namespace {
 
 using namespace tzhost;
 using namespace tztest;
+
+std::vector<OutlineStep> textOutline(GlyphRun const& run) {
+    std::vector<OutlineStep> steps;
+    outlineLetters(run, [&](OutlinedLetter const& letter) {
+        steps.insert(steps.end(), letter.steps.begin(), letter.steps.end());
+    });
+    return steps;
+}
 
 LayoutBox inkOf(GlyphRun const& run) {
     LayoutBox ink{1e300, 1e300, -1e300, -1e300};
@@ -98,6 +109,49 @@ TEST(Outline, DirectionPlacesNeutralSigns) {
 
 TEST(Outline, BlanksHaveNone) {
     EXPECT_TRUE(textOutline(runOf(L"  ")).empty());
+}
+
+std::size_t shapesOf(double tracking) {
+    GlyphRun run;
+    run.text = L"fi";
+    run.face.typeface = L"DejaVu Sans";
+    run.tracking = tracking;
+    std::size_t letters = 0;
+    outlineLetters(run, [&](OutlinedLetter const&) { ++letters; });
+    return letters;
+}
+
+// f and i were one shape, parted as one letter, and i had no room of its own down the page.
+TEST(Letters, DoNotJoinWhereEachHasItsPlace) {
+    EXPECT_EQ(shapesOf(1), 1U);
+    EXPECT_EQ(shapesOf(1.5), 2U);
+    MTextLayoutInput input;
+    input.contents = L"fi";
+    input.style.typeface = L"@DejaVu Sans";
+    MTextLayout const layout = layOutMText(input);
+    ASSERT_EQ(layout.runs.size(), 2U);
+    EXPECT_GT(layout.runs[1].advance, 0.0);
+}
+
+// Marks were drawn with whatever face came first that had them, here one of another script.
+TEST(Letters, MarksTakeTheFaceOfTheLettersBesideThem) {
+    struct {
+        wchar_t const* text;
+        std::size_t items;  // stretches that are drawn as one
+    } const rows[] = {
+        {L"\u56FE\u3001\u56FE",  1},
+        {L"\u3010\u56FE",        1},
+        {L"a\u3001\u3042\u56FE", 2},
+        {L"\u3001",              1},
+    };
+    for (auto const& row : rows) {
+        std::wstring const text = row.text;
+        std::vector<ShapeSpan> const spans{
+            {text.size(), {L"DejaVu Sans"}}
+        };
+        EXPECT_EQ(shapeText(text, spans, Ligatures::on).items.size(), row.items)
+            << TzString(text).toUtf8();
+    }
 }
 
 }  // namespace
