@@ -1,5 +1,6 @@
 #include "host/base/memory_faults.h"
 #include "host/database/drawing.h"
+#include "host/database/exact_values.h"
 #include "host/database/symbol_imp.h"
 #include "host/settings/variables.h"
 #include "tz/ge/matrix3d.h"
@@ -7,14 +8,6 @@
 // What a drawing holds beside its objects: current style and layer, user systems, the working set.
 namespace tzhost {
 namespace {
-
-bool isExactly(TzGePoint3d const& a, TzGePoint3d const& b) {
-    return a.x == b.x && a.y == b.y && a.z == b.z;
-}
-
-bool isExactly(TzGeVector3d const& a, TzGeVector3d const& b) {
-    return a.x == b.x && a.y == b.y && a.z == b.z;
-}
 
 // A record of that table which is not erased.
 bool isRecordOf(TzDbObjectId id, TzDbObjectId table) {

@@ -8,6 +8,7 @@ namespace tzhost {
 
 struct EntityImp : TzDbObjectImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     [[nodiscard]] TzDbObjectRecord* lockingLayer() const override { return layer.record(); }
     [[nodiscard]] bool refersTo(TzDbObjectRecord const* named) const override {
         return layer.record() == named;
@@ -19,6 +20,7 @@ struct EntityImp : TzDbObjectImp {
 };
 
 struct TextStyledImp : EntityImp {
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     [[nodiscard]] bool refersTo(TzDbObjectRecord const* named) const override {
         return style.record() == named || EntityImp::refersTo(named);
     }

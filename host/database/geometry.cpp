@@ -42,10 +42,18 @@ TzGeVector3d unitVector(TzGeVector3d const& vector) {
     return std::abs(vector.length() - 1.0) <= kRounding ? vector : vector.normal();
 }
 
+// What is left of a vector that is close to the normal has lost most of its digits, so that it
+// stands at no right angle yet: another turn makes up for it. A result goes in and comes out
+// unchanged.
 TzGeVector3d perpendicularTo(TzGeVector3d const& normal, TzGeVector3d const& vector) {
-    TzGeVector3d const unit = unitVector(vector);
-    double const along = unit.dotProduct(normal);
-    return std::abs(along) <= kRounding ? unit : unitVector(unit - normal * along);
+    constexpr int kMostTurns = 4;
+    TzGeVector3d unit = unitVector(vector);
+    for (int turn = 0; turn < kMostTurns; ++turn) {
+        double const along = unit.dotProduct(normal);
+        if (std::abs(along) <= kRounding) break;
+        unit = unitVector(unit - normal * along);
+    }
+    return unit;
 }
 
 double angleAbout(TzGeVector3d const& normal, TzGeVector3d const& from, TzGeVector3d const& to) {

@@ -113,6 +113,7 @@ Tzad::ErrorStatus TzDbObject::setField(wchar_t const* key, TzDbField* field, TzD
     auto const old = std::find_if(links.begin(), links.end(),
                                   [&](auto const& link) { return link.first == name; });
     if (old != links.end()) {
+        tzhost::beginHostChange(*old->second.record()->object);
         old->second.record()->erased = true;
         old->second = id;
     } else {

@@ -2,6 +2,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/database/drawing.h"
+#include "host/database/exact_values.h"
 #include "host/database/object_record.h"
 
 TzDbObjectImp::~TzDbObjectImp() = default;
@@ -9,6 +10,10 @@ TzDbObjectImp::~TzDbObjectImp() = default;
 TzDbObjectImp::TzDbObjectImp(TzDbObjectImp const& other)
     : unknown(other.unknown ? std::make_unique<tzhost::UnknownMembers>(*other.unknown) : nullptr),
       fields(other.fields ? std::make_unique<tzhost::FieldLinks>(*other.fields) : nullptr) {}
+
+bool TzDbObjectImp::isSameAs(TzDbObjectImp const& other) const {
+    return tzhost::agree(*this, other, &TzDbObjectImp::unknown, &TzDbObjectImp::fields);
+}
 
 std::unique_ptr<TzDbObjectImp> TzDbObjectAccess::exchange(TzDbObject& object,
                                                           std::unique_ptr<TzDbObjectImp> values) {

@@ -11,12 +11,16 @@ struct TzDbObjectRecord;
 
 namespace tzhost {
 
+struct ObjectList;
+
 // The value of a member of a drawing file that this host does not know, as JSON text, by the path
 // of its object ("" for the entity's own members, "columns" for those inside that member).
 struct UnknownMember {
     std::string path;
     std::string name;
     std::string json;
+
+    friend bool operator==(UnknownMember const&, UnknownMember const&) = default;
 };
 using UnknownMembers = std::vector<UnknownMember>;
 
@@ -36,6 +40,9 @@ public:
 
     // The values in a fresh record-less part.
     [[nodiscard]] virtual std::unique_ptr<TzDbObjectImp> copy() const = 0;
+    // Whether values of the same class are these, to the last bit; nothing computed counts. A class
+    // with values of its own compares them too.
+    [[nodiscard]] virtual bool isSameAs(TzDbObjectImp const& other) const;
     // Called when these values have become those of `object`.
     virtual void settle(TzDbObject& /*object*/) {}
     // Makes these values those of a copy in no drawing: what belongs to the original stays with it.
@@ -48,6 +55,8 @@ public:
     virtual bool showFieldText(std::wstring const& /*text*/) { return false; }
     // Whether a value of this object names that record.
     [[nodiscard]] virtual bool refersTo(TzDbObjectRecord const* /*named*/) const { return false; }
+    // The objects that this one lists in order; null for one that lists none.
+    [[nodiscard]] virtual tzhost::ObjectList* list() { return nullptr; }
     // The record whose lock decides whether this object may be written; null for none.
     [[nodiscard]] virtual TzDbObjectRecord* lockingLayer() const { return nullptr; }
 

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 
-#include "host/database/shape_imp.h"
 #include "host/database/symbol_imp.h"
 
 namespace tzhost {
@@ -22,11 +21,7 @@ std::wstring const& nameOf(TzDbObjectRecord const& record) {
 
 ObjectList* listOf(TzDbObjectRecord const& owner) {
     if (!owner.object) return nullptr;
-    TzDbObjectImp* const imp = TzDbObjectAccess::imp(*owner.object);
-    if (auto* const table = dynamic_cast<TableImp*>(imp)) return &table->shared->list;
-    if (auto* const block = dynamic_cast<BlockImp*>(imp)) return block->entities.get();
-    if (auto* const insert = dynamic_cast<InsertImp*>(imp)) return insert->attributes.get();
-    return nullptr;
+    return TzDbObjectAccess::imp(*owner.object)->list();
 }
 
 void removeFromList(TzDbObjectRecord& owner, TzDbObjectRecord& item) noexcept {

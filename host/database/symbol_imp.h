@@ -21,6 +21,7 @@ void noteLooksChanged();
 
 struct TableImp final : TzDbObjectImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] ObjectList* list() override { return &shared->list; }
 
     struct Shared {
         ObjectList list;
@@ -30,11 +31,14 @@ struct TableImp final : TzDbObjectImp {
 };
 
 struct SymbolImp : TzDbObjectImp {
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
+
     std::wstring name;
 };
 
 struct LayerImp final : SymbolImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
     bool locked = false;
     TzCmColor color = TzCmEntityColor::fromIndex(7);
@@ -42,12 +46,14 @@ struct LayerImp final : SymbolImp {
 
 struct LinetypeImp final : SymbolImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
     std::vector<double> dashes;
 };
 
 struct TextStyleImp final : SymbolImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     void forgetComputed() override { noteLooksChanged(); }
 
     std::wstring fontFile = L"txt.shx";
@@ -68,7 +74,9 @@ struct TextStyleImp final : SymbolImp {
 
 struct BlockImp final : SymbolImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
+    [[nodiscard]] ObjectList* list() override { return entities.get(); }
     // A copy of a block definition is empty.
     void loosen() override;
 

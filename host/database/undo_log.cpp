@@ -52,6 +52,16 @@ void UndoLog::collectVariables() {
     }
 }
 
+// Values that were set to what they were, or there and back, and objects that came and went, are no
+// change that a drafter would take back.
+void UndoLog::dropUnchanged() {
+    std::erase_if(open_.entries, [](Entry const& entry) {
+        TzDbObjectRecord const& record = *entry.record;
+        if (record.erased != entry.erased) return false;
+        return !entry.values || TzDbObjectAccess::imp(*record.object)->isSameAs(*entry.values);
+    });
+}
+
 // A command that only picked a point, such as LIST, is none that a drafter would take back.
 bool UndoLog::Step::isKept() const {
     return !entries.empty() || settings ||
@@ -62,6 +72,7 @@ bool UndoLog::Step::isKept() const {
 void UndoLog::end() {
     if (depth_ == 0 || --depth_ > 0) return;
     collectVariables();
+    dropUnchanged();
     if (!baseSettings_->isSameAs(drawing_.settings())) open_.settings = std::move(baseSettings_);
     Step step = std::exchange(open_, {});
     if (!step.isKept()) return;

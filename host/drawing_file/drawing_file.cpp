@@ -1,6 +1,7 @@
 #include "host/drawing_file/drawing_file.h"
 
 #include <cstdio>
+#include <new>
 
 #include "host/drawing_file/drawing_reader.h"
 #include "host/drawing_file/drawing_writer.h"
@@ -36,7 +37,9 @@ struct FileCloser {
 }  // namespace
 }  // namespace drawingfile
 
-DrawingRead readDrawing(std::filesystem::path const& file) {
+namespace {
+
+DrawingRead readUnguarded(std::filesystem::path const& file) {
     using namespace drawingfile;
     DrawingRead result;
     if (faultStatus("readDrawing", Tzad::eFileError)) {
@@ -72,6 +75,18 @@ DrawingRead readDrawing(std::filesystem::path const& file) {
     return result;
 }
 
+}  // namespace
+
+// What was read so far is gone when memory runs short, so that there is enough for the message.
+DrawingRead readDrawing(std::filesystem::path const& file) try {
+    return readUnguarded(file);
+} catch (std::bad_alloc const&) {
+    DrawingRead result;
+    result.error =
+        file.string() + ": " + localText("cannot be read") + ": " + localText("memory ran short");
+    return result;
+}
+
 void setKeptVariables(Variables::Values const& values) {
     Variables& store = Variables::instance();
     store.resetKept(KeptIn::drawing);
@@ -80,13 +95,16 @@ void setKeptVariables(Variables::Values const& values) {
 }
 
 std::string
-writeDrawing(Drawing& drawing, std::filesystem::path const& file, IfReadOnly ifReadOnly) {
+writeDrawing(Drawing& drawing, std::filesystem::path const& file, IfReadOnly ifReadOnly) try {
     using namespace drawingfile;
     if (faultStatus("writeDrawing", Tzad::eFileError))
         return file.string() + ": " + localText("cannot be written");
     SafeFile target(file, ifReadOnly);
     if (target.isOpen() && writeWhole(drawing, target) && target.commit()) return {};
     return file.string() + ": " + localText("cannot be written") + ": " + target.reason();
+} catch (std::bad_alloc const&) {
+    return file.string() + ": " + localText("cannot be written") + ": " +
+           localText("memory ran short");
 }
 
 }  // namespace tzhost

@@ -3,9 +3,9 @@
 #include <map>
 #include <type_traits>
 
-#include "host/database/field_imp.h"
 #include "host/database/open_state.h"
 #include "host/drawing_file/members.h"
+#include "host/fields/field_imp.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
 #include "tz/db/field.h"

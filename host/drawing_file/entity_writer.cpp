@@ -4,9 +4,9 @@
 #include <cmath>
 #include <initializer_list>
 
-#include "host/database/field_imp.h"
 #include "host/database/open_state.h"
 #include "host/drawing_file/members.h"
+#include "host/fields/field_imp.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 

@@ -3,12 +3,12 @@
 #include <memory>
 #include <vector>
 
-#include "host/database/mtext_imp.h"
-#include "host/database/shape_imp.h"
 #include "host/database/symbol_imp.h"
-#include "host/database/text_imp.h"
 #include "host/drawing_file/member_reader.h"
 #include "host/drawing_file/member_writer.h"
+#include "host/entities/mtext_imp.h"
+#include "host/entities/shape_imp.h"
+#include "host/entities/text_imp.h"
 
 // What a drawing file says of each class, once for reading and writing: `Members` is a MemberReader
 // or a MemberWriter. Members are written in the order in which they stand here.

@@ -1,6 +1,8 @@
 #include "host/drawing_file/table_reader.h"
 
+#include <algorithm>
 #include <cmath>
+#include <iterator>
 #include <memory>
 #include <set>
 
@@ -12,6 +14,16 @@
 namespace tzhost::drawingfile {
 namespace {
 
+// Lists the records in the order of the file; those that the file lacks come last.
+void placeInOrder(TzDbObjectId table, std::vector<TzDbObjectRecord*> order) {
+    std::vector<TzDbObjectRecord*>& items = listOf(*table.record())->items;
+    std::set<TzDbObjectRecord const*> const inFile(order.begin(), order.end());
+    std::copy_if(items.begin(), items.end(), std::back_inserter(order),
+                 [&](TzDbObjectRecord const* each) { return !inFile.contains(each); });
+    items = std::move(order);
+    noteNamesChanged();  // names are found by their records' places
+}
+
 // Reads the list of a table, each record by the description of its values.
 template <class Record, class Imp>
 void readTable(ReadContext& context, JsonValue const& list, char const* name, TzDbObjectId table) {
@@ -21,6 +33,7 @@ void readTable(ReadContext& context, JsonValue const& list, char const* name, Tz
                                     localText(", expected an array"));
     }
     std::set<TzDbObjectRecord const*> seen;
+    std::vector<TzDbObjectRecord*> order;
     for (JsonValue const& item : list.items) {
         if (item.kind != JsonKind::object) {
             return context.complain(item.line, name,
@@ -40,14 +53,15 @@ void readTable(ReadContext& context, JsonValue const& list, char const* name, Tz
         describe(members, values);
         members.keepRest();
         if (!unknown.empty()) values.unknown = std::make_unique<UnknownMembers>(unknown);
-        TzDbObjectRecord const& record =
-            found.isNull() && !context.failed
-                ? addTableRecord(context.drawing, table, std::move(fresh))
-                : *(found.isNull() ? table.record() : found.record());
+        TzDbObjectRecord& record = found.isNull() && !context.failed
+                                       ? addTableRecord(context.drawing, table, std::move(fresh))
+                                       : *(found.isNull() ? table.record() : found.record());
         if (!seen.insert(&record).second)
             members.complain("name", localText("stands twice, expected each once"));
         if (context.failed) return;
+        order.push_back(&record);
     }
+    placeInOrder(table, std::move(order));
 }
 
 // What a value of that type is called in a message.

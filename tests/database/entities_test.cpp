@@ -125,18 +125,24 @@ TEST_F(DrawingTest, DirectionStaysInThePlane) {
 }
 
 TEST_F(DrawingTest, AttachmentMovesTheLocationAndNotTheText) {
-    TzDbMText text;
-    text.setDatabaseDefaults(drawing.get());
-    (void)text.setContents(L"abc\\Pd");
-    (void)text.setRotation(0.3);
-    TzArray<TzGePoint3d> before;
-    text.getBoundingPoints(before);
-    for (int point = 1; point <= 9; ++point) {
-        ASSERT_EQ(text.setAttachmentMovingLocation(TzDbMText::AttachmentPoint(point)), Tzad::eOk);
-        TzArray<TzGePoint3d> after;
-        text.getBoundingPoints(after);
-        for (int i = 0; i < 4; ++i)
-            EXPECT_TRUE(after[i].isEqualTo(before[i], TzGeTol(1e-12))) << point;
+    for (wchar_t const* const typeface : {L"DejaVu Sans", L"@DejaVu Sans"}) {
+        TzDbMText text;
+        (void)text.setTextStyle(addStyle(typeface, typeface));
+        (void)text.setContents(L"abc\\Pd");
+        (void)text.setRotation(0.3);
+        TzArray<TzGePoint3d> before;
+        text.getBoundingPoints(before);
+        // Top left of a face with "@" is the page's upper right corner; its box was said to start
+        // there, to the right of the letters.
+        EXPECT_TRUE(before[typeface[0] == L'@' ? 1 : 0].isEqualTo(text.location()));
+        for (int point = 1; point <= 9; ++point) {
+            auto const attachment = TzDbMText::AttachmentPoint(point);
+            ASSERT_EQ(text.setAttachmentMovingLocation(attachment), Tzad::eOk);
+            TzArray<TzGePoint3d> after;
+            text.getBoundingPoints(after);
+            for (int i = 0; i < 4; ++i)
+                EXPECT_TRUE(after[i].isEqualTo(before[i], TzGeTol(1e-12))) << point;
+        }
     }
 }
 

@@ -84,6 +84,17 @@ TEST_F(DrawingTest, FieldLivesFromAppendingToErasing) {
     EXPECT_EQ(text->close(), Tzad::eOk);
 }
 
+// Fields that show each other's texts twice took all memory.
+TEST_F(DrawingTest, FieldsOfOneTextHaveALength) {
+    addText(std::wstring(60'000, L'x').c_str());
+    TzDbField field;
+    ASSERT_EQ(field.setFieldCode(L"%<\\Object 1 contents>%%<\\Object 1 contents>%%<\\Var LUNITS>%",
+                                 0, nullptr),
+              Tzad::eOk);
+    EXPECT_EQ(field.evaluate(0x20, drawing.get()), Tzad::eFieldNotEvaluated);
+    EXPECT_EQ(field.getFieldCode(2).str(), std::wstring(60'000, L'x') + L"####2");
+}
+
 TEST_F(DrawingTest, FieldNeedsADrawing) {
     TzDbMText text;
     TzDbField field;

@@ -36,6 +36,9 @@ constexpr KeptCase kKept[] = {
      R"("start":[0.1,1e+22,0],"end":[5e-324,1.7976931348623157e+308,3])"                                                                                                                                                                                                                                                                                        },
     {"SlantedDirection",     R"("entities":[{"type":"MTEXT","direction":[0,5,7]}])",
      R"("direction":[0,1,0])"                                                                                                                                                                                                                                                                                                                                   },
+ // Each save used to turn it by some last digits.
+    {"DirectionNearNormal",
+     R"("entities":[{"type":"MTEXT","normal":[0.6,0,0.8],"direction":[0.60001,0.3e-5,0.8]}])",                                                                                                                                                   R"("type":"MTEXT")"                                                                                            },
     {"SkewNormal",           R"("entities":[{"type":"CIRCLE","normal":[1,2,3],"center":[1,2,3]}])",
      R"("center":[1,2,3],"normal":[0.26)"                                                                                                                                                                                                                                                                                                                       },
     {"Columns",
@@ -53,6 +56,11 @@ constexpr KeptCase kKept[] = {
      R"("entities":[{"type":"MTEXT","contents":"a","columns":{"type":1,"count":1000,"width":1e306}}])",
      R"("inWorkingSet":true}])"                                                                                                                                                                                                                                                                                                                                 },
     {"NameOfAMark",          R"("entities read":1,"entities":[{"type":"LINE"}])",                                                                                                                                                                R"("type":"LINE")"                                                                                             },
+ // "Continuous" and "Standard" came first.
+    {"TableOrder",           R"("linetypes":[{"name":"Dashed"},{"name":"continuous"}])",
+     "[\n  {\"name\":\"Dashed\",\"dashes\":[]},\n  {\"name\":\"continuous\""                                                                                                                                                                                                                                                                                    },
+    {"LackingRecordIsLast",  R"("textStyles":[{"name":"Notes"}])",
+     "\"paperOrientation\":false},\n  {\"name\":\"Standard\""                                                                                                                                                                                                                                                                                                   },
     {"Handles",              R"("entities":[{"type":"LINE"},{"handle":"ff","type":"CIRCLE"}])",
      R"({"handle":"100","type":"LINE")"                                                                                                                                                                                                                                                                                                                         },
     {"Field",                R"("entities":[{"type":"MTEXT","contents":"old","field":"%<\\Date>%"}])",

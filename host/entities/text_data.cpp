@@ -4,9 +4,9 @@
 
 #include "host/database/classes.h"
 #include "host/database/drawing.h"
-#include "host/database/style_look.h"
 #include "host/database/symbol_imp.h"
-#include "host/database/text_imp.h"
+#include "host/entities/style_look.h"
+#include "host/entities/text_imp.h"
 #include "host/layout/line_layout.h"
 #include "tz/db/text.h"
 #include "tz/rx/resbuf.h"

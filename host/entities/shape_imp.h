@@ -12,6 +12,7 @@ namespace tzhost {
 
 struct LineImp final : EntityImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
     TzGePoint3d start;
     TzGePoint3d end;
@@ -19,6 +20,7 @@ struct LineImp final : EntityImp {
 
 struct CircleImp final : EntityImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
     TzGePoint3d center;
     TzGeVector3d normal = TzGeVector3d::kZAxis;
@@ -27,10 +29,12 @@ struct CircleImp final : EntityImp {
 
 struct InsertImp final : EntityImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     [[nodiscard]] bool refersTo(TzDbObjectRecord const* named) const override {
         return block.record() == named || EntityImp::refersTo(named);
     }
 
+    [[nodiscard]] ObjectList* list() override { return attributes.get(); }
     // A copy draws the original's attributes, which its own list names.
     void loosen() override;
     void onErase(bool erasing) override;

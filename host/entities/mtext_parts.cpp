@@ -1,7 +1,7 @@
 #include <cmath>
 
 #include "host/database/geometry.h"
-#include "host/database/mtext_imp.h"
+#include "host/entities/mtext_imp.h"
 #include "tz/db/mtext.h"
 
 using tzhost::beginChange;

@@ -4,8 +4,8 @@
 
 #include "host/base/entity_drawing.h"
 #include "host/database/geometry.h"
-#include "host/database/text_drawing.h"
-#include "host/database/text_imp.h"
+#include "host/entities/text_drawing.h"
+#include "host/entities/text_imp.h"
 #include "tz/db/symbol_table.h"
 
 using tzhost::assign;

@@ -1,7 +1,7 @@
 #include "tz/gi/text_style.h"
 
-#include "host/database/style_look.h"
 #include "host/database/symbol_imp.h"
+#include "host/entities/style_look.h"
 #include "host/layout/line_layout.h"
 
 void TzGiTextStyle::setFont(

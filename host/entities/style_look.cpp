@@ -1,4 +1,4 @@
-#include "host/database/style_look.h"
+#include "host/entities/style_look.h"
 
 #include "host/database/drawing.h"
 #include "host/database/symbol_imp.h"

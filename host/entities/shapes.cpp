@@ -4,7 +4,7 @@
 
 #include "host/base/entity_drawing.h"
 #include "host/database/geometry.h"
-#include "host/database/shape_imp.h"
+#include "host/entities/shape_imp.h"
 #include "tz/gi/draw.h"
 
 using tzhost::assign;

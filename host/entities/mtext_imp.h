@@ -19,12 +19,15 @@ struct MTextBackground {
     double scale = 1.5;
     TzCmTransparency transparency;
     bool useBackgroundColor = false;
+
+    friend bool operator==(MTextBackground const&, MTextBackground const&) = default;
 };
 
 struct MTextImp final : TextStyledImp {
     MTextImp() = default;
     MTextImp(MTextImp const& other);
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     void forgetComputed() override;
     bool showFieldText(std::wstring const& text) override;
 
@@ -34,6 +37,12 @@ struct MTextImp final : TextStyledImp {
 
     // The size of the laid out text, measured when it is not known.
     [[nodiscard]] LayoutPoint const& size() const;
+    // The box of that size about the location, along the direction and up from it.
+    [[nodiscard]] LayoutBox box() const;
+    // The place of the attachment point of that number on the box.
+    [[nodiscard]] TzGePoint3d placeOf(short attachmentPoint) const;
+    // A place given in the frame of the box.
+    [[nodiscard]] TzGePoint3d at(LayoutPoint const& point) const;
     // The whole layout. Kept for a text in no drawing, else as long as the caller keeps it.
     [[nodiscard]] std::shared_ptr<MTextLayout const> layout() const;
 

@@ -14,6 +14,7 @@ namespace tzhost {
 
 struct TextImp : TextStyledImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     void forgetComputed() override { looks_ = 0; }
     bool showFieldText(std::wstring const& shown) override;
 
@@ -38,6 +39,7 @@ private:
 
 struct AttributeImp final : TextImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
     std::wstring tag;
 };
@@ -47,6 +49,7 @@ struct DefinitionImp final : TextImp {
     DefinitionImp(DefinitionImp const& other);
     ~DefinitionImp() override;
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     void settle(TzDbObject& object) override;
     [[nodiscard]] bool refersTo(TzDbObjectRecord const* named) const override;
     [[nodiscard]] std::wstring const& shownText() const override { return tag; }

@@ -1,4 +1,4 @@
-#include "host/database/field_properties.h"
+#include "host/fields/field_properties.h"
 
 #include "host/database/classes.h"
 #include "host/database/open_state.h"

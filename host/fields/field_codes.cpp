@@ -1,12 +1,12 @@
-#include "host/database/field_codes.h"
+#include "host/fields/field_codes.h"
 
 #include <cstdlib>
 #include <ctime>
 
 #include "host/base/result_time.h"
 #include "host/database/drawing.h"
-#include "host/database/field_properties.h"
 #include "host/database/open_state.h"
+#include "host/fields/field_properties.h"
 #include "host/runtime/words.h"
 #include "host/settings/variables.h"
 #include "host/text/utf8.h"
@@ -86,10 +86,16 @@ std::optional<FieldSpan> findField(std::wstring_view text, std::size_t start) {
 
 ExpandedText expandFields(std::wstring_view text, Drawing const* drawing) {
     ExpandedText result;
+    std::size_t letters = 0;  // of all values
     std::size_t at = 0;
     while (auto const code = findField(text, at)) {
         result.text += text.substr(at, code->first - at);
-        Value const value = valueOf(text.substr(code->first, code->end - code->first), drawing);
+        Value value = valueOf(text.substr(code->first, code->end - code->first), drawing);
+        if (value && value->size() > kMostFieldLetters - letters) {
+            value.reset();
+            result.tooLong = true;
+        }
+        letters += value ? value->size() : 0;
         result.text += value ? std::wstring_view(*value) : kFailed;
         result.complete = result.complete && value.has_value();
         at = code->end;

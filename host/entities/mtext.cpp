@@ -2,10 +2,10 @@
 
 #include <cmath>
 
-#include "host/database/field_links.h"
 #include "host/database/geometry.h"
-#include "host/database/mtext_imp.h"
 #include "host/database/user_system.h"
+#include "host/entities/mtext_imp.h"
+#include "host/fields/field_links.h"
 #include "tz/db/field.h"
 #include "tz/db/symbol_table.h"
 
@@ -114,16 +114,13 @@ Tzad::ErrorStatus TzDbMText::setAttachment(AttachmentPoint point) {
 }
 
 Tzad::ErrorStatus TzDbMText::setAttachmentMovingLocation(AttachmentPoint point) {
-    AttachmentPoint const before = attachment();
     if (auto const fault = faultStatus("TzDbMText::setAttachmentMovingLocation")) return fault;
     if (point < kTopLeft || point > kBottomRight) return Tzad::eOutOfRange;
     if (auto const status = tzhost::beginChange(*this)) return status;
     MTextImp& values = valuesOf<MTextImp>(*this);
-    TzGeVector3d const up = values.normal.crossProduct(values.direction);
-    double const across = ((point - 1) % 3 - (before - 1) % 3) * 0.5 * actualWidth();
-    double const down = ((point - 1) / 3 - (before - 1) / 3) * 0.5 * actualHeight();
-    values.location += values.direction * across - up * down;
-    values.attachment = static_cast<short>(point);
+    auto const next = static_cast<short>(point);
+    values.location = values.placeOf(next);
+    values.attachment = next;
     values.forgetComputed();
     return Tzad::eOk;
 }
@@ -188,16 +185,12 @@ double TzDbMText::actualHeight(TzGiWorldDraw* /*draw*/) const {
 
 void TzDbMText::getBoundingPoints(TzArray<TzGePoint3d>& points) const {
     MTextImp const& values = valuesOf<MTextImp>(*this);
-    TzGeVector3d const across = values.direction * actualWidth();
-    TzGeVector3d const up = values.normal.crossProduct(values.direction) * actualHeight();
-    int const place = values.attachment - 1;
-    TzGePoint3d const topLeft =
-        values.location - across * (place % 3 * 0.5) + up * (place / 3 * 0.5);
+    tzhost::LayoutBox const box = values.box();
     points.removeAll();
-    points.append(topLeft);
-    points.append(topLeft + across);
-    points.append(topLeft - up);
-    points.append(topLeft + across - up);
+    points.append(values.at({box.left, box.top}));
+    points.append(values.at({box.right, box.top}));
+    points.append(values.at({box.left, box.bottom}));
+    points.append(values.at({box.right, box.bottom}));
 }
 
 bool TzDbMText::isPlanar() const {

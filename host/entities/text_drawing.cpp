@@ -1,7 +1,7 @@
-#include "host/database/text_drawing.h"
+#include "host/entities/text_drawing.h"
 
 #include "host/base/entity_drawing.h"
-#include "host/database/mtext_imp.h"
+#include "host/entities/mtext_imp.h"
 #include "host/layout/mtext_layout.h"
 #include "tz/db/mtext.h"
 

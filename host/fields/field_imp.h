@@ -9,6 +9,7 @@ namespace tzhost {
 
 struct FieldImp final : TzDbObjectImp {
     [[nodiscard]] std::unique_ptr<TzDbObjectImp> copy() const override;
+    [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
     void onErase(bool erasing) override;
 
     std::wstring code;

@@ -1,14 +1,14 @@
-#include "host/database/new_entity.h"
+#include "host/entities/new_entity.h"
 
 #include <set>
 #include <vector>
 
 #include "host/database/classes.h"
 #include "host/database/drawing.h"
-#include "host/database/field_links.h"
 #include "host/database/object_list.h"
-#include "host/database/shape_imp.h"
 #include "host/database/symbol_imp.h"
+#include "host/entities/shape_imp.h"
+#include "host/fields/field_links.h"
 #include "tz/db/mtext.h"
 
 namespace tzhost {

@@ -3,8 +3,8 @@
 #include "host/database/drawing.h"
 #include "host/database/entity_imp.h"
 #include "host/database/geometry.h"
-#include "host/database/new_entity.h"
 #include "host/database/symbol_imp.h"
+#include "host/entities/new_entity.h"
 
 using tzhost::BlockImp;
 using tzhost::faultStatus;

@@ -4,10 +4,13 @@
 #include <new>
 
 #include "host/database/drawing.h"
-#include "host/database/field_codes.h"
-#include "host/database/field_imp.h"
-#include "host/database/field_links.h"
+#include "host/database/exact_values.h"
+#include "host/fields/field_codes.h"
+#include "host/fields/field_imp.h"
+#include "host/fields/field_links.h"
+#include "host/platform/output.h"
 #include "host/runtime/notification.h"
+#include "host/text/local_text.h"
 #include "tz/db/mtext.h"
 #include "tz/gi/draw.h"
 
@@ -27,10 +30,24 @@ void unlink(TzDbObject& owner, TzDbObjectRecord const* field) {
     if (fields->empty()) fields.reset();
 }
 
+void sayTooLong() {
+    TzString const line =
+        TzString::formatted(localText(L"\nFields of one text show %d letters at most; the longer "
+                                      L"value is shown as ####."),
+                            static_cast<int>(kMostFieldLetters));
+    print(line.str());
+}
+
 }  // namespace
 
 std::unique_ptr<TzDbObjectImp> FieldImp::copy() const {
     return std::make_unique<FieldImp>(*this);
+}
+
+bool FieldImp::isSameAs(TzDbObjectImp const& other) const {
+    return TzDbObjectImp::isSameAs(other) &&
+           agree(*this, static_cast<FieldImp const&>(other), &FieldImp::code, &FieldImp::shown,
+                 &FieldImp::evaluated);
 }
 
 // The object keeps the text that the field showed last.
@@ -92,6 +109,7 @@ Tzad::ErrorStatus TzDbField::evaluate(int context, TzDbDatabase* database) {
     FieldImp& values = valuesOf<FieldImp>(*this);
     auto expanded = tzhost::expandFields(values.code, tzhost::drawingOf(database));
     if (auto const status = tzhost::beginChange(*this)) return status;
+    if (expanded.tooLong) tzhost::sayTooLong();
     values.shown = std::move(expanded.text);
     values.evaluated = true;
     if (TzDbObjectRecord const* const record = objectId().record(); record && record->owner) {

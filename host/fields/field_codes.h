@@ -21,10 +21,14 @@ struct FieldSpan {
 [[nodiscard]] std::optional<FieldSpan> findField(std::wstring_view text, std::size_t start);
 
 // A text with its codes computed; those that cannot be show "####". Nothing is looked at twice: a
-// value that looks like a code stays as it is. `drawing` may be null.
+// value that looks like a code stays as it is. The values of one text have no more than
+// kMostFieldLetters together: fields that show each other's texts twice would fill any memory.
+// `drawing` may be null.
+inline constexpr std::size_t kMostFieldLetters = 100'000;
 struct ExpandedText {
     std::wstring text;
     bool complete = true;  // every code could be computed
+    bool tooLong = false;  // a value was left out for its length
 };
 [[nodiscard]] ExpandedText expandFields(std::wstring_view text, Drawing const* drawing);
 

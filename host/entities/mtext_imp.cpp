@@ -1,7 +1,9 @@
-#include "host/database/mtext_imp.h"
+#include "host/entities/mtext_imp.h"
 
-#include "host/database/style_look.h"
+#include "host/database/exact_values.h"
 #include "host/database/symbol_imp.h"
+#include "host/entities/style_look.h"
+#include "host/layout/attachment_box.h"
 #include "host/layout/mtext_layout.h"
 
 namespace tzhost {
@@ -17,6 +19,15 @@ MTextImp::MTextImp(MTextImp const& other)
 
 std::unique_ptr<TzDbObjectImp> MTextImp::copy() const {
     return std::make_unique<MTextImp>(*this);
+}
+
+bool MTextImp::isSameAs(TzDbObjectImp const& other) const {
+    return TextStyledImp::isSameAs(other) &&
+           agree(*this, static_cast<MTextImp const&>(other), &MTextImp::contents,
+                 &MTextImp::location, &MTextImp::normal, &MTextImp::direction,
+                 &MTextImp::textHeight, &MTextImp::width, &MTextImp::height,
+                 &MTextImp::lineSpacingFactor, &MTextImp::lineSpacingStyle, &MTextImp::attachment,
+                 &MTextImp::columns, &MTextImp::background);
 }
 
 void MTextImp::forgetComputed() {
@@ -72,6 +83,21 @@ std::shared_ptr<MTextLayout const> MTextImp::layout() const {
 LayoutPoint const& MTextImp::size() const {
     if (looks_ != looksGeneration()) (void)layout();
     return size_;
+}
+
+LayoutBox MTextImp::box() const {
+    LayoutPoint const& measured = size();
+    return boxAt(attachmentShares(attachment, lookOfStyle(style)), measured.x, measured.y);
+}
+
+TzGePoint3d MTextImp::placeOf(short attachmentPoint) const {
+    LayoutBox const now = box();
+    AttachmentShares const shares = attachmentShares(attachmentPoint, lookOfStyle(style));
+    return at({now.left + shares.along * now.width(), now.top - shares.down * now.height()});
+}
+
+TzGePoint3d MTextImp::at(LayoutPoint const& point) const {
+    return location + direction * point.x + normal.crossProduct(direction) * point.y;
 }
 
 }  // namespace tzhost

@@ -1,17 +1,25 @@
-#include "host/database/text_imp.h"
+#include "host/entities/text_imp.h"
 
 #include <algorithm>
 
+#include "host/database/exact_values.h"
 #include "host/database/geometry.h"
-#include "host/database/mtext_imp.h"
-#include "host/database/style_look.h"
 #include "host/database/symbol_imp.h"
+#include "host/entities/mtext_imp.h"
+#include "host/entities/style_look.h"
 #include "host/layout/line_layout.h"
 
 namespace tzhost {
 
 std::unique_ptr<TzDbObjectImp> TextImp::copy() const {
     return std::make_unique<TextImp>(*this);
+}
+
+bool TextImp::isSameAs(TzDbObjectImp const& other) const {
+    return TextStyledImp::isSameAs(other) &&
+           agree(*this, static_cast<TextImp const&>(other), &TextImp::text, &TextImp::position,
+                 &TextImp::normal, &TextImp::rotation, &TextImp::height, &TextImp::widthFactor,
+                 &TextImp::oblique);
 }
 
 bool TextImp::showFieldText(std::wstring const& shown) {
@@ -42,6 +50,11 @@ std::unique_ptr<TzDbObjectImp> AttributeImp::copy() const {
     return std::make_unique<AttributeImp>(*this);
 }
 
+bool AttributeImp::isSameAs(TzDbObjectImp const& other) const {
+    return TextImp::isSameAs(other) &&
+           agree(*this, static_cast<AttributeImp const&>(other), &AttributeImp::tag);
+}
+
 DefinitionImp::DefinitionImp(DefinitionImp const& other)
     : TextImp(other), tag(other.tag), prompt(other.prompt) {
     if (!other.lines) return;
@@ -53,6 +66,14 @@ DefinitionImp::~DefinitionImp() = default;
 
 std::unique_ptr<TzDbObjectImp> DefinitionImp::copy() const {
     return std::make_unique<DefinitionImp>(*this);
+}
+
+bool DefinitionImp::isSameAs(TzDbObjectImp const& other) const {
+    auto const& same = static_cast<DefinitionImp const&>(other);
+    if (!TextImp::isSameAs(other)) return false;
+    if (!agree(*this, same, &DefinitionImp::tag, &DefinitionImp::prompt)) return false;
+    if (!lines || !same.lines) return lines == same.lines;
+    return TzDbObjectAccess::imp(*lines)->isSameAs(*TzDbObjectAccess::imp(*same.lines));
 }
 
 void DefinitionImp::settle(TzDbObject& object) {

@@ -1,7 +1,7 @@
 #include "host/base/entity_drawing.h"
 #include "host/database/geometry.h"
-#include "host/database/text_drawing.h"
-#include "host/database/text_imp.h"
+#include "host/entities/text_drawing.h"
+#include "host/entities/text_imp.h"
 #include "tz/db/text.h"
 
 using tzhost::AttributeImp;
