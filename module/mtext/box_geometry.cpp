@@ -2,18 +2,11 @@
 
 #include <utility>
 
+#include "module/geometry/attachments.h"
 #include "tz/ge/line3d.h"
 #include "tz/ge/plane.h"
 
 namespace {
-
-// Columns of the attachment points.
-enum class Column { left, centre, right };
-
-Column columnOf(int attachment) {
-    constexpr Column kColumns[] = {Column::left, Column::centre, Column::right};
-    return attachment >= 1 && attachment <= 9 ? kColumns[(attachment - 1) % 3] : Column::left;
-}
 
 // Gives the corners the names of the places at which they stand.
 void putInOrder(BoxCorners& corners, UserAxes const& frame) {
@@ -51,17 +44,14 @@ TzGePoint3d attachmentPoint(BoxCorners const& corners,
                             TzGeVector3d const& width,
                             TzGeVector3d const& height,
                             int attachment) {
-    switch (attachment) {
-    case 2: return corners.topLeft + width / 2;
-    case 3: return corners.topRight;
-    case 4: return corners.topLeft - height / 2;
-    case 5: return corners.topLeft + width / 2 - height / 2;
-    case 6: return corners.topRight - height / 2;
-    case 7: return corners.bottomLeft;
-    case 8: return corners.bottomLeft + width / 2;
-    case 9: return corners.bottomRight;
-    default: return corners.topLeft;
-    }
+    BoxPlace const place = placeOfAttachment(attachment);
+    bool const right = place.column == BoxColumn::right;
+    TzGePoint3d point = place.row == BoxRow::bottom
+                            ? (right ? corners.bottomRight : corners.bottomLeft)
+                            : (right ? corners.topRight : corners.topLeft);
+    if (place.column == BoxColumn::centre) point += width / 2;
+    if (place.row == BoxRow::middle) point -= height / 2;
+    return point;
 }
 
 BoxEdges edgesOf(BoxCorners const& corners, LineFlow flow) {
@@ -108,12 +98,12 @@ TzGePoint3d samplePosition(BoxCorners const& corners,
                            double textSize,
                            double textWidth) {
     // Vertical text is set in by half its size at the left alone.
-    switch (columnOf(attachment)) {
-    case Column::centre:
+    switch (placeOfAttachment(attachment).column) {
+    case BoxColumn::centre:
         return corners.topLeft + (corners.topRight - corners.topLeft) / 2 - frame.y * textSize -
                frame.x * (0.5 * textWidth);
-    case Column::right: return corners.topRight - frame.y * textSize - frame.x * textWidth;
-    case Column::left: break;
+    case BoxColumn::right: return corners.topRight - frame.y * textSize - frame.x * textWidth;
+    case BoxColumn::left: break;
     }
     return flow == LineFlow::vertical ? corners.topLeft + frame.x * (0.5 * textSize)
                                       : corners.topLeft - frame.y * textSize;

@@ -2,7 +2,7 @@
 
 #include <array>
 
-#include "module/mtext/user_axes.h"
+#include "module/geometry/user_axes.h"
 #include "tz/ge/point3d.h"
 #include "tz/ge/vector3d.h"
 

@@ -4,7 +4,7 @@
 #include <iterator>
 
 #include "module/mtext/column_outcome.h"
-#include "module/mtext/question.h"
+#include "module/prompt/asking.h"
 #include "module/prompt/integer_input.h"
 #include "module/prompt/keyword_input.h"
 #include "module/prompt/real_input.h"

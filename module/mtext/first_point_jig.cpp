@@ -1,7 +1,8 @@
 #include "module/mtext/first_point_jig.h"
 
+#include "module/geometry/plain_edges.h"
+#include "module/geometry/user_axes.h"
 #include "module/mtext/sample_text.h"
-#include "module/mtext/user_axes.h"
 #include "module/styles/style_rules.h"
 #include "tz/rx/variables.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/prompt/jig.h"
+#include "module/prompt/jig_entity.h"
 #include "tz/ge/point3d.h"
 #include "tz/ge/vector3d.h"
 

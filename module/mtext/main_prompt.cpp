@@ -1,11 +1,11 @@
 // The first half of the dialogue of MTEXT: the first corner.
 
+#include "module/geometry/points.h"
 #include "module/holders/scope_guard.h"
 #include "module/host_calls/sys_var.h"
 #include "module/host_calls/unit_converter.h"
 #include "module/mtext/first_point_jig.h"
-#include "module/mtext/points.h"
-#include "module/mtext/question.h"
+#include "module/prompt/asking.h"
 #include "module/prompt/jig_input.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/string_table.h"

@@ -1,8 +1,8 @@
 #include "tz/mte/mtext_command.h"
 
+#include "module/geometry/points.h"
+#include "module/geometry/user_axes.h"
 #include "module/host_calls/class_registration.h"
-#include "module/mtext/points.h"
-#include "module/mtext/user_axes.h"
 #include "module/styles/line_spacing.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/attachment_ids.h"

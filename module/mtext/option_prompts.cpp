@@ -3,8 +3,8 @@
 #include <iterator>
 
 #include "module/host_calls/sys_var.h"
-#include "module/mtext/question.h"
 #include "module/prompt/angle_input.h"
+#include "module/prompt/asking.h"
 #include "module/prompt/distance_input.h"
 #include "module/prompt/keyword_input.h"
 #include "module/prompt/string_input.h"

@@ -1,5 +1,7 @@
 #include "module/mtext/rectangle_jig.h"
 
+#include "module/geometry/attachments.h"
+#include "module/geometry/plain_edges.h"
 #include "module/host_calls/sys_var.h"
 #include "module/mtext/sample_text.h"
 #include "module/styles/style_rules.h"
@@ -127,8 +129,9 @@ bool CTzsMtextJig::subWorldDraw(TzGiWorldDraw* draw) {
     CTzsJigEntity::subWorldDraw(draw);
     for (BoxEdge const& side : edgesOf(m_corners, flow()).sides)
         DrawLine(draw, side.from, side.to);
-    if (m_nAttachment >= 1 && m_nAttachment <= 9) {
-        EdgeDrawing const& edges = kEdgesByRow[(m_nAttachment - 1) / 3];
+    if (isAttachment(m_nAttachment)) {
+        auto const row = static_cast<std::size_t>(placeOfAttachment(m_nAttachment).row);
+        EdgeDrawing const& edges = kEdgesByRow[row];
         (this->*edges.top)(draw);
         (this->*edges.bottom)(draw);
     }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "module/mtext/box_geometry.h"
-#include "module/prompt/jig.h"
+#include "module/prompt/jig_entity.h"
 #include "tz/db/object_id.h"
 #include "tz/ge/point3d.h"
 #include "tz/ge/vector3d.h"

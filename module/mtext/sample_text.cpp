@@ -47,8 +47,3 @@ void drawSampleText(TzGiWorldDraw& draw,
                     TzGiTextStyle const& style) {
     draw.geometry().text(position, normal, direction, text, text.length(), true, style);
 }
-
-void drawPlainEdges(TzGiWorldDraw& draw) {
-    ShareDB::disableVisualStyleEdgeModifiers(draw.subEntityTraits(), draw.context(), true, true,
-                                             false);
-}

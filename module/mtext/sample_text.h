@@ -27,5 +27,3 @@ void drawSampleText(TzGiWorldDraw& draw,
                     TzGeVector3d const& normal,
                     TzGeVector3d const& direction,
                     TzGiTextStyle const& style);
-// Lines and text of a preview stand as they are, without the edge effects of the visual style.
-void drawPlainEdges(TzGiWorldDraw& draw);

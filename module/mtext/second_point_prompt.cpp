@@ -2,10 +2,10 @@
 
 #include <array>
 
+#include "module/geometry/points.h"
 #include "module/mtext/column_outcome.h"
-#include "module/mtext/points.h"
-#include "module/mtext/question.h"
 #include "module/mtext/rectangle_jig.h"
+#include "module/prompt/asking.h"
 #include "module/prompt/jig_input.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/attachment_ids.h"

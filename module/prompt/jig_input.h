@@ -1,7 +1,7 @@
 #pragma once
 
 #include "module/prompt/input.h"
-#include "module/prompt/jig.h"
+#include "module/prompt/jig_entity.h"
 
 // A question that is answered by a drag, with a preview.
 //

@@ -2,7 +2,7 @@
 
 #include "module/edit/editor_result.h"
 #include "module/edit/session_field.h"
-#include "module/mtext/points.h"
+#include "module/geometry/points.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/attachment_ids.h"
 #include "tz/mte/entry_points.h"

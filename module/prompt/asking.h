@@ -2,7 +2,7 @@
 
 #include "module/prompt/input.h"
 
-// What the questions of MTEXT share.
+// Questions that are asked once, or until they are answered.
 
 // An answer that carries a value: one that was given, or the default behind an empty answer.
 [[nodiscard]] constexpr bool isAnswered(int status) {

@@ -1,4 +1,4 @@
-#include "module/prompt/jig.h"
+#include "module/prompt/jig_entity.h"
 
 #include "tz/db/host_services.h"
 

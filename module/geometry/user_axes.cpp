@@ -1,4 +1,4 @@
-#include "module/mtext/user_axes.h"
+#include "module/geometry/user_axes.h"
 
 #include "module/host_calls/sys_var.h"
 #include "tz/db/database.h"
