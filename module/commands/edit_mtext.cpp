@@ -8,14 +8,12 @@
 #include "module/holders/scope_guard.h"
 #include "module/host_calls/class_registration.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 #include "tz/ed/selection.h"
 #include "tz/mte/entry_points.h"
 
 namespace {
-
-constexpr unsigned kPickPrompt = 160;
-constexpr unsigned kOnlyTheFirst = 161;
 
 // How the command passes its arguments on to the gate.
 struct EditorSide {
@@ -42,7 +40,7 @@ void editSelected(long long* set, EditReport const& report, EditorSide const& si
     if (tzedSSLength(set, &length) != Tzad::ePromptNormal) return;
     TzScopeGuard const freed(nullptr, [set] { tzedSSFree(set); });
     runReported(report, [&] {
-        if (length != 1) tzutPrintf(L"%ls", gStringTable[kOnlyTheFirst].kwszPtr());
+        if (length != 1) tzutPrintf(L"%ls", gStringTable[kText.onlyTheFirst].kwszPtr());
         return EditMtextInSelectionSet(set, side.tab, side.interactive, side.view);
     });
 }
@@ -50,7 +48,7 @@ void editSelected(long long* set, EditReport const& report, EditorSide const& si
 // Asks until something or nothing was hit; false when the user cancelled. A pick at nothing leaves
 // the name zero, which is no object's, so the editor is not reached.
 bool pickOne(long long* name) {
-    TzString const prompt = gStringTable[kPickPrompt];
+    TzString const prompt = gStringTable[kText.pickText];
     for (;;) {
         double point[3] = {};
         switch (tzedEntSel(prompt, name, point)) {

@@ -2,7 +2,6 @@
 
 #include <cmath>
 #include <functional>
-#include <iterator>
 #include <numbers>
 
 #include "module/commands/locked_warning_filter.h"
@@ -13,6 +12,7 @@
 #include "module/texts/attachment_ids.h"
 #include "module/texts/resources.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ap/document.h"
 #include "tz/db/host_services.h"
 #include "tz/db/mtext.h"
@@ -24,18 +24,6 @@
 #include "tz/rx/class.h"
 
 namespace {
-
-constexpr unsigned kJustificationPrompt = 0x430;
-constexpr unsigned kPropertyPrompt = 0x63F1;
-constexpr unsigned kRotationPrompt = 0x8A03;
-constexpr unsigned kStylePrompt = 0x8A72;
-constexpr unsigned kUnknownStyle = 0x81C8;
-
-// The warning about locked layers: a line for each text, the number found, the number locked.
-constexpr unsigned kLockedLine = 0x2F87;
-constexpr unsigned kFound = 0xF039;
-constexpr unsigned kOneLocked = 0xA9C5;
-constexpr unsigned kManyLocked = 0xDA9B;
 
 constexpr double kDegrees = 180.0;
 
@@ -81,10 +69,10 @@ void changeTextPropery(long long const (&set)[2], std::function<void(TzDbMText*)
 
 void changeTextStyle(long long const (&set)[2]) {
     TzString name;
-    if (tzedGetString(1, gStringTable[kStylePrompt], name) != Tzad::ePromptNormal) return;
+    if (tzedGetString(1, gStringTable[kText.newStylePrompt], name) != Tzad::ePromptNormal) return;
     TzDbObjectId const style = GetTextStyleID(name);
     if (style.isNull()) {
-        tzutPrintf(L"%ls", gStringTable[kUnknownStyle].kwszPtr());
+        tzutPrintf(L"%ls", gStringTable[kText.unknownStyle].kwszPtr());
         return;
     }
     changeTextPropery(set, [style](TzDbMText* text) { (void)text->setTextStyle(style); });
@@ -94,16 +82,16 @@ void changeTextStyle(long long const (&set)[2]) {
 void changeTextRotate(long long const (&set)[2]) {
     int const degrees =
         static_cast<int>(std::lround(firstText(set).rotation * kDegrees / std::numbers::pi));
-    TzEdPromptAngle prompt(TzString::formatted(gStringTable[kRotationPrompt], degrees));
+    TzEdPromptAngle prompt(TzString::formatted(gStringTable[kText.newRotationPrompt], degrees));
     if (prompt.getAngle() != Tzad::ePromptNormal) return;
     double const angle = prompt.value();
     changeTextPropery(set, [angle](TzDbMText* text) { (void)text->setRotation(angle); });
 }
 
 void changeTextJustify(long long const (&set)[2]) {
-    unsigned int ids[] = {1048, 1049, 1050, 1051, 1052, 1053, 1054, 1055, 1056};
-    CKeywordTable keywords(ids, static_cast<int>(std::size(ids)));
-    CTzsKeywordInput input(0, keywords, gStringTable[kJustificationPrompt]);
+    CKeywordTable keywords(kAttachmentKeywords.data(),
+                           static_cast<int>(kAttachmentKeywords.size()));
+    CTzsKeywordInput input(0, keywords, gStringTable[kText.justificationPrompt]);
     input.SetDefault(MapAttachmentToIDS(firstText(set).attachment));
     int const status = input.Prompt();
     if (status != statusNormal && status != statusNone) return;
@@ -128,10 +116,11 @@ constexpr wchar_t kPropertyWords[] = L"Style Rotate Justify";
 
 void report(FilterCount counts) {
     if (counts.locked > 0)
-        TzLockedWarningFilter::sendWarning(getWarningId(kLockedLine), gStringTable[kLockedLine],
-                                           gStringTable[kFound], gStringTable[kOneLocked],
-                                           gStringTable[kManyLocked], counts);
-    tzutPrintf(gStringTable[kFound], counts.found);
+        TzLockedWarningFilter::sendWarning(
+            getWarningId(kText.lockedLine), gStringTable[kText.lockedLine],
+            gStringTable[kText.textsFound], gStringTable[kText.oneLocked],
+            gStringTable[kText.manyLocked], counts);
+    tzutPrintf(gStringTable[kText.textsFound], counts.found);
 }
 
 // The texts selected before the command, without those on locked layers; false when the user
@@ -161,7 +150,7 @@ void changeMtextProperties() {
     if (!selectTexts(set)) return;
 
     TzEdPromptKeyword prompt;
-    prompt.setMessageAndKeywords(gStringTable[kPropertyPrompt], kPropertyWords);
+    prompt.setMessageAndKeywords(gStringTable[kText.propertyPrompt], kPropertyWords);
     if (prompt.getKeyword() != Tzad::ePromptNormal) return;
     for (Property const& property : kProperties)
         if (*prompt.resultString().kwszPtr() == property.keyword) property.change(set);

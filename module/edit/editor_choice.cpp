@@ -2,15 +2,14 @@
 
 #include "module/host_calls/sys_var.h"
 #include "module/texts/resources.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/editors.h"
 #include "tz/pal/settings.h"
 
 namespace {
 
-constexpr int kBuiltInEditorId = 0x8009;
-
 TzString const& builtInEditor() {
-    static TzString const name = loadResourceString(kBuiltInEditorId);
+    static TzString const name = loadResourceString(kText.inPlaceEditor);
     return name;
 }
 

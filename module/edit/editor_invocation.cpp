@@ -9,6 +9,7 @@
 #include "module/host_calls/lock_tests.h"
 #include "module/host_calls/sys_var.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/editors.h"
 #include "tz/ed/print.h"
@@ -19,12 +20,6 @@
 
 namespace {
 
-// Messages.
-constexpr unsigned kNotWritable = 158;
-constexpr unsigned kNoText = 1023;
-constexpr unsigned kOnLockedLayer = 2083;
-constexpr unsigned kOutsideWorkingSet = 2086;
-
 int refuse(unsigned message) {
     tzutPrintf(L"%ls", gStringTable[message].kwszPtr());
     return kNoEditor;
@@ -33,8 +28,8 @@ int refuse(unsigned message) {
 // The message about the lock that forbids to edit a text; 0 when there is none.
 unsigned lockMessage(TzDbMText* text) {
     if (!text) return 0;
-    if (IsOnLockedLayer(text)) return kOnLockedLayer;
-    return IsLockedFromWorkingSet(text) ? kOutsideWorkingSet : 0;
+    if (IsOnLockedLayer(text)) return kText.onLockedLayer;
+    return IsLockedFromWorkingSet(text) ? kText.outsideWorkingSet : 0;
 }
 
 // Editors that tell no more than whether the user accepted.
@@ -79,10 +74,10 @@ int InvokeEditorOn(EasyObject<TzDbMText>& text,
                    bool attribute,
                    bool option13,
                    bool option14) {
-    if (!text.object) return refuse(kNoText);
+    if (!text.object) return refuse(kText.noMultilineText);
     CEasyUpgrade upgrade;
     if (!text->isWriteEnabled() && !upgrade.Upgrade(text.object)) {
-        TwHostMessageBox::simple(gStringTable[kNotWritable], kMessageBoxError);
+        TwHostMessageBox::simple(gStringTable[kText.notWritable], kMessageBoxError);
         return kNoEditor;
     }
     gMTextFixed = 0;

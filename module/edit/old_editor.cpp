@@ -2,17 +2,12 @@
 
 #include "module/edit/editor_result.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 #include "tz/mte/globals.h"
 
-namespace {
-
-constexpr unsigned kNoDialogEditor = 1025;
-
-}  // namespace
-
 int InvokeOldEditorOn(EasyObject<TzDbMText>&, MTETabType, unsigned int, bool) {
-    tzutPrintf(L"%ls", gStringTable[kNoDialogEditor].kwszPtr());
+    tzutPrintf(L"%ls", gStringTable[kText.noDialogEditor].kwszPtr());
     return kNoEditor;
 }
 

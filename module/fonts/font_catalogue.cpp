@@ -4,12 +4,10 @@
 
 #include "module/texts/resources.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 
 namespace {
-
-constexpr unsigned kLoadingElsewhere = 169;
-constexpr unsigned kLoadedElsewhere = 170;
 
 // The entry under the lower-cased key as what the read operations expect, or null.
 template <class Entry, class Table>
@@ -27,10 +25,10 @@ void dropAt(CStdStrW& face) {
 
 CTzadFontMapDatabase::CTzadFontMapDatabase(signed char flag) {
     if (m_sTechnologyTrueType.isEmpty()) {
-        m_sTechnologyTrueType = loadResourceString(144);
-        m_sTechnologyDevice = loadResourceString(145);
-        m_sTechnologyRaster = loadResourceString(146);
-        m_sTechnologyVector = loadResourceString(147);
+        m_sTechnologyTrueType = loadResourceString(kText.trueTypeFace);
+        m_sTechnologyDevice = loadResourceString(kText.deviceFace);
+        m_sTechnologyRaster = loadResourceString(kText.rasterFace);
+        m_sTechnologyVector = loadResourceString(kText.vectorFace);
     }
     // During construction these are the operations of this class, whatever derives from it.
     if (!CTzadFontMapDatabase::IsDatabaseLoaded()) CTzadFontMapDatabase::LoadContents(flag);
@@ -45,11 +43,11 @@ bool CTzadFontMapDatabase::IsDatabaseLoaded() {
 void CTzadFontMapDatabase::LoadContents(signed char /*flag*/) {
     if (m_eDatabaseStatus == kLoaded) return;
     bool const isLoadedElsewhere = m_eDatabaseStatus == kLoading;
-    if (isLoadedElsewhere) tzutPrintf(gStringTable[kLoadingElsewhere]);
+    if (isLoadedElsewhere) tzutPrintf(gStringTable[kText.loadingElsewhere]);
     try {
         std::lock_guard const lock(m_mutexLoading);
         if (isLoadedElsewhere) {
-            tzutPrintf(gStringTable[kLoadedElsewhere]);
+            tzutPrintf(gStringTable[kText.loadedElsewhere]);
         } else {
             m_eDatabaseStatus = kLoaded;
         }

@@ -10,6 +10,7 @@
 #include "module/markup/rtf_units.h"
 #include "module/markup/wrapping.h"
 #include "module/texts/resources.h"
+#include "module/texts/text_ids.h"
 #include "tz/mte/scale_correction.h"
 
 // The words in alphabetical order; what is not among them is unknown.
@@ -219,12 +220,12 @@ void CRichTextToMTextContext::OnEnSpace(wchar_t const*&, int) {
 
 void CRichTextToMTextContext::appendReplacement(std::size_t which) {
     static constexpr Replacement kReplacements[] = {
-        {1033, L"--"},
-        {1034, L"-" },
-        {1035, L"'" },
-        {1036, L"'" },
-        {1037, L"\""},
-        {1038, L"\""},
+        {kText.emDash,           L"--"},
+        {kText.enDash,           L"-" },
+        {kText.leftQuote,        L"'" },
+        {kText.rightQuote,       L"'" },
+        {kText.leftDoubleQuote,  L"\""},
+        {kText.rightDoubleQuote, L"\""},
     };
     TzString& text = replacements_[which];
     if (text.isEmpty()) text = loadResourceString(kReplacements[which].id);

@@ -9,17 +9,11 @@
 #include "module/prompt/keyword_input.h"
 #include "module/prompt/real_input.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
-
-// Keywords and prompts.
-constexpr unsigned kTypePrompt = 1105;
-constexpr unsigned kStatic = 1106;
-constexpr unsigned kDynamic = 1107;
-constexpr unsigned kNoColumns = 1108;
-constexpr unsigned kCountPrompt = 1109;
 
 // Only the bits for empty, zero and negative answers and for free text mean something; the rest of
 // this word has always been handed over.
@@ -32,10 +26,10 @@ struct SizeQuestion {
     unsigned flags;
     double heights;
 };
-constexpr SizeQuestion kTotalWidth{1110, 6, 80.0};
-constexpr SizeQuestion kColumnWidth{1111, 6, 30.0};
-constexpr SizeQuestion kColumnGutter{1112, 4, 5.0};
-constexpr SizeQuestion kColumnHeight{1113, 6, 10.0};
+constexpr SizeQuestion kTotalWidth{kText.totalWidthPrompt, 6, 80.0};
+constexpr SizeQuestion kColumnWidth{kText.columnWidthPrompt, 6, 30.0};
+constexpr SizeQuestion kColumnGutter{kText.gutterWidthPrompt, 4, 5.0};
+constexpr SizeQuestion kColumnHeight{kText.columnHeightPrompt, 6, 10.0};
 
 bool askSize(SizeQuestion const& question, double textHeight, double& size) {
     CKeywordTable none;
@@ -54,11 +48,11 @@ void chooseType(int status, CTzsKeywordInput& input, TextEditorColumns& columns)
     default: return;
     }
     switch (chosen) {
-    case kDynamic:
+    case kText.dynamicColumns:
         columns.columnType = TzDbMText::kDynamicColumns;
         columns.autoHeight = true;
         break;
-    case kStatic: columns.columnType = TzDbMText::kStaticColumns; break;
+    case kText.staticColumns: columns.columnType = TzDbMText::kStaticColumns; break;
     default: columns.columnType = TzDbMText::kNoColumns; break;
     }
 }
@@ -83,16 +77,16 @@ bool TzxMtextCommand::DoColumnHeightPrompt() {
 
 bool TzxMtextCommand::DoColumnCountPrompt() {
     CKeywordTable none;
-    CTzsIntegerInput input(kCountFlags, none, gStringTable[kCountPrompt]);
+    CTzsIntegerInput input(kCountFlags, none, gStringTable[kText.columnCountPrompt]);
     input.SetDefault(kDefaultCount);
     return askUntilAnswered(input, [&] { columns.columnCount = input.GetInteger(); });
 }
 
 int TzxMtextCommand::DoColumnPrompt() {
-    unsigned int ids[] = {kDynamic, kStatic, kNoColumns};
+    unsigned int ids[] = {kText.dynamicColumns, kText.staticColumns, kText.noColumns};
     CKeywordTable keywords(ids, static_cast<int>(std::size(ids)));
-    CTzsKeywordInput input(0, keywords, gStringTable[kTypePrompt]);
-    input.SetDefault(kDynamic);
+    CTzsKeywordInput input(0, keywords, gStringTable[kText.columnTypePrompt]);
+    input.SetDefault(kText.dynamicColumns);
     int const status = input.Prompt();
     if (status == statusCancel) return kColumnsCancelled;
     chooseType(status, input, columns);

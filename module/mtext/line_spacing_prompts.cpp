@@ -7,16 +7,12 @@
 #include "module/prompt/keyword_input.h"
 #include "module/styles/line_spacing.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
 
-// Prompts and keywords.
-constexpr unsigned kAtLeast = 1084;
-constexpr unsigned kExactly = 1085;
-constexpr unsigned kStylePrompt = 1086;
-constexpr unsigned kFactorPrompt = 1087;
 // Negative values are refused, free text comes through.
 constexpr unsigned kFactorFlags = 0x84;
 
@@ -33,17 +29,18 @@ double factorIn(TzString const& text) {
 }  // namespace
 
 bool TzxMtextCommandBase::DoLineSpacingStylePrompt() {
-    unsigned int ids[] = {kAtLeast, kExactly};
+    unsigned int ids[] = {kText.atLeast, kText.exactly};
     CKeywordTable keywords(ids, static_cast<int>(std::size(ids)));
-    CTzsKeywordInput input(0, keywords, gStringTable[kStylePrompt]);
-    input.SetDefault(lineSpacingStyle == TzDb::kAtLeast ? kAtLeast : kExactly);
+    CTzsKeywordInput input(0, keywords, gStringTable[kText.lineSpacingTypePrompt]);
+    input.SetDefault(lineSpacingStyle == TzDb::kAtLeast ? kText.atLeast : kText.exactly);
     for (;;) {
         switch (input.Prompt()) {
         case statusCancel: return false;
         case statusNone: return true;
         case statusNormal:
         case statusKeyword:
-            lineSpacingStyle = input.GetKeyword() == kExactly ? TzDb::kExactly : TzDb::kAtLeast;
+            lineSpacingStyle =
+                input.GetKeyword() == kText.exactly ? TzDb::kExactly : TzDb::kAtLeast;
             return true;
         default: break;
         }
@@ -52,8 +49,8 @@ bool TzxMtextCommandBase::DoLineSpacingStylePrompt() {
 
 bool TzxMtextCommandBase::DoLineSpacingFactorPrompt() {
     CKeywordTable none;
-    TzString const prompt =
-        gStringTable[kFactorPrompt] + TzString::formatted(L" <%.3gx>", lineSpacingFactor);
+    TzString const prompt = gStringTable[kText.lineSpacingFactorPrompt] +
+                            TzString::formatted(L" <%.3gx>", lineSpacingFactor);
     CTzsDistanceInput input(kFactorFlags, none, prompt, firstCornerUcs);
     for (;;) {
         switch (input.Prompt()) {

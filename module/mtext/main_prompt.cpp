@@ -9,6 +9,7 @@
 #include "module/prompt/jig_input.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ap/document.h"
 #include "tz/ap/gesture.h"
 #include "tz/ed/editors.h"
@@ -19,13 +20,6 @@
 namespace {
 
 namespace Gesture = Tzworks::Tzdraft::TzApGesture;
-
-// Prompts and texts.
-constexpr unsigned kStatusLine = 1064;
-constexpr unsigned kFirstCorner = 1065;
-constexpr unsigned kAnnotative = 1101;
-constexpr unsigned kNotAnnotative = 1102;
-constexpr unsigned kAttributePoint = 3010;
 
 // The telemetry of a first corner.
 constexpr int kCornerPhase = 0;
@@ -52,8 +46,8 @@ void printStatusLine(TzxMtextCommand const& command) {
     TzString const style = TzString::formatted(L"\"%ls\"", command.styleName.kwszPtr());
     TzString const height = CLinearUnitConverter(kLinearUnitsOfDrawing, kPrecisionOfDrawing)
                                 .MapDoubleToUnit(command.textHeight);
-    tzutPrintf(gStringTable[kStatusLine], style.kwszPtr(), height.kwszPtr(),
-               gStringTable[annotative ? kAnnotative : kNotAnnotative].kwszPtr());
+    tzutPrintf(gStringTable[kText.statusLine], style.kwszPtr(), height.kwszPtr(),
+               gStringTable[annotative ? kText.annotative : kText.notAnnotative].kwszPtr());
 }
 
 }  // namespace
@@ -66,7 +60,7 @@ bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
     CTzsMtextFirstPointJig jig(TzGePoint3d::kOrigin);
     CKeywordTable none;
     CTzsJigInput input(kControls, none, &jig,
-                       gStringTable[forAttribute ? kAttributePoint : kFirstCorner]);
+                       gStringTable[forAttribute ? kText.insertionPoint : kText.firstCorner]);
     // An empty answer takes the point where the preview stands.
     for (int status = 0; !isAnswered(status);) {
         status = promptWithGesture(input);

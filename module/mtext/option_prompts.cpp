@@ -1,7 +1,5 @@
 // The questions for attachment, rotation, height and width, and the typed text.
 
-#include <iterator>
-
 #include "module/host_calls/sys_var.h"
 #include "module/prompt/angle_input.h"
 #include "module/prompt/asking.h"
@@ -9,34 +7,26 @@
 #include "module/prompt/keyword_input.h"
 #include "module/prompt/string_input.h"
 #include "module/styles/style_rules.h"
+#include "module/texts/attachment_ids.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
-
-// Prompts.
-constexpr unsigned kRotationPrompt = 1066;
-constexpr unsigned kHeightPrompt = 1070;
-constexpr unsigned kWidthPrompt = 1071;
-constexpr unsigned kAttachmentPrompt = 1072;
-constexpr unsigned kTextPrompt = 1074;
-constexpr unsigned kPaperHeightPrompt = 1103;
 
 // Flags of a question.
 constexpr unsigned kRefusesEmpty = 1;
 constexpr unsigned kRefusesZeroAndNegative = 6;
 constexpr unsigned kRefusesNegative = 4;
 
-constexpr unsigned kTopLeft = 1048;
-
 }  // namespace
 
 bool TzxMtextCommandBase::DoAttachPrompt() {
-    unsigned int ids[] = {kTopLeft, 1049, 1050, 1051, 1052, 1053, 1054, 1055, 1056};
-    CKeywordTable keywords(ids, static_cast<int>(std::size(ids)));
-    CTzsKeywordInput input(0, keywords, gStringTable[kAttachmentPrompt]);
+    CKeywordTable keywords(kAttachmentKeywords.data(),
+                           static_cast<int>(kAttachmentKeywords.size()));
+    CTzsKeywordInput input(0, keywords, gStringTable[kText.justificationPrompt]);
     // An empty answer means the top left, whatever the attachment is now.
-    input.SetDefault(kTopLeft);
+    input.SetDefault(kText.topLeft);
     for (;;) {
         switch (input.Prompt()) {
         case statusCancel: return false;
@@ -50,7 +40,7 @@ bool TzxMtextCommandBase::DoAttachPrompt() {
 
 bool TzxMtextCommandBase::DoRotatePrompt() {
     CKeywordTable none;
-    CTzsAngleInput input(kRefusesEmpty, none, gStringTable[kRotationPrompt], firstCornerUcs);
+    CTzsAngleInput input(kRefusesEmpty, none, gStringTable[kText.rotationPrompt], firstCornerUcs);
     input.SetDefault(rotation);
     return askUntilAnswered(input, [&] { rotation = input.GetAngle(); });
 }
@@ -61,7 +51,7 @@ bool TzxMtextCommandBase::DoHeightPrompt(bool useBase) {
     double const scale = annotative ? CTzadSysVar::GetDouble(L"CANNOSCALEVALUE") : 1.0;
     CKeywordTable none;
     CTzsDistanceInput input(kRefusesZeroAndNegative, none,
-                            gStringTable[annotative ? kPaperHeightPrompt : kHeightPrompt],
+                            gStringTable[annotative ? kText.paperHeightPrompt : kText.heightPrompt],
                             useBase ? firstCornerUcs : nullptr);
     input.SetDefault(textHeight * scale);
     return askOnce(input, [&] { textHeight = input.GetDistance() / scale; });
@@ -69,14 +59,15 @@ bool TzxMtextCommandBase::DoHeightPrompt(bool useBase) {
 
 bool TzxMtextCommandBase::DoWidth() {
     CKeywordTable none;
-    CTzsDistanceInput input(kRefusesNegative, none, gStringTable[kWidthPrompt], firstCornerUcs);
+    CTzsDistanceInput input(kRefusesNegative, none, gStringTable[kText.widthPrompt],
+                            firstCornerUcs);
     // Without a default an empty answer gives 0, a text that does not wrap.
     return askOnce(input, [&] { boxWidth = input.GetDistance(); });
 }
 
 bool TzxMtextCommandBase::DoTextString() {
     CKeywordTable none;
-    CTzsStringInput input(0, none, gStringTable[kTextPrompt], true);
+    CTzsStringInput input(0, none, gStringTable[kText.textPrompt], true);
     TzString typed;
     for (;;) {
         switch (input.Prompt()) {

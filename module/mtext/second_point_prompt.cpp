@@ -10,12 +10,12 @@
 #include "module/styles/style_rules.h"
 #include "module/texts/attachment_ids.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/mte/globals.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
 
-constexpr unsigned kOppositeCorner = 1073;
 constexpr auto kControls = TzEdJig::kGovernedByOrthoMode;
 
 // What follows an option.
@@ -80,13 +80,13 @@ struct Option {
 };
 constexpr std::array<Option, 7> kOptions{
     {
-     {1046, askHeight},
-     {1043, askAttachment},
-     {1083, askLineSpacing},
-     {1044, askRotation},
-     {1045, askStyle},
-     {1059, askWidth},
-     {1104, askColumns},
+     {kText.height, askHeight},
+     {kText.justify, askAttachment},
+     {kText.lineSpacing, askLineSpacing},
+     {kText.rotation, askRotation},
+     {kText.style, askStyle},
+     {kText.width, askWidth},
+     {kText.columns, askColumns},
      }
 };
 
@@ -118,7 +118,7 @@ bool TzxMtextCommand::DoSecondPointPrompt(bool forAttribute) {
         ids[i] = kOptions[i].keyword;
     int const count = static_cast<int>(ids.size());
     CKeywordTable keywords(ids.data(), forAttribute ? count - 1 : count);
-    CTzsJigInput input(kControls, keywords, &jig, gStringTable[kOppositeCorner]);
+    CTzsJigInput input(kControls, keywords, &jig, gStringTable[kText.oppositeCorner]);
 
     SecondCorner at{*this, jig};
     for (;;) {

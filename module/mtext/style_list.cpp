@@ -4,6 +4,7 @@
 #include "module/prompt/string_input.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/db/database.h"
 #include "tz/db/host_services.h"
 #include "tz/ed/print.h"
@@ -11,20 +12,6 @@
 #include "tz/mte/mtext_command.h"
 
 namespace {
-
-// Texts of the list.
-constexpr unsigned kPatternPrompt = 1075;
-constexpr unsigned kHeading = 1076;
-constexpr unsigned kNameAndFont = 1077;
-constexpr unsigned kSizes = 1078;
-constexpr unsigned kModes = 1079;
-constexpr unsigned kNoneFound = 1080;
-constexpr unsigned kCurrentStyle = 1081;
-constexpr unsigned kExternalStyles = 1094;
-constexpr unsigned kBackward = 2068;
-constexpr unsigned kUpsideDown = 2069;
-constexpr unsigned kVertical = 2070;
-constexpr unsigned kNormal = 2071;
 
 // Bits of a style's flags.
 constexpr int kBackwardBit = 2;
@@ -40,14 +27,14 @@ void printText(unsigned id) {
 
 TzString modesOf(TzDbTextStyleTableRecord const& style) {
     TzString modes;
-    if (style.flagBits() & kBackwardBit) modes += gStringTable[kBackward] + L" ";
-    if (style.flagBits() & kUpsideDownBit) modes += gStringTable[kUpsideDown] + L" ";
-    if (style.isVertical()) modes += gStringTable[kVertical] + L" ";
-    return modes.isEmpty() ? gStringTable[kNormal] : modes;
+    if (style.flagBits() & kBackwardBit) modes += gStringTable[kText.backward] + L" ";
+    if (style.flagBits() & kUpsideDownBit) modes += gStringTable[kText.upsideDown] + L" ";
+    if (style.isVertical()) modes += gStringTable[kText.vertical] + L" ";
+    return modes.isEmpty() ? gStringTable[kText.normal] : modes;
 }
 
 void printStyle(TzDbTextStyleTableRecord const& style) {
-    tzutPrintf(gStringTable[kNameAndFont], quoted(style.getName()).kwszPtr(),
+    tzutPrintf(gStringTable[kText.styleNameAndFont], quoted(style.getName()).kwszPtr(),
                style.fileName().kwszPtr());
     TzString const bigFont = style.bigFontFileName();
     if (!bigFont.isEmpty()) tzutPrintf(L", %ls", bigFont.kwszPtr());
@@ -55,10 +42,10 @@ void printStyle(TzDbTextStyleTableRecord const& style) {
     CLinearUnitConverter const lengths(kLinearUnitsOfDrawing, kPrecisionOfDrawing);
     CLinearUnitConverter const factors(kDecimal, kPrecisionOfDrawing);
     CRadialUnitConverter const angles(kRadialUnitsOfDrawing, kPrecisionOfDrawing);
-    tzutPrintf(gStringTable[kSizes], lengths.MapDoubleToUnit(style.textSize()).kwszPtr(),
+    tzutPrintf(gStringTable[kText.styleSizes], lengths.MapDoubleToUnit(style.textSize()).kwszPtr(),
                factors.MapDoubleToUnit(style.xScale()).kwszPtr(),
                angles.MapDoubleToUnit(style.obliquingAngle()).kwszPtr());
-    tzutPrintf(gStringTable[kModes], modesOf(style).kwszPtr());
+    tzutPrintf(gStringTable[kText.styleGeneration], modesOf(style).kwszPtr());
 }
 
 // How many styles a list showed, and how many it left out as another drawing's.
@@ -86,7 +73,7 @@ ListCounts printStyles(TzDbTextStyleTableIterator& walk, TzString const& pattern
 // Asks which styles to list; false when there is no answer.
 bool askPattern(TzString& pattern) {
     CKeywordTable none;
-    CTzsSymbolStringInput input(0, none, gStringTable[kPatternPrompt]);
+    CTzsSymbolStringInput input(0, none, gStringTable[kText.stylePatternPrompt]);
     input.SetDefault(L"*");
     int const status = input.Prompt();
     if (status == statusNone) {
@@ -108,10 +95,10 @@ void TzxMtextCommandBase::EnumerateStyles() {
     EasyIterator<TzDbTextStyleTable, TzDbTextStyleTableIterator> walk;
     if (table->newIterator(walk.object, true, true) != Tzad::eOk) return;
     tzedTextScr();
-    printText(kHeading);
+    printText(kText.styleHeading);
     walk->start(true, true);
     ListCounts const counts = printStyles(*walk.object, pattern);
-    if (counts.shown == 0) printText(kNoneFound);
-    if (counts.external > 0) tzutPrintf(gStringTable[kExternalStyles], counts.external);
-    tzutPrintf(gStringTable[kCurrentStyle], quoted(GetCurrentTextStyleName()).kwszPtr());
+    if (counts.shown == 0) printText(kText.noStyleFound);
+    if (counts.external > 0) tzutPrintf(gStringTable[kText.externalStyles], counts.external);
+    tzutPrintf(gStringTable[kText.currentStyle], quoted(GetCurrentTextStyleName()).kwszPtr());
 }

@@ -2,14 +2,11 @@
 
 #include "module/prompt/string_input.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 #include "tz/mte/mtext_command.h"
 
 namespace {
-
-constexpr unsigned kPrompt = 1067;
-constexpr unsigned kListRequest = 1068;
-constexpr unsigned kUnknownStyle = 1069;
 
 // The names of styles that belong to an external reference hold this; they cannot be chosen.
 constexpr wchar_t kExternalMark = L'|';
@@ -18,7 +15,7 @@ constexpr wchar_t kExternalMark = L'|';
 
 bool TzxMtextCommandBase::DoStylePrompt() {
     CKeywordTable none;
-    CTzsSymbolStringInput input(0, none, gStringTable[kPrompt]);
+    CTzsSymbolStringInput input(0, none, gStringTable[kText.stylePrompt]);
     input.SetDefault(styleName);
     for (;;) {
         int const status = input.Prompt();
@@ -28,7 +25,7 @@ bool TzxMtextCommandBase::DoStylePrompt() {
             return true;
         }
         TzString const answer = input.GetInput();
-        if (status == statusNormal && answer == gStringTable[kListRequest]) {
+        if (status == statusNormal && answer == gStringTable[kText.listRequest]) {
             EnumerateStyles();
             continue;
         }
@@ -38,6 +35,6 @@ bool TzxMtextCommandBase::DoStylePrompt() {
             styleName = answer;
             return true;
         }
-        tzutPrintf(L"%ls", gStringTable[kUnknownStyle].kwszPtr());
+        tzutPrintf(L"%ls", gStringTable[kText.unusableStyle].kwszPtr());
     }
 }

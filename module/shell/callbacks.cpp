@@ -8,6 +8,7 @@
 #include "module/holders/scope_guard.h"
 #include "module/host_calls/sys_var.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/selection.h"
@@ -17,8 +18,6 @@
 #include "tz/mte/mtext_command.h"
 
 namespace {
-
-constexpr unsigned kNotYetAvailable = 1024;
 
 // Bits of CMDACTIVE: the answers come from a script or from a program.
 constexpr int kAnsweredWithoutUser = 4 | 32;
@@ -75,7 +74,7 @@ void CompatibleEditMtextCallback() {
 }
 
 void AlignTextCallback() {
-    tzutPrintf(gStringTable[kNotYetAvailable], gsAlignText_GlobalName.kwszPtr());
+    tzutPrintf(gStringTable[kText.notAvailable], gsAlignText_GlobalName.kwszPtr());
 }
 
 void MtextPropertiesCallback() {

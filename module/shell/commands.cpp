@@ -3,6 +3,7 @@
 #include "module/shell/callbacks.h"
 #include "module/shell/registration.h"
 #include "module/texts/resources.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/command_stack.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/diagnostics.h"
@@ -23,16 +24,19 @@ struct Command {
 // without help.
 constexpr std::array<Command, 7> kCommands{
     {
-     {&gsEditMtext_GlobalName, &gsEditMtext_LocalName, L"MTEDIT", 143, EditMtextCallback},
-     {&gsCompatibleEditMtext_GlobalName, &gsCompatibleEditMtext_LocalName, L"-MTEDIT", 18372,
-         CompatibleEditMtextCallback},
-     {&gsAlignText_GlobalName, &gsAlignText_LocalName, L"TEXTALIGN", 127, AlignTextCallback},
-     {&gsMtext_GlobalName, &gsMtext_LocalName, L"MTEXT", 1062, ImprovedMtextCallback},
-     {&gsCompatibleMtext_GlobalName, &gsCompatibleMtext_LocalName, L"-MTEXT", 1063,
-         CompatibleMtextCallback},
-     {&gsMtprop_GlobalName, &gsMtprop_LocalName, L"MTPROP", 1082, MtpropCallback},
-     {&gsMtextProperties_GlobalName, &gsMtextProperties_LocalName, L"MTEXTPROPERTIES", 52328,
-         MtextPropertiesCallback},
+     {&gsEditMtext_GlobalName, &gsEditMtext_LocalName, L"MTEDIT", kText.mteditCommand,
+         EditMtextCallback},
+     {&gsCompatibleEditMtext_GlobalName, &gsCompatibleEditMtext_LocalName, L"-MTEDIT",
+         kText.plainMteditCommand, CompatibleEditMtextCallback},
+     {&gsAlignText_GlobalName, &gsAlignText_LocalName, L"TEXTALIGN", kText.textalignCommand,
+         AlignTextCallback},
+     {&gsMtext_GlobalName, &gsMtext_LocalName, L"MTEXT", kText.mtextCommand,
+         ImprovedMtextCallback},
+     {&gsCompatibleMtext_GlobalName, &gsCompatibleMtext_LocalName, L"-MTEXT",
+         kText.plainMtextCommand, CompatibleMtextCallback},
+     {&gsMtprop_GlobalName, &gsMtprop_LocalName, L"MTPROP", kText.mtpropCommand, MtpropCallback},
+     {&gsMtextProperties_GlobalName, &gsMtextProperties_LocalName, L"MTEXTPROPERTIES",
+         kText.mtextpropertiesCommand, MtextPropertiesCallback},
      }
 };
 

@@ -2,6 +2,7 @@
 
 #include "module/shell/registration.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/ed/command_stack.h"
 #include "tz/ed/functions.h"
 #include "tz/ed/print.h"
@@ -25,8 +26,6 @@ constexpr std::array<Function, 3> kFunctions{
      {&gsMtprop_GlobalName, kProperties},
      }
 };
-
-constexpr unsigned int kNeedsEntityMessage = 163;
 
 }  // namespace
 
@@ -59,7 +58,7 @@ bool invokeFunction() {
         // The gate has told what there is to tell; the call itself has worked.
         (void)EditMtextByAdsName(name, tab, true, true);
     } else {
-        tzutPrintf(gStringTable[kNeedsEntityMessage]);
+        tzutPrintf(gStringTable[kText.needsEntity]);
     }
     return true;
 }

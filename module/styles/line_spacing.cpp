@@ -3,10 +3,9 @@
 #include "module/host_calls/sys_var.h"
 #include "module/host_calls/unit_converter.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 
 namespace {
-
-constexpr unsigned int kInvalidFactorMessage = 1096;
 
 CLinearUnitConverter drawingUnits() {
     return CLinearUnitConverter(kLinearUnitsOfDrawing, kPrecisionOfDrawing);
@@ -57,6 +56,6 @@ TzString InvalidSpacingFactorMessage(double textHeight) {
     TzString const most = units.MapDoubleToUnit(kLargestLineSpacingFactor * distance);
     TzString const leastFactor = TzString::formatted(L"%g", kSmallestLineSpacingFactor);
     TzString const mostFactor = TzString::formatted(L"%g", kLargestLineSpacingFactor);
-    return TzString::formatted(gStringTable[kInvalidFactorMessage], least.kwszPtr(),
+    return TzString::formatted(gStringTable[kText.invalidLineSpacing], least.kwszPtr(),
                                leastFactor.kwszPtr(), most.kwszPtr(), mostFactor.kwszPtr());
 }

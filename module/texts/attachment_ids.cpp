@@ -1,23 +1,15 @@
 #include "module/texts/attachment_ids.h"
 
-namespace {
-
-constexpr unsigned int kTopLeftId = 1048;
-constexpr unsigned int kTopToBottomId = 1058;
-
-}  // namespace
+#include <algorithm>
 
 TzDbMText::AttachmentPoint MapAttachment(unsigned int id) {
-    bool const known = id >= kTopLeftId && id - kTopLeftId < TzDbMText::kBottomRight;
-    return known ? static_cast<TzDbMText::AttachmentPoint>(id - kTopLeftId + TzDbMText::kTopLeft)
-                 : TzDbMText::kTopLeft;
+    auto const at = std::find(kAttachmentKeywords.begin(), kAttachmentKeywords.end(), id);
+    if (at == kAttachmentKeywords.end()) return TzDbMText::kTopLeft;
+    return static_cast<TzDbMText::AttachmentPoint>(at - kAttachmentKeywords.begin() +
+                                                   TzDbMText::kTopLeft);
 }
 
 unsigned int MapAttachmentToIDS(TzDbMText::AttachmentPoint point) {
-    if (point < TzDbMText::kTopLeft || point > TzDbMText::kBottomRight) return kTopLeftId;
-    return kTopLeftId + static_cast<unsigned int>(point - TzDbMText::kTopLeft);
-}
-
-TzDbMText::FlowDirection MapDirection(unsigned int id) {
-    return id == kTopToBottomId ? TzDbMText::kTtoB : TzDbMText::kLtoR;
+    bool const known = point >= TzDbMText::kTopLeft && point <= TzDbMText::kBottomRight;
+    return kAttachmentKeywords[known ? static_cast<std::size_t>(point - TzDbMText::kTopLeft) : 0];
 }

@@ -1,12 +1,19 @@
 #pragma once
 
+#include <array>
+
+#include "module/texts/text_ids.h"
 #include "tz/db/mtext.h"
 
-// Attachment points and flow directions against the ids of their keywords.
+// Attachment points against the ids of their keywords.
 
-// Keywords 1048 to 1056 are the points in their order; any other id gives the top left one.
+// The keywords of the points in the order of their numbers, which is also the prompt's order.
+inline constexpr std::array<unsigned int, 9> kAttachmentKeywords{
+    kText.topLeft,     kText.topCentre,  kText.topRight,     kText.middleLeft,  kText.middleCentre,
+    kText.middleRight, kText.bottomLeft, kText.bottomCentre, kText.bottomRight,
+};
+
+// The point of a keyword; the top left one for any other id.
 [[nodiscard]] TzDbMText::AttachmentPoint MapAttachment(unsigned int id);
-// The keyword of a point; 1048, top left, for a value that is none.
+// The keyword of a point; that of the top left one for a value that is none.
 [[nodiscard]] unsigned int MapAttachmentToIDS(TzDbMText::AttachmentPoint point);
-// Keyword 1058 is top to bottom, any other id left to right.
-[[nodiscard]] TzDbMText::FlowDirection MapDirection(unsigned int id);

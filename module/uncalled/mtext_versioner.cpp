@@ -2,12 +2,12 @@
 
 #include "module/holders/scope_guard.h"
 #include "module/texts/string_table.h"
+#include "module/texts/text_ids.h"
 #include "tz/pal/message_box.h"
 
 namespace {
 
 constexpr int kFirstNewerFormat = 4;
-constexpr unsigned int kTooNewMessage = 229;
 
 }  // namespace
 
@@ -23,6 +23,6 @@ bool MTextVersioner::isNewer(wchar_t const* contents) {
 
 bool MTextVersioner::too_new(wchar_t const* contents) {
     if (!isNewer(contents)) return false;
-    MessageBox(nullptr, gStringTable[kTooNewMessage], nullptr, kMessageBoxError);
+    MessageBox(nullptr, gStringTable[kText.tooNew], nullptr, kMessageBoxError);
     return true;
 }

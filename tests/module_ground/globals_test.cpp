@@ -6,6 +6,7 @@
 
 #include "host/platform/output.h"
 #include "module/texts/attachment_ids.h"
+#include "module/uncalled/flow_direction.h"
 #include "module/uncalled/mtext_versioner.h"
 #include "tz/mte/globals.h"
 

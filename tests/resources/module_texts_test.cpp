@@ -28,58 +28,6 @@ TEST(ModuleTexts, AreThoseOfTheLanguage) {
     EXPECT_EQ(loadResourceString(1101) == L"Yes", isEnglish);
 }
 
-TEST(ModuleTexts, ExistForEachIdInTheCode) {
-    std::vector<UsedText> const used = textsInCode();
-    EXPECT_GT(used.size(), 40U) << "the search finds too little";
-    for (UsedText const& each : used)
-        EXPECT_FALSE(loadResourceString(static_cast<int>(each.id)).isEmpty())
-            << each.file << " uses " << each.id;
-}
-
-// From the first id to the last one.
-struct Range {
-    int first;
-    int last;
-};
-constexpr Range kAllTexts[] = {
-    {127,   127  },
-    {143,   147  },
-    {158,   158  },
-    {160,   161  },
-    {163,   163  },
-    {169,   170  },
-    {229,   229  },
-    {1023,  1025 },
-    {1033,  1038 },
-    {1043,  1046 },
-    {1048,  1059 },
-    {1062,  1087 },
-    {1094,  1094 },
-    {1096,  1096 },
-    {1101,  1113 },
-    {2068,  2071 },
-    {2083,  2083 },
-    {2086,  2086 },
-    {3010,  3010 },
-    {12167, 12167},
-    {18372, 18372},
-    {25585, 25585},
-    {32777, 32777},
-    {33224, 33224},
-    {35331, 35331},
-    {35442, 35442},
-    {43461, 43461},
-    {52328, 52328},
-    {55963, 55963},
-    {57662, 57697},
-    {61497, 61497},
-};
-TEST(ModuleTexts, ExistForTheWholeSystem) {
-    for (Range const& range : kAllTexts)
-        for (int id = range.first; id <= range.last; ++id)
-            EXPECT_FALSE(loadResourceString(id).isEmpty()) << id;
-}
-
 TEST(ModuleTexts, FormatTheirArguments) {
     wchar_t const* const a = L"A";
     wchar_t const* const b = L"B";

@@ -4,6 +4,8 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <array>
+#include <bit>
 #include <cerrno>
 #include <cstring>
 #include <filesystem>
@@ -16,6 +18,7 @@
 #include "host/text/format_conversions.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
+#include "module/texts/text_ids.h"
 #include "tests/resources/texts_in_code.h"
 #include "tz/text/string.h"
 
@@ -75,6 +78,23 @@ bool maybeSame(tzhost::ResourceRow const& row) {
 // A command of the host: its name is in capitals.
 bool isCommandName(std::wstring_view text) {
     return std::all_of(text.begin(), text.end(), [](wchar_t c) { return c >= L'A' && c <= L'Z'; });
+}
+
+// The table of ids in the code and the tables of all languages are the same whole.
+TEST(ModuleTexts, HaveTheIdsOfTheCode) {
+    using Ids = std::array<std::uint32_t, sizeof(TextIds) / sizeof(std::uint32_t)>;
+    Ids ids = std::bit_cast<Ids>(kText);
+    std::sort(ids.begin(), ids.end());
+    std::vector<std::string> all = languages();
+    all.push_back("en");
+    for (std::string const& language : all) {
+        std::vector<std::uint32_t> listed;
+        for (auto const& [id, row] : moduleTexts(language)) {
+            listed.push_back(id);
+            EXPECT_FALSE(row.text.empty()) << language << " " << id;
+        }
+        EXPECT_EQ(listed, std::vector<std::uint32_t>(ids.begin(), ids.end())) << language;
+    }
 }
 
 class Translations : public testing::TestWithParam<std::string> {};
