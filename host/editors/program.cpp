@@ -5,46 +5,15 @@
 #include <cstring>
 #include <fcntl.h>
 #include <sys/wait.h>
-#include <termios.h>
 #include <unistd.h>
 
+#include "host/editors/lent_terminal.h"
+#include "host/editors/passed_signals.h"
 #include "host/text/local_text.h"
 #include "tz/text/string.h"
 
 namespace tzhost {
 namespace {
-
-// The terminal of standard input, given to a program and taken back.
-class Terminal {
-public:
-    Terminal() : isTerminal_(isatty(STDIN_FILENO) == 1) {
-        if (!isTerminal_) return;
-        tcgetattr(STDIN_FILENO, &settings_);
-        // The host is in the background while the program runs and must not be stopped for that.
-        struct sigaction ignore {};
-        ignore.sa_handler = SIG_IGN;
-        sigaction(SIGTTOU, &ignore, &before_);
-    }
-    Terminal(Terminal const&) = delete;
-    Terminal& operator=(Terminal const&) = delete;
-    ~Terminal() {
-        if (!isTerminal_) return;
-        tcsetpgrp(STDIN_FILENO, getpgrp());
-        tcsetattr(STDIN_FILENO, TCSADRAIN, &settings_);
-        sigaction(SIGTTOU, &before_, nullptr);
-        // Wherever the program left the cursor, what follows begins a line.
-        if (isatty(STDOUT_FILENO) == 1) (void)!write(STDOUT_FILENO, "\r", 1);
-    }
-    [[nodiscard]] bool isTerminal() const { return isTerminal_; }
-    void giveTo(pid_t program) const {
-        if (isTerminal_) tcsetpgrp(STDIN_FILENO, program);
-    }
-
-private:
-    bool isTerminal_;
-    termios settings_{};
-    struct sigaction before_ {};
-};
 
 // The words as execvp takes them; they must outlive that.
 std::vector<char*> argumentsOf(std::vector<std::string>& words) {
@@ -58,9 +27,10 @@ std::vector<char*> argumentsOf(std::vector<std::string>& words) {
 // In the child: becomes the program, or tells through the pipe why it cannot. Nothing here may
 // throw, else the child would go on as a second host.
 [[noreturn]] void
-become(std::vector<char*> const& arguments, Terminal const& terminal, int report) noexcept {
+become(std::vector<char*> const& arguments, LentTerminal const& terminal, int report) noexcept {
     setpgid(0, 0);
     terminal.giveTo(getpid());
+    terminal.becomeInput();
     for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE, SIGXFSZ})
         std::signal(each, SIG_DFL);
     execvp(arguments[0], arguments.data());
@@ -70,15 +40,28 @@ become(std::vector<char*> const& arguments, Terminal const& terminal, int report
 }
 
 // A program that stops itself goes on at once: its session waits for it, and so does the terminal.
-int waitFor(pid_t child) {
+// One that wants a terminal which cannot be lent would stop again and again, so it is ended.
+int waitFor(pid_t child, LentTerminal const& terminal) {
     int status = 0;
     for (;;) {
         pid_t const changed = waitpid(child, &status, WUNTRACED);
         if (changed < 0 && errno != EINTR) return status;
         if (changed < 0) continue;
         if (!WIFSTOPPED(status)) return status;
-        kill(-child, SIGCONT);
+        bool const wantsTerminal = WSTOPSIG(status) == SIGTTIN || WSTOPSIG(status) == SIGTTOU;
+        kill(-child, wantsTerminal && !terminal.isThere() ? SIGKILL : SIGCONT);
     }
+}
+
+// Gives the program the terminal and waits for its end; its status. `reason` is set when the
+// program could not be run, which comes over the pipe `report`.
+int follow(pid_t child, LentTerminal const& terminal, int report, int& reason) {
+    terminal.giveTo(child);
+    ssize_t got = 0;
+    do {
+        got = read(report, &reason, sizeof reason);
+    } while (got < 0 && errno == EINTR);
+    return waitFor(child, terminal);
 }
 
 std::string notRun(int reason) {
@@ -122,22 +105,19 @@ ProgramResult runProgram(std::string_view command, std::filesystem::path const& 
     std::vector<char*> const arguments = argumentsOf(words);
     int report[2];
     if (pipe2(report, O_CLOEXEC) != 0) return {false, notRun(errno)};
-    Terminal const terminal;
+    PassedSignals passed;  // goes last: what it postponed may end the process
+    LentTerminal const terminal;
     pid_t const child = fork();
     if (child == 0) become(arguments, terminal, report[1]);
+    int reason = child < 0 ? errno : 0;
     close(report[1]);
-    if (child < 0) {
-        int const reason = errno;
-        close(report[0]);
-        return {false, notRun(reason)};
+    if (child > 0) {
+        setpgid(child, child);
+        passed.passTo(child);
     }
-    setpgid(child, child);
-    terminal.giveTo(child);
-    int reason = 0;
-    bool const missing = read(report[0], &reason, sizeof reason) == sizeof reason;
+    int const status = child < 0 ? 0 : follow(child, terminal, report[0], reason);
     close(report[0]);
-    int const status = waitFor(child);
-    if (missing) return {false, notRun(reason)};
+    if (reason != 0) return {false, notRun(reason)};
     if (WIFEXITED(status) && WEXITSTATUS(status) == 0) return {true, ""};
     return {false, problemOf(status)};
 }

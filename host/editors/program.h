@@ -5,10 +5,12 @@
 #include <string_view>
 #include <vector>
 
-// Runs an editor as a program of its own on one file. No shell sees the command or the file's name.
+// Runs an editor as a program of its own on one file. No shell reads the command or the file's
+// name.
 namespace tzhost {
 
-// A command apart at blanks; quotes, single or double, keep blanks together.
+// The words of a command, which are apart at blanks. Quotes, single or double, keep blanks
+// together.
 [[nodiscard]] std::vector<std::string> splitCommand(std::string_view command);
 
 struct ProgramResult {
@@ -17,8 +19,8 @@ struct ProgramResult {
 };
 
 // Runs the command with the file as its last argument and waits for its end. A program on the
-// terminal owns it meanwhile: it gets the foreground, and the terminal's settings are taken back
-// afterwards, also when the program was killed.
+// terminal has it meanwhile; afterwards the terminal is as it was, also when the program was
+// killed. A signal that asks this process to end goes to the program too, so that the wait ends.
 [[nodiscard]] ProgramResult runProgram(std::string_view command, std::filesystem::path const& file);
 
 }  // namespace tzhost

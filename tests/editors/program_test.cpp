@@ -4,6 +4,8 @@
 
 #include <unistd.h>
 
+#include <chrono>
+#include <csignal>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -49,6 +51,23 @@ TEST(Programs, LeaveOneHostWhicheverAllocationFails) {
     }
     EXPECT_FALSE(struck) << "the sweep came to its end";
     EXPECT_FALSE(std::filesystem::exists(kSecond)) << "at allocation " << call;
+}
+
+int endSignals = 0;
+void countSignal(int) {
+    ++endSignals;
+}
+
+// The host used to die alone, and left the program and its file behind.
+TEST(Programs, GetTheSignalThatEndsTheSession) {
+    std::ofstream("ending.sh") << "kill -TERM $PPID; sleep 60\n";
+    auto* const before = std::signal(SIGTERM, countSignal);
+    auto const start = std::chrono::steady_clock::now();
+    tzhost::ProgramResult const result = tzhost::runProgram("/bin/sh ending.sh", "note.txt");
+    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds(30));
+    EXPECT_EQ(result.problem, "was killed by signal 15");
+    EXPECT_EQ(endSignals, 1);
+    EXPECT_EQ(std::signal(SIGTERM, before), countSignal) << "taken back";
 }
 
 // A session at a terminal, which asks nothing here.

@@ -61,7 +61,7 @@ public:
     TemporaryFolder(TemporaryFolder const&) = delete;
     TemporaryFolder& operator=(TemporaryFolder const&) = delete;
     ~TemporaryFolder() {
-        unsetenv("TMPDIR");
+        setenv("TMPDIR", before_.c_str(), 1);
         fs::remove_all(folder_);
     }
     [[nodiscard]] std::ptrdiff_t files() const {
@@ -70,6 +70,7 @@ public:
 
 private:
     fs::path folder_ = scratch("temporary");
+    std::string before_ = fs::temp_directory_path();
 };
 
 class TextEditor : public testing::TestWithParam<EditorRow> {};
