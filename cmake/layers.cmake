@@ -36,6 +36,7 @@ tz_row(host/files          USES sdk host/base host/text LIBRARIES json ini)
 tz_row(host/settings       USES sdk host/base host/text host/files LIBRARIES json)
 tz_row(host/code_pages     USES sdk host/settings)
 tz_row(host/fonts          USES sdk host/base host/text host/files host/code_pages LIBRARIES fontconfig)
+tz_row(host/rtf            USES sdk host/text host/code_pages)
 tz_row(host/resources      USES sdk host/base host/text host/files)
 tz_row(host/platform       USES sdk host/base host/text LIBRARIES json)
 tz_row(host/faults         USES sdk host/base host/text)
@@ -51,6 +52,6 @@ tz_row(host/selection      USES sdk host/base host/text host/settings host/platf
 tz_row(host/editors        USES sdk host/base host/text host/files host/settings host/platform host/runtime host/command_line LIBRARIES json)
 
 tz_row(apps/tzdraft        USES sdk host/base host/text host/files host/settings host/fonts host/resources host/platform host/faults host/runtime host/layout host/database host/drawing_file host/display host/command_line host/selection host/editors LIBRARIES json cli editline)
-tz_row(apps/tzconvert      USES sdk host/base host/text host/files host/settings host/code_pages host/fonts module/globals module/host_calls module/texts module/styles module/fonts module/markup LIBRARIES json cli)
+tz_row(apps/tzconvert      USES sdk host/base host/text host/files host/settings host/code_pages host/fonts host/rtf module/globals module/host_calls module/texts module/styles module/fonts module/markup LIBRARIES json cli)
 
 tz_row(examples            USES sdk)

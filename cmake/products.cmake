@@ -3,7 +3,7 @@
 # The ground of the host for programs without libtz: archives that call each other through the
 # operations of sdk/, so the linker reads them until nothing is missing.
 add_library(tz_ground INTERFACE)
-target_link_libraries(tz_ground INTERFACE $<LINK_GROUP:RESCAN,host_base,host_geometry,host_text,host_files,host_settings,host_code_pages,host_fonts,host_resources,host_platform>)
+target_link_libraries(tz_ground INTERFACE $<LINK_GROUP:RESCAN,host_base,host_geometry,host_text,host_files,host_settings,host_code_pages,host_fonts,host_rtf,host_resources,host_platform>)
 
 # The embedded host: every host layer whole, so that what only the module calls is in it too.
 tz_layers_in("^host/" layers)

@@ -8,6 +8,7 @@
 
 #include "apps/tzconvert/conversion.h"
 #include "apps/tzconvert/machine.h"
+#include "apps/tzconvert/normalising.h"
 #include "apps/tzconvert/places.h"
 #include "apps/tzconvert/report.h"
 #include "apps/tzconvert/streams.h"
@@ -47,13 +48,24 @@ private:
     [[nodiscard]] Failure convertUnguarded(std::string const& file) {
         std::string const target = targetOf(options_, file);
         if (Failure failure = places_.checkTarget(file, target)) return failure;
-        std::wstring text;
-        if (Failure failure = readText(file, text)) return failure;
-        Converted const converted = convert(options_, std::move(text));
-        if (Failure failure = writeText(target, converted.text)) return failure;
+        Converted converted;
+        Failure const failure = options_.direction == Direction::normalise
+                                    ? normaliseFile(file, target)
+                                    : convertText(file, target, converted);
+        if (failure) return failure;
         places_.keepTarget(target);
         reports_.push_back({file, converted.found});
         return {};
+    }
+
+    [[nodiscard]] Failure
+    convertText(std::string const& file, std::string const& target, Converted& converted) const {
+        std::wstring text;
+        if (Failure failure =
+                options_.normalises ? readNormalised(file, text) : readText(file, text))
+            return failure;
+        converted = convert(options_, std::move(text));
+        return writeText(target, converted.text);
     }
 
     Options const& options_;

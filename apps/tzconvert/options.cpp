@@ -10,7 +10,8 @@ namespace {
 
 constexpr char kPurpose[] = "Converts MTEXT markup to RTF and RTF to MTEXT markup.";
 constexpr char kFooter[] =
-    "Without FILE, or with \"-\", standard input is read; input is UTF-8 and taken byte for byte.\n"
+    "Without FILE, or with \"-\", standard input is read; input is UTF-8 and taken byte for byte, and any\n"
+    "bytes where RTF is normalised.\n"
     "Exit status: 0 done; 2 wrong usage, an unusable file, or input that is not UTF-8 or holds a zero\n"
     "character, of which nothing is written.";
 
@@ -24,6 +25,7 @@ constexpr DirectionRow kDirections[] = {
     {"to-rtf",     Direction::toRtf,     ".rtf",   "markup to RTF"                             },
     {"to-mtext",   Direction::toMtext,   ".mtext", "RTF to markup"                             },
     {"round-trip", Direction::roundTrip, ".mtext", "markup to RTF to markup within one session"},
+    {"normalise",  Direction::normalise, ".rtf",   "any RTF to the RTF that to-mtext reads"    },
 };
 
 // What an RTF size can say: half-points of 10 twips.
@@ -171,6 +173,10 @@ void declare(CLI::App& app, Options& options) {
         declareFont(command, options);
         declareText(command, options);
         declareFiles(command, options);
+        if (direction == Direction::toMtext) {
+            command.add_flag("--normalise", options.normalises,
+                             "any RTF is read, bytes in the code pages that it names");
+        }
         command.footer(kFooter);
     }
 }

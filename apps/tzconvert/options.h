@@ -11,7 +11,7 @@ namespace tzconvert {
 inline constexpr int kDone = 0;
 inline constexpr int kUnusable = 2;  // wrong usage, an unusable file, or input that was refused
 
-enum class Direction { toRtf, toMtext, roundTrip };
+enum class Direction { toRtf, toMtext, roundTrip, normalise };
 
 // The ending of the name of a result, with its dot.
 [[nodiscard]] char const* endingOf(Direction direction);
@@ -42,6 +42,7 @@ struct Options {
     double oblique = 0.0;
     int baseAlignment = 0;
     bool keepsTrailingParagraphs = false;
+    bool normalises = false;  // RTF that is read goes through the normaliser
 
     int codePage = 1252;    // the system's
     std::string fontMap;    // empty: the shipped one

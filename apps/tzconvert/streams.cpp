@@ -34,6 +34,29 @@ Failure decodeAll(tzhost::FileReader& reader, std::wstring& text) {
     return kept > 0 ? Failure(faultAt(offset, "not UTF-8")) : Failure();
 }
 
+Failure takeAll(tzhost::FileReader& reader, std::string& bytes) {
+    bytes.reserve(reader.expectedSize());
+    std::string piece(kPiece, '\0');
+    while (std::size_t const count = reader.read(piece.data(), kPiece))
+        bytes.append(piece, 0, count);
+    return reader.hasFailed() ? "cannot be read: " + tzhost::systemReason() : Failure();
+}
+
+// What `take` finds wrong with a file that it reads, under the name of the file.
+template <class Take, class Content>
+Failure readFile(Take take, std::string const& file, Content& content) {
+    Failure fault;
+    if (file == "-") {
+        tzhost::FileReader standardInput;
+        fault = take(standardInput, content);
+    } else {
+        tzhost::FileReader reader(file);
+        fault = take(reader, content);
+    }
+    if (fault) return shownName(file) + ": " + *fault;
+    return {};
+}
+
 Failure writeStandardOutput(std::string_view bytes) {
     if (std::fwrite(bytes.data(), 1, bytes.size(), stdout) == bytes.size() &&
         std::fflush(stdout) == 0) {
@@ -49,16 +72,11 @@ std::string shownName(std::string const& file) {
 }
 
 Failure readText(std::string const& file, std::wstring& text) {
-    Failure fault;
-    if (file == "-") {
-        tzhost::FileReader standardInput;
-        fault = decodeAll(standardInput, text);
-    } else {
-        tzhost::FileReader reader(file);
-        fault = decodeAll(reader, text);
-    }
-    if (fault) return shownName(file) + ": " + *fault;
-    return {};
+    return readFile(decodeAll, file, text);
+}
+
+Failure readBytes(std::string const& file, std::string& bytes) {
+    return readFile(takeAll, file, bytes);
 }
 
 Failure writeText(std::string const& file, std::wstring_view text) {

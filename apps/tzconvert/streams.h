@@ -18,6 +18,9 @@ using Failure = std::optional<std::string>;
 // or holds a zero character is refused.
 [[nodiscard]] Failure readText(std::string const& file, std::wstring& text);
 
+// The same with any bytes, which may have zeros among them.
+[[nodiscard]] Failure readBytes(std::string const& file, std::string& bytes);
+
 // Writes all of a text as UTF-8, to standard output for an empty name. A file is the old or the new
 // one, whatever happens.
 [[nodiscard]] Failure writeText(std::string const& file, std::wstring_view text);

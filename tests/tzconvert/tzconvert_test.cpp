@@ -103,11 +103,10 @@ constexpr RunCase kRuns[] = {
     {"NoSuchPage",            "to-rtf --code-page 0",                                                    "a"sv,                              2, "",                             "--code-page"                                      },
     {"NoFontMap",             "to-rtf --font-map none.ini",                                              "a"sv,                              2, "",                             "none.ini: cannot be read"                         },
     {"NoFolder",              "to-rtf --output none/x.rtf",                                              "a"sv,                              2, "",                             "none/x.rtf: cannot be written"                    },
-    {"NoCommand",             "",                                                                        ""sv,                               2, "",                             "expected to-rtf, to-mtext, round-trip; try --help"},
+    {"NoCommand",             "",                                                                        ""sv,                               2, "",                             "-rtf, to-mtext, round-trip, normalise; try --help"},
     {"OptionAheadOfCommand",  "--size 3 to-rtf in",                                                      "a"sv,                              2, "",
      "options stand behind the command, not \"--size\""                                                                                                                                                                            },
-    {"UnknownCommand",        "to-html",                                                                 ""sv,                               2, "",
-     "expected to-rtf, to-mtext, round-trip, not \"to-html\""                                                                                                                                                                      },
+    {"UnknownCommand",        "to-html",                                                                 ""sv,                               2, "",                             "to-mtext, round-trip, normalise, not \"to-html\"" },
     {"Version",               "--version",                                                               ""sv,                               0, "~tzconvert 1",                 ""                                                 },
     {"DashAsOutput",          "to-mtext --output -",                                                     "a"sv,                              0, "a",                            ""                                                 },
     {"ReportOnOutput",        "to-mtext --output text --report - --size 2.5",                            "a"sv,                              0,
@@ -155,6 +154,19 @@ TEST_P(Runs, EndAs) {
 INSTANTIATE_TEST_SUITE_P(Commands, Runs, testing::ValuesIn(kRuns), [](auto const& row) {
     return row.param.name;
 });
+
+TEST(Normaliser, TakesBytesAndCountsWhatIsLeftOutInOneLine) {
+    std::string_view const rtf =
+        "{\\new \xC0\0}\\u-10179?\\u-8704?{\\pict}{\\footnote}{\\footnote}{\\header}"sv;
+    Outcome const read = run("to-mtext --normalise --code-page 1251", std::string(rtf));
+    EXPECT_EQ(read.out, "\\U+0410\xF0\x9F\x98\x80");
+    Outcome const written = run("normalise --code-page 1251", std::string(rtf));
+    EXPECT_EQ(written.status, 0);
+    EXPECT_EQ(written.out, "{\\rtf1\\ansi\n\\pard \\u1040?\xF0\x9F\x98\x80\\par\n}");
+    EXPECT_EQ(written.err,
+              "tzconvert: standard input: left out: 1 picture, 2 notes, 1 header or footer\n");
+    EXPECT_EQ(read.err, written.err);
+}
 
 TEST(Files, AreWrittenWholeOrNotAtAll) {
     write("kept.rtf", "old");

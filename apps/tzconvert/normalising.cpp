@@ -1,0 +1,53 @@
+#include "apps/tzconvert/normalising.h"
+
+#include <cstdio>
+#include <utility>
+
+#include "apps/tzconvert/text_codec.h"
+#include "host/rtf/normaliser.h"
+
+namespace tzconvert {
+namespace {
+
+void appendCount(std::string& text, int count, char const* one, char const* several) {
+    if (count == 0) return;
+    text += (text.empty() ? "" : ", ") + std::to_string(count) + " " + (count == 1 ? one : several);
+}
+
+void tellWhatIsLeftOut(std::string const& file, tzhost::NormalisedRtf const& rtf) {
+    std::string counts;
+    appendCount(counts, rtf.pictures, "picture", "pictures");
+    appendCount(counts, rtf.notes, "note", "notes");
+    appendCount(counts, rtf.headers, "header or footer", "headers and footers");
+    std::fprintf(stderr, "tzconvert: %s: left out: %s\n", shownName(file).c_str(), counts.c_str());
+}
+
+Failure normalise(std::string const& file, std::string& document) {
+    tzhost::NormalisedRtf rtf;
+    {
+        std::string bytes;
+        if (Failure failure = readBytes(file, bytes)) return failure;
+        rtf = tzhost::normaliseRtf(bytes);
+    }
+    if (!rtf.isComplete()) tellWhatIsLeftOut(file, rtf);
+    document = std::move(rtf.document);
+    return {};
+}
+
+}  // namespace
+
+Failure readNormalised(std::string const& file, std::wstring& text) {
+    std::string document;
+    if (Failure failure = normalise(file, document)) return failure;
+    text.reserve(document.size());
+    (void)decodeText(document, text);  // it is UTF-8 without zeros
+    return {};
+}
+
+Failure normaliseFile(std::string const& file, std::string const& target) {
+    std::string document;
+    if (Failure failure = normalise(file, document)) return failure;
+    return writeBytes(target, document);
+}
+
+}  // namespace tzconvert

@@ -1,0 +1,219 @@
+#include "host/rtf/dialect_writer.h"
+
+#include <charconv>
+
+#include "host/code_pages/code_page_converter.h"
+#include "host/code_pages/code_page_table.h"
+#include "host/text/utf8.h"
+
+namespace tzhost {
+
+namespace {
+
+constexpr wchar_t kHardSpace = 0xA0;
+constexpr wchar_t kLastEscaped = 0xFFFF;
+
+void appendWord(std::string& text, char const* word) {
+    text += '\\';
+    text += word;
+}
+
+void appendWord(std::string& text, char const* word, long long value) {
+    appendWord(text, word);
+    char digits[24];
+    text.append(digits, std::to_chars(digits, digits + sizeof digits, value).ptr);
+}
+
+void appendLook(std::string& text, DialectLook const& look) {
+    if (look.font >= 0) appendWord(text, "f", look.font);
+    if (look.size > 0) appendWord(text, "fs", look.size);
+    if (look.color >= 0) appendWord(text, "cf", look.color);
+    if (look.isBold) appendWord(text, "b");
+    if (look.isItalic) appendWord(text, "i");
+    if (look.isUnderlined) appendWord(text, "ul");
+    if (look.isStruck) appendWord(text, "strike");
+    if (look.isStackMark) appendWord(text, "dn1234");
+}
+
+char const* familyWord(int family) {
+    static constexpr char const* kWords[] = {"fnil",    "froman",  "fswiss",
+                                             "fmodern", "fscript", "fdecor"};
+    auto const at = static_cast<std::size_t>(family) >> 4;
+    return kWords[at < std::size(kWords) ? at : 0];
+}
+
+// The name in the page of its set, which is how the reader takes names; signs of the table are
+// left out.
+void appendName(std::string& text, DialectFont const& font) {
+    static constexpr char kHex[] = "0123456789abcdef";
+    for (char const c : encode(codePageOf(static_cast<Charset>(font.charset)), font.name)) {
+        auto const byte = static_cast<unsigned char>(c);
+        if (byte >= 0x80)
+            text.append({'\\', '\'', kHex[byte >> 4], kHex[byte & 0xF]});
+        else if (byte >= ' ' && std::string_view("\\{};").find(c) == std::string_view::npos)
+            text += c;
+    }
+}
+
+}  // namespace
+
+int DialectWriter::addFont(DialectFont const& font) {
+    fonts_.push_back(font);
+    return static_cast<int>(fonts_.size()) - 1;
+}
+
+int DialectWriter::colorNumber(unsigned int rgb) {
+    auto const [at, isNew] = colorNumbers_.try_emplace(rgb, static_cast<int>(colors_.size()));
+    if (isNew) colors_.push_back(rgb);
+    return at->second;
+}
+
+void DialectWriter::setLook(DialectLook const& look) {
+    if (look == look_) return;
+    closeLook();
+    if (look == DialectLook()) return;
+    protectStackSign();
+    body_ += '{';
+    appendLook(body_, look);
+    body_ += ' ';
+    look_ = look;
+    if (look.isStackMark) isInStack_ = true;
+}
+
+void DialectWriter::closeLook() {
+    if (look_ == DialectLook()) return;
+    bool const isAhead = body_.size() == paragraphStart_;
+    body_ += '}';
+    if (isAhead) paragraphStart_ = body_.size();
+    look_ = {};
+}
+
+// The reader looks for words of paragraphs behind every backslash, also behind the second of an
+// escaped pair; a line end in between, which it skips, keeps it from finding one there.
+void DialectWriter::ascii(std::string_view text) {
+    if (text.empty()) return;
+    hasContent_ = true;
+    bool const isBehindBackslash = !body_.empty() && body_.back() == '\\';
+    if (isBehindBackslash && std::string_view("flpt").find(text[0]) != std::string_view::npos)
+        body_ += '\n';
+    bool const isStackSign = isBehindBackslash && text == "S" && !look_.isStackMark;
+    stackSignAt_ = isStackSign ? body_.size() : kNowhere;
+    body_ += text;
+}
+
+void DialectWriter::character(wchar_t c) {
+    if (c > kLastEscaped) {
+        stackSignAt_ = kNowhere;
+        body_ += toUtf8(std::wstring_view(&c, 1));
+    } else if (c == kHardSpace) {
+        stackSignAt_ = kNowhere;
+        body_ += "\\~";
+    } else if (c >= 0x80) {
+        openWord();
+        appendWord(body_, "u", c);
+        body_ += '?';
+    } else if (c == '\\' || c == '{' || c == '}') {
+        stackSignAt_ = kNowhere;
+        body_ += '\\';
+        body_ += static_cast<char>(c);
+    } else {
+        char const plain = static_cast<char>(c);
+        ascii({&plain, 1});
+    }
+    hasContent_ = true;
+}
+
+void DialectWriter::tab(DialectLook const& look) {
+    setLines(look);
+    openWord();
+    body_ += "\\tab ";
+    hasContent_ = true;
+}
+
+void DialectWriter::line(DialectLook const& look) {
+    setLines(look);
+    openWord();
+    body_ += "\\line ";
+    hasContent_ = true;
+}
+
+void DialectWriter::setLines(DialectLook const& look) {
+    if (look.isUnderlined != look_.isUnderlined || look.isStruck != look_.isStruck) setLook(look);
+}
+
+void DialectWriter::endStack() {
+    if (!isInStack_) return;
+    isInStack_ = false;
+    body_ += "{\\dn6}";
+}
+
+void DialectWriter::openWord() {
+    protectStackSign();
+}
+
+// Behind an escaped backslash and an "S" the reader swallows words up to the next text. The "S"
+// as a number of its own is no such sign.
+void DialectWriter::protectStackSign() {
+    if (stackSignAt_ == kNowhere) return;
+    body_.replace(stackSignAt_, 1, "\\u83?");
+    stackSignAt_ = kNowhere;
+}
+
+void DialectWriter::endParagraph(DialectParagraph const& paragraph, DialectLook const& mark) {
+    if (!hasContent_)
+        setLook(mark);
+    else if (mark == DialectLook())
+        closeLook();
+    protectStackSign();
+    insertSettings(paragraph);
+    body_ += "\\par\n";
+    paragraphStart_ = body_.size();
+    hasContent_ = false;
+}
+
+// Settings hold for the whole paragraph and are known at its end.
+void DialectWriter::insertSettings(DialectParagraph const& paragraph) {
+    std::string words;
+    appendWord(words, "pard");
+    if (paragraph.firstIndent != 0) appendWord(words, "fi", paragraph.firstIndent);
+    if (paragraph.leftIndent != 0) appendWord(words, "li", paragraph.leftIndent);
+    for (int const stop : paragraph.tabs)
+        appendWord(words, "tx", stop);
+    words += ' ';
+    body_.insert(paragraphStart_, words);
+}
+
+std::string DialectWriter::head() const {
+    std::string text = "{\\rtf1\\ansi";
+    if (!fonts_.empty()) text += "{\\fonttbl";
+    for (std::size_t i = 0; i < fonts_.size(); ++i) {
+        DialectFont const& font = fonts_[i];
+        appendWord(text += '{', "f", static_cast<long long>(i));
+        appendWord(text, familyWord(font.family));
+        if (font.pitch > 0) appendWord(text, "fprq", font.pitch);
+        appendWord(text, "fcharset", font.charset);
+        text += ' ';
+        appendName(text, font);
+        text += ";}";
+    }
+    if (!fonts_.empty()) text += '}';
+    if (!colors_.empty()) text += "{\\colortbl";
+    for (unsigned int const rgb : colors_) {
+        appendWord(text, "red", rgb & 0xFF);
+        appendWord(text, "green", (rgb >> 8) & 0xFF);
+        appendWord(text, "blue", (rgb >> 16) & 0xFF);
+        text += ';';
+    }
+    if (!colors_.empty()) text += '}';
+    return text += '\n';
+}
+
+std::string DialectWriter::finish(DialectParagraph const& last) {
+    if (hasContent_) endParagraph(last, look_);
+    closeLook();
+    body_ += '}';
+    body_.insert(0, head());
+    return std::move(body_);
+}
+
+}  // namespace tzhost
