@@ -24,7 +24,7 @@ tz_row(module/uncalled     USES sdk module/holders module/host_calls module/text
 tz_row(module/fonts        USES sdk module/globals module/host_calls module/texts)
 tz_row(module/prompt       USES sdk module/globals module/host_calls module/texts)
 tz_row(module/markup       USES sdk module/globals module/host_calls module/texts module/styles module/fonts)
-tz_row(module/edit         USES sdk module/globals module/holders module/host_calls module/texts module/geometry)
+tz_row(module/edit         USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/markup)
 tz_row(module/mtext        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/prompt module/edit)
 tz_row(module/commands     USES sdk module/globals module/holders module/host_calls module/texts module/styles module/prompt module/edit)
 tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/prompt module/markup module/edit module/mtext module/commands)

@@ -5,9 +5,9 @@
 #include <cwchar>
 
 #include "host/platform/output.h"
+#include "module/edit/mtext_versioner.h"
 #include "module/texts/attachment_ids.h"
 #include "module/uncalled/flow_direction.h"
-#include "module/uncalled/mtext_versioner.h"
 #include "tz/mte/globals.h"
 
 namespace {

@@ -3,9 +3,9 @@
 #include <gtest/gtest.h>
 
 #include "host/base/fault_point.h"
+#include "module/host_calls/sys_code_page.h"
 #include "module/host_calls/sys_var.h"
 #include "module/host_calls/truncate.h"
-#include "module/uncalled/sys_code_page.h"
 #include "tests/module_ground/variables_fixture.h"
 #include "tz/ge/point3d.h"
 

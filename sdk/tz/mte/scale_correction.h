@@ -21,6 +21,7 @@ public:
     // The reference size, in both measures.
     void SetScaleTwips(int twips) { m_nScaleTwips = twips; }
     void SetScaleUnits(double units) { m_dScaleUnits = units; }
+    [[nodiscard]] int GetScaleTwips() const { return m_nScaleTwips; }
 
     // Truncated toward zero, but for a positive length at least 1. The first length of each twips
     // value is remembered.

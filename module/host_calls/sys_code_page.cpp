@@ -1,4 +1,4 @@
-#include "module/uncalled/sys_code_page.h"
+#include "module/host_calls/sys_code_page.h"
 
 #include <algorithm>
 #include <cwchar>

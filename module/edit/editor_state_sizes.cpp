@@ -1,0 +1,54 @@
+// Lengths of a session: drawing units, twips of font sizes, twips of margins.
+
+#include <climits>
+#include <cmath>
+
+#include "module/host_calls/unit_converter.h"
+#include "tz/mte/editor_state.h"
+#include "tz/mte/globals.h"
+
+namespace {
+
+// The nearest whole number that an int holds; 0 for no number.
+int truncated(double value) {
+    if (std::isnan(value)) return 0;
+    if (value >= static_cast<double>(INT_MAX)) return INT_MAX;
+    if (value <= static_cast<double>(INT_MIN)) return INT_MIN;
+    return static_cast<int>(value);
+}
+
+}  // namespace
+
+double CMTextEditorState::GetMaximumSize() const {
+    return m_fontScale.ScaleTwipsToUnits(m_nMaximumTwipSize);
+}
+
+double CMTextEditorState::GetMinimumSize() const {
+    return m_fontScale.ScaleTwipsToUnits(m_nMinimumTwipSize);
+}
+
+double CMTextEditorState::TwipsToUnits(int twips, signed char bFont) const {
+    return (bFont ? m_fontScale : m_marginScale).ScaleTwipsToUnits(twips);
+}
+
+int CMTextEditorState::UnitsToTwips(double units, signed char bFont) {
+    return (bFont ? m_fontScale : m_marginScale).ScaleUnitsToTwips(units);
+}
+
+// The text form does the rounding: the length is written in the units and the precision in force
+// and read back.
+int CMTextEditorState::TwipsAdjustedForLinearUnits(int twips) {
+    CLinearUnitConverter const units(kLinearUnitsOfDrawing, kPrecisionOfDrawing);
+    TzString const shown = units.MapDoubleToUnit(m_fontScale.ScaleTwipsToUnits(twips));
+    return m_fontScale.ScaleUnitsToTwips(units.MapUnitToDouble(shown, nullptr));
+}
+
+int CMTextEditorState::CalcMarginFromWidth(double width) {
+    double const ratio = width / g_dTextSize / m_dCharWidth / m_dTracking / g_dWidthFactor;
+    return truncated(UnitsToTwips(g_dTextSize, 1) * ratio * gdTweakFactor);
+}
+
+double CMTextEditorState::CalcWidthFromMargin(int margin) {
+    return margin / gdTweakFactor / UnitsToTwips(g_dTextSize, 1) * m_dCharWidth * m_dTracking *
+           g_dWidthFactor * g_dTextSize;
+}
