@@ -66,7 +66,6 @@ struct TextIds {
     unsigned int tooNew = 229;
     unsigned int noMultilineText = 1023;
     unsigned int notAvailable = 1024;
-    unsigned int noDialogEditor = 1025;
     unsigned int inPlaceEditor = 32777;
     unsigned int onLockedLayer = 2083;
     unsigned int outsideWorkingSet = 2086;

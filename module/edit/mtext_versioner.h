@@ -4,8 +4,7 @@
 
 class TzDbMText;
 
-// Tells whether a text was written in a newer format than this module can edit. Nothing calls it
-// yet: it is for the session of the dialog editor.
+// Tells whether a text was written in a newer format than this module can edit.
 //
 //   MTextVersioner versioner(text);
 //   if (versioner.too_new(text->contents())) return;

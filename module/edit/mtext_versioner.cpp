@@ -1,4 +1,4 @@
-#include "module/uncalled/mtext_versioner.h"
+#include "module/edit/mtext_versioner.h"
 
 #include "module/holders/scope_guard.h"
 #include "module/texts/string_table.h"
