@@ -9,7 +9,7 @@
 // name.
 namespace tzhost {
 
-// The words of a command, which are apart at blanks. Quotes, single or double, keep blanks
+// The words of a command: blanks part them, and quotes, single or double, keep blanks
 // together.
 [[nodiscard]] std::vector<std::string> splitCommand(std::string_view command);
 

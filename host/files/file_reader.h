@@ -1,13 +1,14 @@
 #pragma once
 
-// A file read from front to end in pieces, for who needs it in another form than bytes.
+// A file that is read from its start to its end in pieces, for callers who do not need its bytes as
+// a whole.
 //
 //   FileReader reader(path);
 //   std::array<char, 1 << 16> piece;
 //   while (std::size_t const size = reader.read(piece.data(), piece.size())) take(piece, size);
 //   if (reader.hasFailed()) complain(systemReason());
 //
-// Folders are no files. A file over 1 GiB is not read.
+// Folders are refused; pipes and devices are read. Reading fails beyond 1 GiB.
 
 #include <cstddef>
 #include <string>
@@ -16,7 +17,7 @@ namespace tzhost {
 
 class FileReader {
 public:
-    // One that cannot be opened has failed.
+    // A file that cannot be opened has failed.
     explicit FileReader(std::string const& path);
     // Standard input, which stays open.
     FileReader() = default;
@@ -24,10 +25,10 @@ public:
     FileReader(FileReader const&) = delete;
     FileReader& operator=(FileReader const&) = delete;
 
-    // How many bytes the file holds, as the system says; 0 of a pipe.
+    // The number of bytes in the file, as the system says; 0 for a pipe.
     [[nodiscard]] std::size_t expectedSize() const;
-    // Puts the next bytes there, up to `size`; fewer only at the end. 0 at the end, and when
-    // reading fails.
+    // Reads the next `size` bytes, fewer only at the end. The number of bytes; 0 at the end and
+    // when reading fails.
     [[nodiscard]] std::size_t read(char* to, std::size_t size);
     // Whether opening or reading failed; errno then says why.
     [[nodiscard]] bool hasFailed() const { return hasFailed_; }

@@ -14,7 +14,7 @@ namespace tzhost {
 
 class IniData {
 public:
-    // A section's keys and values as written, in the order of the file.
+    // The keys and values of a section as written, in the order of the file.
     using Rows = std::vector<std::pair<std::wstring, std::wstring>>;
 
     struct Section {
@@ -23,11 +23,11 @@ public:
             values;  // by key in lower case, the last of each
     };
 
-    // Of a file's bytes.
+    // Reads the bytes of a file.
     [[nodiscard]] static IniData fromBytes(std::string_view bytes);
 
-    // Null when there is no such section. Valid as long as this object. A section is made ready
-    // when it is first asked for: most of a long file may never be. Not thread-safe.
+    // Null when there is no such section. Valid as long as this object. A section is read when it
+    // is first asked for, since most of a long file may never be needed. Not thread-safe.
     [[nodiscard]] Section const* section(std::wstring_view name) const;
 
 private:
@@ -36,12 +36,12 @@ private:
     mutable std::map<std::wstring, Section> sections_;  // by name in lower case
 };
 
-// The file's data, read anew when the file has changed since; empty for one that cannot be read.
-// Never null.
+// The data of the file, which is read again when it has changed. Empty for a file that cannot be
+// read; never null.
 [[nodiscard]] std::shared_ptr<IniData const> openIni(std::string const& path);
 
-// The bytes with an equals sign behind each key that stands alone, as the file reader needs it: it
-// would give such a key the value of the line before.
+// The bytes with an equals sign after each key that stands alone. Without it the file reader gives
+// such a key the value of the previous line.
 [[nodiscard]] std::string withEqualsSigns(std::string_view bytes);
 
 // Text in lower case, by the host's table.

@@ -61,7 +61,7 @@ public:
         return true;
     }
     bool parse_error(std::size_t, std::string const&, nlohmann::json::exception const& error) {
-        // The parser's text begins with a number of its own in brackets and places behind it.
+        // The parser's text begins with a number in brackets and the place, which are left out.
         std::string const text = error.what();
         std::size_t const colon = text.find(": ");
         return fail(colon == text.npos ? text : text.substr(colon + 2));
@@ -89,7 +89,7 @@ private:
     }
 
     // A new value where the document has grown to. Values that are open are the last of their
-    // parents, so adding behind the innermost one moves none of them.
+    // parents, so adding after the innermost one moves none of them.
     LocatedJson* place(LocatedJson::Kind kind) {
         LocatedJson* here = &result_.root;
         if (!open_.empty() && open_.back()->kind_ == LocatedJson::Kind::object) {

@@ -1,8 +1,8 @@
 #pragma once
 
-// A JSON document whose values know their line, for short files that people write by hand: whoever
-// finds fault with a value can say where it stands. Files of many entries are better read as a
-// stream, with LineCounter beneath it.
+// A JSON document whose values know their line, for short files that people write by hand: a
+// complaint about a value can say where it stands. Files of many entries are better read as a
+// stream over a LineCounter.
 //
 //   LocatedJson::Result const read = LocatedJson::read(bytes);
 //   if (!read.error.empty()) complain(file, read.line, read.error);
@@ -17,7 +17,7 @@
 
 namespace tzhost {
 
-// Reads characters for a parser and knows the line of the last one that was more than a line end.
+// Reads characters for a parser and knows the line of the last one that was not a line end.
 // The copies of an iterator share their counter, which outlives them.
 class LineCounter {
 public:
@@ -61,7 +61,7 @@ private:
     std::string_view bytes_;
     std::size_t counted_ = 0;  // characters before this one are counted
     int line_ = 1;
-    int ends_ = 0;  // line ends behind the last character
+    int ends_ = 0;  // line ends after the last character
 };
 
 class LocatedJson {

@@ -16,7 +16,7 @@
 namespace tzhost {
 namespace {
 
-// A file size limit must give an error, not end the process.
+// Makes a write beyond the limit on file sizes fail instead of ending the process by a signal.
 class NoSizeSignal {
 public:
     NoSizeSignal() {
@@ -39,7 +39,8 @@ mode_t newPermissions() {
     return 0666 & ~mask;
 }
 
-// Makes the renaming last; folders that cannot be flushed are left to the system.
+// Flushes the folder, so that the renaming survives a crash. Where folders cannot be flushed the
+// system does it in its own time.
 void flushFolder(std::filesystem::path const& folder) {
     int const handle =
         open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
@@ -48,8 +49,8 @@ void flushFolder(std::filesystem::path const& folder) {
     (void)close(handle);
 }
 
-// A descriptor for the file when the program's own output goes there ("/dev/stdout"), which must
-// not be replaced, since others write to it too. -1 when it does not.
+// A descriptor for the file when the program's own output goes there ("/dev/stdout"), else -1. Such
+// a file must not be replaced, since others write to it too.
 int ownOutput(std::filesystem::path const& target) {
     struct stat file {};
     if (stat(target.c_str(), &file) != 0 || !S_ISREG(file.st_mode)) return -1;

@@ -27,7 +27,7 @@ bool isEnglish(std::string const& locale) {
 
 std::optional<fs::path>
 translatedFile(fs::path const& folder, std::string const& locale, std::string const& name) {
-    // A locale is a plain word: one that would lead elsewhere is none.
+    // A slash would lead out of the folder, so such a text is no locale.
     if (isEnglish(locale) || locale.find('/') != locale.npos) return std::nullopt;
     std::string const whole = nameOf(locale);
     for (std::string const& part : {whole, languageOf(whole)}) {

@@ -7,8 +7,8 @@
 //   for each text, ascending by id: id, offset of the text from the file's start, its bytes,
 //   the texts in UTF-8
 //
-// The checksum is FNV-1a. A file of another version, another length or another checksum, or whose
-// ids or offsets are out of order, is refused whole.
+// The checksum is FNV-1a. A file is refused whole when its version, length or checksum differs, or
+// when its ids or offsets are out of order.
 
 #include <cstdint>
 #include <map>
@@ -25,7 +25,7 @@ using ResourceTexts = std::map<std::uint32_t, std::wstring>;
 // The texts of one library, as its file holds them.
 class ResourceFile {
 public:
-    // Nothing for bytes that are no whole library.
+    // Nothing when the bytes are not a whole library.
     [[nodiscard]] static std::optional<ResourceFile> fromBytes(std::string bytes);
 
     // The text under an id; nothing when there is none.

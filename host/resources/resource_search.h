@@ -1,6 +1,6 @@
 #pragma once
 
-// Where resource libraries are looked for. Set by whoever loads a module, before it is loaded.
+// Where resource libraries are looked for. The caller that loads a module sets it beforehand.
 
 #include <optional>
 #include <string>
@@ -10,19 +10,19 @@
 namespace tzhost {
 
 struct ResourceSearch {
-    std::string folder;  // the module's; empty: that of this host's libraries
+    std::string folder;  // of the module; empty: that of this host's libraries
     std::string locale;  // such as "de" or "de_AT"; empty: English
-    std::string file;    // one file in place of every library; empty: none
+    std::string file;    // read in place of every library; empty: none
 };
 
-// Replaces the search and returns the one before.
+// Replaces the search and returns the previous one.
 ResourceSearch setResourceSearch(ResourceSearch search);
 // The one in force.
 [[nodiscard]] ResourceSearch const& resourceSearch();
 
-// The first library of that name that is there: in the folder of the locale, of its language, then
-// in the folder itself, where the English one lies. Nothing when it is missing or damaged; a
-// damaged one is not passed over for another.
+// The first library of that name in the folder of the locale, in that of its language, and in the
+// folder itself, where the English one lies. Nothing when there is none, or when the first is
+// damaged: another one is not tried then.
 [[nodiscard]] std::optional<ResourceFile> openResourceFile(std::wstring const& name);
 
 }  // namespace tzhost

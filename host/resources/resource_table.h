@@ -46,11 +46,11 @@ struct ResourceTable {
 // What is wrong, one line each: "en.txt:12: the keyword has no \" _\"".
 using ResourceFaults = std::vector<std::string>;
 
-// Reads a table; faults of single lines are added to `faults`, and those lines left out.
+// Reads a table. A line with a fault is left out, and the fault is added to `faults`.
 [[nodiscard]] ResourceTable
 readResourceTable(std::string const& file, std::string_view bytes, ResourceFaults& faults);
 
-// Adds the faults of a table by itself, and against the table that it translates.
+// Adds the faults of a table: those of its own, and those against the table that it translates.
 void checkResourceTable(ResourceTable const& table, ResourceFaults& faults);
 void checkTranslation(ResourceTable const& original,
                       ResourceTable const& translation,

@@ -20,7 +20,7 @@ using Json = nlohmann::ordered_json;
 
 constexpr int kIndent = 2;
 
-// The document with the user's variables in it.
+// Puts the user's variables into the document.
 void putVariables(Json& document) {
     for (auto const& [name, value] : Variables::instance().kept(KeptIn::user)) {
         std::string const key = toUtf8(name);
@@ -64,7 +64,7 @@ std::optional<std::string> saveUserVariables(std::string const& path) {
     auto const old = readFile(path);
     Json document = Json::object();
     if (old) {
-        // What is no settings file is not ours to write into.
+        // A file that holds no settings may be something else of the user's: it stays as it is.
         if (SettingsResult const read = readSettings(*old); !read.error.empty()) {
             return path + ':' + read.error;
         }

@@ -8,8 +8,8 @@
 //    "productKey": "", "denied": ["FIELD"], "fabric": false, "inPlaceEditors": [],
 //    "rtfEditor": "", "textEditor": ""}
 //
-// Every member may be left out. Anything else is an error with its line and member, and then
-// nothing of the file counts.
+// Every member may be left out. Any other member is an error, told with its line, and then nothing
+// of the file counts.
 
 #include <cstdint>
 #include <map>
@@ -26,7 +26,8 @@ namespace tzhost {
 
 using RegistryValue = std::variant<std::uint32_t, std::wstring>;
 
-// Names of products, of their values and of keys are in lower case, names of values as written.
+// Names of products, of their values and of registry keys are in lower case. Names of registry
+// values are as written.
 struct Settings {
     std::vector<std::pair<std::wstring, VariableValue>> variables;
     std::map<std::wstring, std::map<std::wstring, std::uint32_t>> product;
@@ -42,7 +43,7 @@ struct Settings {
 // The settings in force: empty ones until some are loaded.
 [[nodiscard]] Settings& settings();
 
-// Reads settings; what is wrong with them stands in `error` as "line: member: what".
+// Reads settings. What is wrong with them stands in `error`, as "line: member: what".
 struct SettingsResult {
     Settings settings;
     std::string error;

@@ -19,7 +19,7 @@ namespace {
 
 using Kind = LocatedJson::Kind;
 
-// Keeps the first fault; behind it nothing more is read.
+// Keeps the first fault; nothing is read after it.
 class Reader {
 public:
     void read(LocatedJson const& root);
@@ -99,8 +99,8 @@ bool beginsWithRoot(std::wstring_view key) {
     return false;
 }
 
-// A JSON value as a variable of that type may hold it; another kind of value gives another type,
-// which the variable then refuses.
+// The value of a variable of that type. A JSON value of another kind gives a value of another type,
+// which the variable refuses.
 VariableValue variableValue(LocatedJson const& value, VariableType type) {
     if (value.kind() == Kind::text) return fromUtf8(value.text());
     double const number = value.kind() == Kind::number ? value.number() : std::nan("");

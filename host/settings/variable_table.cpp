@@ -146,7 +146,7 @@ std::span<VariableDefinition const> variableTable() {
     return kVariables;
 }
 
-// Takes no memory, since what gives something back reads variables too.
+// Allocates nothing: destructors that give something back look variables up, and must not fail.
 VariableDefinition const* findVariable(std::wstring_view name) {
     constexpr std::size_t kLongest = 32;
     std::array<wchar_t, kLongest> buffer{};

@@ -1,7 +1,7 @@
 #pragma once
 
-// The system variables that there are: one row each with type, default, limits and where the value
-// is kept. What they hold lives in host/settings/variables.h.
+// The system variables: one row each with its type, default, limits and where its value is kept.
+// The values themselves are in host/settings/variables.h.
 
 #include <optional>
 #include <span>

@@ -30,8 +30,8 @@ using VariableValue = std::variant<short, double, std::wstring, VariablePoint>;
 // The shortest text that reads back as the same number, such as "0.2" or "1e+30".
 [[nodiscard]] std::wstring writeReal(double value);
 
-// The number that the whole text means; nothing for an empty text, one with something behind the
-// number, or one that is not finite.
+// The number that the whole text means. Nothing for an empty text, for one that goes on after the
+// number, and for a number that is not finite.
 [[nodiscard]] std::optional<double> readReal(std::wstring_view text);
 
 }  // namespace tzhost

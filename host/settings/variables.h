@@ -1,8 +1,7 @@
 #pragma once
 
-// What the system variables hold: one store for the process, as one drawing is worked on at a time.
-// Whoever opens a drawing puts its values in, whoever saves one takes them out, and undo takes
-// snapshots.
+// The values of the system variables: one store for the process, since one drawing is open at a
+// time. Opening a drawing puts its values in, saving one takes them out, and undo takes snapshots.
 //
 //   tzhost::Variables& store = tzhost::Variables::instance();
 //   if (auto const written = store.set(L"LUNITS", short{4}, tzhost::Writer::user);
@@ -10,9 +9,9 @@
 //       say(written.reason);
 //   }
 //
-// An override is a value for this run alone, whatever the variable's kind: it shows in every read,
-// hides what the drawing or the settings say, is never saved, and ends with the next write; one of
-// a read-only variable holds, as only the host itself writes those. Not thread-safe.
+// An override is a value for this run alone. It hides the value of the drawing or the settings in
+// every read and is never saved. The next write ends it, but not that of a read-only variable,
+// which only the host writes. Not thread-safe.
 
 #include <functional>
 #include <map>
@@ -27,7 +26,7 @@
 
 namespace tzhost {
 
-// Who writes. Users and modules are refused at read-only variables; the host is not.
+// Who writes. Only the host may write read-only variables.
 enum class Writer { user, module, host };
 
 struct WriteResult {
@@ -37,7 +36,7 @@ struct WriteResult {
     [[nodiscard]] bool isDone() const { return reason.empty(); }
 };
 
-// One write that took place, the value being equal to the one before or not.
+// A write that took place. The value may equal the previous one.
 struct VariableWrite {
     VariableDefinition const& definition;
     VariableValue const& value;
@@ -58,22 +57,21 @@ public:
     WriteResult set(std::wstring_view name, VariableValue const& value, Writer writer);
     // The same from a text as SETVAR and --var get it.
     WriteResult setFromText(std::wstring_view name, std::wstring_view text, Writer writer);
-    // A value for this run alone, read-only variables included; limits hold.
+    // Sets an override. Read-only variables take one too; limits hold.
     WriteResult overrideFromText(std::wstring_view name, std::wstring_view text);
 
-    // The values of one kind beneath the overrides, by name: what a drawing or the settings save.
+    // The values of one kind without overrides, by name: what a drawing or the settings save.
     using Values = std::vector<std::pair<std::wstring_view, VariableValue>>;
     [[nodiscard]] Values kept(KeptIn kind) const;
-    // Puts every variable of one kind back to its default beneath the overrides, as a new drawing
-    // does.
+    // Puts every variable of one kind back to its default, as a new drawing does. Overrides stay.
     void resetKept(KeptIn kind);
-    // Everything as at the start, without overrides. Observers stay and are not told.
+    // Puts every variable back to its default, without overrides. Observers stay and are not told.
     void reset();
-    // Puts a value that a drawing or the settings kept in its place beneath an override, read-only
-    // variables included. Observers are not told.
+    // Sets the value that a drawing or the settings kept; an override stays. Read-only variables
+    // are set too. Observers are not told.
     WriteResult setKept(std::wstring_view name, VariableValue const& value);
 
-    // Everything of the drawing, overrides included, for undo: restore brings back the same state.
+    // All variables that a drawing keeps, with their overrides, for undo: restore brings them back.
     struct Slot {
         VariableValue value;
         std::optional<VariableValue> override_;
@@ -82,7 +80,8 @@ public:
     [[nodiscard]] Snapshot snapshot() const;
     void restore(Snapshot const& snapshot);
 
-    // Calls `observer` behind every write of set and setFromText; the number takes it out again.
+    // Calls `observer` after every write by set and setFromText. Returns its number, by which
+    // removeObserver takes it out.
     using Observer = std::function<void(VariableWrite const&)>;
     int addObserver(Observer observer);
     void removeObserver(int number);

@@ -8,7 +8,7 @@
 
 namespace {
 
-// Looks its value up at each read, so that it shows later changes.
+// Looks the value up at each read, so that later changes show.
 class Variable : public TzRxVariable {
 public:
     explicit Variable(tzhost::VariableDefinition const& row) : row_(row) {}

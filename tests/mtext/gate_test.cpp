@@ -161,7 +161,7 @@ struct ContentsRow {
     char const* name;
     wchar_t const* before;
     char const* left;     // in the editor
-    wchar_t const* code;  // of the field behind the session; empty for none
+    wchar_t const* code;  // of the field after the session; empty for none
     wchar_t const* contents;
     bool written;
 };
