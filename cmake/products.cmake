@@ -1,4 +1,4 @@
-# The products, made of the layers that exist.
+# The products, made of the layers.
 
 # The ground of the host for programs without libtz: archives that call each other through the
 # operations of sdk/, so the linker reads them until nothing is missing.
@@ -7,49 +7,43 @@ target_link_libraries(tz_ground INTERFACE $<LINK_GROUP:RESCAN,host_base,host_geo
 
 # The embedded host: every host layer whole, so that what only the module calls is in it too.
 tz_layers_in("^host/" layers)
-if(layers)
-    add_library(tz SHARED ${CMAKE_CURRENT_LIST_DIR}/empty.cpp)
-    foreach(layer IN LISTS layers)
-        target_link_libraries(tz PRIVATE $<LINK_LIBRARY:WHOLE_ARCHIVE,${layer}>)
-    endforeach()
-    target_link_libraries(tz PRIVATE Threads::Threads ${CMAKE_DL_LIBS})
-    target_link_options(tz PRIVATE ${TZ_LINK_DEFS})
-    set_target_properties(tz PROPERTIES VERSION 1 SOVERSION 1)
-    add_dependencies(tz_products tz)
-endif()
+add_library(tz SHARED ${CMAKE_CURRENT_LIST_DIR}/empty.cpp)
+foreach(layer IN LISTS layers)
+    target_link_libraries(tz PRIVATE $<LINK_LIBRARY:WHOLE_ARCHIVE,${layer}>)
+endforeach()
+target_link_libraries(tz PRIVATE Threads::Threads ${CMAKE_DL_LIBS})
+target_link_options(tz PRIVATE ${TZ_LINK_DEFS})
+set_target_properties(tz PROPERTIES VERSION 1 SOVERSION 1)
+add_dependencies(tz_products tz)
 
 # The module: every module layer whole, hidden but for the names of its list.
 tz_layers_in("^module/" layers)
-if("module_shell" IN_LIST layers AND TARGET tz)
-    set(exports ${PROJECT_SOURCE_DIR}/module/shell/exports.txt)
-    set(version_script ${CMAKE_BINARY_DIR}/tzmted.version)
-    add_custom_command(OUTPUT ${version_script}
-        COMMAND Python3::Interpreter ${PROJECT_SOURCE_DIR}/scripts/lint/exports.py
-            --list ${exports} --version-script ${version_script}
-        DEPENDS ${exports} ${PROJECT_SOURCE_DIR}/scripts/lint/exports.py VERBATIM)
-    add_custom_target(tzmted_version_script DEPENDS ${version_script})
-    add_library(tzmted MODULE ${CMAKE_CURRENT_LIST_DIR}/empty.cpp)
-    foreach(layer IN LISTS layers)
-        target_link_libraries(tzmted PRIVATE $<LINK_LIBRARY:WHOLE_ARCHIVE,${layer}>)
-    endforeach()
-    target_link_libraries(tzmted PRIVATE tz)
-    tz_module_properties(tzmted tzmted)
-    target_link_options(tzmted PRIVATE -Wl,--version-script=${version_script})
-    set_target_properties(tzmted PROPERTIES LINK_DEPENDS ${version_script})
-    add_dependencies(tzmted tzmted_version_script)
-    add_dependencies(tz_products tzmted)
-endif()
+set(exports ${PROJECT_SOURCE_DIR}/module/shell/exports.txt)
+set(version_script ${CMAKE_BINARY_DIR}/tzmted.version)
+add_custom_command(OUTPUT ${version_script}
+    COMMAND Python3::Interpreter ${PROJECT_SOURCE_DIR}/scripts/lint/exports.py
+        --list ${exports} --version-script ${version_script}
+    DEPENDS ${exports} ${PROJECT_SOURCE_DIR}/scripts/lint/exports.py VERBATIM)
+add_custom_target(tzmted_version_script DEPENDS ${version_script})
+add_library(tzmted MODULE ${CMAKE_CURRENT_LIST_DIR}/empty.cpp)
+foreach(layer IN LISTS layers)
+    target_link_libraries(tzmted PRIVATE $<LINK_LIBRARY:WHOLE_ARCHIVE,${layer}>)
+endforeach()
+target_link_libraries(tzmted PRIVATE tz)
+tz_module_properties(tzmted tzmted)
+target_link_options(tzmted PRIVATE -Wl,--version-script=${version_script})
+set_target_properties(tzmted PROPERTIES LINK_DEPENDS ${version_script})
+add_dependencies(tzmted tzmted_version_script)
+add_dependencies(tz_products tzmted)
 
 # The programs: each is its layer, which suites link too, and a main.cpp.
 function(tz_program name)
     add_executable(${name} ${PROJECT_SOURCE_DIR}/apps/${name}/main.cpp)
     tz_flags(${name})
-    target_link_libraries(${name} PRIVATE $<TARGET_NAME_IF_EXISTS:app_${name}> ${ARGN})
+    target_link_libraries(${name} PRIVATE app_${name} ${ARGN})
     add_dependencies(tz_products ${name})
 endfunction()
-if(TARGET app_tzdraft AND TARGET tz AND EXISTS ${PROJECT_SOURCE_DIR}/apps/tzdraft/main.cpp)
-    tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
-endif()
+tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
 # Archives only, so that no drawing database and no display library comes along.
 tz_link_closure(layers module_markup)
 tz_program(tzconvert ${layers} tz_ground)

@@ -71,7 +71,7 @@ function(tz_flags target)
         -Wnon-virtual-dtor -Wold-style-cast $<$<BOOL:${TZ_WERROR}>:-Werror>)
 endfunction()
 
-# The existing targets of `names`, each layer followed by those of its row, highest first, so that
+# The targets of `names`, each layer followed by those of its row, highest first, so that
 # archives stand in the order in which a linker wants them. Host layers are left out: they come as
 # libtz, or (for programs without it) are named by the caller.
 function(tz_link_closure out)
@@ -91,7 +91,7 @@ function(tz_link_closure out)
     list(REVERSE folders)
     foreach(folder IN LISTS folders)
         tz_target_of(${folder} name)
-        if(folder IN_LIST wanted AND TARGET ${name} AND NOT folder MATCHES "^host/|^sdk$")
+        if(folder IN_LIST wanted AND NOT folder MATCHES "^host/|^sdk$")
             list(APPEND result ${name})
         endif()
     endforeach()
@@ -144,7 +144,7 @@ function(add_layer name)
     set_property(GLOBAL APPEND PROPERTY TZ_LAYERS ${name})
 endfunction()
 
-# The existing layers with code whose folder matches `pattern`.
+# The layers with code whose folder matches `pattern`.
 function(tz_layers_in pattern out)
     get_property(layers GLOBAL PROPERTY TZ_LAYERS)
     set(result "")
@@ -162,7 +162,7 @@ function(tz_proof_target target)
     tz_flags(${target})
     target_include_directories(${target} PRIVATE ${TZ_ALL_ROOTS})
     tz_link_closure(libs ${ARGN})
-    target_link_libraries(${target} PUBLIC ${libs} $<TARGET_NAME_IF_EXISTS:tz>
+    target_link_libraries(${target} PUBLIC ${libs} tz
         tz_library_json tz_library_ini tz_library_fontconfig tz_library_pango tz_library_cairo
         tz_library_cli tz_library_editline)
     get_target_property(type ${target} TYPE)
@@ -270,9 +270,6 @@ function(tz_module_properties target output)
 endfunction()
 
 function(add_example_program name)
-    if(NOT TARGET tz)
-        return()
-    endif()
     add_executable(example_${name} ${ARGN})
     tz_flags(example_${name})
     set_target_properties(example_${name} PROPERTIES OUTPUT_NAME ${name})
@@ -282,17 +279,12 @@ function(add_example_program name)
 endfunction()
 
 function(add_example_module name)
-    if(NOT TARGET tz)
-        return()
-    endif()
     add_library(example_${name} MODULE ${ARGN})
     tz_flags(example_${name})
     tz_module_properties(example_${name} ${name})
     target_include_directories(example_${name} PRIVATE ${TZ_ROOT_sdk} ${TZ_ROOT_examples})
-    if(TARGET tzmted)
-        add_dependencies(example_${name} tzmted)
-        target_link_libraries(example_${name} PRIVATE $<TARGET_FILE:tzmted>)
-    endif()
+    add_dependencies(example_${name} tzmted)
+    target_link_libraries(example_${name} PRIVATE $<TARGET_FILE:tzmted>)
     target_link_libraries(example_${name} PRIVATE tz)
     add_dependencies(tz_products example_${name})
 endfunction()
