@@ -26,10 +26,11 @@ struct SizeQuestion {
     unsigned flags;
     double heights;
 };
-constexpr SizeQuestion kTotalWidth{kText.totalWidthPrompt, 6, 80.0};
-constexpr SizeQuestion kColumnWidth{kText.columnWidthPrompt, 6, 30.0};
-constexpr SizeQuestion kColumnGutter{kText.gutterWidthPrompt, 4, 5.0};
-constexpr SizeQuestion kColumnHeight{kText.columnHeightPrompt, 6, 10.0};
+constexpr SizeQuestion kTotalWidth{kText.totalWidthPrompt, kRefusesZero | kRefusesNegative, 80.0};
+constexpr SizeQuestion kColumnWidth{kText.columnWidthPrompt, kRefusesZero | kRefusesNegative, 30.0};
+constexpr SizeQuestion kColumnGutter{kText.gutterWidthPrompt, kRefusesNegative, 5.0};
+constexpr SizeQuestion kColumnHeight{kText.columnHeightPrompt, kRefusesZero | kRefusesNegative,
+                                     10.0};
 
 bool askSize(SizeQuestion const& question, double textHeight, double& size) {
     CKeywordTable none;

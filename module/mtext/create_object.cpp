@@ -123,8 +123,7 @@ bool editText(TzxMtextCommand const& command, EasyObject<TzDbMText>& text, Purpo
 // is.
 void storeDefaults(TzxMtextCommand& command, TzDbObjectId style) {
     TzDbDatabase* const database = tzdbHostApplicationServices()->workingDatabase();
-    if (StyleIsAnnotative(database->textstyle()))
-        command.textHeight *= CTzadSysVar::GetDouble(L"CANNOSCALEVALUE");
+    if (StyleIsAnnotative(database->textstyle())) command.textHeight *= annotationScale();
     (void)CTzadSysVar::SetDouble(L"TEXTSIZE", command.textHeight);
     (void)database->setTextstyle(style);
     (void)SetLineSpacingStyle(static_cast<TzDb::LineSpacingStyle>(command.lineSpacingStyle));

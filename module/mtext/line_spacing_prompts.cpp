@@ -13,9 +13,6 @@
 
 namespace {
 
-// Negative values are refused, free text comes through.
-constexpr unsigned kFactorFlags = 0x84;
-
 bool endsWithX(TzString const& text) {
     wchar_t const last = text.getAt(text.length() - 1);
     return last == L'x' || last == L'X';
@@ -51,7 +48,7 @@ bool TzxMtextCommandBase::DoLineSpacingFactorPrompt() {
     CKeywordTable none;
     TzString const prompt = gStringTable[kText.lineSpacingFactorPrompt] +
                             TzString::formatted(L" <%.3gx>", lineSpacingFactor);
-    CTzsDistanceInput input(kFactorFlags, none, prompt, firstCornerUcs);
+    CTzsDistanceInput input(kRefusesNegative | kTakesFreeText, none, prompt, firstCornerUcs);
     for (;;) {
         switch (input.Prompt()) {
         case statusNone: return true;

@@ -1,6 +1,5 @@
 // The questions for attachment, rotation, height and width, and the typed text.
 
-#include "module/host_calls/sys_var.h"
 #include "module/prompt/angle_input.h"
 #include "module/prompt/asking.h"
 #include "module/prompt/distance_input.h"
@@ -11,15 +10,6 @@
 #include "module/texts/string_table.h"
 #include "module/texts/text_ids.h"
 #include "tz/mte/mtext_command.h"
-
-namespace {
-
-// Flags of a question.
-constexpr unsigned kRefusesEmpty = 1;
-constexpr unsigned kRefusesZeroAndNegative = 6;
-constexpr unsigned kRefusesNegative = 4;
-
-}  // namespace
 
 bool TzxMtextCommandBase::DoAttachPrompt() {
     CKeywordTable keywords(kAttachmentKeywords.data(),
@@ -48,9 +38,9 @@ bool TzxMtextCommandBase::DoRotatePrompt() {
 bool TzxMtextCommandBase::DoHeightPrompt(bool useBase) {
     // The height of an annotative text is asked for as it shows in the drawing.
     bool const annotative = StyleIsAnnotative(GetTextStyleID(styleName));
-    double const scale = annotative ? CTzadSysVar::GetDouble(L"CANNOSCALEVALUE") : 1.0;
+    double const scale = annotative ? annotationScale() : 1.0;
     CKeywordTable none;
-    CTzsDistanceInput input(kRefusesZeroAndNegative, none,
+    CTzsDistanceInput input(kRefusesZero | kRefusesNegative, none,
                             gStringTable[annotative ? kText.paperHeightPrompt : kText.heightPrompt],
                             useBase ? firstCornerUcs : nullptr);
     input.SetDefault(textHeight * scale);

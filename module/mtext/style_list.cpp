@@ -60,7 +60,7 @@ ListCounts printStyles(TzDbTextStyleTableIterator& walk, TzString const& pattern
         EasyObject<TzDbTextStyleTableRecord> style;
         if (walk.getRecord(style.object, TzDb::kForRead) != Tzad::eOk) continue;
         TzString const name = style->getName();
-        if (name.find(L'|') != -1) {
+        if (name.find(kExternalStyleMark) != -1) {
             ++counts.external;
         } else if (tzutWcMatchEx(name, pattern, true)) {
             printStyle(*style.object);

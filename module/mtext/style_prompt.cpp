@@ -1,17 +1,11 @@
 // The question for the text style.
 
 #include "module/prompt/string_input.h"
+#include "module/styles/style_rules.h"
 #include "module/texts/string_table.h"
 #include "module/texts/text_ids.h"
 #include "tz/ed/print.h"
 #include "tz/mte/mtext_command.h"
-
-namespace {
-
-// The names of styles that belong to an external reference hold this; they cannot be chosen.
-constexpr wchar_t kExternalMark = L'|';
-
-}  // namespace
 
 bool TzxMtextCommandBase::DoStylePrompt() {
     CKeywordTable none;
@@ -31,7 +25,7 @@ bool TzxMtextCommandBase::DoStylePrompt() {
         }
         // Nothing was asked for: a failed question leaves the style too.
         if (answer.isEmpty()) return true;
-        if (IsStyleNameOK(answer) && answer.find(kExternalMark) == -1) {
+        if (IsStyleNameOK(answer) && answer.find(kExternalStyleMark) == -1) {
             styleName = answer;
             return true;
         }

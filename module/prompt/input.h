@@ -22,6 +22,13 @@ enum PromptStatus : int {
     statusKeyword = -5005  // a keyword or free text was given
 };
 
+// Bits of a question's flags: answers that the host refuses, and asks again. Other bits change
+// nothing.
+inline constexpr unsigned kRefusesEmpty = 1;
+inline constexpr unsigned kRefusesZero = 2;
+inline constexpr unsigned kRefusesNegative = 4;
+inline constexpr unsigned kTakesFreeText = 0x80;  // gives it back as statusKeyword
+
 class CTzsInput {
 public:
     // `flags` go to tzedInitGet with each asking. The table is copied, its ids stay borrowed.

@@ -24,6 +24,12 @@ class TzDbTextStyleTableRecord;
 // such property.
 [[nodiscard]] bool StyleIsAnnotative(TzDbObjectId style);
 
+// The names of styles that belong to an external reference hold this; they cannot be chosen.
+inline constexpr wchar_t kExternalStyleMark = L'|';
+
+// Drawing units to one unit of an annotative text's own height, the variable CANNOSCALEVALUE.
+[[nodiscard]] double annotationScale();
+
 // The text height to begin with, in drawing units: the style's own, over the annotation scale for
 // an annotative style; for a style of variable height TEXTSIZE; 0.2 when neither gives one.
 [[nodiscard]] double ComputeTextSize(TzDbObjectId style);

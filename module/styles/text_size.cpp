@@ -14,11 +14,11 @@ double ownHeightOf(TzDbObjectId style) {
     return record->textSize();
 }
 
+}  // namespace
+
 double annotationScale() {
     return CTzadSysVar::GetDouble(L"CANNOSCALEVALUE");
 }
-
-}  // namespace
 
 double ComputeTextSize(TzDbObjectId style) {
     double size = ownHeightOf(style);
