@@ -139,6 +139,10 @@ Reply TzEdJigDriver::pick(TzGePoint3d const& user) {
         Reply const moved = moveTo(user);
         if (moved.kind == Reply::Kind::done) return moved;
     }
-    tzhost::setLastPoint(jig_.data_.hasPoint ? toUser(jig_.data_.point) : user);
+    // The way through world coordinates and back would round the numbers that were typed; a point
+    // that ortho mode held elsewhere has no others.
+    TzGePoint3d const& sampled = jig_.data_.point;
+    bool const isAsTyped = !jig_.data_.hasPoint || sampled.isEqualTo(toWorld(user));
+    tzhost::setLastPoint(isAsTyped ? user : toUser(sampled));
     return Reply::done(TzEdJig::kNormal);
 }

@@ -139,6 +139,19 @@ TEST_F(Drags, GoOnWhereTheCursorStands) {
     EXPECT_TRUE(tzhost::lastPoint().isEqualTo({6, 6, 0}));
 }
 
+// It used to go through world coordinates and back, which rounded it.
+TEST_F(Drags, LeaveTheLastPointAsItWasTyped) {
+    Session const session("62.1,14.3\n");
+    ASSERT_TRUE(tzhost::setUserSystem({
+        {100000.3, 7.7, 0},
+        {0.8,      0.6, 0},
+        {-0.6,     0.8, 0}
+    }));
+    (void)NotingJig().drag();
+    EXPECT_EQ(tzhost::lastPoint().x, 62.1);
+    EXPECT_EQ(tzhost::lastPoint().y, 14.3);
+}
+
 TEST_F(Drags, EndWithWhatTheSamplerSays) {
     Session const session("1,1\n2,2\n");
     NotingJig jig;
