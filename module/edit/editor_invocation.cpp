@@ -84,7 +84,7 @@ int InvokeEditorOn(EasyObject<TzDbMText>& text,
     gMTextFixed = CTzadSysVar::GetInt(L"MTEXTFIXED");
     tzdbHostApplicationServices()->textEditorStarting();
     EditedText const edited(text);
-    TzArray<TzGePoint3d> boundingPoints;  // measures the text ahead of the session; not looked at
+    TzArray<TzGePoint3d> boundingPoints;  // measures the text before the session; not looked at
     text->getBoundingPoints(boundingPoints);
     resetFontList();
 

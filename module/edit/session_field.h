@@ -4,7 +4,7 @@
 #include "tz/mte/easy_object.h"
 
 // The field that an editor session leaves in the holder of a text that is in no drawing. Whoever
-// runs the session makes one of these ahead of it, so that a field is never lost.
+// runs the session makes one of these before it, so that a field is never lost.
 //
 //   EasyObject<TzDbMText> held(text, EasyFlags::kNone);
 //   SessionField field(held);

@@ -18,7 +18,7 @@ public:
 
     // In the drawing's angular units.
     [[nodiscard]] TzString FormattedReal() const override;
-    // The angle of the last answer, or the default behind an empty one; GetReal by another name.
+    // The angle of the last answer, or the default after an empty one; GetReal by another name.
     [[nodiscard]] virtual double GetAngle() const;
 
     [[nodiscard]] int OnPrompt(TzString const& prompt) override;

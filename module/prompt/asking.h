@@ -4,7 +4,7 @@
 
 // Questions that are asked once, or until they are answered.
 
-// An answer that carries a value: one that was given, or the default behind an empty answer.
+// An answer that carries a value: one that was given, or the default after an empty answer.
 [[nodiscard]] constexpr bool isAnswered(int status) {
     return status == statusNormal || status == statusNone;
 }

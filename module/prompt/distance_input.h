@@ -18,7 +18,7 @@ public:
 
     // In the drawing's linear units.
     [[nodiscard]] TzString FormattedReal() const override;
-    // The length of the last answer, or the default behind an empty one; GetReal by another name.
+    // The length of the last answer, or the default after an empty one; GetReal by another name.
     [[nodiscard]] virtual double GetDistance() const;
 
     [[nodiscard]] int OnPrompt(TzString const& prompt) override;

@@ -62,10 +62,10 @@ public:
     [[nodiscard]] int GetKeywordCount() const { return keywords.GetCount(); }
 
 protected:
-    // `text` with the keywords behind it in brackets; the keywords alone when it is empty.
+    // `text`, then the keywords in brackets; the keywords alone when it is empty.
     [[nodiscard]] TzString DefaultPrompt(TzString const& text) const;
     [[nodiscard]] TzString DefaultPrompt() const { return DefaultPrompt(promptText); }
-    // The same with a default, in angle brackets, ahead of the keywords.
+    // The same with a default, in angle brackets, before the keywords.
     [[nodiscard]] TzString PromptWithDefault(TzString const& shownDefault) const;
 
     TzString promptText;  // without default, keywords and colon

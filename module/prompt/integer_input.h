@@ -14,7 +14,7 @@ public:
 
     // Also lets an empty answer through (bit 0 of the flags) that the flags refused.
     virtual void SetDefault(int value);
-    // The last answer, or the default behind an empty one; 0 before one, and as it was after a
+    // The last answer, or the default after an empty one; 0 before one, and as it was after a
     // failure or a cancel.
     [[nodiscard]] virtual int GetInteger() const;
     // The default as the prompt shows it.

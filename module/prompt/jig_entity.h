@@ -12,7 +12,7 @@
 //   };
 //
 // and is dragged by a CTzsJigInput of module/prompt/jig_input.h. It lies on the stack of whoever
-// asks, ahead of the input, and is never added to a drawing. Points are world coordinates.
+// asks, made before the input, and is never added to a drawing. Points are world coordinates.
 class CTzsJigEntity : public TzDbEntity {
 public:
     // What the host draws: the preview itself.

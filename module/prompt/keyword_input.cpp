@@ -17,7 +17,7 @@ bool CTzsKeywordInput::HasDefault() const {
 
 TzString CTzsKeywordInput::PromptString() const {
     if (!HasDefault()) return DefaultPrompt();
-    // Other than for values, the default stands behind the brackets.
+    // Questions for values show their default before the keywords, this one after them.
     return DefaultPrompt() + L" <" + FormatAsPromptOption(GetKeywordString(GetDefault(), true)) +
            L">";
 }

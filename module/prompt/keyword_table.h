@@ -4,7 +4,7 @@
 #include "tz/text/string.h"
 
 // The keywords of one question, by the ids of their texts. Each text reads "local words _global
-// word": the local part is the translator's and may hold a comma, behind which words stand that
+// word": the local part is the translator's and may hold a comma, after which words stand that
 // only serve to match; the global one is the same in every language. Blanks, "=", "(" and ")" are
 // no part of what is matched.
 //
@@ -27,7 +27,7 @@ public:
     // Reads the texts; what follows needs them.
     void LoadStrings();
     // The two parts of the text at `index`. A text without a separator is the local part whole, and
-    // the global one is then what stands behind its first character.
+    // the global one is then what stands after its first character.
     void GetKeywords(int index, TzString& local, TzString& global) const;
     // `index` must be one of the table's.
     [[nodiscard]] unsigned int GetKeywordID(int index) const { return keywordIds[index]; }

@@ -9,7 +9,7 @@
 
 // Variables that the module exports for other host modules to read. They are defined by the module
 // and live from its load to its unload; the module alone writes them, on the host's one thread.
-// First values stand behind each.
+// The comment of each begins with its first value.
 
 // The module's texts by their ids, with variables expanded: "{NAME}" stands for the value of a
 // system variable, "{(}" and "{)}" for braces. An id without a text gives the empty text. [any]
