@@ -7,7 +7,7 @@
 
 #include "apps/tzconvert/batch.h"
 #include "apps/tzconvert/options.h"
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 
 namespace {
 

@@ -7,7 +7,7 @@
 
 #include "host/code_pages/code_page_converter.h"
 #include "host/code_pages/code_page_table.h"
-#include "host/fonts/font_catalogue.h"
+#include "host/fonts/machine_catalogue.h"
 #include "host/text/case_table.h"
 
 namespace tzhost {

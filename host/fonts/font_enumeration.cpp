@@ -4,7 +4,7 @@
 #include <string>
 
 #include "host/base/fault_point.h"
-#include "host/fonts/font_catalogue.h"
+#include "host/fonts/machine_catalogue.h"
 #include "tz/text/font_info.h"
 
 // Nothing is drawn through a device context; it only shows that a window was there.

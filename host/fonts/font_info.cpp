@@ -4,7 +4,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/files/ini_data.h"
-#include "host/fonts/font_catalogue.h"
+#include "host/fonts/machine_catalogue.h"
 
 namespace {
 

@@ -3,8 +3,8 @@
 #include "tz/mte/font_map_database.h"
 
 // What the table alone says of a face: the entry of exactly that description, or null. The font
-// service is not asked, so that the fonts of the machine need not be read for a face that is
-// written as a face anyway. Fills the table when it is empty; valid until the table changes.
+// service is not asked: it takes long at its first question, and who calls this takes no notice of
+// the file that it would name. Fills the table when it is empty; valid until the table changes.
 [[nodiscard]] CMTextFontToFileMapEntry const* fontEntry(CMTextFontMapDatabase& fonts,
                                                         CStdStrW const& face,
                                                         bool bold,

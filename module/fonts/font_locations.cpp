@@ -2,7 +2,7 @@
 
 #include "module/fonts/font_locations.h"
 
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 #include "tz/pal/settings.h"
 
 namespace {

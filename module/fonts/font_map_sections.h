@@ -22,7 +22,7 @@ private:
     signed char m_bOneWay;  // the low eight bits of the key's number: 256 reads as 0
 };
 
-// Lets a described face lead to a file, in the place of the one that it led to; a folder ahead of
+// Lets a described face lead to a file, in the place of the one that it led to; a folder before
 // the file does not count.
 void leadBack(TableKey const& face, CStdStrW const& file, CMTextFontMapDatabase::MapType type);
 

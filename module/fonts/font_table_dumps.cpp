@@ -1,6 +1,6 @@
 // The tables as sections of an INI file, for developers.
 
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 #include "tz/pal/ini_file.h"
 
 namespace {

@@ -1,6 +1,6 @@
 // The tables of the process and their emptying.
 
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 
 IFileToFontMapEntry::~IFileToFontMapEntry() = default;
 IFontToFileMapEntry::~IFontToFileMapEntry() = default;

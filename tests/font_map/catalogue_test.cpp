@@ -9,7 +9,7 @@
 
 #include "host/settings/settings.h"
 #include "module/fonts/font_locations.h"
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 
 namespace {
 
@@ -116,7 +116,7 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
     };
     tzhost::settings().productKey = L"SOFTWARE\\Product";
     CTzadFontMapDatabase::PopulateDatabaseFromRegistry();
-    // The walk closes both lists again, so that nothing is found behind it.
+    // The walk closes both lists again, so that nothing is found after it.
     EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(L"Plain Face"), L"");
     ASSERT_TRUE(regLocation().Open(HKEY_LOCAL_MACHINE, CTzadFontMapDatabase::m_sRegistryLocation));
     ASSERT_TRUE(regLocationAlt().Open(HKEY_LOCAL_MACHINE, L"SOFTWARE\\Product\\AltFontNames"));

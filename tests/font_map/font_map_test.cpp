@@ -169,7 +169,7 @@ TEST_F(FontMap, ProxiesRunOutAndTheEmergencyFaceHasNoWayBack) {
     EXPECT_EQ(byFile(fonts, L"u1.shx"), L"Proxy A|0|0|0|0|2");
     EXPECT_EQ(byFile(fonts, L"U2"), L"Proxy B|0|0|0|0|2");
     EXPECT_FALSE(fonts.ProxiesExhausted());
-    // The gap at 3 ends the list; the next file reads the key behind it.
+    // The gap at 3 ends the list; the next file reads the key after it.
     EXPECT_EQ(byFile(fonts, L"u3.shx"), L"Last Resort|0|0|0|0|2");
     EXPECT_TRUE(fonts.ProxiesExhausted());
     EXPECT_EQ(byFile(fonts, L"u4.shx"), L"Never Read|0|0|0|0|2");
@@ -271,15 +271,15 @@ TEST_F(FontMap, OffersFacesToAList) {
         }
         void AddFreeProxy(CStdStrW const& face) override { text += L"free " + face + L"\n"; }
     };
-    write(
-        "[SHX Map]\nb.shx=B,0,0,0,0\na.shx=A,0,0,0,0\n[Postscript Map]\np.pfb=P,0,0,0,0\n[Misc Map]\n"
-        "m.ttf=M,0,0,0,0\n[Proxy Fonts]\nProxy 1=P1\nProxy 2=P2\nProxy 3=P3\n");
+    write("[SHX Map]\nb.shx=B,0,0,0,0\na.shx=A,0,0,0,0\n[Postscript Map]\np.pfb=P,0,0,0,0\n"
+          "[Misc Map]\n"
+          "m.ttf=M,0,0,0,0\n[Proxy Fonts]\nProxy 1=P1\nProxy 2=P2\nProxy 3=P3\n");
     Fonts fonts(0);
     (void)byFile(fonts, L"n.shx");
     List list;
     fonts.FixupFontBox(&list);
     EXPECT_EQ(list.text, L"shx A\nshx B\nmisc M\nproxy P1 for n.shx\nfree P2\nfree P3\n");
-    // Running out counts too, so that none is offered behind the end of the list.
+    // Running out counts too, so that none is offered after the end of the list.
     for (wchar_t const* file : {L"o.shx", L"p.shx", L"q.shx"})
         (void)byFile(fonts, file);
     EXPECT_TRUE(fonts.ProxiesExhausted());

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "tz/export.h"
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 #include "tz/text/charset.h"
 #include "tz/text/std_str.h"
 #include "tz/text/string.h"
@@ -74,7 +74,7 @@ public:
     void RemoveFontToFileMapEntries(MapType type);
     // Offers the mapped faces, and the proxies that nothing has taken, to a list.
     void FixupFontBox(CMTextFontList* list);
-    // Lends the big-font face to a pair ahead of time.
+    // Lends the big-font face to a pair in advance.
     void SetBigfont(CStdStrW file, CStdStrW big);
     void SetBigfont(CStdStrW spec);
     // Whether a text names a pair: whether it holds a comma.

@@ -30,7 +30,7 @@ public:
     // The face of a file, empty with everything else 0 when it is not in the table.
     virtual CStdStrW
     MapFileToFont(CStdStrW file, bool& bold, bool& italic, int& charset, int& family);
-    // The file of a face's form, empty when it is not in the table; "@" ahead of the face does not
+    // The file of a face's form, empty when it is not in the table; "@" before the face does not
     // count, nor do the two numbers.
     virtual CStdStrW MapFontToFile(CStdStrW face, bool bold, bool italic, int charset, int family);
     // Write both tables, or one, into sections "Fonts to Files" and "Files to Fonts" of an INI

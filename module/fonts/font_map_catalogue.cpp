@@ -1,4 +1,4 @@
-#include "tz/mte/font_catalogue.h"
+#include "tz/mte/font_map_catalogue.h"
 
 #include <system_error>
 

@@ -1,4 +1,4 @@
-#include "host/fonts/font_catalogue.h"
+#include "host/fonts/machine_catalogue.h"
 
 #include <algorithm>
 #include <cstdlib>
