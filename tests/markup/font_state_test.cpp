@@ -3,7 +3,7 @@
 #include <gtest/gtest.h>
 
 #include "host/settings/variables.h"
-#include "module/markup/font_state.h"
+#include "module/markup/write_markup/font_state.h"
 #include "tests/markup/conversions.h"
 #include "tz/gi/color.h"
 
@@ -148,14 +148,14 @@ TEST_F(FontState, TellsTypefacesApart) {
         bool isSame;
     };
     constexpr Row kRows[] = {
-        {"Same",              L"A",    204, L"A",    204, true },
-        {"CaseDoesNotCount",  L"a",    204, L"A",    204, true },
-        {"OtherName",         L"A",    0,   L"B",    0,   false},
-        {"OtherSet",          L"A",    204, L"A",    0,   false},
-        {"SystemAgainstNone", L"A",    134, L"A",    0,   true },
-        {"NoneAgainstSystem", L"A",    0,   L"A",    134, false},
-        {"OfTheStyle",        L"Base", 0,   L"Base", 134, true },
-        {"OfTheStyleExactly", L"Base", 0,   L"BASE", 134, false},
+        {"Same", L"A", 204, L"A", 204, true},
+        {"CaseDoesNotCount", L"a", 204, L"A", 204, true},
+        {"OtherName", L"A", 0, L"B", 0, false},
+        {"OtherSet", L"A", 204, L"A", 0, false},
+        {"SystemAgainstNone", L"A", 134, L"A", 0, true},
+        {"NoneAgainstSystem", L"A", 0, L"A", 134, false},
+        {"OfTheStyle", L"Base", 0, L"Base", 134, true},
+        {"OfTheStyleExactly", L"Base", 0, L"BASE", 134, false},
     };
     for (Row const& row : kRows) {
         CFontAttributes one;
@@ -177,15 +177,15 @@ TEST(Looks, DifferByAllButTrueColorAndAlignment) {
         bool isEqual;
     };
     constexpr Row kRows[] = {
-        {"Pitch",      [](CFontAttributes& look) { look.m_nPitchAndFamily = 1; },        false, false},
-        {"Bold",       [](CFontAttributes& look) { look.m_bBold = true; },               false, false},
-        {"Italic",     [](CFontAttributes& look) { look.m_bItalic = true; },             false, false},
-        {"Underline",  [](CFontAttributes& look) { look.m_bUnderline = true; },          true,  false},
-        {"Strike",     [](CFontAttributes& look) { look.m_bStrikethrough = true; },      true,  false},
-        {"ColorIndex", [](CFontAttributes& look) { look.m_nColorIndex = 1; },            true,  false},
-        {"Size",       [](CFontAttributes& look) { look.m_dSize = 1e-300; },             true,  false},
-        {"TrueColor",  [](CFontAttributes& look) { look.m_nRGB = 0; },                   true,  true },
-        {"Alignment",  [](CFontAttributes& look) { look.m_eBaseAlignment = kAlignTop; }, true,  true },
+        {"Pitch", [](CFontAttributes& look) { look.m_nPitchAndFamily = 1; }, false, false},
+        {"Bold", [](CFontAttributes& look) { look.m_bBold = true; }, false, false},
+        {"Italic", [](CFontAttributes& look) { look.m_bItalic = true; }, false, false},
+        {"Underline", [](CFontAttributes& look) { look.m_bUnderline = true; }, true, false},
+        {"Strike", [](CFontAttributes& look) { look.m_bStrikethrough = true; }, true, false},
+        {"ColorIndex", [](CFontAttributes& look) { look.m_nColorIndex = 1; }, true, false},
+        {"Size", [](CFontAttributes& look) { look.m_dSize = 1e-300; }, true, false},
+        {"TrueColor", [](CFontAttributes& look) { look.m_nRGB = 0; }, true, true},
+        {"Alignment", [](CFontAttributes& look) { look.m_eBaseAlignment = kAlignTop; }, true, true},
     };
     for (Row const& row : kRows) {
         CFontAttributes look;
