@@ -45,5 +45,6 @@ function(tz_program name)
 endfunction()
 tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
 # Archives only, so that no drawing database and no display library comes along.
-tz_link_closure(layers module_markup)
+tz_link_closure(layers app_tzconvert)
+list(REMOVE_ITEM layers app_tzconvert)
 tz_program(tzconvert ${layers} tz_ground)

@@ -10,7 +10,7 @@
 #   add_example_program(NAME sources...)              a program bin/NAME, built from sdk/ alone
 #   add_lint(NAME command...)                         a check of the source tree, test lint.NAME
 #
-# LIBS names layers (module_markup, app_tzdraft), support libraries or third-party targets; a layer
+# LIBS names layers (module_prompt, app_tzdraft), support libraries or third-party targets; a layer
 # brings the layers of its row along, and libtz is always there.
 
 set(TZ_ROOTS ${CMAKE_BINARY_DIR}/roots)

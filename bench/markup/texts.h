@@ -7,7 +7,7 @@
 #include <span>
 #include <string>
 
-#include "module/markup/conversion_session.h"
+#include "module/markup/session/conversion_session.h"
 
 namespace tzbench {
 

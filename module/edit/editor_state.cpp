@@ -6,7 +6,7 @@
 #include <memory>
 
 #include "module/host_calls/sys_var.h"
-#include "module/markup/conversion_session.h"
+#include "module/markup/session/conversion_session.h"
 #include "module/styles/drawing_colors.h"
 #include "module/styles/stack_defaults.h"
 #include "tz/mte/dialog_params.h"

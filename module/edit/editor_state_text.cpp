@@ -3,7 +3,7 @@
 
 #include <utility>
 
-#include "module/markup/conversion_session.h"
+#include "module/markup/session/conversion_session.h"
 #include "tz/mte/editor_state.h"
 #include "tz/mte/globals.h"
 

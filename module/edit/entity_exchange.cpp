@@ -5,7 +5,7 @@
 #include "module/edit/attachment.h"
 #include "module/edit/field_backslashes.h"
 #include "module/edit/session_field.h"
-#include "module/markup/rtf_color_table.h"
+#include "module/markup/shared/rtf_color_table.h"
 #include "module/styles/drawing_colors.h"
 #include "module/styles/style_rules.h"
 #include "tz/db/symbol_table.h"

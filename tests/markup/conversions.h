@@ -4,7 +4,7 @@
 
 #include <string>
 
-#include "module/markup/conversion_session.h"
+#include "module/markup/session/conversion_session.h"
 
 namespace markuptest {
 

@@ -69,18 +69,18 @@ struct LookCase {
     wchar_t const* part;  // of its markup
 };
 constexpr LookCase kLooks[] = {
-    {"note",     L"\\fHelvetica|b1|i0|c0|p32;millimetres"                                      },
-    {"note",     L"\\fHelvetica|b0|i1|c0|p32;not"                                              },
-    {"note",     L"\\Onoted\\o"                                                                },
-    {"note",     L"\\fCourier|b0|i0|c0|p48;C:"                                                 },
-    {"note",     L"\\H1.286x;General"                                                          },
+    {"note", L"\\fHelvetica|b1|i0|c0|p32;millimetres"},
+    {"note", L"\\fHelvetica|b0|i1|c0|p32;not"},
+    {"note", L"\\Onoted\\o"},
+    {"note", L"\\fCourier|b0|i0|c0|p48;C:"},
+    {"note", L"\\H1.286x;General"},
     {"schedule", L"\\pi-0.357143,l0.357143,t0.357143;1.\tFrames: oak.\\P\\pl0.714286;a.\toiled"},
-    {"finishes", L"\\H1.2x;Ground floor\\H0.8333x; "                                           },
-    {"bolts",    L"\\fTimes New Roman|b1|i0|c0|p0;A2"                                          },
-    {"holes",    L"\\fCourier New|b1|i0|c0|p49;\\C250;\\c0;local function"                     },
-    {"holes",    L"\\C44;\\c32432;120"                                                         },
-    {"memo",     L"\\P}Beam B3: {\\fLiberation Sans|b1|i0|c0|p34;HEA 200}, see "               },
-    {"labels",   L"{\\L\u0427\u0435\u0440\u0442\u0451\u0436}; "                                },
+    {"finishes", L"\\H1.2x;Ground floor\\H0.8333x; "},
+    {"bolts", L"\\fTimes New Roman|b1|i0|c0|p0;A2"},
+    {"holes", L"\\fCourier New|b1|i0|c0|p49;\\C250;\\c0;local function"},
+    {"holes", L"\\C44;\\c32432;120"},
+    {"memo", L"\\P}Beam B3: {\\fLiberation Sans|b1|i0|c0|p34;HEA 200}, see "},
+    {"labels", L"{\\L\u0427\u0435\u0440\u0442\u0451\u0436}; "},
 };
 
 TEST(Documents, KeepTheirLooks) {

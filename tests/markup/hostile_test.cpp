@@ -5,7 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include "module/markup/stack_look_ahead.h"
+#include "module/markup/read_markup/stack_look_ahead.h"
 #include "tests/markup/conversions.h"
 
 namespace {
@@ -31,35 +31,35 @@ std::wstring textOf(HostileCase const& row) {
 }
 
 constexpr HostileCase kRtf[] = {
-    {"OpenGroups",            L"",                L"{",                          1000000, 1 },
-    {"OpenGroupsInHeader",    L"{\\rtf1 ",        L"{",                          1000000, 1 },
-    {"OpenGroupsInFonts",     L"{\\fonttbl",      L"{",                          300000,  1 },
-    {"OpenGroupsInAFont",     L"{\\fonttbl{\\f1", L"{\\fname",                   100000,  1 },
-    {"OpenGroupsInColors",    L"{\\colortbl",     L"{",                          300000,  1 },
-    {"OpenGroupsInLists",     L"{\\pntext",       L"{",                          300000,  1 },
-    {"OpenGroupsWithLook",    L"",                L"{\\b a",                     100000,  40},
-    {"Closings",              L"{\\rtf1 a",       L"}",                          300000,  1 },
-    {"FontTables",            L"",                L"{\\fonttbl",                 200000,  1 },
-    {"StrayInFonts",          L"{\\fonttbl",      L"\\x y;",                     200000,  1 },
-    {"FontsOfOneNumber",      L"{\\fonttbl",      L"{\\f1 A;}",                  100000,  1 },
-    {"NamesWithoutEnd",       L"{\\fonttbl",      L"{\\f1 A",                    100000,  1 },
-    {"Colors",                L"{\\colortbl",     L"\\red1;",                    500000,  1 },
-    {"StrayInColors",         L"{\\colortbl",     L"\\x y;{z}",                  200000,  1 },
-    {"Paragraphs",            L"",                L"\\pard",                     200000,  1 },
-    {"ParagraphsWithIndents", L"",                L"\\pard\\li5",                100000,  1 },
-    {"ParagraphsWithOneTab",  L"",                L"\\pard\\tx50",               100000,  1 },
-    {"ParagraphsWithTabs",    L"",                L"\\pard\\tx1\\tx2\\tx3",      50000,   1 },
-    {"Lists",                 L"",                L"\\pntext",                   200000,  1 },
-    {"StacksWithoutEnd",      L"",                L"\\\\S",                      200000,  2 },
-    {"Destinations",          L"",                L"{\\*\\x",                    200000,  1 },
-    {"Toggles",               L"",                L"\\ul a\\ul0 b",              100000,  1 },
-    {"LoneBackslashes",       L"",                L"\\",                         300001,  2 },
-    {"CutOffEscapes",         L"",                L"\\'",                        200000,  1 },
-    {"CutOffCodes",           L"",                L"\\u",                        200000,  5 },
-    {"LongNumbers",           L"",                L"\\fs99999999999999999999 a", 50000,   2 },
-    {"BinaryWithoutData",     L"{\\rtf1 a",       L"\\bin2000000000 ",           50000,   1 },
-    {"LongWord",              L"\\",              L"a",                          1000000, 1 },
-    {"OneLetter",             L"",                L"a",                          1000000, 1 },
+    {"OpenGroups", L"", L"{", 1000000, 1},
+    {"OpenGroupsInHeader", L"{\\rtf1 ", L"{", 1000000, 1},
+    {"OpenGroupsInFonts", L"{\\fonttbl", L"{", 300000, 1},
+    {"OpenGroupsInAFont", L"{\\fonttbl{\\f1", L"{\\fname", 100000, 1},
+    {"OpenGroupsInColors", L"{\\colortbl", L"{", 300000, 1},
+    {"OpenGroupsInLists", L"{\\pntext", L"{", 300000, 1},
+    {"OpenGroupsWithLook", L"", L"{\\b a", 100000, 40},
+    {"Closings", L"{\\rtf1 a", L"}", 300000, 1},
+    {"FontTables", L"", L"{\\fonttbl", 200000, 1},
+    {"StrayInFonts", L"{\\fonttbl", L"\\x y;", 200000, 1},
+    {"FontsOfOneNumber", L"{\\fonttbl", L"{\\f1 A;}", 100000, 1},
+    {"NamesWithoutEnd", L"{\\fonttbl", L"{\\f1 A", 100000, 1},
+    {"Colors", L"{\\colortbl", L"\\red1;", 500000, 1},
+    {"StrayInColors", L"{\\colortbl", L"\\x y;{z}", 200000, 1},
+    {"Paragraphs", L"", L"\\pard", 200000, 1},
+    {"ParagraphsWithIndents", L"", L"\\pard\\li5", 100000, 1},
+    {"ParagraphsWithOneTab", L"", L"\\pard\\tx50", 100000, 1},
+    {"ParagraphsWithTabs", L"", L"\\pard\\tx1\\tx2\\tx3", 50000, 1},
+    {"Lists", L"", L"\\pntext", 200000, 1},
+    {"StacksWithoutEnd", L"", L"\\\\S", 200000, 2},
+    {"Destinations", L"", L"{\\*\\x", 200000, 1},
+    {"Toggles", L"", L"\\ul a\\ul0 b", 100000, 1},
+    {"LoneBackslashes", L"", L"\\", 300001, 2},
+    {"CutOffEscapes", L"", L"\\'", 200000, 1},
+    {"CutOffCodes", L"", L"\\u", 200000, 5},
+    {"LongNumbers", L"", L"\\fs99999999999999999999 a", 50000, 2},
+    {"BinaryWithoutData", L"{\\rtf1 a", L"\\bin2000000000 ", 50000, 1},
+    {"LongWord", L"\\", L"a", 1000000, 1},
+    {"OneLetter", L"", L"a", 1000000, 1},
 };
 
 class HostileRtf : public testing::TestWithParam<HostileCase> {};
@@ -71,25 +71,25 @@ TEST_P(HostileRtf, IsReadToItsEnd) {
 }
 
 constexpr HostileCase kMarkup[] = {
-    {"OpenGroups",        L"",       L"{",                        1000000, 1},
-    {"Closings",          L"",       L"}",                        300000,  1},
-    {"GroupsWithFont",    L"\\fA|;", L"{}",                       200000,  1},
-    {"Stacks",            L"",       L"\\S",                      200000,  2},
-    {"StacksWithLetters", L"",       L"\\Sab",                    100000,  2},
-    {"StacksWithCodes",   L"",       L"\\S\\u+/000",              50000,   2},
-    {"StacksAligned",     L"",       L"\\S\\\\",                  100000,  2},
-    {"StackSignAtTheEnd", L"/",      L"\\S",                      100001,  2},
-    {"Fonts",             L"",       L"\\fA",                     50000,   8},
-    {"FontsWithoutEnd",   L"",       L"\\fA|b",                   50000,   8},
-    {"Files",             L"",       L"\\Fa;",                    50000,   8},
-    {"Tabs",              L"\\pt",   L"1,",                       200000,  1},
-    {"Settings",          L"",       L"\\pt1;\\ptz;",             50000,   6},
-    {"Heights",           L"",       L"\\H2x;",                   100000,  5},
-    {"LongNumbers",       L"",       L"\\C99999999999999999999;", 50000,   1},
-    {"Codes",             L"",       L"\\U",                      200000,  3},
-    {"LoneBackslashes",   L"",       L"\\",                       300001,  1},
-    {"Wide",              L"",       L"\u4E2D",                   200000,  8},
-    {"OneLetter",         L"",       L"a",                        1000000, 1},
+    {"OpenGroups", L"", L"{", 1000000, 1},
+    {"Closings", L"", L"}", 300000, 1},
+    {"GroupsWithFont", L"\\fA|;", L"{}", 200000, 1},
+    {"Stacks", L"", L"\\S", 200000, 2},
+    {"StacksWithLetters", L"", L"\\Sab", 100000, 2},
+    {"StacksWithCodes", L"", L"\\S\\u+/000", 50000, 2},
+    {"StacksAligned", L"", L"\\S\\\\", 100000, 2},
+    {"StackSignAtTheEnd", L"/", L"\\S", 100001, 2},
+    {"Fonts", L"", L"\\fA", 50000, 8},
+    {"FontsWithoutEnd", L"", L"\\fA|b", 50000, 8},
+    {"Files", L"", L"\\Fa;", 50000, 8},
+    {"Tabs", L"\\pt", L"1,", 200000, 1},
+    {"Settings", L"", L"\\pt1;\\ptz;", 50000, 6},
+    {"Heights", L"", L"\\H2x;", 100000, 5},
+    {"LongNumbers", L"", L"\\C99999999999999999999;", 50000, 1},
+    {"Codes", L"", L"\\U", 200000, 3},
+    {"LoneBackslashes", L"", L"\\", 300001, 1},
+    {"Wide", L"", L"\u4E2D", 200000, 8},
+    {"OneLetter", L"", L"a", 1000000, 1},
 };
 
 class HostileMarkup : public testing::TestWithParam<HostileCase> {};

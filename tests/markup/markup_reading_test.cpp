@@ -5,7 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include "module/markup/markup_reading.h"
+#include "module/markup/read_markup/markup_numbers.h"
 
 namespace {
 
@@ -16,20 +16,20 @@ struct IntegerCase {
     std::wstring_view rest;
 };
 constexpr IntegerCase kIntegers[] = {
-    {"Closed",         L"12;x",                 12,              L"x"      },
-    {"Open",           L"12x",                  12,              L"x"      },
-    {"OneSemicolon",   L"12;;",                 12,              L";"      },
-    {"None",           L"x",                    0,               L"x"      },
-    {"SemicolonAlone", L";x",                   0,               L"x"      },
-    {"NoSign",         L"-1;",                  0,               L"-1;"    },
-    {"Empty",          L"",                     0,               L""       },
-    {"WideFirst",      L"\u4E2D;",              0,               L"\u4E2D;"},
-    {"WideBehind",     L"7\u4E2D;",             7,               L"\u4E2D;"},
-    {"OtherDigits",    L"\u0661;",              0,               L"\u0661;"},
-    {"Largest",        L"2147483647;",          2147483647,      L""       },
-    {"WrapsByOne",     L"2147483648;",          -2147483647 - 1, L""       },
-    {"WrapsAround",    L"4294967297;",          1,               L""       },
-    {"TwentyDigits",   L"12345678901234567890", -350287150,      L""       },
+    {"Closed", L"12;x", 12, L"x"},
+    {"Open", L"12x", 12, L"x"},
+    {"OneSemicolon", L"12;;", 12, L";"},
+    {"None", L"x", 0, L"x"},
+    {"SemicolonAlone", L";x", 0, L"x"},
+    {"NoSign", L"-1;", 0, L"-1;"},
+    {"Empty", L"", 0, L""},
+    {"WideFirst", L"\u4E2D;", 0, L"\u4E2D;"},
+    {"WideBehind", L"7\u4E2D;", 7, L"\u4E2D;"},
+    {"OtherDigits", L"\u0661;", 0, L"\u0661;"},
+    {"Largest", L"2147483647;", 2147483647, L""},
+    {"WrapsByOne", L"2147483648;", -2147483647 - 1, L""},
+    {"WrapsAround", L"4294967297;", 1, L""},
+    {"TwentyDigits", L"12345678901234567890", -350287150, L""},
 };
 
 TEST(Integers, AreReadAs) {
@@ -48,17 +48,17 @@ struct RealCase {
     std::wstring_view rest;
 };
 constexpr RealCase kReals[] = {
-    {"Relative",       L"1.5x;",    1.5,                  true,  L""        },
-    {"CapitalMark",    L"2X;",      2.0,                  true,  L""        },
-    {"NoLeadingDigit", L"-.5",      -0.5,                 false, L""        },
-    {"PointAlone",     L".;x",      0.0,                  false, L"x"       },
-    {"NoPlus",         L"+1;",      0.0,                  false, L"+1;"     },
-    {"NoExponent",     L"1e5;",     1.0,                  false, L"e5;"     },
-    {"MarkAlone",      L"x;",       0.0,                  true,  L""        },
-    {"TwoPoints",      L"1.2.3;",   1.2,                  false, L".3;"     },
-    {"WideFirst",      L"\u4E2D1;", 0.0,                  false, L"\u4E2D1;"},
-    {"Empty",          L"",         0.0,                  false, L""        },
-    {"Sum",            L"0.25;",    2 / 10.0 + 5 / 100.0, false, L""        },
+    {"Relative", L"1.5x;", 1.5, true, L""},
+    {"CapitalMark", L"2X;", 2.0, true, L""},
+    {"NoLeadingDigit", L"-.5", -0.5, false, L""},
+    {"PointAlone", L".;x", 0.0, false, L"x"},
+    {"NoPlus", L"+1;", 0.0, false, L"+1;"},
+    {"NoExponent", L"1e5;", 1.0, false, L"e5;"},
+    {"MarkAlone", L"x;", 0.0, true, L""},
+    {"TwoPoints", L"1.2.3;", 1.2, false, L".3;"},
+    {"WideFirst", L"\u4E2D1;", 0.0, false, L"\u4E2D1;"},
+    {"Empty", L"", 0.0, false, L""},
+    {"Sum", L"0.25;", 2 / 10.0 + 5 / 100.0, false, L""},
 };
 
 TEST(Reals, AreReadAs) {
@@ -94,13 +94,13 @@ struct TextCase {
     std::wstring_view rest;
 };
 constexpr TextCase kTexts[] = {
-    {"Closed",             L"1/2;x",    L"1/2",        L"x" },
-    {"Empty",              L";x",       L"",           L"x" },
-    {"Open",               L"abc",      L"abc",        L""  },
-    {"EscapeHidesTheNext", L"\\;;x;",   L"\\;;x",      L""  },
-    {"HiddenBackslash",    L"\\a\\;x;", L"\\a\\",      L"x;"},
-    {"PairAtTheEnd",       L"a\\;",     L"a\\;",       L""  },
-    {"LoneBackslash",      L"a\\",      {L"a\\\0", 3}, L""  },
+    {"Closed", L"1/2;x", L"1/2", L"x"},
+    {"Empty", L";x", L"", L"x"},
+    {"Open", L"abc", L"abc", L""},
+    {"EscapeHidesTheNext", L"\\;;x;", L"\\;;x", L""},
+    {"HiddenBackslash", L"\\a\\;x;", L"\\a\\", L"x;"},
+    {"PairAtTheEnd", L"a\\;", L"a\\;", L""},
+    {"LoneBackslash", L"a\\", {L"a\\\0", 3}, L""},
 };
 
 TEST(Texts, EndAtTheSemicolon) {
@@ -118,12 +118,8 @@ TEST(HexValues, StandBehindTheCursorsCharacter) {
         std::wstring_view rest;
     };
     constexpr Row kRows[] = {
-        {L"+4E2Dx", 0x4E2D, L"x"},
-        {L"+4e2d",  0x4E2D, L"" },
-        {L"+4Eg2",  0,      L"2"},
-        {L"+4E",    0,      L"" },
-        {L"+",      0,      L"" },
-        {L"",       0,      L"" },
+        {L"+4E2Dx", 0x4E2D, L"x"}, {L"+4e2d", 0x4E2D, L""}, {L"+4Eg2", 0, L"2"},
+        {L"+4E", 0, L""},          {L"+", 0, L""},          {L"", 0, L""},
     };
     for (Row const& row : kRows) {
         wchar_t const* cursor = row.text;
@@ -139,20 +135,13 @@ TEST(UnicodeCodes, ConvertBothWays) {
         wchar_t const* value;  // null: refused
     };
     constexpr Row kRows[] = {
-        {L"233?",     0, L"\\U+00E9"    },
-        {L"?",        0, L"\\U+0000"    },
-        {L"-?",       0, L"\\U+0000"    },
-        {L"-3913?",   0, L"\\U+FFFFF0B7"},
-        {L"12345?",   0, L"\\U+3039"    },
-        {L"123456?",  0, nullptr        },
-        {L"-12345?",  0, nullptr        },
-        {L"12a?",     0, nullptr        },
-        {L"1-2?",     0, nullptr        },
-        {L"12",       0, nullptr        },
-        {L"00e9rest", 1, L"\\u233?"     },
-        {L"4E2D",     1, L"\\u20013?"   },
-        {L"4E2",      1, nullptr        },
-        {L"4E2g",     1, nullptr        },
+        {L"233?", 0, L"\\U+00E9"},    {L"?", 0, L"\\U+0000"},
+        {L"-?", 0, L"\\U+0000"},      {L"-3913?", 0, L"\\U+FFFFF0B7"},
+        {L"12345?", 0, L"\\U+3039"},  {L"123456?", 0, nullptr},
+        {L"-12345?", 0, nullptr},     {L"12a?", 0, nullptr},
+        {L"1-2?", 0, nullptr},        {L"12", 0, nullptr},
+        {L"00e9rest", 1, L"\\u233?"}, {L"4E2D", 1, L"\\u20013?"},
+        {L"4E2", 1, nullptr},         {L"4E2g", 1, nullptr},
     };
     for (Row const& row : kRows) {
         CStdStrW out(L"old");
@@ -169,11 +158,9 @@ TEST(UnicodeCodes, OfMarkupTakeFiveCharacters) {
         std::wstring_view rest;
     };
     constexpr Row kRows[] = {
-        {L"\\U+00E9x",  L"\\u233?",   L"x" },
-        {L"\\u+4e2d",   L"\\u20013?", L""  },
-        {L"\\Uabcdefg", L"\\u0?",     L"fg"},
-        {L"\\U+00",     L"\\u0?",     L""  },
-        {L"\\U",        L"\\u0?",     L""  },
+        {L"\\U+00E9x", L"\\u233?", L"x"}, {L"\\u+4e2d", L"\\u20013?", L""},
+        {L"\\Uabcdefg", L"\\u0?", L"fg"}, {L"\\U+00", L"\\u0?", L""},
+        {L"\\U", L"\\u0?", L""},
     };
     for (Row const& row : kRows) {
         wchar_t const* cursor = row.text + 2;

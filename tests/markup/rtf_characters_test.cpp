@@ -4,9 +4,9 @@
 
 #include <gtest/gtest.h>
 
-#include "module/markup/number_text.h"
-#include "module/markup/rtf_reading.h"
-#include "module/markup/rtf_writing.h"
+#include "module/markup/read_rtf/rtf_characters.h"
+#include "module/markup/shared/number_text.h"
+#include "module/markup/shared/rtf_escapes.h"
 
 namespace {
 
@@ -17,13 +17,13 @@ TEST(Escapes, AreWrittenForTheLowByte) {
         wchar_t const* expanded;
     };
     constexpr Row kRows[] = {
-        {L'A',    L"A",          L"\\'41"},
-        {0x7F,    L"\x7F",       L"\\'7f"},
-        {0x80,    L"\\'80",      L"\\'80"},
-        {0xE9,    L"\\'e9",      L"\\'e9"},
-        {0x4E2D,  L"\\'2d",      L"\\'2d"},
-        {0x1F600, L"\\'00",      L"\\'00"},
-        {0x10041, L"\U00010041", L"\\'41"}, // bits above 16 are not looked at
+        {L'A', L"A", L"\\'41"},
+        {0x7F, L"\x7F", L"\\'7f"},
+        {0x80, L"\\'80", L"\\'80"},
+        {0xE9, L"\\'e9", L"\\'e9"},
+        {0x4E2D, L"\\'2d", L"\\'2d"},
+        {0x1F600, L"\\'00", L"\\'00"},
+        {0x10041, L"\U00010041", L"\\'41"},  // bits above 16 are not looked at
     };
     for (Row const& row : kRows) {
         EXPECT_STREQ(Handle8Bits(row.c).c_str(), row.handled);
@@ -69,14 +69,9 @@ TEST(HexPairs, GoOverLineBreaks) {
         std::wstring_view rest;
     };
     constexpr Row kRows[] = {
-        {L"e9x",     0xE9, L"x"},
-        {L"E9",      0xE9, L"" },
-        {L"\r\ne9x", 0xE9, L"x"},
-        {L"\te\n9x", 0xE9, L"x"},
-        {L"g9",      0x09, L"" }, // no hex digit reads as 0
-        {L"e",       0xE0, L"" },
-        {L"\r\n",    0,    L"" },
-        {L"",        0,    L"" },
+        {L"e9x", 0xE9, L"x"},     {L"E9", 0xE9, L""}, {L"\r\ne9x", 0xE9, L"x"},
+        {L"\te\n9x", 0xE9, L"x"}, {L"g9", 0x09, L""},  // no hex digit reads as 0
+        {L"e", 0xE0, L""},        {L"\r\n", 0, L""},  {L"", 0, L""},
     };
     for (Row const& row : kRows) {
         wchar_t const* cursor = row.text;
@@ -88,39 +83,39 @@ TEST(HexPairs, GoOverLineBreaks) {
 struct EscapeCase {
     char const* name;
     int page;
-    wchar_t const* text;  // behind the \'
+    wchar_t const* text;  // after the \'
     wchar_t const* value;
     std::wstring_view rest;
 };
 constexpr EscapeCase kEscapes[] = {
-    {"Latin",             1252,  L"e9x",              L"\u00E9", L"x"    },
-    {"LatinQuote",        1252,  L"93",               L"\u201C", L""     },
-    {"Cyrillic",          1251,  L"c0\\'c1",          L"\u0410", L"\\'c1"},
-    {"Japanese",          932,   L"82\\'a0x",         L"\u3042", L"x"    },
-    {"JapaneseSplit",     932,   L"82\r\n\\'\na\r0x", L"\u3042", L"x"    },
-    {"JapaneseBareTrail", 932,   L"82lx",             L"\uFF2D", L"x"    },
-    {"JapaneseBackslash", 932,   L"83\\\\x",          L"\u30BD", L"x"    },
-    {"JapaneseKana",      932,   L"b1x",              L"\uFF71", L"x"    },
-    {"LeadThenWord",      932,   L"82\\par",          L"\u0082", L"\\par"},
-    {"LeadThenBrace",     932,   L"82}",              L"\u0082", L"}"    },
-    {"LeadThenOpenBrace", 932,   L"82{",              L"\u0082", L"{"    },
-    {"LeadAtTheEnd",      932,   L"82",               L"\u0082", L""     },
-    {"LeadThenBackslash", 932,   L"82\\",             L"\u0082", L"\\"   },
-    {"Chinese",           936,   L"d6\\'d0x",         L"\u4E2D", L"x"    },
-    {"Korean",            949,   L"b0\\'a1x",         L"\uAC00", L"x"    },
-    {"Big5",              950,   L"a4\\'a4x",         L"\u4E2D", L"x"    },
-    {"LatinSplit",        1252,  L"\r\ne\t9x",        L"\u00E9", L"x"    },
-    {"CyrillicSplit",     1251,  L"\nc\r0x",          L"\u0410", L"x"    },
-    {"ChineseSplit",      936,   L"d\n6\r\n\\'\td0x", L"\u4E2D", L"x"    },
-    {"KoreanSplit",       949,   L"b0\n\\'\na1x",     L"\uAC00", L"x"    },
-    {"Big5Split",         950,   L"\na4\r\\'a\n4x",   L"\u4E2D", L"x"    },
-    {"UnknownPageSplit",  4711,  L"e\r\n9x",          L"\u00E9", L"x"    },
-    {"TabBehindIsLost",   1252,  L"e9\tx",            L"\u00E9", L"x"    },
-    {"SingleByteIgnores", 1252,  L"b0\\'a1",          L"\u00B0", L"\\'a1"},
-    {"NoSuchPair",        936,   L"ff\\'ff",          L"\u00FF", L"\\'ff"},
-    {"UnknownPage",       4711,  L"e9",               L"\u00E9", L""     },
-    {"Utf8Page",          65001, L"e9",               L"\u00E9", L""     },
-    {"Zero",              1252,  L"zz",               {L"\0"},   L""     },
+    {"Latin", 1252, L"e9x", L"\u00E9", L"x"},
+    {"LatinQuote", 1252, L"93", L"\u201C", L""},
+    {"Cyrillic", 1251, L"c0\\'c1", L"\u0410", L"\\'c1"},
+    {"Japanese", 932, L"82\\'a0x", L"\u3042", L"x"},
+    {"JapaneseSplit", 932, L"82\r\n\\'\na\r0x", L"\u3042", L"x"},
+    {"JapaneseBareTrail", 932, L"82lx", L"\uFF2D", L"x"},
+    {"JapaneseBackslash", 932, L"83\\\\x", L"\u30BD", L"x"},
+    {"JapaneseKana", 932, L"b1x", L"\uFF71", L"x"},
+    {"LeadThenWord", 932, L"82\\par", L"\u0082", L"\\par"},
+    {"LeadThenBrace", 932, L"82}", L"\u0082", L"}"},
+    {"LeadThenOpenBrace", 932, L"82{", L"\u0082", L"{"},
+    {"LeadAtTheEnd", 932, L"82", L"\u0082", L""},
+    {"LeadThenBackslash", 932, L"82\\", L"\u0082", L"\\"},
+    {"Chinese", 936, L"d6\\'d0x", L"\u4E2D", L"x"},
+    {"Korean", 949, L"b0\\'a1x", L"\uAC00", L"x"},
+    {"Big5", 950, L"a4\\'a4x", L"\u4E2D", L"x"},
+    {"LatinSplit", 1252, L"\r\ne\t9x", L"\u00E9", L"x"},
+    {"CyrillicSplit", 1251, L"\nc\r0x", L"\u0410", L"x"},
+    {"ChineseSplit", 936, L"d\n6\r\n\\'\td0x", L"\u4E2D", L"x"},
+    {"KoreanSplit", 949, L"b0\n\\'\na1x", L"\uAC00", L"x"},
+    {"Big5Split", 950, L"\na4\r\\'a\n4x", L"\u4E2D", L"x"},
+    {"UnknownPageSplit", 4711, L"e\r\n9x", L"\u00E9", L"x"},
+    {"TabBehindIsLost", 1252, L"e9\tx", L"\u00E9", L"x"},
+    {"SingleByteIgnores", 1252, L"b0\\'a1", L"\u00B0", L"\\'a1"},
+    {"NoSuchPair", 936, L"ff\\'ff", L"\u00FF", L"\\'ff"},
+    {"UnknownPage", 4711, L"e9", L"\u00E9", L""},
+    {"Utf8Page", 65001, L"e9", L"\u00E9", L""},
+    {"Zero", 1252, L"zz", {L"\0"}, L""},
 };
 
 TEST(EscapedCharacters, AreDecodedByThePage) {
@@ -144,25 +139,27 @@ TEST(EscapedCharacters, GiveTheBytesAsOneValue) {
 }
 
 constexpr EscapeCase kCharacters[] = {
-    {"Bare",              1252, L"ab",          L"a",      L"b"  },
-    {"BareOverLines",     1252, L"\r\n\tab",    L"a",      L"b"  },
-    {"Escape",            1252, L"\\'e9b",      L"\u00E9", L"b"  },
-    {"EscapeSplit",       1252, L"\\\n'\re9b",  L"\u00E9", L"b"  },
-    {"EscapedPair",       932,  L"\\'82\\'a0b", L"\u3042", L"b"  },
-    {"BareLead",          932,
+    {"Bare", 1252, L"ab", L"a", L"b"},
+    {"BareOverLines", 1252, L"\r\n\tab", L"a", L"b"},
+    {"Escape", 1252, L"\\'e9b", L"\u00E9", L"b"},
+    {"EscapeSplit", 1252, L"\\\n'\re9b", L"\u00E9", L"b"},
+    {"EscapedPair", 932, L"\\'82\\'a0b", L"\u3042", L"b"},
+    {"BareLead", 932,
      L"\x82\x6C"
-     L"b",                                      L"\uFF2D", L"b"  },
-    {"BareLeadSplit",     932,
+     L"b",
+     L"\uFF2D", L"b"},
+    {"BareLeadSplit", 932,
      L"\x82\n\x6C"
-     L"b",                                      L"\uFF2D", L"b"  },
-    {"BareLeadAtTheEnd",  932,  L"\x82",        L"\u0082", L""   },
-    {"Backslash",         1252, L"\\\\ab",      L"\\a",    L"b"  },
-    {"BackslashAtTheEnd", 1252, L"\\\\",        L"\\",     L""   },
-    {"Word",              1252, L"\\par",       L"",       L"par"},
-    {"Lone",              1252, L"\\",          L"",       L""   },
-    {"LoneOverLines",     1252, L"\\\r\n",      L"",       L""   },
-    {"WideLosesHighBits", 1252, L"\u4E41b",     L"A",      L"b"  },
-    {"Empty",             1252, L"\n",          L"",       L""   },
+     L"b",
+     L"\uFF2D", L"b"},
+    {"BareLeadAtTheEnd", 932, L"\x82", L"\u0082", L""},
+    {"Backslash", 1252, L"\\\\ab", L"\\a", L"b"},
+    {"BackslashAtTheEnd", 1252, L"\\\\", L"\\", L""},
+    {"Word", 1252, L"\\par", L"", L"par"},
+    {"Lone", 1252, L"\\", L"", L""},
+    {"LoneOverLines", 1252, L"\\\r\n", L"", L""},
+    {"WideLosesHighBits", 1252, L"\u4E41b", L"A", L"b"},
+    {"Empty", 1252, L"\n", L"", L""},
 };
 
 TEST(Characters, OfFontTablesAreReadByBytes) {

@@ -143,7 +143,7 @@ void Reader::addText(wchar_t c) {
     out_.text += c;
 }
 
-// Behind "\dn1234 \\S": "<alignment,per cent>}", the text, and "{\dn1234 \\s}". A backslash makes
+// After "\dn1234 \\S": "<alignment,per cent>}", the text, and "{\dn1234 \\s}". A backslash makes
 // the next character no sign.
 void Reader::readStack() {
     at_ = text_.find(L'<', at_) + 1;
@@ -195,13 +195,10 @@ bool Reader::applyLook(std::wstring const& word, int value) {
         bool State::*flag;
     };
     static constexpr Row kRows[] = {
-        {L"f",      &State::font,       nullptr          },
-        {L"fs",     &State::halfPoints, nullptr          },
-        {L"cf",     &State::color,      nullptr          },
-        {L"b",      nullptr,            &State::bold     },
-        {L"i",      nullptr,            &State::italic   },
-        {L"ul",     nullptr,            &State::underline},
-        {L"strike", nullptr,            &State::overline },
+        {L"f", &State::font, nullptr},          {L"fs", &State::halfPoints, nullptr},
+        {L"cf", &State::color, nullptr},        {L"b", nullptr, &State::bold},
+        {L"i", nullptr, &State::italic},        {L"ul", nullptr, &State::underline},
+        {L"strike", nullptr, &State::overline},
     };
     for (Row const& row : kRows) {
         if (word != row.word) continue;
@@ -256,7 +253,7 @@ void Reader::readWord() {
     apply(word, value);
 }
 
-// An East Asian code stands as text behind an escaped backslash.
+// An East Asian code stands as text after an escaped backslash.
 void Reader::readSymbol(wchar_t symbol) {
     constexpr std::size_t kCodeLength = 7;  // M+n and four digits
     if (symbol == L'\\' && text_.compare(at_ + 1, 1, L"+") == 0) {

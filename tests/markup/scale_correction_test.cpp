@@ -5,7 +5,7 @@
 
 #include <gtest/gtest.h>
 
-#include "module/markup/string_stream.h"
+#include "module/markup/shared/string_stream.h"
 #include "tz/mte/scale_correction.h"
 
 namespace {
@@ -24,19 +24,19 @@ TEST(Scale, TurnsUnitsToTwips) {
         int twips;
     };
     constexpr Row kRows[] = {
-        {0, 0.2,    280    },
-        {0, 0.25,   350    },
-        {0, 1e-9,   1      }, // a positive length never
-  // vanishes
-        {1, 1e-9,   10     },
-        {1, 0.2,    280    },
-        {1, 0.2001, 280    }, // 280.14, truncated ahead of
-  // the rounding
-        {1, 0.2008, 290    },
-        {0, 0.0,    0      },
-        {0, -1.0,   -1400  },
-        {1, -1.0,   -1390  },
-        {0, 1e300,  INT_MAX},
+        {0, 0.2, 280},
+        {0, 0.25, 350},
+        {0, 1e-9, 1},  // a positive length never
+                       // vanishes
+        {1, 1e-9, 10},
+        {1, 0.2, 280},
+        {1, 0.2001, 280},  // 280.14, truncated before
+                           // the rounding
+        {1, 0.2008, 290},
+        {0, 0.0, 0},
+        {0, -1.0, -1400},
+        {1, -1.0, -1390},
+        {0, 1e300, INT_MAX},
         {0, -1e300, INT_MIN},
     };
     for (Row const& row : kRows) {

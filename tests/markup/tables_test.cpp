@@ -2,8 +2,8 @@
 
 #include <gtest/gtest.h>
 
-#include "module/markup/rtf_color_table.h"
-#include "module/markup/rtf_font_table.h"
+#include "module/markup/shared/rtf_color_table.h"
+#include "module/markup/shared/rtf_font_table.h"
 #include "tz/gi/color.h"
 
 namespace {
@@ -37,12 +37,9 @@ TEST(ColorTable, AnswersWithColorAndIndex) {
         int index;
     };
     constexpr Row kRows[] = {
-        {0,  true,  0x0000FF, 256}, // red is ByLayer here, not index 1
-        {1,  true,  0x00FF00, 0  },
-        {2,  true,  0xFF0000, 5  },
-        {3,  true,  0xFF0102, 5  },
-        {4,  false, 0,        0  },
-        {-1, false, 0,        0  },
+        {0, true, 0x0000FF, 256},  // red is ByLayer here, not index 1
+        {1, true, 0x00FF00, 0},   {2, true, 0xFF0000, 5}, {3, true, 0xFF0102, 5},
+        {4, false, 0, 0},         {-1, false, 0, 0},
     };
     for (Row const& row : kRows) {
         unsigned int rgb = 9;
@@ -67,13 +64,13 @@ TEST(FontTable, WritesItsFonts) {
         wchar_t const* text;
     };
     constexpr Row kRows[] = {
-        {0,   0,    L"Arial",  L"\\fnil\\fcharset0 Arial;"             },
-        {0,   0x22, L"Arial",  L"\\fswiss\\fprq2\\fcharset0 Arial;"    },
-        {1,   0x11, L"A;}",    L"\\froman\\fprq1\\fcharset1 A;};"      },
-        {204, 0x31, L"\u0410", L"\\fmodern\\fprq1\\fcharset204 \\'c0;" },
+        {0, 0, L"Arial", L"\\fnil\\fcharset0 Arial;"},
+        {0, 0x22, L"Arial", L"\\fswiss\\fprq2\\fcharset0 Arial;"},
+        {1, 0x11, L"A;}", L"\\froman\\fprq1\\fcharset1 A;};"},
+        {204, 0x31, L"\u0410", L"\\fmodern\\fprq1\\fcharset204 \\'c0;"},
         {128, 0x42, L"\uFF2D", L"\\fscript\\fprq2\\fcharset128 \\'82l;"},
-        {2,   0x50, L"",       L"\\fdecor\\fcharset2 ;"                },
-        {0,   0x60, L"x",      L"\\fnil\\fcharset0 x;"                 },
+        {2, 0x50, L"", L"\\fdecor\\fcharset2 ;"},
+        {0, 0x60, L"x", L"\\fnil\\fcharset0 x;"},
     };
     EXPECT_STREQ(CRichTextFontTable().EmitFontTable().c_str(), L"{\\fonttbl}");
     for (Row const& row : kRows) {

@@ -1,0 +1,110 @@
+#pragma once
+
+#include <unordered_map>
+
+#include "module/markup/write_markup/font_attributes.h"
+#include "tz/text/std_str.h"
+
+class CMTextFontMapDatabase;
+
+// Turns what a text is to look like into MTEXT formatting codes: it keeps what the next character
+// must look like, what the output was last told, and the look at the outermost level, and writes
+// the difference.
+//
+//   CFontState state(&fonts);
+//   state.InitializeFontName(L"Arial", false, false, kAnsiCharset, 34);   // first: sets all
+//   state.InitializeFontSize(2.5);
+//   state.InitializeColor(256, 0xFFFFFF);
+//   state.SetUnderline(true);
+//   if (state.IsEmissionPending()) { out += state.EmitStateInMText(); state.Reset(); }   // {\L
+//   out += state.EmitTerminatingStateInMText();                                          // }
+//
+// The font map must outlive the state; one state serves one conversion. InitializeFontName writes
+// process-wide state, the name of the text style's face (g_sStyleFontName), so that states are not
+// used side by side.
+class CFontState {
+public:
+    explicit CFontState(CMTextFontMapDatabase* fontMap) : m_pFontMap(fontMap) {}
+    // Holds the other state's present look and gives it back at its own end. Never emits.
+    explicit CFontState(CFontState* other);
+    virtual ~CFontState();
+    CFontState(CFontState const&) = delete;
+    CFontState& operator=(CFontState const&) = delete;
+
+    // Takes over the other state's present look.
+    void SetValuesFrom(CFontState const* other);
+
+    // These change the present look and leave it pending, also when the value is the one there.
+    void SetFontName(FontName const& name);
+    void SetCharSet(Charset charset);
+    void SetPitchAndFamily(int pitchAndFamily);
+    void SetBold(bool isOn);
+    void SetItalic(bool isOn);
+    void SetUnderline(bool isOn);
+    void SetStrikethrough(bool isOn);
+    void SetColor(int index, unsigned int rgb);
+    void SetFontSize(double size);
+    // `bForce` non-zero: what was emitted counts as another alignment.
+    void SetBaseAlignment(VerticalAlignment alignment, signed char bForce);
+    // Of the outermost level when `bBase` is non-zero, else the present one.
+    [[nodiscard]] VerticalAlignment GetBaseAlignment(signed char bBase) const;
+
+    // What the text begins with; nothing is pending for it. The first overwrites all that the
+    // others set.
+    void InitializeFontName(
+        FontName const& name, bool bold, bool italic, Charset charset, int pitchAndFamily);
+    void InitializeColor(int index, unsigned int rgb);
+    void InitializeFontSize(double size);
+
+    [[nodiscard]] bool IsEmissionPending() const { return m_bPending; }
+    // To be called when the codes of EmitStateInMText are written.
+    void Reset();
+    // The codes from what was emitted to the present look. A return to the outermost look is the
+    // closing brace alone.
+    [[nodiscard]] CStdStrW EmitStateInMText();
+    // The braces that are open, closed.
+    [[nodiscard]] CStdStrW EmitTerminatingStateInMText();
+
+protected:
+    // The same as EmitStateInMText, after what `codes` holds, with the codes of faces that are
+    // known. The font tables may not change between two calls unless the codes are forgotten.
+    void appendState(CStdStrW& codes);
+    void forgetFaceCodes() { faceCodes_.clear(); }
+    [[nodiscard]] CFontAttributes const& base() const { return m_base; }
+    [[nodiscard]] CFontAttributes const& current() const { return m_current; }
+    // Back to a look that was kept.
+    void restore(CFontAttributes const& kept);
+
+private:
+    struct FaceKey {
+        void const* name;
+        bool bold;
+        bool italic;
+        Charset charset;
+        int pitch;
+        bool operator==(FaceKey const&) const = default;
+    };
+    struct FaceKeyHash {
+        std::size_t operator()(FaceKey const& key) const;
+    };
+    struct FaceCode {
+        FontName name;  // keeps the key's name alive
+        CStdStrW code;
+    };
+
+    [[nodiscard]] bool appendBrace(CStdStrW& codes);
+    [[nodiscard]] CStdStrW const& faceCode();
+    [[nodiscard]] CStdStrW newFaceCode() const;
+    [[nodiscard]] CStdStrW fileCode(CStdStrW const& file) const;
+    void appendSize(CStdStrW& codes) const;
+    void appendColor(CStdStrW& codes) const;
+
+    CMTextFontMapDatabase* m_pFontMap;
+    CFontAttributes m_current;
+    CFontAttributes m_emitted;
+    CFontAttributes m_base;
+    bool m_bPending = false;
+    int m_nBraceDepth = 0;
+    CFontState* m_pRestoreTo = nullptr;
+    std::unordered_map<FaceKey, FaceCode, FaceKeyHash> faceCodes_;  // as far as written
+};
