@@ -2,7 +2,7 @@
 
 #include <utility>
 
-#include "module/markup/rtf_units.h"
+#include "module/markup/shared/rtf_units.h"
 #include "tz/text/string.h"
 
 namespace tzconvert {
@@ -25,7 +25,7 @@ TextStart startOf(Options const& options) {
     return start;
 }
 
-// What is known ahead of any conversion.
+// What is known before any conversion.
 MarkupFindings startFindings(Options const& options) {
     MarkupFindings found;
     found.wholeText = {options.tracking, options.widthFactor, options.oblique,

@@ -5,7 +5,7 @@
 #include <string>
 
 #include "apps/tzconvert/options.h"
-#include "module/markup/conversion_session.h"
+#include "module/markup/session/conversion_session.h"
 
 namespace tzconvert {
 

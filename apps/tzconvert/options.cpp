@@ -10,10 +10,10 @@ namespace {
 
 constexpr char kPurpose[] = "Converts MTEXT markup to RTF and RTF to MTEXT markup.";
 constexpr char kFooter[] =
-    "Without FILE, or with \"-\", standard input is read; input is UTF-8 and taken byte for byte, and any\n"
-    "bytes where RTF is normalised.\n"
-    "Exit status: 0 done; 2 wrong usage, an unusable file, or input that is not UTF-8 or holds a zero\n"
-    "character, of which nothing is written.";
+    "Without FILE, or with \"-\", standard input is read; input is UTF-8 and taken byte for\n"
+    "byte, and any bytes where RTF is normalised.\n"
+    "Exit status: 0 done; 2 wrong usage, an unusable file, or input that is not UTF-8 or holds a\n"
+    "zero character, of which nothing is written.";
 
 struct DirectionRow {
     char const* name;
@@ -195,7 +195,7 @@ std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
     std::vector<std::string> const rest = app.remaining();
     if (!app.get_subcommands().empty()) {
         return rest.empty() ? wrong.what()
-                            : "options stand behind the command, not \"" + rest.front() + "\"";
+                            : "options stand after the command, not \"" + rest.front() + "\"";
     }
     std::string text = "expected";
     for (DirectionRow const& row : kDirections)

@@ -11,10 +11,10 @@ namespace tzconvert {
 // How far bytes were decoded, and why not to their end.
 struct Decoded {
     std::size_t size;   // the bytes that are in the text
-    char const* fault;  // of the byte behind them, which is refused; null when none is
+    char const* fault;  // of the byte after them, which is refused; null when none is
 };
 
-// Decodes a piece of UTF-8 without zeros behind `text`. Up to three bytes at its end that begin a
+// Decodes a piece of UTF-8 without zeros after `text`. Up to three bytes at its end that begin a
 // character are left for the next piece.
 [[nodiscard]] Decoded decodeText(std::string_view bytes, std::wstring& text);
 
