@@ -12,7 +12,8 @@ import tree
 
 def initialised(archive):
     """Source files in an archive that hold initialisers, as folder/file.cpp."""
-    folder = os.path.basename(archive)[len("lib"):-len(".a")].replace("_", "/", 1)
+    target = os.path.basename(archive)[len("lib"):-len(".a")]
+    folder = next(row for row in tree.rows() if row.replace("/", "_") == target)
     text = subprocess.run(["nm", "-A", archive], check=True, capture_output=True, text=True).stdout
     found = re.findall(r"^[^:]*:([^:]+)\.o:.* t _GLOBAL__sub_I_", text, re.M)
     return {f"{folder}/{name}" for name in found}
