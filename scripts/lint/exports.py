@@ -1,7 +1,8 @@
 #!/usr/bin/env python3
 """Turns the module's list of exported names into a linker version script, or compares it with the
-module, with the bodies that carry the export mark and with the headers that declare them. Exit
-status 77 when there is no module."""
+module, with the bodies that carry the export mark and with the headers that declare them. A line
+"owed NAME" is a promise: no body yet, so it is refused as soon as there is one. Exit status 77 when
+there is no module."""
 import argparse
 import fnmatch
 import os
@@ -13,6 +14,7 @@ import tree
 
 INTERFACE = "sdk/tz/mte/"
 MARKED_FUNCTION = re.compile(r"TZ_API[^;{}()]*?\b(\w+)\(")
+OWED = "owed "
 PLAIN = re.compile(r"^[A-Za-z_.$][\w.$]*$")
 
 
@@ -24,6 +26,11 @@ def read_list(path):
             if name and not name.startswith("#"):
                 names.append(name)
     return names
+
+
+def needed_words(entry):
+    """What headers must hold for an entry: the names of its class and of itself."""
+    return re.findall(r"\w+", entry.split("(")[0].removeprefix("glob ").split(" for ")[-1])
 
 
 def version_script(names):
@@ -75,23 +82,27 @@ def fits(entry, mangled, readable):
     return entry in (mangled, readable)
 
 
-def misdeclared(symbols):
-    """Faults of the headers: other modules see sdk/ alone, and what it declares must be there."""
+def misdeclared(names, symbols):
+    """Faults of the headers: other modules see sdk/ alone, what it declares must be there, and it
+    declares what is there."""
     bodies = {shown.split("(")[0] for _, shown in symbols}
     faults = []
+    words = set()
     for name in tree.tracked(".h"):
         if not name.startswith(("module/", INTERFACE)):
             continue
         code = re.sub(r"//.*", "", "\n".join(tree.text_of(name)))
         if name.startswith(INTERFACE):
+            words |= set(re.findall(r"\w+", code))
             faults += [f"{name}: declared but not exported: {function}"
                        for function in MARKED_FUNCTION.findall(code) if function not in bodies]
         elif "TZ_API" in code:
             faults.append(f"{name}: what the module exports is declared in {INTERFACE}")
-    return faults
+    return faults + [f"in the list but not declared in {INTERFACE}: {entry}" for entry in names
+                     if not words.issuperset(needed_words(entry))]
 
 
-def compare(names, module, archives):
+def compare(names, owed, module, archives):
     def unlisted(symbols):
         return [shown for mangled, shown in symbols
                 if not any(fits(entry, mangled, shown) for entry in names)]
@@ -101,7 +112,9 @@ def compare(names, module, archives):
     faults += [f"marked and defined but not in the list: {name}" for name in unlisted(marked(archives))]
     faults += [f"in the list but not exported: {entry}" for entry in names
                if not any(fits(entry, *symbol) for symbol in symbols)]
-    faults += misdeclared(symbols)
+    faults += misdeclared(names, symbols)
+    faults += [f"no longer owed: {entry}" for entry in owed
+               if any(entry == shown.split("(")[0] for _, shown in symbols + marked(archives))]
     faults += [f"twice in the list: {name}" for name in sorted(set(names)) if names.count(name) > 1]
     return faults
 
@@ -113,7 +126,9 @@ def main():
     parser.add_argument("--module", help="the built module, to compare with")
     parser.add_argument("--archives", help="the folder of the layers that it was made of")
     options = parser.parse_args()
-    names = read_list(options.list)
+    entries = read_list(options.list)
+    names = [entry for entry in entries if not entry.startswith(OWED)]
+    owed = [entry.removeprefix(OWED) for entry in entries if entry.startswith(OWED)]
     if options.version_script:
         with open(options.version_script, "w", encoding="utf-8") as out:
             out.write(version_script(names))
@@ -121,8 +136,8 @@ def main():
         if not os.path.exists(options.module):
             print("no module was built")
             return 77
-        faults = compare(names, options.module, options.archives)
-        print("\n".join(faults) or f"{len(names)} names, all exported, nothing else")
+        faults = compare(names, owed, options.module, options.archives)
+        print("\n".join(faults) or f"{len(names)} names, all exported, nothing else; {len(owed)} owed")
         return 1 if faults else 0
     return 0
 
