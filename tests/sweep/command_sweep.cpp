@@ -17,6 +17,7 @@
 #include "host/drawing_file/drawing_file.h"
 #include "host/runtime/command_runner.h"
 #include "host/runtime/command_stack.h"
+#include "host/selection/entity_list.h"
 
 namespace tztest {
 namespace {
@@ -98,6 +99,7 @@ private:
     std::size_t answered_ = 0;
     std::size_t blocksTaken_ = 0;
     std::size_t undoSteps_ = 0;
+    tzhost::EntityIds implied_;  // every try has it anew
     std::string before_;
     tzhost::FaultPlan faults_;
     std::mt19937 random_{20261121};
@@ -155,6 +157,7 @@ tzhost::Answer SweepSource::begin(tzhost::Answer const& line) {
     plans_.clear();
     plan_ = 0;
     undoSteps_ = tzdraft::Session::current().drawing().undoLog().steps();
+    implied_ = tzhost::impliedSelection();
     before_ = savedDrawing();
     faults_.clear();
     faults_.install();  // without rules it counts the calls
@@ -198,6 +201,7 @@ void SweepSource::startTry(Plan const& plan) {
     phase_ = Phase::trying;
     answered_ = 0;
     blocksTaken_ = 0;
+    tzhost::setImpliedSelection(implied_);
     faults_.clear();
     if (!plan.fault.empty() && !faults_.add(plan.fault)) faults_.install();
 }
