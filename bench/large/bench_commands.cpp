@@ -1,5 +1,7 @@
 // Commands on one entity of a drawing with 100,000, each taken back again. The floor is the same in
 // a drawing with 10: neither the audit nor undo may look at objects that a command does not touch.
+// And commands on all of 100,000 texts, whose floor is as many texts in drawings of 1,000: the cost
+// of a text must not grow with the selection.
 #include <benchmark/benchmark.h>
 
 #include <filesystem>
@@ -16,6 +18,8 @@
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
 #include "host/runtime/module_linker.h"
+#include "tz/db/symbol_table.h"
+#include "tz/mte/easy_object.h"
 
 namespace {
 
@@ -23,6 +27,8 @@ constexpr double kMost = 1.2;
 constexpr int kSmall = 10;
 constexpr int kLarge = 100000;
 constexpr int kRepeats = 100;
+constexpr double kMostForAll = 1.3;
+constexpr int kFew = 1000;
 
 struct CommandRow {
     char const* name;
@@ -35,6 +41,13 @@ constexpr CommandRow kCommands[] = {
     {"eraseLast", L"ERASE",  "last\n\n",                      true },
     {"list",      L"LIST",   "#6\n\n",                        false},
     {"newText",   L"-MTEXT", "0,-5\n10,-9\nAnother note\n\n", true },
+};
+
+constexpr CommandRow kOnAll[] = {
+    {"heightOfAll", L"-MTEDIT",         "all\n\n5\n",           true},
+    {"styleOfAll",  L"MTEXTPROPERTIES", "all\n\nStyle\nTwo\n",  true},
+    {"turnAll",     L"MTEXTPROPERTIES", "all\n\nRotate\n45\n",  true},
+    {"justifyAll",  L"MTEXTPROPERTIES", "all\n\nJustify\nMC\n", true},
 };
 
 // The program's commands and the module's, with undo around each.
@@ -62,12 +75,12 @@ public:
     [[nodiscard]] std::string const& error() const { return error_; }
 
     // Runs the command and takes it back, again and again; how often that went wrong.
-    static int repeat(tzhost::Drawing* drawing, CommandRow const& row) {
+    static int repeat(tzhost::Drawing* drawing, CommandRow const& row, int times = kRepeats) {
         tzhost::setWorkingDrawing(drawing);
         tzhost::documents().open(drawing);
         tzhost::Command const* const command = tzhost::commandStack().find(row.command);
         int wrong = 0;
-        for (int left = kRepeats; left > 0; --left) {
+        for (int left = times; left > 0; --left) {
             tzhost::ScriptSource answers{std::string_view(row.answers)};
             tzhost::commandLine().setSource(&answers);
             bool const isClean = tzhost::runCommand(*command, tzhost::AnswersFrom::script).clean();
@@ -101,4 +114,34 @@ BENCHMARK(runOnOne)
     ->UseManualTime()
     ->Unit(benchmark::kMillisecond);
 
+// A drawing of texts with a second style to choose.
+std::unique_ptr<tzhost::Drawing> textsWithTwoStyles(int count) {
+    auto drawing = tzbench::drawingWithTexts(count);
+    EasyTable<TzDbTextStyleTable> styles;
+    if (drawing->getTextStyleTable(styles.object, TzDb::kForWrite) != Tzad::eOk) return drawing;
+    auto* const style = new TzDbTextStyleTableRecord;
+    TzDbObjectId id;
+    // Refused, the first use of the style finds that it is missing.
+    if (style->setName(L"Two") == Tzad::eOk && styles->addRecord(style, id) == Tzad::eOk)
+        (void)style->close();
+    return drawing;
+}
+
+void runOnAll(benchmark::State& state) {
+    CommandRow const& row = kOnAll[state.range(0)];
+    state.SetLabel(row.name);
+    Commands const commands;
+    if (!commands.isLoaded()) state.SkipWithError(commands.error().c_str());
+    auto const few = textsWithTwoStyles(kFew);
+    auto const many = textsWithTwoStyles(kLarge);
+    if (Commands::repeat(few.get(), row, 1) > 0) state.SkipWithError("the command went wrong");
+    tzbench::AgainstFloor against(state, kMostForAll);
+    while (state.KeepRunning())
+        against.turn([&] { return Commands::repeat(many.get(), row, 1); },
+                     [&] { return Commands::repeat(few.get(), row, kLarge / kFew); });
+}
+BENCHMARK(runOnAll)
+    ->DenseRange(0, std::size(kOnAll) - 1)
+    ->UseManualTime()
+    ->Unit(benchmark::kMillisecond);
 }  // namespace
