@@ -66,6 +66,12 @@ void CommandLine::print(std::wstring_view text) {
     transcript_.message(text);
 }
 
+// It has lines of its own; a line end that its text begins with adds no empty one.
+void CommandLine::notify(Notification const& notification) {
+    std::wstring_view const text = notification.text;
+    say(text.substr(text.starts_with(L'\n') ? 1 : 0));
+}
+
 void CommandLine::complain(std::wstring const& text) {
     hasFailed_ = true;
     if (errors_) errors_(text + L"\n");

@@ -69,7 +69,7 @@ public:
     void setVoice(Voice voice) { voice_ = voice; }
     void print(std::wstring_view text) override;
     // A message that waits for the user is a line of the host's own, and nobody waits.
-    void notify(Notification const& notification) override { say(notification.text); }
+    void notify(Notification const& notification) override;
     // Puts everything back as at the start, the source and the screens included.
     void reset();
 
