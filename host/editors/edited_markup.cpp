@@ -4,6 +4,7 @@
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
 #include "tz/db/field.h"
+#include "tz/mte/easy_object.h"
 
 namespace tzhost {
 namespace {
@@ -14,12 +15,11 @@ constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 // Replaces the text's evaluated contents by those with the codes of its field, where it has one.
 // False when there is a field that cannot be opened.
 bool readFieldCode(TzDbMText const& text, TzString& markup) {
-    TzDbField* field = nullptr;
-    Tzad::ErrorStatus const status = text.getField(kTextFieldKey, field, TzDb::kForRead);
+    EasyObject<TzDbField> field;  // closes it also when memory is short
+    Tzad::ErrorStatus const status = text.getField(kTextFieldKey, field.object, TzDb::kForRead);
     if (status == Tzad::eKeyNotFound) return true;
     if (status != Tzad::eOk) return false;
     markup = field->getFieldCode(0);
-    (void)field->close();  // it was opened for read, which closes in any case
     return true;
 }
 
