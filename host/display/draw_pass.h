@@ -35,7 +35,7 @@ public:
     static constexpr int kMostNested = 2'000'000;
     static constexpr int kMostLetters = 5'000'000;
 
-    // Draws one drawable behind what was drawn before: its attributes, then itself. Null draws
+    // Draws one drawable after those drawn so far: its attributes, then itself. Null draws
     // nothing.
     void draw(TzGiDrawable* drawable);
     [[nodiscard]] DrawList const& list() const { return list_; }

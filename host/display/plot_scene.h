@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "host/display/draw_list.h"
-#include "host/display/view.h"
+#include "host/display/view_axes.h"
 #include "host/layout/text_outline.h"
 
 // A drawing list as flat shapes in the colours of a page: all that remains is to scale and paint

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "host/display/view.h"
+#include "host/display/view_axes.h"
 
 // How the drawing lies on the screen, which exists in numbers only.
 namespace tzhost {

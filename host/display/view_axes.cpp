@@ -1,4 +1,4 @@
-#include "host/display/view.h"
+#include "host/display/view_axes.h"
 
 #include <variant>
 
