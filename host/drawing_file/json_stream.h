@@ -3,18 +3,13 @@
 #include <cstdio>
 #include <string>
 
-#include "host/drawing_file/json_value.h"
+#include "host/files/json_events.h"
 
 // Reads the JSON of a drawing and hands over its parts as they come, so that no more than one
 // entity is held as JSON.
 namespace tzhost::drawingfile {
 
-// What is wrong with a file; `member` is empty where none is meant.
-struct Problem {
-    int line = 1;
-    std::string member;
-    std::string what;
-};
+using Problem = JsonProblem;
 
 // Takes the parts of a drawing. False from an operation stops the reading; whoever gives it knows
 // why.

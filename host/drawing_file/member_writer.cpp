@@ -2,7 +2,7 @@
 
 #include "host/database/symbol_imp.h"
 #include "host/database/true_color.h"
-#include "host/drawing_file/json_value.h"
+#include "host/files/json_value.h"
 #include "host/text/utf8.h"
 
 namespace tzhost::drawingfile {

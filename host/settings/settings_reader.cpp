@@ -7,7 +7,7 @@
 #include <limits>
 
 #include "host/files/ini_data.h"
-#include "host/files/located_json.h"
+#include "host/files/json_events.h"
 #include "host/settings/settings.h"
 #include "host/settings/variable_table.h"
 #include "host/text/local_text.h"
@@ -17,64 +17,62 @@ namespace tzhost {
 
 namespace {
 
-using Kind = LocatedJson::Kind;
+using Kind = JsonKind;
 
 // Keeps the first fault; nothing is read after it.
 class Reader {
 public:
-    void read(LocatedJson const& root);
+    void read(JsonValue const& root);
     [[nodiscard]] SettingsResult take() { return std::move(result_); }
 
-    void variables(LocatedJson const& value, std::string const& path);
-    void product(LocatedJson const& value, std::string const& path);
-    void registry(LocatedJson const& value, std::string const& path);
-    void fabric(LocatedJson const& value, std::string const& path);
+    void variables(JsonValue const& value, std::string const& path);
+    void product(JsonValue const& value, std::string const& path);
+    void registry(JsonValue const& value, std::string const& path);
+    void fabric(JsonValue const& value, std::string const& path);
     template <std::wstring Settings::*Member>
-    void text(LocatedJson const& value, std::string const& path) {
-        if (isA(value, Kind::text, path)) result_.settings.*Member = fromUtf8(value.text());
+    void text(JsonValue const& value, std::string const& path) {
+        if (isA(value, Kind::text, path)) result_.settings.*Member = fromUtf8(value.text);
     }
     template <std::vector<std::wstring> Settings::*Member>
-    void texts(LocatedJson const& value, std::string const& path) {
+    void texts(JsonValue const& value, std::string const& path) {
         if (!isA(value, Kind::array, path)) return;
-        for (LocatedJson const& item : value.items()) {
+        for (JsonValue const& item : value.items) {
             if (!isA(item, Kind::text, path)) return;
-            (result_.settings.*Member).push_back(fromUtf8(item.text()));
+            (result_.settings.*Member).push_back(fromUtf8(item.text));
         }
     }
 
 private:
     [[nodiscard]] bool isGood() const { return result_.error.empty(); }
-    void fail(LocatedJson const& where, std::string const& path, std::string const& what) {
+    void fail(JsonValue const& where, std::string const& path, std::string const& what) {
         if (!isGood()) return;
         result_.error =
-            std::to_string(where.line()) + ": " + (path.empty() ? "" : path + ": ") + what;
+            std::to_string(where.line) + ": " + (path.empty() ? "" : path + ": ") + what;
     }
-    bool isA(LocatedJson const& value, Kind kind, std::string const& path) {
-        if (value.kind() == kind) return true;
+    bool isA(JsonValue const& value, Kind kind, std::string const& path) {
+        if (value.kind == kind) return true;
         fail(value, path, localText("expected ") + nameOf(kind));
         return false;
     }
     // A whole number of 32 bits without sign.
-    std::optional<std::uint32_t> wholeNumber(LocatedJson const& value, std::string const& path) {
+    std::optional<std::uint32_t> wholeNumber(JsonValue const& value, std::string const& path) {
         constexpr double kMost = std::numeric_limits<std::uint32_t>::max();
-        double const number = value.number();
-        if (value.kind() == Kind::number && number >= 0 && number <= kMost &&
+        double const number = value.number;
+        if (value.kind == Kind::number && number >= 0 && number <= kMost &&
             number == std::trunc(number)) {
             return static_cast<std::uint32_t>(number);
         }
         fail(value, path, localText("expected a whole number from 0 to 4294967295"));
         return std::nullopt;
     }
-    void registryValue(std::wstring const& key,
-                       LocatedJson::Member const& member,
-                       std::string const& path);
+    void registryValue(std::wstring const& key, JsonMember const& member, std::string const& path);
 
     SettingsResult result_;
 };
 
 struct MemberRow {
     std::string_view name;
-    void (Reader::*read)(LocatedJson const& value, std::string const& path);
+    void (Reader::*read)(JsonValue const& value, std::string const& path);
 };
 
 constexpr MemberRow kMembers[] = {
@@ -101,17 +99,17 @@ bool beginsWithRoot(std::wstring_view key) {
 
 // The value of a variable of that type. A JSON value of another kind gives a value of another type,
 // which the variable refuses.
-VariableValue variableValue(LocatedJson const& value, VariableType type) {
-    if (value.kind() == Kind::text) return fromUtf8(value.text());
-    double const number = value.kind() == Kind::number ? value.number() : std::nan("");
+VariableValue variableValue(JsonValue const& value, VariableType type) {
+    if (value.kind == Kind::text) return fromUtf8(value.text);
+    double const number = value.kind == Kind::number ? value.number : std::nan("");
     bool const isShort = number == std::trunc(number) && std::fabs(number) <= 32767;
     if (type == VariableType::shortInteger && isShort) return static_cast<short>(number);
     return number;
 }
 
-void Reader::read(LocatedJson const& root) {
+void Reader::read(JsonValue const& root) {
     if (!isA(root, Kind::object, "")) return;
-    for (auto const& [name, value] : root.members()) {
+    for (auto const& [name, value] : root.members) {
         MemberRow const* found = nullptr;
         for (MemberRow const& row : kMembers) {
             if (row.name == name) found = &row;
@@ -122,9 +120,9 @@ void Reader::read(LocatedJson const& root) {
     }
 }
 
-void Reader::variables(LocatedJson const& value, std::string const& path) {
+void Reader::variables(JsonValue const& value, std::string const& path) {
     if (!isA(value, Kind::object, path)) return;
-    for (auto const& [name, held] : value.members()) {
+    for (auto const& [name, held] : value.members) {
         std::string const here = path + '.' + name;
         VariableDefinition const* const row = findVariable(fromUtf8(name));
         if (row == nullptr) return fail(held, here, localText("there is no such system variable"));
@@ -138,12 +136,12 @@ void Reader::variables(LocatedJson const& value, std::string const& path) {
     }
 }
 
-void Reader::product(LocatedJson const& value, std::string const& path) {
+void Reader::product(JsonValue const& value, std::string const& path) {
     if (!isA(value, Kind::object, path)) return;
-    for (auto const& [name, values] : value.members()) {
+    for (auto const& [name, values] : value.members) {
         if (!isA(values, Kind::object, path + '.' + name)) return;
         auto& into = result_.settings.product[lowered(fromUtf8(name))];
-        for (auto const& [key, number] : values.members()) {
+        for (auto const& [key, number] : values.members) {
             auto const read = wholeNumber(number, path + '.' + name + '.' + key);
             if (!read) return;
             into[lowered(fromUtf8(key))] = *read;
@@ -151,9 +149,9 @@ void Reader::product(LocatedJson const& value, std::string const& path) {
     }
 }
 
-void Reader::registry(LocatedJson const& value, std::string const& path) {
+void Reader::registry(JsonValue const& value, std::string const& path) {
     if (!isA(value, Kind::object, path)) return;
-    for (auto const& [name, values] : value.members()) {
+    for (auto const& [name, values] : value.members) {
         std::string const here = path + '.' + name;
         std::wstring key = lowered(fromUtf8(name));
         if (!beginsWithRoot(key)) {
@@ -164,26 +162,26 @@ void Reader::registry(LocatedJson const& value, std::string const& path) {
             key.pop_back();
         if (!isA(values, Kind::object, here)) return;
         result_.settings.registry[key];
-        for (LocatedJson::Member const& member : values.members()) {
+        for (JsonMember const& member : values.members) {
             registryValue(key, member, here + '.' + member.first);
         }
     }
 }
 
 void Reader::registryValue(std::wstring const& key,
-                           LocatedJson::Member const& member,
+                           JsonMember const& member,
                            std::string const& path) {
     auto& into = result_.settings.registry[key];
     std::wstring const name = fromUtf8(member.first);
-    if (member.second.kind() == Kind::text) {
-        into.emplace_back(name, fromUtf8(member.second.text()));
+    if (member.second.kind == Kind::text) {
+        into.emplace_back(name, fromUtf8(member.second.text));
     } else if (auto const number = wholeNumber(member.second, path)) {
         into.emplace_back(name, *number);
     }
 }
 
-void Reader::fabric(LocatedJson const& value, std::string const& path) {
-    if (isA(value, Kind::boolean, path)) result_.settings.fabric = value.boolean();
+void Reader::fabric(JsonValue const& value, std::string const& path) {
+    if (isA(value, Kind::flag, path)) result_.settings.fabric = value.flag;
 }
 
 }  // namespace
@@ -195,9 +193,10 @@ SettingsResult readSettings(std::string_view bytes) {
                 std::to_string(line) + ": " + localText("the byte at offset ") +
                     std::to_string(bad) + localText(" is no UTF-8")};
     }
-    LocatedJson::Result const document = LocatedJson::read(bytes);
-    if (!document.error.empty()) {
-        return {{}, std::to_string(document.line) + ": " + document.error};
+    JsonDocument const document = readJson(bytes);
+    if (document.failed) {
+        auto const& [line, member, what] = document.problem;
+        return {{}, std::to_string(line) + ": " + (member.empty() ? "" : member + ": ") + what};
     }
     Reader reader;
     reader.read(document.root);

@@ -53,7 +53,7 @@ constexpr FaultRow kFaults[] = {
     {"UnknownRoot",           "{\"registry\": {\"HKEY_USERS\\\\A\": {}}}",
      "1: registry.HKEY_USERS\\A: expected HKEY_CURRENT_USER or HKEY_LOCAL_MACHINE first"                                     },
     {"Twice",                 "{\"fabric\": true,\n\"fabric\": true}",
-     "2: the member \"fabric\" stands here twice"                                                                            },
+     "2: fabric: stands twice, expected each member once"                                                                    },
     {"NotUtf8",               "{\"productKey\": \"\xFF\"}",                            "1: the byte at offset 16 is no UTF-8"},
 };
 class SettingsFile : public testing::TestWithParam<FaultRow> {};
@@ -70,7 +70,8 @@ TEST(SettingsDocument, ThatIsNoJsonIsRefusedWithItsLine) {
         EXPECT_EQ(tzhost::readSettings(text).error.substr(0, 3), "2: ") << text;
     }
     EXPECT_FALSE(tzhost::readSettings("").error.empty());
-    EXPECT_EQ(tzhost::readSettings(std::string(100000, '[')).error, "1: nested too deeply");
+    EXPECT_EQ(tzhost::readSettings(std::string(100000, '[')).error,
+              "1: is nested too deeply, expected at most 200 levels");
 }
 
 // A settings file of its own, and defaults again afterwards.
