@@ -84,12 +84,12 @@ public:
     [[nodiscard]] bool isWorkingSetActive() const override { return settings_.workingSetActive; }
     [[nodiscard]] double workingAngle() const override { return settings_.workingAngle; }
 
-    // The settings; what changes them is taken back with the command that did it.
+    // The settings. Undo takes a change of them back with the command that made it.
     [[nodiscard]] DrawingSettings const& settings() const { return settings_; }
     // Puts settings in place unchecked and shows the style's name in TEXTSTYLE.
     void setSettings(DrawingSettings const& settings);
-    // The same for settings whose style is that of before, or a drawing that is not worked on yet:
-    // no variable changes, and nothing can fail.
+    // The same where the style stays, or in a drawing that is not worked on yet: no variable
+    // changes, and nothing can fail.
     void restoreSettings(DrawingSettings const& settings) { settings_ = settings; }
     void setFile(std::filesystem::path file) { fileName_ = std::move(file); }
     [[nodiscard]] std::filesystem::path const& file() const { return fileName_; }

@@ -9,7 +9,7 @@
 #include "host/database/object_record.h"
 
 // The objects that a table or a block lists, in order. Undo keeps no copies of such a list: it
-// takes out what a step put in, so that adding to a long list costs nothing but the new entry.
+// takes out what a step put in. So adding to a long list costs no more than adding to a short one.
 namespace tzhost {
 
 struct ObjectList {

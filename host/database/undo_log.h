@@ -26,7 +26,7 @@ public:
 
     // Steps do not nest: inside a step, begin and end are counted and change nothing.
     void begin();
-    // Keeps the step when something but the last point is not what it was before the command.
+    // Keeps the step when anything but the last point differs from what it was before the command.
     void end();
     // Takes back the last finished step; false when there is none. Within a step the undoing itself
     // is not noted.

@@ -11,7 +11,7 @@
 namespace tzhost::drawingfile {
 
 // Which members a run over the file takes. Entities name layers, styles and blocks; when they come
-// ahead of those, a second run over the file reads the entities alone.
+// before those, a second run over the file reads the entities alone.
 enum class Pass { first, entitiesOnly };
 
 // Takes the parts of a drawing as the stream hands them over.

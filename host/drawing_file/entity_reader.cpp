@@ -56,8 +56,8 @@ std::uint64_t EntityReader::handleOf(JsonValue const& value) {
     if (!handle) {
         context_.complain(
             member->line, "handle",
-            localText(
-                "is no handle, expected a text of hexadecimal digits from \"1\" to \"3FFFFFFFFFFFFFFF\""));
+            localText("is no handle, expected a text of hexadecimal digits from \"1\" to "
+                      "\"3FFFFFFFFFFFFFFF\""));
         return 0;
     }
     if (!context_.drawing.objectAt(*handle).isNull()) {

@@ -12,8 +12,8 @@
 
 namespace tzhost::drawingfile {
 
-// Writes members of one object behind each other; the counterpart of MemberReader. Every member is
-// written, also one that has its default. The braces stand in `open` and `close`.
+// Writes the members of one object one after the other; the counterpart of MemberReader. Every
+// member is written, also one that has its default. The braces stand in `open` and `close`.
 class MemberWriter {
 public:
     // `kept` holds what the file had that this host does not know; null for nothing.

@@ -30,7 +30,7 @@ void describeHeights(MemberReader& members, TextEditorColumns& columns) {
     members.flag("flowReversed", columns.flowReversed);
 }
 
-// Few texts have these, so they are written where they say something.
+// Few texts have these values, so only those that differ from the defaults are written.
 void describeHeights(MemberWriter& members, TextEditorColumns& columns) {
     if (!columns.heights.isEmpty()) {
         members.numbers("heights", {columns.heights.begin(), columns.heights.end()}, Range::size);

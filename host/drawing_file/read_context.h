@@ -10,7 +10,7 @@
 namespace tzhost::drawingfile {
 
 // What the readers of a drawing's parts share: the drawing, and the first problem that was met. A
-// reader goes on with defaults behind a problem; whoever drives it looks at the end of each part.
+// reader goes on with defaults after a problem; its caller looks for one at the end of each part.
 struct ReadContext {
     Drawing& drawing;
     bool failed = false;

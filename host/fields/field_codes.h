@@ -11,13 +11,13 @@ namespace tzhost {
 
 class Drawing;
 
-// Where a code stands: its first character, and the one behind it.
+// Where a code stands: its first character, and the first one after it.
 struct FieldSpan {
     std::size_t first;
     std::size_t end;
 };
 
-// The first code at or behind `start`.
+// The first code that begins at `start` or after it.
 [[nodiscard]] std::optional<FieldSpan> findField(std::wstring_view text, std::size_t start);
 
 // A text with its codes computed; those that cannot be show "####". Nothing is looked at twice: a

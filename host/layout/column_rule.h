@@ -21,7 +21,7 @@ struct SpacingRule {
 // The rule of an MTEXT; a factor that is not above 0 counts as 1.
 [[nodiscard]] SpacingRule spacingRuleOf(MTextLayoutInput const& input);
 
-// How high each column is. A height of 0 or below has no limit; columns behind the list are as high
+// How high each column is. A height of 0 or below has no limit; columns after the list are as high
 // as `height`. The last of `most` columns takes all that is left; a `most` of 0 allows any number.
 struct ColumnRule {
     std::vector<double> heights;

@@ -131,8 +131,8 @@ private:
     std::size_t span_ = 0;
 };
 
-// Letters and marks take the font of a letter ahead of them; marks ahead of all letters that of the
-// first one.
+// Letters and marks take the font of a letter before them; marks before all letters take that of
+// the first letter.
 void shareFonts(std::vector<TextItem>& items, Utf8Text const& utf8) {
     FontGiver forwards(utf8);
     for (TextItem& each : items)

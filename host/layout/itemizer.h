@@ -26,7 +26,7 @@ struct TextItem {
     CjkKind lacking = CjkKind::none;
 
     [[nodiscard]] PangoAnalysis const& analysis() const { return item->analysis; }
-    // Whether this item goes on with the borrowed font and the direction of the one ahead of it, so
+    // Whether this item goes on with the borrowed font and the direction of the one before it, so
     // that both are drawn as one.
     [[nodiscard]] bool continues(TextItem const& ahead) const;
 };

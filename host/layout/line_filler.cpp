@@ -46,7 +46,7 @@ std::vector<SegmentLine> Filler::fill() {
         if (overflows(cell) && lastBreak > start_) {
             endLine(lastBreak);
             startLine(lastBreak);
-            // The characters behind the break are met again: each once, since they fit.
+            // The characters after the break are met again: each once, since they fit.
             i = lastBreak - 1;
             continue;
         }

@@ -21,16 +21,16 @@ double LineFrame::offset(SegmentLine const& line) const {
 
 double LineFrame::measure(std::vector<LaidLine> const& lines) const {
     double before = 0.0;
-    double behind = 0.0;
+    double after = 0.0;
     for (LaidLine const& laid : lines) {
         double const start = offset(laid.line) - share * width;
         before = std::max(before, -start);
-        behind = std::max(behind, start + laid.line.advance);
+        after = std::max(after, start + laid.line.advance);
     }
     if (share == 0.0) {
-        return behind;
+        return after;
     }
-    return share == 1.0 ? before : 2.0 * std::max(before, behind);
+    return share == 1.0 ? before : 2.0 * std::max(before, after);
 }
 
 }  // namespace tzhost

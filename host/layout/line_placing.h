@@ -15,7 +15,7 @@ namespace tzhost {
 
 // Where lines stand in their frame, whose width is the wrap width or that of the longest line.
 struct LineFrame {
-    double share = 0.0;  // of the room that a line leaves, what lies ahead of it
+    double share = 0.0;  // the part of the room left by a line that lies before it
     double width = 0.0;
 
     [[nodiscard]] double offset(SegmentLine const& line) const;

@@ -290,7 +290,7 @@ void Reader::readFontFace() {
     MarkupFont font;
     font.charset = 1;
     font.name = readFontName();
-    // Without fields the semicolon behind the name stays and stands as text.
+    // Without fields the semicolon after the name stays and is text.
     if (*cursor_ == L'|') {
         while (*cursor_ != 0 && *cursor_ != L';') {
             wchar_t const field = *cursor_++;

@@ -75,7 +75,7 @@ std::wstring scanEscapedText(wchar_t const*& cursor) {
     while (*cursor != 0 && *cursor != L';') {
         bool const pair = *cursor == L'\\';
         text += *cursor++;
-        // Of a pair, its character and the one behind it are taken unseen.
+        // The character of a pair and the one after it are taken whatever they are.
         for (int i = 0; pair && i < 2 && *cursor != 0; ++i) {
             text += *cursor++;
         }

@@ -11,7 +11,7 @@ namespace tzhost::markup {
 // does not fit wraps around 32 bits.
 [[nodiscard]] int scanNumber(wchar_t const*& cursor);
 
-// A real as the codes write it, and whether an "x" behind it made it a factor.
+// A real as the codes write it, and whether an "x" after it made it a factor.
 struct ScannedReal {
     double value = 0.0;
     bool relative = false;
@@ -24,15 +24,15 @@ struct ScannedReal {
 void skipSemicolon(wchar_t const*& cursor);
 
 // The text up to an unescaped ";", which is taken too. A backslash and its character are copied as
-// a pair, and the character behind such a pair is copied whatever it is, so a ";" there ends
+// a pair, and the character after such a pair is copied whatever it is, so a ";" there ends
 // nothing.
 [[nodiscard]] std::wstring scanEscapedText(wchar_t const*& cursor);
 
-// With the cursor behind "\U": the character of "+XXXX" (four hex digits), or 0 when something else
+// With the cursor after "\U": the character of "+XXXX" (four hex digits), or 0 when something else
 // stands there. Five characters are taken either way, as far as the text goes.
 [[nodiscard]] wchar_t scanUnicode(wchar_t const*& cursor);
 
-// With the cursor behind "\M": the character of "+nXXXX", n from 1 to 5 choosing one of the
+// With the cursor after "\M": the character of "+nXXXX", n from 1 to 5 choosing one of the
 // double-byte code pages 932, 936, 949, 950 and 1361. False, and the cursor stays, when something
 // else stands there. Bytes that are no character of the page read as U+FFFD.
 [[nodiscard]] bool scanMultibyte(wchar_t const*& cursor, wchar_t& character);

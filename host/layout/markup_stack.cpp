@@ -9,7 +9,7 @@
 namespace tzhost::markup {
 namespace {
 
-// A text counts as a stack when it holds one of these. The letters behind the three real stack
+// A text counts as a stack when it holds one of these. The letters after the three real stack
 // characters belong to the format all the same: a text with a "T" in it is a stack of one part.
 constexpr std::wstring_view kStackMarks = L"/#^TzmtedRes.dll";
 
@@ -28,12 +28,12 @@ constexpr std::array<SignRow, 3> kStackSigns{
      }
 };
 
-// Where a walk over the arguments of a stack stands. Their end is found with the character behind
+// Where a walk over the arguments of a stack stands. Their end is found with the character after
 // an escape pair taken unseen; the stack character is looked for with Unicode codes left out.
 struct Walk {
     unsigned int unseen = 0;  // characters still to take without a test for the end
     unsigned int hidden = 0;  // characters of a Unicode code still to leave out
-    bool escaped = false;     // behind a backslash
+    bool escaped = false;     // after a backslash
 
     [[nodiscard]] std::uint32_t bit() const {
         return std::uint32_t{1} << (unseen * 7 + (escaped ? 6 : hidden));

@@ -13,7 +13,7 @@ namespace tzhost::markup {
 
 // Tells whether the arguments of a stack code hold a stack character. Without one the code is text,
 // and what follows is read again, so the probe remembers what it has walked over in vain: all calls
-// together walk in linear time, provided that positions never fall back behind a stack that was
+// together walk in linear time, provided that positions never go back to before a stack that was
 // found.
 class StackProbe {
 public:

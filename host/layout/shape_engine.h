@@ -9,7 +9,7 @@
 
 #include "host/layout/layout_types.h"
 
-// The Pango objects behind shaping and outlines, set up so that nothing is rounded to pixels.
+// The Pango objects that shaping and outlines use, set up so that nothing is rounded to pixels.
 namespace tzhost {
 
 // The reference size in Pango units. It is a multiple of the units per em of all usual fonts (1000

@@ -31,7 +31,7 @@ struct ShapedCharacter {
     double advance = 0.0;  // in heights of capitals of the span's face
     bool mayBreakBefore = false;
     bool isBlank = false;
-    bool opensLetter = true;  // false for what joins the character ahead of it, such as an accent
+    bool opensLetter = true;  // false for what joins the character before it, such as an accent
 };
 
 struct ShapedText {
