@@ -104,6 +104,17 @@ void editById() {
     tzutPrintf(L"\nIn place: %ls\n", gbUsedIPE ? L"yes" : L"no");
 }
 
+// The first text of a selection, then the same one by its older name.
+void editSelected() {
+    long long set[2]{};
+    if (tzedSSGet(nullptr, nullptr, nullptr, nullptr, set) != Tzad::ePromptNormal) return;
+    report(L"Selected", EditMtextInSelectionSet(set, kMTETabText, true, true));
+    long long name[2]{};
+    if (tzedSSName(set, 0, name) == Tzad::ePromptNormal)
+        report(L"Named", EditMtextByAdsName(name, kMTETabText, true, true));
+    tzedSSFree(set);
+}
+
 // The plain markup, in the raw editor.
 void editMarkup() {
     EasyObject<TzDbMText> text;
@@ -136,15 +147,16 @@ constexpr std::array kChoices{
     Choice{L"Markup",     editMarkup     },
     Choice{L"NEw",        writeNew       },
     Choice{L"NOthing",    writeNothing   },
+    Choice{L"Selected",   editSelected   },
 };
 
 }  // namespace
 
 void noteCommand() {
-    tzedInitGet(1, L"Attribute Definition Entity Identity Markup NEw NOthing");
+    tzedInitGet(1, L"Attribute Definition Entity Identity Markup NEw NOthing Selected");
     TzString word;
-    if (tzedGetKword(L"\nNote [Attribute/Definition/Entity/Identity/Markup/NEw/NOthing]: ", word) !=
-        Tzad::ePromptNormal)
+    if (tzedGetKword(L"\nNote [Attribute/Definition/Entity/Identity/Markup/NEw/NOthing/Selected]: ",
+                     word) != Tzad::ePromptNormal)
         return;
     for (Choice const& choice : kChoices)
         if (word == choice.word) choice.body();
