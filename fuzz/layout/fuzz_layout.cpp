@@ -8,7 +8,7 @@
 
 #include "host/layout/markup_reader.h"
 #include "host/layout/mtext_layout.h"
-#include "host/layout/text_outline.h"
+#include "host/shaping/text_outline.h"
 #include "host/text/utf8.h"
 
 extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size) {

@@ -6,7 +6,8 @@
 
 #include "host/display/draw_list.h"
 #include "host/display/view_axes.h"
-#include "host/layout/text_outline.h"
+#include "host/layout/layout_types.h"
+#include "host/shaping/text_outline.h"
 
 // A drawing list as flat shapes in the colours of a page: all that remains is to scale and paint
 // them. Coordinates are those of the view, in drawing units, y up. The shapes are made each time

@@ -2,8 +2,8 @@
 
 #include <string>
 
-#include "host/layout/shaper.h"
 #include "host/layout/text_line.h"
+#include "host/shaping/shaper.h"
 
 // The step from a look to a run of letters.
 namespace tzhost {

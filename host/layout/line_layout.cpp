@@ -6,7 +6,7 @@
 #include "host/layout/face_table.h"
 #include "host/layout/glyph_run.h"
 #include "host/layout/markup_scan.h"
-#include "host/layout/shaper.h"
+#include "host/shaping/shaper.h"
 
 namespace tzhost {
 namespace {

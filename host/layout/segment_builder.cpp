@@ -4,8 +4,8 @@
 
 #include "host/layout/face_table.h"
 #include "host/layout/glyph_run.h"
-#include "host/layout/shaper.h"
 #include "host/layout/stack_layout.h"
+#include "host/shaping/shaper.h"
 
 namespace tzhost {
 namespace {

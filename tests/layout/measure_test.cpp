@@ -8,7 +8,7 @@
 #include "host/faults/fault_plan.h"
 #include "host/layout/line_layout.h"
 #include "host/layout/mtext_layout.h"
-#include "host/layout/shape_engine.h"
+#include "host/shaping/shape_engine.h"
 
 namespace {
 

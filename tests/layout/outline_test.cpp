@@ -5,8 +5,8 @@
 
 #include "host/layout/line_layout.h"
 #include "host/layout/mtext_layout.h"
-#include "host/layout/shaper.h"
-#include "host/layout/text_outline.h"
+#include "host/shaping/shaper.h"
+#include "host/shaping/text_outline.h"
 #include "tests/layout/layout_printer.h"
 #include "tz/text/string.h"
 

@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-#include "host/layout/layout_types.h"
+#include "host/shaping/glyph_types.h"
 
 // Shapes text with Pango and measures it in heights of capitals, so that the caller only scales.
 // All is shaped at one reference size without hinting or rounding, whatever the height of the text

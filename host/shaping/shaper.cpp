@@ -1,12 +1,12 @@
-#include "host/layout/shaper.h"
+#include "host/shaping/shaper.h"
 
 #include <pango/pango.h>
 
 #include <algorithm>
 #include <memory>
 
-#include "host/layout/itemizer.h"
-#include "host/layout/shape_engine.h"
+#include "host/shaping/itemizer.h"
+#include "host/shaping/shape_engine.h"
 
 namespace tzhost {
 namespace {

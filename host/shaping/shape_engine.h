@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "host/layout/layout_types.h"
+#include "host/shaping/glyph_types.h"
 
 // The Pango objects that shaping and outlines use, set up so that nothing is rounded to pixels.
 namespace tzhost {

@@ -4,7 +4,7 @@
 
 #include <vector>
 
-#include "host/layout/text_outline.h"
+#include "host/shaping/text_outline.h"
 
 // The outlines of single glyphs, traced once: a text asks for the same few again and again.
 namespace tzhost {

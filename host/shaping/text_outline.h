@@ -4,7 +4,7 @@
 #include <functional>
 #include <vector>
 
-#include "host/layout/layout_types.h"
+#include "host/shaping/glyph_types.h"
 
 // The letters of a run as outlines, for plots.
 //

@@ -5,8 +5,8 @@
 #include <memory>
 #include <vector>
 
-#include "host/layout/shape_engine.h"
-#include "host/layout/shaper.h"
+#include "host/shaping/shape_engine.h"
+#include "host/shaping/shaper.h"
 
 // Cuts a text into items, each of one font and one direction, the same way for measuring and for
 // drawing.

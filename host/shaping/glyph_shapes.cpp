@@ -1,4 +1,4 @@
-#include "host/layout/glyph_shapes.h"
+#include "host/shaping/glyph_shapes.h"
 
 #include <pango/pangocairo.h>
 

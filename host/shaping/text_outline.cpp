@@ -1,4 +1,4 @@
-#include "host/layout/text_outline.h"
+#include "host/shaping/text_outline.h"
 
 #include <pango/pango.h>
 
@@ -6,9 +6,9 @@
 #include <memory>
 #include <vector>
 
-#include "host/layout/glyph_shapes.h"
-#include "host/layout/itemizer.h"
-#include "host/layout/shape_engine.h"
+#include "host/shaping/glyph_shapes.h"
+#include "host/shaping/itemizer.h"
+#include "host/shaping/shape_engine.h"
 
 namespace tzhost {
 namespace {

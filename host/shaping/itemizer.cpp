@@ -1,4 +1,4 @@
-#include "host/layout/itemizer.h"
+#include "host/shaping/itemizer.h"
 
 #include <algorithm>
 #include <iterator>

@@ -1,4 +1,4 @@
-#include "host/layout/shape_engine.h"
+#include "host/shaping/shape_engine.h"
 
 #include <hb-ot.h>
 #include <hb.h>
