@@ -50,7 +50,7 @@ void declare(CLI::App& app, Options& options) {
                 "the module to load; beside the program when left out");
     declareFile(app, "--resources", options.resources, "the resource library of the module");
     declareText(app, "--rtf-editor", options.richTextEditor, "CMD",
-                "program for the dialog editor; not used yet");
+                "program for the dialog editor, such as a word processor");
     declareText(app, "--text-editor", options.textEditor, "CMD",
                 "program for the in-place and raw editors");
     declareFile(app, "--events", options.events,

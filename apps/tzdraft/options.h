@@ -27,7 +27,7 @@ struct Options {
     std::filesystem::path settings;
     std::filesystem::path module;
     std::filesystem::path resources;
-    std::string richTextEditor;  // taken, but no dialog editor opens yet
+    std::string richTextEditor;
     std::string textEditor;
     std::filesystem::path events;
     std::vector<std::string> faults;  // NAME[:K][=STATUS]

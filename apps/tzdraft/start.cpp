@@ -124,6 +124,7 @@ void chooseEditors(Options const& options) {
     tzhost::EditorConfiguration& editors = tzhost::editorConfiguration();
     editors.textEditor = firstOf({options.textEditor, tzhost::toUtf8(settings.textEditor),
                                   environment("VISUAL"), environment("EDITOR")});
+    editors.richTextEditor = firstOf({options.richTextEditor, tzhost::toUtf8(settings.rtfEditor)});
     editors.inPlaceEditors.assign(settings.inPlaceEditors.begin(), settings.inPlaceEditors.end());
 }
 

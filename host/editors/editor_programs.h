@@ -7,7 +7,8 @@
 namespace tzhost {
 
 struct EditorConfiguration {
-    std::string textEditor;  // command of the in-place and raw editors; may be empty
+    std::string textEditor;      // command of the in-place and raw editors; may be empty
+    std::string richTextEditor;  // command of the dialog editor; may be empty
     std::vector<std::wstring> inPlaceEditors;  // values of MTEXTED that name an in-place editor
 };
 [[nodiscard]] EditorConfiguration& editorConfiguration();

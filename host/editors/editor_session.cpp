@@ -98,13 +98,11 @@ SessionEnd takeBlock(EditedText& text, EditorBlock const& block) {
 
 }  // namespace
 
-SessionEnd runEditorSession(EditedText& text, std::string const& program) {
+SessionEnd runEditorSession(EditedText& text, EditorProgram const& program) {
     if (std::optional<EditorBlock> const block = commandLine().takeEditorBlock())
         return takeBlock(text, *block);
-    if (!program.empty()) return ProgramSession(text, program).run();
-    commandLine().say(
-        localText(L"There is no editor: --text-editor, the settings, $VISUAL or $EDITOR name one; "
-                  L"-MTEXT takes the text at the command line."));
+    if (!program.command.empty()) return ProgramSession(text, program.command).run();
+    commandLine().say(program.lack);
     return SessionEnd::left;
 }
 

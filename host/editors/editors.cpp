@@ -1,8 +1,12 @@
 #include "tz/ed/editors.h"
 
+#include <utility>
+
 #include "host/base/fault_point.h"
 #include "host/command_line/command_line.h"
+#include "host/editors/dialog_questions.h"
 #include "host/editors/edited_markup.h"
+#include "host/editors/edited_rtf.h"
 #include "host/editors/editor_events.h"
 #include "host/editors/editor_programs.h"
 #include "host/editors/editor_session.h"
@@ -13,6 +17,7 @@
 #include "tz/ap/host_dialog.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/dialog_params.h"
+#include "tz/mte/editor_state.h"
 
 namespace tzhost {
 namespace {
@@ -28,7 +33,10 @@ int editMarkup(TzDbMText& text,
     EditedMarkup markup(text);
     bool accepted = false;
     if (markup.canBeRead()) {
-        accepted = runEditorSession(markup, program) == SessionEnd::accepted;
+        wchar_t const* const lack =
+            localText(L"There is no editor: --text-editor, the settings, $VISUAL or $EDITOR name "
+                      L"one; -MTEXT takes the text at the command line.");
+        accepted = runEditorSession(markup, {program, lack}) == SessionEnd::accepted;
     } else {
         commandLine().say(
             localText(L"The text has a field that cannot be opened; it stays as it was."));
@@ -47,13 +55,41 @@ void runRawEditor(TzApHostDialogParams& params) {
     params.setReturnCode(accepted ? 1 : 2);
 }
 
+// Edits the text of the dialog's session as rich text; whether it was accepted.
+bool editRichText(CMTextEditorInterface& state) {
+    EditedRtf rtf(state);
+    if (!rtf.failure().empty()) {
+        commandLine().say(rtf.failure());
+        return false;
+    }
+    DialogChanges changes;
+    bool const isAsked = state.GetActiveTab() == CMTextEditorInterface::kPropertiesTab &&
+                         !commandLine().isScripted();
+    if (isAsked && !askDialogValues(state, changes)) return false;
+    rtf.setChanges(std::move(changes));
+    std::string const& command = editorConfiguration().richTextEditor;
+    wchar_t const* const lack =
+        localText(L"There is no editor for rich text: --rtf-editor or the settings name one.");
+    return runEditorSession(rtf, {command, lack}) == SessionEnd::accepted;
+}
+
+void runDialogEditor(TzApHostDialogParams& params) {
+    auto const& old = static_cast<TzApHostOldEditorParamsFrameless const&>(params);
+    CMTextEditorState* const state = old.mTextEditorState();
+    if (!state) return params.setReturnCode(3);
+    bool const accepted = editRichText(*state);
+    reportEditor("dialog", accepted, nullptr);
+    params.setReturnCode(accepted ? 1 : 2);
+}
+
 struct DialogRow {
     wchar_t const* parameterClass;
     void (*run)(TzApHostDialogParams&);
 };
 
 constexpr DialogRow kDialogs[] = {
-    {L"TzApHostRawEditorParamsFrameless", runRawEditor},
+    {L"TzApHostRawEditorParamsFrameless", runRawEditor   },
+    {L"TzApHostOldEditorParamsFrameless", runDialogEditor},
 };
 
 }  // namespace

@@ -24,7 +24,8 @@ class RtfDocument {
 public:
     // Of about so many bytes. Text that names no size has the usual one, in half-points; 0 is that
     // of the text style.
-    RtfDocument(std::size_t bytes, int usualSize) : writer_(bytes), usualSize_(usualSize) {}
+    RtfDocument(std::size_t bytes, int usualSize, RtfReplacements const& replacements)
+        : writer_(bytes), replacements_(replacements), usualSize_(usualSize) {}
 
     void take(RtfToken const& token);
     [[nodiscard]] NormalisedRtf finish();
@@ -97,6 +98,7 @@ private:
     [[nodiscard]] int knownPage(int page) const;
     [[nodiscard]] RtfStyleValues const& styleOf(RtfStyleKind kind);
     [[nodiscard]] int valueOf(RtfField field);
+    [[nodiscard]] int addFont(DialectFont const& font);
     [[nodiscard]] KeptFont keptFont(int number);
     [[nodiscard]] DialectLook lookInForce();
     [[nodiscard]] Run const& run();
@@ -145,6 +147,7 @@ private:
     RtfByteText bytes_;
     NormalisedRtf result_;
 
+    RtfReplacements const& replacements_;
     int usualSize_;
     int codePage_ = 0;  // of the document; 0: the system's
     int defaultFont_ = kRtfUnset;

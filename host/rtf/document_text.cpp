@@ -53,12 +53,17 @@ int RtfDocument::valueOf(RtfField field) {
     return value;
 }
 
+int RtfDocument::addFont(DialectFont const& font) {
+    DialectFont const written = replacements_.font(font);
+    return written.name.empty() ? -1 : writer_.addFont(written);
+}
+
 RtfDocument::KeptFont RtfDocument::keptFont(int number) {
     RtfFont const* const font = fonts_.find(number);
     KeptFont kept{number, true, -1, SymbolFace::none, knownPage(font ? font->codePage : 0)};
     if (!font) return kept;
     auto const [at, isNew] = writtenFonts_.try_emplace(number, 0);
-    if (isNew) at->second = writer_.addFont(font->face);
+    if (isNew) at->second = addFont(font->face);
     kept.written = at->second;
     if (kept.page == kSymbolPage) kept.symbols = symbolFaceOf(font->face.name);
     return kept;
@@ -70,7 +75,7 @@ DialectLook RtfDocument::lookInForce() {
     look.size = std::clamp(orZero(valueOf(RtfField::size)), 0, kMostSize);
     if (look.size == 0) look.size = usualSize_;
     if (auto const color = colors_.find(valueOf(RtfField::color)))
-        look.color = writer_.colorNumber(*color);
+        look.color = writer_.colorNumber(replacements_.color(*color));
     look.isBold = isOn(valueOf(RtfField::bold));
     look.isItalic = isOn(valueOf(RtfField::italic));
     look.isUnderlined = isOn(valueOf(RtfField::underline));

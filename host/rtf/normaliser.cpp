@@ -21,8 +21,8 @@ bool namesSizes(std::string_view bytes) {
 
 }  // namespace
 
-NormalisedRtf normaliseRtf(std::string_view bytes) {
-    RtfDocument document(bytes.size(), namesSizes(bytes) ? kUsualHalfPoints : 0);
+NormalisedRtf normaliseRtf(std::string_view bytes, RtfReplacements const& replacements) {
+    RtfDocument document(bytes.size(), namesSizes(bytes) ? kUsualHalfPoints : 0, replacements);
     RtfTokens tokens(bytes);
     for (RtfToken token = tokens.next(); token.kind != RtfToken::Kind::end; token = tokens.next())
         document.take(token);

@@ -12,6 +12,8 @@
 #include <string>
 #include <string_view>
 
+#include "host/rtf/dialect_writer.h"
+
 namespace tzhost {
 
 struct NormalisedRtf {
@@ -24,8 +26,22 @@ struct NormalisedRtf {
     [[nodiscard]] bool isComplete() const { return pictures + notes + headers == 0; }
 };
 
+// What stands in the place of the faces and colours of a document; here each stands for itself.
+class RtfReplacements {
+public:
+    RtfReplacements() = default;
+    RtfReplacements(RtfReplacements const&) = delete;
+    RtfReplacements& operator=(RtfReplacements const&) = delete;
+    virtual ~RtfReplacements() = default;
+    // A face without a name is that of the text style.
+    [[nodiscard]] virtual DialectFont font(DialectFont const& font) const { return font; }
+    // 0x00BBGGRR.
+    [[nodiscard]] virtual unsigned int color(unsigned int rgb) const { return rgb; }
+};
+
 // A byte above 0x7F is read in the code page of its run, which is the system's where the document
 // names none.
-[[nodiscard]] NormalisedRtf normaliseRtf(std::string_view bytes);
+[[nodiscard]] NormalisedRtf normaliseRtf(std::string_view bytes,
+                                         RtfReplacements const& replacements = {});
 
 }  // namespace tzhost
