@@ -7,6 +7,7 @@
 #include "module/commands/locked_warning_filter.h"
 #include "module/commands/mtext_selection.h"
 #include "module/holders/scope_guard.h"
+#include "module/host_calls/selection_sets.h"
 #include "module/prompt/keyword_input.h"
 #include "module/styles/style_rules.h"
 #include "module/texts/attachment_ids.h"
