@@ -2,14 +2,12 @@
 
 #include <memory>
 
+#include "module/align/align_command.h"
 #include "module/commands/mtext_height.h"
 #include "module/commands/mtext_properties.h"
 #include "module/commands/mtext_selection.h"
 #include "module/holders/scope_guard.h"
 #include "module/host_calls/sys_var.h"
-#include "module/texts/string_table.h"
-#include "module/texts/text_ids.h"
-#include "tz/ed/print.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/selection.h"
 #include "tz/mte/edit_mtext.h"
@@ -74,7 +72,8 @@ void CompatibleEditMtextCallback() {
 }
 
 void AlignTextCallback() {
-    tzutPrintf(gStringTable[kText.notAvailable], gsAlignText_GlobalName.kwszPtr());
+    TzMTextAlignCmd command;
+    command.run();
 }
 
 void MtextPropertiesCallback() {

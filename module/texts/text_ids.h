@@ -65,7 +65,6 @@ struct TextIds {
     unsigned int needsEntity = 163;
     unsigned int tooNew = 229;
     unsigned int noMultilineText = 1023;
-    unsigned int notAvailable = 1024;
     unsigned int inPlaceEditor = 32777;
     unsigned int onLockedLayer = 2083;
     unsigned int outsideWorkingSet = 2086;

@@ -100,9 +100,9 @@ TzGeMatrix3d const kSystems[] = {
 class Moved {
 public:
     Moved(TzMTextAlignOption& option,
-        TzGeMatrix3d const& system,
-        tagTextDirection justification,
-        Line const& line)
+          TzGeMatrix3d const& system,
+          tagTextDirection justification,
+          Line const& line)
         : texts_(unequalTexts(system, justification)), along_(line.x, line.y, 0) {
         TzGeLineSeg3d const baseline(system * kFirst, system * (kFirst + along_));
         auto const entities = entitiesOf(texts_);
@@ -231,7 +231,7 @@ TEST(Spacing, NeedsOneDegree) {
     for (ThresholdRow const& row : kThresholds) {
         double const angle = row.degrees * std::numbers::pi / 180;
         Moved const run(option, kSystems[0], tagTextDirection::TL,
-                      {"", std::sin(angle), std::cos(angle)});
+                        {"", std::sin(angle), std::cos(angle)});
         EXPECT_EQ(option.hasError(), row.error) << row.degrees;
     }
 }
