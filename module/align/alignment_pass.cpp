@@ -68,6 +68,10 @@ void TzMTextAlignManipulatorGut::align(TzMTextAlignOption::Entities const& entit
     TzMTextAlignOption::Offsets const offsets =
         m_option->createOffsetFor(entities, m_sortedIndices, m_baseline, m_coordSystem);
     if (offsets.size() != m_sortedIndices.size()) return;
+    // Moved in the order of the list, as they lie in memory: with many texts that is what counts.
+    TzMTextAlignOption::Offsets ofEach(entities.size());
     for (std::size_t i = 0; i < offsets.size(); ++i)
-        entities[m_sortedIndices[i]]->move(offsets[i]);
+        ofEach[m_sortedIndices[i]] = offsets[i];
+    for (std::size_t i = 0; i < entities.size(); ++i)
+        entities[i]->move(ofEach[i]);
 }

@@ -2,8 +2,9 @@
 
 #include <algorithm>
 
+// The point is asked first: it tells most planes apart, and for less.
 bool isTheSamePlane(TzGePlane const& a, TzGePlane const& b) {
-    return a.isParallelTo(b) && a.isOn(b.pointOnPlane());
+    return a.isOn(b.pointOnPlane()) && a.isParallelTo(b);
 }
 
 bool isCoordSystemParalle(TzGeMatrix3d const& a, TzGeMatrix3d const& b) {
