@@ -214,7 +214,10 @@ void SweepSource::finishTry() {
     SweepTry done;
     done.command = TzString(command_.text).toUtf8();
     done.what = plan.what;
-    done.auditIsClean = tzhost::worstAudit().clean();
+    tzhost::Audit left = tzhost::worstAudit();
+    done.auditIsClean = left.clean();
+    left.highlighted = 0;
+    done.onlyHighlightingIsLeft = !done.auditIsClean && left.clean();
     std::string const after = savedDrawing();
     done.drawingIsUntouched = after == before_;
     done.drawingIsValid = !after.empty() && tzhost::readDrawing(scratchFile()).drawing != nullptr;

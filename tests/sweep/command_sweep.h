@@ -19,8 +19,9 @@ struct SweepTry {
     std::string command;
     std::string what;  // "cancel from question 3", "tzedSSGet:2"
     bool auditIsClean = true;
-    bool drawingIsValid = true;      // it can be saved and read again
-    bool drawingIsUntouched = true;  // but for the last point
+    bool onlyHighlightingIsLeft = false;  // when it is not clean
+    bool drawingIsValid = true;           // it can be saved and read again
+    bool drawingIsUntouched = true;       // but for the last point
 };
 
 struct SweepCounts {
