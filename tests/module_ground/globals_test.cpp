@@ -7,6 +7,7 @@
 #include "host/platform/output.h"
 #include "module/edit/mtext_versioner.h"
 #include "module/texts/attachment_ids.h"
+#include "module/uncalled/align_direction.h"
 #include "module/uncalled/flow_direction.h"
 #include "tz/mte/globals.h"
 
@@ -40,6 +41,9 @@ TEST(AttachmentKeywords, NameEachPointAndNothingElse) {
             << point;
     EXPECT_EQ(MapDirection(1058), TzDbMText::kTtoB);
     EXPECT_EQ(MapDirection(1057), TzDbMText::kLtoR);
+    TzGeBoundBlock3d const box({1, 2, 3}, {4, 5, 6});
+    EXPECT_TRUE(TzMTextAlignDirection::referencePoint(box).isEqualTo({0, 0, 0}));
+    EXPECT_EQ(TzMTextAlignDirection::distanceBetweenReferencePoints(), 0.0);
 }
 
 struct BoxNotes : tzhost::NotificationSink {
