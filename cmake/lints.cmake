@@ -1,6 +1,13 @@
 # Lints are tests like any other; the scripts need nothing but Python's standard library.
 set(lint ${PROJECT_SOURCE_DIR}/scripts/lint)
 add_lint(layers Python3::Interpreter ${lint}/layers.py)
+# The build draws the picture of the folders that docs/overview.md shows.
+add_custom_command(OUTPUT ${CMAKE_BINARY_DIR}/layers.svg
+    COMMAND Python3::Interpreter ${lint}/picture.py ${CMAKE_BINARY_DIR}/layers.svg
+    DEPENDS ${PROJECT_SOURCE_DIR}/cmake/layers.cmake ${lint}/picture.py VERBATIM)
+add_custom_target(tz_picture ALL DEPENDS ${CMAKE_BINARY_DIR}/layers.svg)
+add_lint(picture Python3::Interpreter ${lint}/picture.py ${CMAKE_BINARY_DIR}/layers.svg
+    ${PROJECT_SOURCE_DIR}/docs/pictures/layers.svg)
 add_lint(sources Python3::Interpreter ${lint}/sources.py)
 add_lint(words Python3::Interpreter ${lint}/words.py)
 add_lint(format Python3::Interpreter ${lint}/format.py)
