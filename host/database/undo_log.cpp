@@ -76,6 +76,7 @@ void UndoLog::end() {
     if (!baseSettings_->isSameAs(drawing_.settings())) open_.settings = std::move(baseSettings_);
     Step step = std::exchange(open_, {});
     if (!step.isKept()) return;
+    step.serial = serial_;
     step.entries.shrink_to_fit();
     step.variables.shrink_to_fit();
     steps_.push_back(std::move(step));

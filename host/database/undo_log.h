@@ -34,6 +34,9 @@ public:
     [[nodiscard]] bool isEmpty() const { return steps_.empty(); }
     // Finished steps that can be taken back.
     [[nodiscard]] std::size_t steps() const { return steps_.size(); }
+    // The drawing is in a file as the finished steps left it, and whether that is so now.
+    void noteSaved() { saved_ = state(); }
+    [[nodiscard]] bool isSaved() const { return saved_ == state(); }
 
     // The object is about to change; it also covers erasing.
     void noteChange(TzDbObjectRecord& record);
@@ -56,10 +59,13 @@ private:
         std::vector<Entry> entries;
         std::vector<VariableChange> variables;
         std::unique_ptr<DrawingSettings> settings;  // null when they did not change
+        std::uint32_t serial = 0;
 
         [[nodiscard]] bool isKept() const;
     };
 
+    // The step that led to what the drawing holds, 0 for none.
+    [[nodiscard]] std::uint32_t state() const { return steps_.empty() ? 0 : steps_.back().serial; }
     void rememberBase();
     void collectVariables();
     void dropUnchanged();
@@ -71,6 +77,7 @@ private:
     Step open_;
     int depth_ = 0;
     std::uint32_t serial_ = 0;  // of the step that is open; records carry it
+    std::uint32_t saved_ = 0;   // the state that a file holds
     Variables::Snapshot baseVariables_;
     std::unique_ptr<DrawingSettings> baseSettings_;
 };
