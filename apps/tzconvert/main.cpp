@@ -7,6 +7,7 @@
 
 #include "apps/tzconvert/batch.h"
 #include "apps/tzconvert/options.h"
+#include "host/files/standard_streams.h"
 #include "tz/mte/font_map_catalogue.h"
 
 namespace {
@@ -45,6 +46,7 @@ void operator delete(void* block, std::size_t) noexcept {
 }
 
 int main(int count, char** arguments) {
+    tzhost::openStandardStreams();
     tzconvert::ParsedOptions const parsed = tzconvert::parseOptions(count, arguments);
     int const status = parsed.exit ? *parsed.exit : tzconvert::run(parsed.options);
     // The font tables are the process's and free their entries only when they are told to.

@@ -53,14 +53,15 @@ Completion complete(std::wstring_view start, std::vector<std::wstring> words, Ca
 }  // namespace
 
 Completion completeWord(std::wstring_view typed, std::vector<std::wstring> const& words) {
-    std::size_t const blank = typed.find_last_of(L" \t");
-    std::wstring_view const start =
-        blank == std::wstring_view::npos ? typed : typed.substr(blank + 1);
-    bool const isGlobal = start.starts_with(L'_');
+    return completeName(typed.substr(typed.find_last_of(L" \t") + 1), words);
+}
+
+Completion completeName(std::wstring_view typed, std::vector<std::wstring> const& names) {
+    bool const isGlobal = typed.starts_with(L'_');
     std::vector<std::wstring> offered;
-    std::copy_if(words.begin(), words.end(), std::back_inserter(offered),
-                 [&](std::wstring const& word) { return word.starts_with(L'_') == isGlobal; });
-    return complete(start, std::move(offered), Case::ignored);
+    std::copy_if(names.begin(), names.end(), std::back_inserter(offered),
+                 [&](std::wstring const& name) { return name.starts_with(L'_') == isGlobal; });
+    return complete(typed, std::move(offered), Case::ignored);
 }
 
 Completion completeFile(std::wstring_view typed) {

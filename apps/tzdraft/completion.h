@@ -12,10 +12,14 @@ struct Completion {
     std::vector<std::wstring> choices;  // what it could become, when that is not decided yet
 };
 
-// Of the word in front of the cursor, by words that compare without regard to case, and in lower
-// case behind a small letter. Words of every language begin with "_" and are offered behind one.
+// Of the word before the cursor, by words that compare without regard to case, and in lower case
+// after a small letter. Words of every language begin with "_" and are offered after one.
 [[nodiscard]] Completion completeWord(std::wstring_view typed,
                                       std::vector<std::wstring> const& words);
+
+// The same of the whole text, by names, which may hold blanks.
+[[nodiscard]] Completion completeName(std::wstring_view typed,
+                                      std::vector<std::wstring> const& names);
 
 // Of the whole text as the name of a file, relative to the working folder; a folder gets a slash.
 // Names that begin with a dot are offered when the dot is typed.

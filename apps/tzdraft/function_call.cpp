@@ -28,21 +28,27 @@ std::wstring_view trimmed(std::wstring_view text) {
     return text.substr(first, text.find_last_not_of(kBlanks) - first + 1);
 }
 
-// The one argument as the function gets it; null when it is neither an entity nor a text.
-Arguments readArgument(std::wstring_view text) {
-    if (text.size() >= 2 && text.front() == L'"' && text.back() == L'"') {
-        Arguments argument(tzutNewRb(Tzad::eResultString));
-        argument->resval.rstring =
-            tzutNewString(std::wstring(text.substr(1, text.size() - 2)).c_str());
-        return argument;
-    }
-    if (text.empty() || text.front() != L'#') return nullptr;
-    auto const handle = tzhost::readHandle(tzhost::toUtf8(text.substr(1)));
-    if (!handle) return nullptr;
-    Arguments argument(tzutNewRb(Tzad::eResultEntityName));
+Arguments textArgument(std::wstring_view text) {
+    Arguments argument(tzutNewRb(Tzad::eResultString));
+    if (argument) argument->resval.rstring = tzutNewString(std::wstring(text).c_str());
+    return argument;
+}
+
+Arguments entityArgument(std::wstring_view digits) {
+    auto const handle = tzhost::readHandle(tzhost::toUtf8(digits));
+    Arguments argument(handle ? tzutNewRb(Tzad::eResultEntityName) : nullptr);
+    if (!argument) return nullptr;
     TzDbObjectId const id = Session::current().drawing().objectAt(*handle);
     if (tzdbGetTzsName(argument->resval.rlname, id) != Tzad::eOk) return nullptr;
     return argument;
+}
+
+// The one argument as the function gets it; null when it is neither an entity nor a text, and when
+// the host gives no record for it.
+Arguments readArgument(std::wstring_view text) {
+    bool const isText = text.size() >= 2 && text.front() == L'"' && text.back() == L'"';
+    if (isText) return textArgument(text.substr(1, text.size() - 2));
+    return text.starts_with(L'#') ? entityArgument(text.substr(1)) : nullptr;
 }
 
 void complain(std::wstring_view call, wchar_t const* what) {

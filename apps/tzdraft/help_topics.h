@@ -12,9 +12,9 @@
 // their texts themselves.
 namespace tzdraft {
 
-// The text of what was registered under that name, lines apart by line feeds. What was not
-// registered is looked for under the name itself; a registered topic that no file tells about is
-// its own text; else the text is empty.
+// The text about a command or a function, with line feeds between its lines. One that registered no
+// topic is looked for under its own name; a registered topic that no file tells about is its own
+// text; else the text is empty.
 [[nodiscard]] std::wstring helpFor(TzString const& name);
 
 }  // namespace tzdraft

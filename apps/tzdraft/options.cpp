@@ -1,7 +1,12 @@
 #include "apps/tzdraft/options.h"
 
 #include <CLI/CLI.hpp>
+#include <cerrno>
 #include <cstdio>
+#include <cstring>
+#include <sstream>
+
+#include "host/text/visible_text.h"
 
 namespace tzdraft {
 namespace {
@@ -11,8 +16,14 @@ constexpr char kPurpose[] =
 constexpr char kScripts[] =
     "A script is UTF-8 text with one answer a line: an empty line is Enter, ^C cancels, ;; begins a\n"
     "comment, ~x,y moves the cursor in a drag, <<< and >>> enclose what an editor leaves.\n"
-    "Exit status: 0 done; 1 input ended inside a command; 2 wrong usage or an unusable file; 3 a command\n"
-    "left something open.";
+    "Exit status: 0 done; 1 input ended inside a command, an editor block was not taken, a SAVE, PLOT,\n"
+    "OPEN or LOAD of a script failed, or the session had to end early; 2 wrong usage, an unusable file,\n"
+    "or a result that cannot be written; 3 a command left something open.";
+
+// Some files are left out by an empty name; nobody means that by writing the option.
+std::string problemWithName(std::string const& name) {
+    return name.empty() ? "the file name is empty" : "";
+}
 
 void declareText(CLI::App& app,
                  char const* name,
@@ -23,15 +34,17 @@ void declareText(CLI::App& app,
 }
 
 void declareFile(CLI::App& app, char const* name, std::filesystem::path& file, char const* help) {
-    app.add_option(name, file, help)->type_name("FILE");
+    app.add_option(name, file, help)->type_name("FILE")->check(problemWithName, "");
 }
 
 void declare(CLI::App& app, Options& options) {
     app.add_option("DRAWING", options.drawing, "the drawing to open; a new one when left out")
-        ->type_name("");
+        ->type_name("")
+        ->check(problemWithName, "");
     app.add_option("--script", options.script,
                    "answers from FILE ('-' is standard input); without it, an interactive session")
-        ->type_name("FILE");
+        ->type_name("FILE")
+        ->check(problemWithName, "");
     declareFile(app, "--save", options.save, "write the drawing at the end");
     declareFile(app, "--svg", options.svg,
                 "plot the active space at the end, fitted to its extents");
@@ -61,6 +74,15 @@ void declare(CLI::App& app, Options& options) {
         ->allow_extra_args(false);  // one each time, so that it can be repeated
 }
 
+// The exit status.
+int printAnswer(std::string const& text) {
+    bool const isWritten =
+        std::fwrite(text.data(), 1, text.size(), stdout) == text.size() && std::fflush(stdout) == 0;
+    if (isWritten) return kDone;
+    std::fprintf(stderr, "tzdraft: standard output: %s\n", std::strerror(errno));
+    return kUnusable;
+}
+
 }  // namespace
 
 ParsedOptions parseOptions(int count, char const* const* arguments) {
@@ -72,10 +94,12 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     try {
         app.parse(count, arguments);
     } catch (CLI::Success const& asked) {  // --help, --version
-        app.exit(asked);
-        parsed.exit = kDone;
+        std::ostringstream text;
+        app.exit(asked, text);
+        parsed.exit = printAnswer(text.str());
     } catch (CLI::ParseError const& wrong) {
-        std::fprintf(stderr, "tzdraft: %s; try --help\n", wrong.what());
+        std::string const problem = tzhost::visible(wrong.what(), tzhost::LineFeeds::shown);
+        std::fprintf(stderr, "tzdraft: %s; try --help\n", problem.c_str());
         parsed.exit = kUnusable;
     }
     return parsed;

@@ -10,9 +10,9 @@ namespace tzdraft {
 
 // Exit statuses.
 inline constexpr int kDone = 0;
-inline constexpr int kInputEnded = 1;  // within a command, or an editor block that nobody took
-inline constexpr int kUnusable = 2;    // wrong usage, an unusable file, or no module
-inline constexpr int kLeftOver = 3;    // a command left something open
+inline constexpr int kFailed = 1;    // the session ended early, or a script asked for what failed
+inline constexpr int kUnusable = 2;  // wrong usage, an unusable file, or no module
+inline constexpr int kLeftOver = 3;  // a command left something open
 
 struct Options {
     std::filesystem::path drawing;  // empty: a new one

@@ -1,12 +1,16 @@
 #include "apps/tzdraft/program.h"
 
 #include <exception>
+#include <new>
 #include <optional>
 #include <string>
 #include <vector>
 
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/host_commands.h"
+#include "apps/tzdraft/commands/unsaved.h"
+#include "apps/tzdraft/end_signals.h"
 #include "apps/tzdraft/event_file.h"
 #include "apps/tzdraft/function_call.h"
 #include "apps/tzdraft/local_text.h"
@@ -25,6 +29,7 @@
 #include "host/settings/settings.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
+#include "host/text/visible_text.h"
 
 namespace tzdraft {
 namespace {
@@ -48,8 +53,11 @@ private:
     bool planFaults();
     void tellIdleFaults() const;
     bool loadModule();
+    [[nodiscard]] bool mustEnd() const;
+    void tellEarlyEnd() const;
     void readCommands();
-    [[nodiscard]] std::vector<std::wstring> commandNames() const;
+    [[nodiscard]] std::optional<std::wstring> nextLine() const;
+    [[nodiscard]] static bool endsHere();
     void runCall(std::wstring const& line);
     void runTyped(std::wstring const& line);
     void runGuarded(std::wstring const& line);
@@ -58,7 +66,8 @@ private:
     int finish();
     void writeResults();
     void saveSettings();
-    void note(std::filesystem::path const& result, std::string const& problem);
+    template <class Write>
+    void writeResult(std::filesystem::path const& file, Write write);
     bool complain(std::string const& error) const;
 
     Options const& options_;
@@ -69,11 +78,11 @@ private:
     tzhost::FaultPlan faults_;
     SettingsState settings_ = SettingsState::unusable;
     std::vector<std::string> problems_;  // with results, one line each
-    std::string written_;                // results, apart by commas
+    std::string written_;                // results, with commas between them
 };
 
 bool Run::complain(std::string const& error) const {
-    screens_.errors("tzdraft: " + error + "\n");
+    screens_.errors("tzdraft: " + tzhost::visible(error, tzhost::LineFeeds::shown) + "\n");
     return false;
 }
 
@@ -88,9 +97,26 @@ bool Run::openSource() {
     return source_ ? true : complain(error);
 }
 
+// A person may name a drawing that is not there yet; to a script that is a mistake.
+bool isToBeMade(std::filesystem::path const& file) {
+    std::error_code problem;
+    auto const status = std::filesystem::status(file, problem);
+    bool const isMissing = status.type() == std::filesystem::file_type::not_found;
+    std::filesystem::path const folder = file.has_parent_path() ? file.parent_path() : ".";
+    return tzhost::commandLine().isPerson() && isMissing &&
+           std::filesystem::is_directory(folder, problem);
+}
+
 bool Run::openDrawing() {
     if (options_.drawing.empty()) {
         session_.makeNew();
+        return true;
+    }
+    if (isToBeMade(options_.drawing)) {
+        session_.makeNew(options_.drawing);
+        tzhost::commandLine().say(
+            TzString::formatted(localText(L"New drawing: %ls."), options_.drawing.wstring().c_str())
+                .str());
         return true;
     }
     std::string error;
@@ -124,8 +150,11 @@ bool Run::loadModule() {
 bool Run::begin() {
     tzhost::CommandLine& line = tzhost::commandLine();
     line.reset();
-    line.setScreen([this](std::wstring_view text) { screens_.output(tzhost::toUtf8(text)); });
-    line.setErrorScreen([this](std::wstring_view text) { screens_.errors(tzhost::toUtf8(text)); });
+    line.setScreen([this](tzhost::Shown kind, std::wstring_view text) {
+        auto const& screen = kind == tzhost::Shown::error ? screens_.errors : screens_.output;
+        screen(tzhost::toUtf8(text));
+    });
+    line.setEndCheck([this] { return mustEnd(); });
     line.attach();
     tzhost::audit() = tzhost::Audit();
     tzhost::resetWorstAudit();
@@ -138,27 +167,29 @@ bool Run::begin() {
     tzhost::addCommandHooks({[this](tzhost::Command const& command) { beginCommand(command); },
                              [this](tzhost::Command const& command) { endCommand(command); }});
     session_.setModule(modulePath(options_));
+    if (!options_.save.empty()) session_.saveAtEnd();
     if (!openDrawing()) return false;
     if (!options_.faults.empty()) faults_.install();
     return loadModule();
 }
 
-// Names of commands, for completion.
-std::vector<std::wstring> Run::commandNames() const {
-    std::vector<std::wstring> names;
-    if (tzhost::commandLine().isScripted()) return names;
-    for (tzhost::Command const& each : tzhost::commandStack().commands()) {
-        names.push_back(each.localName.str());
-        names.push_back(L'_' + each.globalName.str());
+bool Run::mustEnd() const {
+    return EndSignals::caught() != 0 || !screens_.outputProblem().empty();
+}
+
+void Run::tellEarlyEnd() const {
+    if (int const signal = EndSignals::caught()) {
+        complain(TzString::formatted(localText(L"signal %d ended the session"), signal).toUtf8());
+    } else if (std::string const problem = screens_.outputProblem(); !problem.empty()) {
+        complain(localText("the transcript cannot be written") + ": " + localText(problem.c_str()));
     }
-    return names;
 }
 
 // A call is taken back as a command is.
 void Run::runCall(std::wstring const& line) {
     session_.beginCommand();
     try {
-        callTyped(line);
+        tzhost::runFunction([&] { callTyped(line); });
     } catch (...) {
         session_.endCommand();
         throw;
@@ -177,8 +208,8 @@ void Run::runTyped(std::wstring const& line) {
         return tzhost::commandLine().say(
             TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str()).str());
     }
-    auto const answers = tzhost::commandLine().isScripted() ? tzhost::AnswersFrom::script
-                                                            : tzhost::AnswersFrom::user;
+    auto const answers =
+        tzhost::commandLine().isPerson() ? tzhost::AnswersFrom::user : tzhost::AnswersFrom::script;
     tzhost::runCommand(*command, answers);
 }
 
@@ -190,19 +221,36 @@ void Run::runGuarded(std::wstring const& line) {
         tzhost::commandLine().say(line + localText(L" ended early: ") +
                                   tzhost::fromUtf8(problem.what()));
     }
-    // The command's audit has counted them; a call has none, so the next command's does.
-    if (!isCall(line)) tzhost::freeAllSets();
+    tzhost::freeAllSets();  // the audit has counted them
 }
 
-// Enter alone repeats the line before it at a terminal; in a script it does nothing.
+// Whether the end of the input is that of the session. A person who ended it by Ctrl-D may stay.
+bool Run::endsHere() {
+    tzhost::CommandLine& line = tzhost::commandLine();
+    line.setVoice(tzhost::CommandLine::Voice::host);
+    bool const isOver = line.hasEnded() || mayLeave();
+    line.setVoice(tzhost::CommandLine::Voice::module);
+    if (!isOver) line.goOn();
+    return isOver;
+}
+
+// Nothing when the session ends.
+std::optional<std::wstring> Run::nextLine() const {
+    tzhost::CommandLine& line = tzhost::commandLine();
+    while (!session_.wantsToEnd()) {
+        auto text =
+            line.readCommand(line.isPerson() ? commandNames() : std::vector<std::wstring>());
+        if (text || endsHere()) return text;
+    }
+    return std::nullopt;
+}
+
+// Enter alone repeats the line before it where a person types; in a script it does nothing.
 void Run::readCommands() {
     std::wstring last;
-    while (!session_.wantsToEnd()) {
-        std::optional<std::wstring> const line = tzhost::commandLine().readCommand(commandNames());
-        if (!line) return;
+    while (auto const line = nextLine()) {
         if (!line->empty()) last = *line;
-        if (!line->empty() || (!last.empty() && !tzhost::commandLine().isScripted()))
-            runGuarded(last);
+        if (!line->empty() || (!last.empty() && tzhost::commandLine().isPerson())) runGuarded(last);
     }
 }
 
@@ -224,11 +272,20 @@ void Run::endCommand(tzhost::Command const& command) {
     tzhost::commandLine().setVoice(tzhost::CommandLine::Voice::module);
 }
 
-// A result that was written, or why it was not.
-void Run::note(std::filesystem::path const& result, std::string const& problem) {
-    if (!problem.empty()) return problems_.push_back(problem);
+// Notes that a result was written, or why it was not. `write` fails by an error, or by an exception
+// when memory runs short.
+template <class Write>
+void Run::writeResult(std::filesystem::path const& file, Write write) {
+    if (file.empty()) return;
+    std::string error;
+    try {
+        (void)write(error);  // the error says it
+    } catch (std::bad_alloc const&) {
+        error = file.string() + ": " + localText("there is not enough memory to write it");
+    }
+    if (!error.empty()) return problems_.push_back(error);
     if (!written_.empty()) written_ += ", ";
-    written_ += result.string();
+    written_ += file.string();
 }
 
 // One that cannot be written keeps none of the others back.
@@ -237,20 +294,16 @@ void Run::writeResults() {
         std::filesystem::path const& file;
         tzhost::PlotFormat format;
     };
-    if (!options_.save.empty()) {
-        std::string error;
-        (void)session_.save(options_.save, error);  // the error says it
-        note(options_.save, error);
-    }
+    writeResult(options_.save,
+                [&](std::string& error) { return session_.save(options_.save, error); });
     for (Plot const& plot : {
              Plot{options_.svg, tzhost::PlotFormat::svg},
              Plot{options_.png, tzhost::PlotFormat::png},
              Plot{options_.pdf, tzhost::PlotFormat::pdf}
     }) {
-        if (plot.file.empty()) continue;
-        std::string error;
-        (void)session_.plotAs(plot.format, plot.file, error);
-        note(plot.file, error);
+        writeResult(plot.file, [&](std::string& error) {
+            return session_.plotAs(plot.format, plot.file, error);
+        });
     }
 }
 
@@ -263,17 +316,14 @@ void Run::saveSettings() {
 
 int Run::finish() {
     tzhost::commandLine().freshLine();
+    tellEarlyEnd();
     faults_.remove();
     tellIdleFaults();
     writeResults();
     saveSettings();
     bool const leftOver = !tzhost::worstAudit().clean();
     tzhost::dynamicLinker().unloadAll();
-    if (!options_.events.empty()) {
-        std::string error;
-        (void)events_.finish(error);
-        note(options_.events, error);
-    }
+    writeResult(options_.events, [&](std::string& error) { return events_.finish(error); });
     if (!problems_.empty()) {
         if (!written_.empty()) problems_.back() += "; " + tzhost::localText("written: ") + written_;
         for (std::string const& problem : problems_)
@@ -281,11 +331,12 @@ int Run::finish() {
         return kUnusable;
     }
     if (leftOver) return kLeftOver;
-    return tzhost::commandLine().hasFailed() ? kInputEnded : kDone;
+    return tzhost::commandLine().hasFailed() ? kFailed : kDone;
 }
 
 int Run::toItsEnd() {
     if (!begin()) return kUnusable;
+    EndSignals const endInOrder;
     readCommands();
     return finish();
 }
@@ -301,7 +352,13 @@ Run::~Run() {
 }  // namespace
 
 int runProgram(Options const& options, Screens screens) {
-    return Run(options, std::move(screens)).toItsEnd();
+    auto const errors = screens.errors;
+    try {
+        return Run(options, std::move(screens)).toItsEnd();
+    } catch (std::bad_alloc const&) {
+        errors("tzdraft: " + localText("there is not enough memory") + "\n");
+    }
+    return kUnusable;
 }
 
 }  // namespace tzdraft

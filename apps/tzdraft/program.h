@@ -16,6 +16,9 @@ struct Screens {
     std::function<void(std::string_view)> errors;  // lines about what could not be done
     // Answers in place of the script; null for none.
     std::unique_ptr<tzhost::AnswerSource> source = nullptr;
+    // What keeps the transcript from being written, which ends the session; empty while nothing
+    // does.
+    std::function<std::string()> outputProblem = [] { return std::string(); };
 };
 
 [[nodiscard]] int runProgram(Options const& options, Screens screens);

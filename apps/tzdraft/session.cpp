@@ -31,8 +31,16 @@ constexpr std::array kPlotEndings{
 // Drawings that undo can bring back.
 constexpr std::size_t kMostReplaced = 8;
 
-void sayError(std::string const& error) {
-    tzhost::commandLine().say(tzhost::fromUtf8(error));
+std::wstring nameOf(tzhost::Drawing const& drawing) {
+    if (drawing.file().empty()) return localText(L"a drawing without a name");
+    return tzhost::fromUtf8(drawing.file().string());
+}
+
+// The same for each way to name a file, as far as the system tells.
+std::filesystem::path plainPath(std::filesystem::path const& file) {
+    std::error_code unknown;
+    std::filesystem::path plain = std::filesystem::weakly_canonical(file, unknown);
+    return unknown ? file : plain;
 }
 
 }  // namespace
@@ -85,6 +93,11 @@ void Session::makeNew() {
     replaceForUndo(tzhost::Drawing::create(), [] { tzhost::setKeptVariables({}); });
 }
 
+void Session::makeNew(std::filesystem::path const& file) {
+    makeNew();
+    drawing_->setFile(file);
+}
+
 bool Session::open(std::filesystem::path const& file, std::string& error) {
     tzhost::DrawingRead read = tzhost::readDrawing(file);
     if (!read.drawing) {
@@ -94,8 +107,28 @@ bool Session::open(std::filesystem::path const& file, std::string& error) {
     for (std::string const& warning : read.warnings) {
         tzhost::commandLine().say(tzhost::fromUtf8(warning));
     }
+    ownFiles_.insert(plainPath(file));
     replaceForUndo(std::move(read.drawing), [&] { tzhost::setKeptVariables(read.variables); });
     return true;
+}
+
+std::vector<std::wstring> Session::unsaved() const {
+    std::vector<std::wstring> names;
+    if (!drawing_->undoLog().isSaved()) names.push_back(nameOf(*drawing_));
+    for (Replaced const& each : replaced_) {
+        if (!each.drawing->undoLog().isSaved()) names.push_back(nameOf(*each.drawing));
+    }
+    return names;
+}
+
+std::wstring Session::unsavedToDrop() const {
+    if (replaced_.size() < kMostReplaced) return {};
+    tzhost::Drawing& oldest = *replaced_.front().drawing;
+    return oldest.undoLog().isSaved() ? std::wstring() : nameOf(oldest);
+}
+
+bool Session::isOwn(std::filesystem::path const& file) const {
+    return ownFiles_.count(plainPath(file)) > 0;
 }
 
 bool Session::undo() {
@@ -110,8 +143,11 @@ bool Session::undo() {
 
 bool Session::save(std::filesystem::path const& file, std::string& error) {
     error = tzhost::writeDrawing(*drawing_, file);
-    if (error.empty()) drawing_->setFile(file);
-    return error.empty();
+    if (!error.empty()) return false;
+    drawing_->setFile(file);
+    drawing_->undoLog().noteSaved();
+    ownFiles_.insert(plainPath(file));
+    return true;
 }
 
 bool Session::plot(std::filesystem::path const& file, std::string& error) const {
@@ -143,7 +179,8 @@ void Session::loadLater(std::filesystem::path file) {
                                   : module_.parent_path() / file;
     postponed_.emplace_back([file = std::move(file)] {
         std::string error;
-        if (!tzhost::dynamicLinker().load(file, error)) sayError(error);
+        if (!tzhost::dynamicLinker().load(file, error))
+            tzhost::commandLine().sayFailure(tzhost::fromUtf8(error));
     });
 }
 
@@ -152,7 +189,7 @@ void Session::unloadLater() {
         auto const& modules = tzhost::dynamicLinker().modules();
         std::string error = localText("No module is loaded.");
         if (modules.empty() || !tzhost::dynamicLinker().unload(modules.back()->file, error))
-            sayError(error);
+            tzhost::commandLine().say(tzhost::fromUtf8(error));
     });
 }
 

@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <functional>
 #include <memory>
+#include <set>
 #include <string>
 #include <vector>
 
@@ -27,6 +28,8 @@ public:
 
     // An empty drawing in place of the one that is open.
     void makeNew();
+    // The same for a file that is not there yet, which SAVE then proposes.
+    void makeNew(std::filesystem::path const& file);
     // Another drawing in place of it; on failure the drawing stays.
     [[nodiscard]] bool open(std::filesystem::path const& file, std::string& error);
     // The open drawing to a file, whole or not at all.
@@ -38,6 +41,18 @@ public:
     plotAs(tzhost::PlotFormat format, std::filesystem::path const& file, std::string& error) const;
     // The open drawing; there is always one once makeNew or open was called.
     [[nodiscard]] tzhost::Drawing& drawing() const { return *drawing_; }
+
+    // The drawing is written at the end of the session anyway.
+    void saveAtEnd() { savesAtEnd_ = true; }
+    [[nodiscard]] bool savesAtEnd() const { return savesAtEnd_; }
+    // The names of the drawings with changes that no file holds: the open one, and those that undo
+    // can bring back.
+    [[nodiscard]] std::vector<std::wstring> unsaved() const;
+    // The name of the drawing with such changes that the next new one would push out of undo's
+    // reach; empty for none.
+    [[nodiscard]] std::wstring unsavedToDrop() const;
+    // Whether this session opened or wrote that file.
+    [[nodiscard]] bool isOwn(std::filesystem::path const& file) const;
 
     // A command wants the session to end.
     void quit() { wantsToEnd_ = true; }
@@ -59,7 +74,7 @@ public:
     // Begin and end of a command, or of a call of a function.
     void beginCommand();
     void endCommand();
-    // Does what was asked for the time behind the command.
+    // Does what was asked for the time after the command.
     void doPostponed();
 
 private:
@@ -80,9 +95,11 @@ private:
     // Drawings that a command has done away with live until that command has ended.
     std::vector<std::unique_ptr<tzhost::Drawing>> retired_;
     std::vector<std::function<void()>> postponed_;
+    std::set<std::filesystem::path> ownFiles_;
     std::filesystem::path module_;
     bool isInCommand_ = false;
     bool wantsToEnd_ = false;
+    bool savesAtEnd_ = false;
 };
 
 }  // namespace tzdraft

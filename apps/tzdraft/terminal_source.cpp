@@ -6,10 +6,12 @@
 #include <filesystem>
 #include <histedit.h>
 #include <unistd.h>
+#include <utility>
 
 #include "apps/tzdraft/completion.h"
 #include "host/files/install_paths.h"
 #include "host/text/utf8.h"
+#include "host/text/visible_text.h"
 
 namespace tzdraft {
 namespace {
@@ -41,6 +43,7 @@ public:
     ~Editor();
 
     tzhost::Answer read(tzhost::AnswerRequest const& request);
+    [[nodiscard]] bool hasEnded() const { return hasEnded_; }
 
 private:
     static Editor& of(EditLine* line);
@@ -48,7 +51,10 @@ private:
     static unsigned char cancel(EditLine* line, wint_t key);
     static unsigned char suspend(EditLine* line, wint_t key);
     static unsigned char complete(EditLine* line, wint_t key);
+    static unsigned char deleteOrLeave(EditLine* line, wint_t key);
     void bindKeys();
+    [[nodiscard]] Completion completionOf(std::wstring_view typed) const;
+    tzhost::Answer noLine();
     void remember(std::wstring const& text);
     void show(std::vector<std::wstring> const& choices) const;
 
@@ -58,7 +64,8 @@ private:
     tzhost::AnswerRequest const* request_ = nullptr;  // while one is read
     std::wstring prompt_;
     bool isCancelled_ = false;
-    bool hasEnded_ = false;
+    bool isLeft_ = false;    // by Ctrl-D; up to the idle prompt each answer is an end
+    bool hasEnded_ = false;  // the terminal is gone
 };
 
 TerminalSource::Editor::Editor() {
@@ -86,8 +93,10 @@ void TerminalSource::Editor::bindKeys() {
     el_wset(line_, EL_ADDFN, L"tz-cancel", L"cancel the question", &Editor::cancel);
     el_wset(line_, EL_ADDFN, L"tz-complete", L"complete the word", &Editor::complete);
     el_wset(line_, EL_ADDFN, L"tz-suspend", L"suspend the program", &Editor::suspend);
+    el_wset(line_, EL_ADDFN, L"tz-leave", L"delete a character, or leave", &Editor::deleteOrLeave);
     el_wset(line_, EL_BIND, L"^C", L"tz-cancel", nullptr);
     el_wset(line_, EL_BIND, L"^Z", L"tz-suspend", nullptr);
+    el_wset(line_, EL_BIND, L"^D", L"tz-leave", nullptr);
     el_wset(line_, EL_BIND, L"\t", L"tz-complete", nullptr);
     el_wset(line_, EL_BIND, L"^R", L"em-inc-search-prev", nullptr);
 }
@@ -122,14 +131,34 @@ unsigned char TerminalSource::Editor::suspend(EditLine* /*line*/, wint_t /*key*/
     return CC_REDISPLAY;
 }
 
+unsigned char TerminalSource::Editor::deleteOrLeave(EditLine* line, wint_t /*key*/) {
+    LineInfoW const* const info = el_wline(line);
+    if (info->buffer == info->lastchar) {
+        of(line).isLeft_ = true;
+        return CC_EOF;
+    }
+    if (info->cursor == info->lastchar) return CC_REFRESH_BEEP;
+    el_cursor(line, 1);
+    el_wdeletestr(line, 1);  // the character before the cursor
+    return CC_REFRESH;
+}
+
+Completion TerminalSource::Editor::completionOf(std::wstring_view typed) const {
+    tzhost::Offer const& offer = request_->offer;
+    switch (offer.kind) {
+    case tzhost::Offer::Kind::files: return completeFile(typed);
+    case tzhost::Offer::Kind::names: return completeName(typed, offer.choices);
+    case tzhost::Offer::Kind::words: return completeWord(typed, offer.choices);
+    case tzhost::Offer::Kind::nothing: break;
+    }
+    return {L"\t", {}};
+}
+
 unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {
     Editor const& editor = of(line);
     LineInfoW const* const info = el_wline(line);
-    std::wstring_view const typed(info->buffer,
-                                  static_cast<std::size_t>(info->cursor - info->buffer));
-    bool const isText = editor.request_->kind == tzhost::QuestionKind::string;
     Completion const completion =
-        isText ? completeFile(typed) : completeWord(typed, editor.request_->words);
+        editor.completionOf({info->buffer, static_cast<std::size_t>(info->cursor - info->buffer)});
     if (!completion.insert.empty()) {
         el_winsertstr(line, completion.insert.c_str());
         return CC_REFRESH;
@@ -143,7 +172,7 @@ unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {
 void TerminalSource::Editor::show(std::vector<std::wstring> const& choices) const {
     std::string text = "\n";
     for (std::wstring const& each : choices)
-        text += tzhost::toUtf8(each) + "  ";
+        text += tzhost::toUtf8(tzhost::visible(each, tzhost::LineFeeds::shown)) + "  ";
     text += "\n";
     std::fwrite(text.data(), 1, text.size(), stdout);
     std::fflush(stdout);
@@ -155,19 +184,26 @@ void TerminalSource::Editor::remember(std::wstring const& text) {
     history_w(history_, &event, H_ENTER, text.c_str());
 }
 
+tzhost::Answer TerminalSource::Editor::noLine() {
+    std::fputs(isCancelled_ ? "^C\n" : "\n", stdout);
+    std::fflush(stdout);
+    hasEnded_ = !isCancelled_ && !isLeft_;
+    return {isCancelled_ ? tzhost::Answer::Kind::cancel : tzhost::Answer::Kind::end, {}};
+}
+
 tzhost::Answer TerminalSource::Editor::read(tzhost::AnswerRequest const& request) {
     using Kind = tzhost::Answer::Kind;
-    if (hasEnded_) return {};
+    bool const isIdle = request.kind == tzhost::QuestionKind::command;
+    if (hasEnded_ || std::exchange(isLeft_, isLeft_ && !isIdle)) return {};
     request_ = &request;
     prompt_ = request.prompt;
     isCancelled_ = false;
     int length = 0;
     wchar_t const* const typed = el_wgets(line_, &length);
     if (!typed || length <= 0) {
-        std::fputs(isCancelled_ ? "^C\n" : "\n", stdout);
-        std::fflush(stdout);
-        hasEnded_ = !isCancelled_;
-        return {isCancelled_ ? Kind::cancel : Kind::end, {}};
+        tzhost::Answer answer = noLine();
+        if (isIdle) isLeft_ = false;
+        return answer;
     }
     std::wstring text(typed, static_cast<std::size_t>(length));
     while (text.ends_with(L'\n') || text.ends_with(L'\r'))
@@ -187,6 +223,10 @@ bool TerminalSource::isThere() {
 
 tzhost::Answer TerminalSource::next(tzhost::AnswerRequest const& request) {
     return editor_->read(request);
+}
+
+bool TerminalSource::hasEnded() const {
+    return editor_->hasEnded();
 }
 
 }  // namespace tzdraft

@@ -4,13 +4,14 @@
 
 #include "host/command_line/answer_source.h"
 
-// Answers from a person at the terminal of standard input: a line to edit behind each prompt, with
-// the lines typed before (kept in the file "history" of the configuration folder), and completion
-// of commands, keywords and file names by Tab.
+// Answers from a person at the terminal of standard input: a line to edit after each prompt, with
+// the lines typed before (kept in the file "history" of the configuration folder). Tab completes
+// what the question offers; where it asks for a text, a tab is a part of the answer.
 //
-// Ctrl-C cancels the question, Ctrl-D on an empty line ends the input. Between the questions the
-// terminal is as it was found, but that Ctrl-C does nothing: it would end the program with the
-// drawing unsaved. There is one at a time.
+// Ctrl-C cancels the question. Ctrl-D on an empty line ends the input of the command and of the
+// idle prompt after it; whoever reads commands may go on. Between the questions the terminal is as
+// it was found, except that Ctrl-C does nothing: it would end the program with the drawing unsaved.
+// There is one at a time.
 namespace tzdraft {
 
 class TerminalSource : public tzhost::AnswerSource {
@@ -24,7 +25,10 @@ public:
     [[nodiscard]] static bool isThere();
 
     [[nodiscard]] tzhost::Answer next(tzhost::AnswerRequest const& request) override;
-    [[nodiscard]] bool isTerminal() const override { return true; }
+    [[nodiscard]] bool hasEnded() const override;
+    [[nodiscard]] bool isPerson() const override { return true; }
+    [[nodiscard]] bool echoes() const override { return true; }
+    [[nodiscard]] bool ownsTerminal() const override { return true; }
 
 private:
     class Editor;

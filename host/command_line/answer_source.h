@@ -33,11 +33,24 @@ enum class QuestionKind {
 // The name of a kind, as events give it.
 [[nodiscard]] char const* nameOf(QuestionKind kind);
 
+// What completion may offer for an answer.
+struct Offer {
+    enum class Kind {
+        nothing,  // a text, in which a tab is a tab
+        words,    // the word before the cursor, by `choices`; global words begin with "_"
+        names,    // the whole answer, by `choices`
+        files,    // the whole answer, as the name of a file
+    };
+    Kind kind = Kind::nothing;
+    std::vector<std::wstring> choices = {};
+};
+
 // What is asked, for sources that let a person see and edit.
 struct AnswerRequest {
     QuestionKind kind = QuestionKind::command;
-    std::wstring_view prompt;         // ahead of the answer; to a terminal, one line that it shows
-    std::vector<std::wstring> words;  // what completion may offer, global words behind "_"
+    // To a source that owns the terminal: one line, which the source shows before the answer.
+    std::wstring_view prompt;
+    Offer offer = {};
 };
 
 struct Answer {
@@ -46,7 +59,7 @@ struct Answer {
         cancel,   // the user cancelled
         tooLong,  // a line beyond kLongestAnswer, which was dropped
         fault,    // something in the script that is no answer: `text` says where and what
-        end,      // nothing comes any more; `text` says where, "file:line: ", or is empty
+        end,      // no answer: the input ends; `text` says where, "file:line: ", or is empty
     };
     Kind kind = Kind::end;
     std::wstring text;
@@ -57,20 +70,30 @@ constexpr std::size_t kLongestAnswer = 32768;
 
 // What a script leaves in the editor that opens next.
 struct EditorBlock {
-    std::wstring text;  // lines apart by line feeds, none behind the last
+    std::wstring text;  // lines with line feeds between them, none after the last
     bool accepted = true;
 };
 
 class AnswerSource {
 public:
     virtual ~AnswerSource() = default;
-    // The answer to a question. After `end` it goes on giving `end`.
+    // The answer to a question. Once hasEnded, each is `end`.
     [[nodiscard]] virtual Answer next(AnswerRequest const& request) = 0;
     // The editor block that comes next, if one does; it then counts as taken.
     [[nodiscard]] virtual std::optional<EditorBlock> takeBlock() { return std::nullopt; }
-    // Whether this is a terminal, which shows prompts and answers by itself and leaves the cursor
-    // at the start of a line.
-    [[nodiscard]] virtual bool isTerminal() const { return false; }
+    // Whether nothing comes any more. A person can end the input of one command and go on.
+    [[nodiscard]] virtual bool hasEnded() const { return true; }
+    // Where the last answer stood, "file:line: "; empty when that has no place.
+    [[nodiscard]] virtual std::wstring place() const { return {}; }
+
+    // Whether a person answers, who can be asked whether something is meant. What a script says is
+    // meant.
+    [[nodiscard]] virtual bool isPerson() const { return false; }
+    // Whether an answer shows on the screen as it is typed, with an Enter after it; the transcript
+    // then leaves it out.
+    [[nodiscard]] virtual bool echoes() const { return false; }
+    // Whether the source shows the last line of a prompt itself, since it edits what follows it.
+    [[nodiscard]] virtual bool ownsTerminal() const { return false; }
 };
 
 }  // namespace tzhost

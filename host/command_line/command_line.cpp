@@ -7,6 +7,7 @@
 #include "host/runtime/documents.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
+#include "host/text/visible_text.h"
 #include "tz/rx/status.h"
 
 namespace tzhost {
@@ -43,13 +44,15 @@ AnswerSource* CommandLine::setSource(AnswerSource* source) {
 void CommandLine::reset() {
     source_ = nullptr;
     transcript_ = {};
-    errors_ = {};
+    mustEnd_ = {};
     sent_.clear();
     armed_ = {};
+    offer_ = {};
     input_.reset();
     voice_ = Voice::module;
     failures_ = 0;
     hasFailed_ = false;
+    hasEndedInCommand_ = false;
     resetDragCursor();
 }
 
@@ -74,14 +77,28 @@ void CommandLine::notify(Notification const& notification) {
 
 void CommandLine::complain(std::wstring const& text) {
     hasFailed_ = true;
-    if (errors_) errors_(text + L"\n");
+    transcript_.error(text);
+}
+
+void CommandLine::sayFailure(std::wstring const& what) {
+    say(visible(what, LineFeeds::shown));
+    if (!isPerson()) complain((source_ ? source_->place() : L"") + what);
 }
 
 // Said once, however many questions still wait.
 void CommandLine::endedInCommand(std::wstring const& where) {
-    if (!hasFailed_ && !where.empty())
-        complain(where + localText(L"the input ends inside a command"));
-    hasFailed_ = true;
+    if (std::exchange(hasEndedInCommand_, true) || where.empty()) return;
+    transcript_.error(where + localText(L"the input ends inside a command"));
+}
+
+bool CommandLine::hasEnded() const {
+    return source_ == nullptr || source_->hasEnded() || (mustEnd_ && mustEnd_());
+}
+
+bool CommandLine::mustEnd() {
+    bool const isOver = mustEnd_ && mustEnd_();
+    hasFailed_ = hasFailed_ || isOver;
+    return isOver;
 }
 
 Answer CommandLine::readFromSource(AnswerRequest const& request) {
@@ -93,24 +110,37 @@ Answer CommandLine::readFromSource(AnswerRequest const& request) {
     return {};
 }
 
-Answer CommandLine::ask(AnswerRequest const& request) {
-    bool const isSent = !sent_.isEmpty();
-    bool const isOnTerminal = !isSent && !isScripted();
-    AnswerRequest shown = request;
-    if (isOnTerminal) {
-        // The terminal edits one line: what stands above it is shown from here.
-        std::size_t const above = request.prompt.rfind(L'\n') + 1;
-        shown.prompt.remove_prefix(above);
-        transcript_.prompt(request.prompt.substr(0, above));
-    } else {
-        transcript_.prompt(request.prompt);
-    }
-    Answer answer = isSent ? sent_.next() : readFromSource(shown);
-    if (answer.kind != Answer::Kind::end) failures_ = 0;
-    if (isOnTerminal) {
-        transcript_.answeredOnTerminal();
-    } else if (answer.kind == Answer::Kind::line || answer.kind == Answer::Kind::cancel) {
+// What was read when the input had to end is a part of an answer at most.
+Answer CommandLine::read(AnswerRequest const& request) {
+    if (mustEnd()) return {};
+    Answer answer = sent_.isEmpty() ? readFromSource(request) : sent_.next();
+    return mustEnd() ? Answer() : answer;
+}
+
+// Who owns the terminal edits one line: what stands above it is shown from here.
+void CommandLine::showPrompt(AnswerRequest& request, std::wstring const& prompt) {
+    request.prompt = prompt;
+    bool const isOwned = sent_.isEmpty() && source_ != nullptr && source_->ownsTerminal();
+    std::size_t const above = isOwned ? prompt.rfind(L'\n') + 1 : prompt.size();
+    transcript_.prompt(request.prompt.substr(0, above));
+    if (isOwned) request.prompt.remove_prefix(above);
+}
+
+void CommandLine::showAnswer(Answer const& answer) {
+    if (answer.kind == Answer::Kind::line || answer.kind == Answer::Kind::cancel)
         transcript_.answer(answer.kind == Answer::Kind::line ? answer.text : kCancelEcho);
+}
+
+Answer CommandLine::ask(AnswerRequest request) {
+    bool const isTyped = sent_.isEmpty() && source_ != nullptr && source_->echoes();
+    std::wstring const prompt = visible(request.prompt);
+    showPrompt(request, prompt);
+    Answer const answer = read(request);
+    if (answer.kind != Answer::Kind::end) failures_ = 0;
+    if (isTyped) {
+        transcript_.answerWasTyped();
+    } else {
+        showAnswer(answer);
     }
     if (answer.kind == Answer::Kind::end && request.kind != QuestionKind::command)
         endedInCommand(answer.text);
@@ -123,7 +153,9 @@ std::optional<std::wstring> CommandLine::readCommand(std::vector<std::wstring> w
             sent_.push(text.str());
         document->typed.clear();
     }
-    AnswerRequest const request{QuestionKind::command, localText(kIdlePrompt), std::move(words)};
+    AnswerRequest const request{
+        QuestionKind::command, localText(kIdlePrompt), {Offer::Kind::words, std::move(words)}
+    };
     while (true) {
         Answer answer = ask(request);
         if (answer.kind == Answer::Kind::line) return std::move(answer.text);

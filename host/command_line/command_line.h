@@ -5,7 +5,7 @@
 //
 //   tzhost::CommandLine& line = tzhost::commandLine();
 //   line.setSource(script.get());
-//   line.setScreen(writeToStandardOutput);
+//   line.setScreen(writeByKind);
 //   line.attach();
 //   while (auto command = line.readCommand()) run(*command);
 //
@@ -15,6 +15,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "host/command_line/answer_source.h"
@@ -43,9 +44,11 @@ class CommandLine : public PrintSink, public NotificationSink {
 public:
     // Not owned; the source before. Null stands for a script at its end.
     AnswerSource* setSource(AnswerSource* source);
-    // Where the transcript goes, and where one-line errors of the script go.
+    // Where all that is shown goes, errors included.
     void setScreen(Transcript::Screen screen) { transcript_.setScreen(std::move(screen)); }
-    void setErrorScreen(Transcript::Screen screen) { errors_ = std::move(screen); }
+    // Asked before and after each answer: true ends the input at once, which counts as a failure.
+    // The source is not asked any more.
+    void setEndCheck(std::function<bool()> mustEnd) { mustEnd_ = std::move(mustEnd); }
     // Takes what the host and its modules print, until the object ends or another takes over.
     void attach();
     ~CommandLine() override;
@@ -53,17 +56,25 @@ public:
     // At the idle prompt: the next line, empty for Enter alone; nothing when the input has ended.
     // `words` are for completion.
     [[nodiscard]] std::optional<std::wstring> readCommand(std::vector<std::wstring> words = {});
+    // Whether nothing comes any more. At a terminal the input of one command may end before.
+    [[nodiscard]] bool hasEnded() const;
+    // Takes an end of the input back, when a person stays after all.
+    void goOn() { hasEndedInCommand_ = false; }
     // What a script leaves in the editor that opens now.
     [[nodiscard]] std::optional<EditorBlock> takeEditorBlock();
-    // Whether answers come from a script, or from nowhere.
-    [[nodiscard]] bool isScripted() const { return source_ == nullptr || !source_->isTerminal(); }
-    // The input ended while a question waited, or the script held a fault: exit status 1.
-    [[nodiscard]] bool hasFailed() const { return hasFailed_; }
+    // Whether a person answers, not a script.
+    [[nodiscard]] bool isPerson() const { return source_ != nullptr && source_->isPerson(); }
+    // The input ended while a question waited, the script held a fault or asked for something that
+    // failed, or the input had to end: exit status 1.
+    [[nodiscard]] bool hasFailed() const { return hasFailed_ || hasEndedInCommand_; }
 
     // A line of the host's own; no event.
     void say(std::wstring_view line) { transcript_.line(line); }
     // Ends the line that the cursor stands in.
     void freshLine() { transcript_.freshLine(); }
+    // A command could not do what it was told: a line of the host's own. In a script also an error
+    // with its place, and a failure of the session.
+    void sayFailure(std::wstring const& what);
     // Who prints: what modules print are events, too, what the host's own commands print are not.
     enum class Voice { module, host };
     void setVoice(Voice voice) { voice_ = voice; }
@@ -75,12 +86,15 @@ public:
 
     // For questions. Each showing of `request` gives one answer; faults of the script are reported
     // and stepped over.
-    [[nodiscard]] Answer ask(AnswerRequest const& request);
+    [[nodiscard]] Answer ask(AnswerRequest request);
     void arm(Armed armed) { armed_ = std::move(armed); }
     // Hands the armed flags and words to the question that begins, and forgets what the one before
     // left.
     [[nodiscard]] Armed takeArmed();
-    // The keyword or free text behind -5005, taken once.
+    // What completion may offer at the next question for a text, taken once.
+    void offer(Offer offer) { offer_ = std::move(offer); }
+    [[nodiscard]] Offer takeOffer() { return std::exchange(offer_, {}); }
+    // The keyword or free text of status -5005, taken once.
     void leaveInput(std::wstring text) { input_ = std::move(text); }
     [[nodiscard]] std::optional<std::wstring> takeInput();
     // A question that failed without taking a line answers with this: the 100th in a row is a
@@ -90,19 +104,25 @@ public:
     int answered(std::wstring_view line, int status) const;
 
 private:
+    [[nodiscard]] Answer read(AnswerRequest const& request);
     [[nodiscard]] Answer readFromSource(AnswerRequest const& request);
+    void showPrompt(AnswerRequest& request, std::wstring const& prompt);
+    void showAnswer(Answer const& answer);
+    [[nodiscard]] bool mustEnd();
     void complain(std::wstring const& text);
     void endedInCommand(std::wstring const& where);
 
     AnswerSource* source_ = nullptr;
     Transcript transcript_;
-    Transcript::Screen errors_;
+    std::function<bool()> mustEnd_;
     SentStrings sent_;
     Armed armed_;
+    Offer offer_;
     std::optional<std::wstring> input_;
     Voice voice_ = Voice::module;
     int failures_ = 0;  // questions in a row that took no line
     bool hasFailed_ = false;
+    bool hasEndedInCommand_ = false;
     bool isAttached_ = false;
 };
 

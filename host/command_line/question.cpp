@@ -17,14 +17,21 @@ std::wstring_view withoutBlanksAround(std::wstring_view text) {
     return text.substr(0, text.find_last_not_of(L" \t") + 1);
 }
 
-AnswerRequest requestFor(QuestionKind kind, std::wstring_view prompt, KeywordList const& words) {
-    AnswerRequest request{kind, prompt, {}};
-    if (commandLine().isScripted()) return request;  // a script completes nothing
+bool isText(QuestionKind kind) {
+    return kind == QuestionKind::string || kind == QuestionKind::symbol;
+}
+
+// Of the keywords; a question for a text has none unless whoever asks it says so.
+Offer usualOffer(QuestionKind kind, KeywordList const& words) {
+    Offer asked = commandLine().takeOffer();
+    if (isText(kind)) return asked;
+    Offer offer{Offer::Kind::words};
+    if (!commandLine().isPerson()) return offer;  // a script completes nothing
     for (int i = 0; i < words.count(); ++i) {
-        request.words.push_back(words.local(i));
-        request.words.push_back(L'_' + words.global(i));
+        offer.choices.push_back(words.local(i));
+        offer.choices.push_back(L'_' + words.global(i));
     }
-    return request;
+    return offer;
 }
 
 }  // namespace
@@ -32,7 +39,8 @@ AnswerRequest requestFor(QuestionKind kind, std::wstring_view prompt, KeywordLis
 std::optional<int> failsAt(std::string_view operation) {
     auto const fault = faultAt(operation);
     if (!fault) return std::nullopt;
-    (void)commandLine().takeArmed();  // the flags were for this question alone
+    (void)commandLine().takeArmed();  // flags and offer were for this question alone
+    (void)commandLine().takeOffer();
     return commandLine().failed(*fault);
 }
 
@@ -40,7 +48,8 @@ Question::Question(QuestionKind kind, wchar_t const* prompt)
     : Question(kind, prompt, commandLine().takeArmed()) {}
 
 Question::Question(QuestionKind kind, wchar_t const* prompt, Armed armed)
-    : line_(commandLine()), kind_(kind), prompt_(prompt ? prompt : L""), armed_(std::move(armed)) {
+    : line_(commandLine()), kind_(kind), prompt_(prompt ? prompt : L""), armed_(std::move(armed)),
+      offer_(usualOffer(kind, armed_.words)) {
     reportEvent([&] {
         return Event{
             {"event",    "prompt"           },
@@ -59,7 +68,7 @@ void Question::setEndings(int empty, int cancel) {
 
 int Question::ask(Reader const& read) {
     while (true) {
-        Answer const answer = line_.ask(requestFor(kind_, prompt_, armed_.words));
+        Answer const answer = line_.ask({kind_, prompt_, offer_});
         switch (answer.kind) {
         case Answer::Kind::line:
             if (auto const status = take(answer.text, read)) return *status;

@@ -66,6 +66,8 @@ public:
     void setWordReader(WordReader reader) { wordReader_ = std::move(reader); }
     // The flags do not apply; the words do.
     void clearFlags() { armed_.flags = 0; }
+    // What completion may offer, in place of the keywords.
+    void setOffer(Offer offer) { offer_ = std::move(offer); }
     // Shown from now on instead of the prompt.
     void setPrompt(std::wstring prompt) { prompt_ = std::move(prompt); }
     [[nodiscard]] Armed const& armed() const { return armed_; }
@@ -82,6 +84,7 @@ private:
     QuestionKind kind_;
     std::wstring prompt_;
     Armed armed_;
+    Offer offer_;
     WordReader wordReader_;
     int emptyStatus_ = Tzad::ePromptNone;
     int cancelStatus_ = Tzad::ePromptCancel;

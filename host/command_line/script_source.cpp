@@ -61,7 +61,8 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
     }
     std::ifstream input(file, std::ios::binary);
     std::ostringstream whole;
-    if (!input || std::filesystem::is_directory(file) ||
+    std::error_code unreadable;  // then it cannot be opened either
+    if (!input || std::filesystem::is_directory(file, unreadable) ||
         (input.peek() != Traits::eof() && !(whole << input.rdbuf()))) {
         error = file + ": " + localText("the script cannot be read");
         return nullptr;
@@ -77,12 +78,12 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
     return std::make_unique<ScriptSource>(text, file);
 }
 
-std::wstring ScriptSource::place(int line) const {
+std::wstring ScriptSource::placeOf(int line) const {
     return fromUtf8(name_) + L":" + std::to_wstring(line) + L": ";
 }
 
 void ScriptSource::fail(int line, wchar_t const* what) {
-    fault_ = place(line) + localText(what);
+    fault_ = placeOf(line) + localText(what);
     text_.reset();
     peeked_.reset();
 }
@@ -146,14 +147,20 @@ std::optional<EditorBlock> ScriptSource::takeBlock() {
     return block;
 }
 
+// A script that a fault ended has no end of its own that would be worth a line.
 Answer ScriptSource::last() {
-    if (fault_.empty()) return {Answer::Kind::end, place(lines_)};
-    return {Answer::Kind::fault, std::exchange(fault_, {})};
+    if (!fault_.empty()) {
+        isBroken_ = true;
+        return {Answer::Kind::fault, std::exchange(fault_, {})};
+    }
+    hasEnded_ = true;
+    return {Answer::Kind::end, isBroken_ ? std::wstring() : placeOf(lines_)};
 }
 
 Answer ScriptSource::next(AnswerRequest const& request) {
     Line const* const line = peek();
     if (line == nullptr) return last();
+    taken_ = line->number;
     if (line->isTooLong) {
         peeked_.reset();
         return {Answer::Kind::tooLong, {}};
@@ -164,7 +171,7 @@ Answer ScriptSource::next(AnswerRequest const& request) {
     if (!isString && word == kBlockStart) {
         int const start = line->number;
         if (!readBlock()) return last();
-        return {Answer::Kind::fault, place(start) + localText(L"no editor takes this block")};
+        return {Answer::Kind::fault, placeOf(start) + localText(L"no editor takes this block")};
     }
     if (word == kCancel) {
         peeked_.reset();

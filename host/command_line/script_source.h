@@ -35,6 +35,8 @@ public:
 
     [[nodiscard]] Answer next(AnswerRequest const& request) override;
     [[nodiscard]] std::optional<EditorBlock> takeBlock() override;
+    [[nodiscard]] bool hasEnded() const override { return hasEnded_; }
+    [[nodiscard]] std::wstring place() const override { return placeOf(taken_); }
 
 private:
     enum class Length { bounded, any };
@@ -50,14 +52,17 @@ private:
     [[nodiscard]] Line const* peek();
     [[nodiscard]] std::optional<EditorBlock> readBlock();
     void fail(int line, wchar_t const* what);
-    [[nodiscard]] std::wstring place(int line) const;
+    [[nodiscard]] std::wstring placeOf(int line) const;
     [[nodiscard]] Answer last();
 
     std::string name_;
     std::unique_ptr<std::istream> text_;
     std::optional<Line> peeked_;
-    std::wstring fault_;  // what ended the script early, until it is reported
+    std::wstring fault_;     // what ended the script early, until it is reported
+    bool isBroken_ = false;  // that was reported
+    bool hasEnded_ = false;
     int lines_ = 0;
+    int taken_ = 0;  // the line of the last answer
 };
 
 }  // namespace tzhost

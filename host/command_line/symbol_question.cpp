@@ -2,12 +2,21 @@
 
 #include "host/base/fault_point.h"
 #include "host/command_line/question.h"
+#include "host/command_line/symbol_names.h"
+#include "host/database/drawing.h"
 #include "host/database/symbol_name.h"
 #include "host/text/local_text.h"
 #include "tz/ed/prompts.h"
 #include "tz/rx/resbuf.h"
 
 namespace {
+
+// The question does not say which table it is about. Modules ask it for text styles alone.
+tzhost::Offer offerFor(TzDbDatabase* database) {
+    tzhost::Drawing const* const drawing = tzhost::drawingOf(database);
+    TzDbObjectId const styles = drawing ? drawing->textStyleTableId() : TzDbObjectId();
+    return {tzhost::Offer::Kind::names, tzhost::symbolNames(styles)};
+}
 
 class SymbolServices : public TzEdSymbolUtilities::Services {
 public:
@@ -17,12 +26,13 @@ public:
     }
 
     [[nodiscard]] int
-    getSymbolString(wchar_t*& result, wchar_t const* prompt, TzDbDatabase* /*database*/) override {
+    getSymbolString(wchar_t*& result, wchar_t const* prompt, TzDbDatabase* database) override {
         result = nullptr;
         if (auto const failed = tzhost::failsAt("TzEdSymbolUtilities::getSymbolString")) {
             return *failed;
         }
         tzhost::Question question(tzhost::QuestionKind::symbol, prompt);
+        if (tzhost::commandLine().isPerson()) question.setOffer(offerFor(database));
         return question.ask([&](std::wstring_view answer) {
             if (!tzhost::isNameOrPattern(answer)) {
                 return tzhost::Reply::unreadable(tzhost::localText(

@@ -2,6 +2,8 @@
 
 #include <utility>
 
+#include "host/text/visible_text.h"
+
 namespace tzhost {
 
 namespace {
@@ -17,47 +19,52 @@ void Transcript::setScreen(Screen screen) {
     screen_ = std::move(screen);
 }
 
-void Transcript::show(std::wstring_view text) {
+void Transcript::show(Shown kind, std::wstring_view text) {
     if (text.empty()) return;
     cursor_ = text.ends_with(L'\n') ? Cursor::lineStart : Cursor::inLine;
-    if (screen_) screen_(text);
+    if (screen_) screen_(kind, visible(text));
 }
 
-void Transcript::freshLine() {
-    if (cursor_ == Cursor::inLine || cursor_ == Cursor::behindAnswer) show(L"\n");
+void Transcript::freshLine(Shown next) {
+    if (cursor_ == Cursor::inLine || cursor_ == Cursor::afterAnswer) show(next, L"\n");
     cursor_ = Cursor::lineStart;
 }
 
 void Transcript::prompt(std::wstring_view text) {
-    freshLine();
-    show(withoutLineFeed(text));
+    freshLine(Shown::prompt);
+    show(Shown::prompt, withoutLineFeed(text));
 }
 
 void Transcript::answer(std::wstring_view text) {
     bool const isLineEmpty = cursor_ == Cursor::lineStart && text.empty();
-    show(text);
-    cursor_ = isLineEmpty ? Cursor::belowAnswer : Cursor::behindAnswer;
+    show(Shown::answer, text);
+    cursor_ = isLineEmpty ? Cursor::belowAnswer : Cursor::afterAnswer;
 }
 
 void Transcript::message(std::wstring_view text) {
     if (text.empty()) return;
     if (cursor_ == Cursor::belowAnswer) {
         cursor_ = Cursor::lineStart;
-        show(withoutLineFeed(text));
+        show(Shown::message, withoutLineFeed(text));
         return;
     }
-    if (cursor_ == Cursor::behindAnswer && text.front() != L'\n') freshLine();
+    if (cursor_ == Cursor::afterAnswer && text.front() != L'\n') freshLine(Shown::message);
     bool const isBlankLine = text.find_first_not_of(L'\n') == std::wstring_view::npos;
-    show(cursor_ == Cursor::lineStart && !isBlankLine ? withoutLineFeed(text) : text);
+    show(Shown::message,
+         cursor_ == Cursor::lineStart && !isBlankLine ? withoutLineFeed(text) : text);
 }
 
 void Transcript::line(std::wstring_view text) {
-    freshLine();
-    show(text);
-    freshLine();
+    freshLine(Shown::line);
+    show(Shown::line, text);
+    freshLine(Shown::line);
 }
 
-void Transcript::answeredOnTerminal() {
+void Transcript::error(std::wstring_view text) {
+    if (screen_) screen_(Shown::error, visible(text, LineFeeds::shown) + L"\n");
+}
+
+void Transcript::answerWasTyped() {
     cursor_ = Cursor::belowAnswer;
 }
 

@@ -71,12 +71,22 @@ public:
         }
         setActive(0);
         reportPhase(command_, "end");
-        reportAudit(audit());
-        if (!audit().clean()) worst() = audit();
     }
 
 private:
     Command const command_;  // a copy: the command may unload its own module
+};
+
+// The audit of what runs meanwhile, on every way out.
+class Audited {
+public:
+    Audited() = default;
+    Audited(Audited const&) = delete;
+    Audited& operator=(Audited const&) = delete;
+    ~Audited() {
+        reportAudit(audit());
+        if (!audit().clean()) worst() = audit();
+    }
 };
 
 }  // namespace
@@ -90,9 +100,19 @@ void clearCommandHooks() {
 
 Audit runCommand(Command const& command, AnswersFrom answers) {
     {
+        Audited const isAudited;
         Run const run(command, answers);
         MemoryFaultScope const memory;
         command.callback();
+    }
+    return audit();
+}
+
+Audit runFunction(std::function<void()> const& call) {
+    {
+        Audited const isAudited;
+        MemoryFaultScope const memory;
+        call();
     }
     return audit();
 }

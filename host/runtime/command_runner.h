@@ -25,7 +25,11 @@ enum class AnswersFrom { user, script };
 // command left over; an exception of the command passes on after all of that.
 Audit runCommand(Command const& command, AnswersFrom answers);
 
-// The audit after the last command that left something over; clean when none did.
+// Runs a call of a function, in which memory can fail as in a command, with an audit after it.
+// Returns what it left over; an exception passes on after that.
+Audit runFunction(std::function<void()> const& call);
+
+// The audit after the last command or call that left something over; clean when none did.
 [[nodiscard]] Audit const& worstAudit();
 void resetWorstAudit();
 

@@ -32,6 +32,20 @@ TEST(IdlePrompt, ReadsCommandsAndStepsOverTheRest) {
                                     L"That line is too long.\nCommand: QUIT\nCommand: ");
 }
 
+// Names used to reach the terminal with what it obeys in them.
+TEST(Screen, ShowsControlCharactersAndKeepsErrorsInALine) {
+    Session const session("a\rb\n<<<\n>>>\n");
+    tzutPrintf(L"\nL\x1B[6n\x9B\t\x7F\n");
+    TzString text;
+    EXPECT_EQ(tzedGetString(1, L"\nName <\a>: ", text), Tzad::ePromptNormal);
+    EXPECT_EQ(text, L"a\rb");
+    commandLine().sayFailure(L"a\nb\x1B: no");
+    EXPECT_EQ(session.transcript(), L"L\\U+001B[6n\\U+009B\t\\U+007F\nName <\\U+0007>: "
+                                    L"a\\U+000Db\na\\U+000Ab\\U+001B: no\n");
+    EXPECT_EQ(session.errors(), L"script:1: a\\U+000Ab\\U+001B: no\n");
+    EXPECT_TRUE(commandLine().hasFailed());
+}
+
 TEST(IdlePrompt, EndsWithoutAFault) {
     Session const session("");
     EXPECT_EQ(commands(), L"");
@@ -64,14 +78,16 @@ public:
     Terminal(std::wstring& screen, std::deque<std::wstring> lines)
         : screen_(screen), lines_(std::move(lines)) {}
     tzhost::Answer next(tzhost::AnswerRequest const& request) override {
-        words += std::to_string(request.words.size());
+        words += std::to_string(request.offer.choices.size());
         if (lines_.empty()) return {};
         screen_ += std::wstring(request.prompt) + lines_.front() + L"\n";
         tzhost::Answer answer{tzhost::Answer::Kind::line, lines_.front()};
         lines_.pop_front();
         return answer;
     }
-    [[nodiscard]] bool isTerminal() const override { return true; }
+    [[nodiscard]] bool isPerson() const override { return true; }
+    [[nodiscard]] bool echoes() const override { return true; }
+    [[nodiscard]] bool ownsTerminal() const override { return true; }
 
     std::string words;  // how many words each question offered
 
@@ -85,8 +101,7 @@ TEST(Terminals, ShowEachLineOnce) {
     std::wstring screen;
     Terminal terminal(screen, {L"MTEXT", L"b", L"7"});
     commandLine().setSource(&terminal);
-    commandLine().setScreen([&](std::wstring_view text) { screen += text; });
-    EXPECT_FALSE(commandLine().isScripted());
+    commandLine().setScreen([&](tzhost::Shown, std::wstring_view text) { screen += text; });
     EXPECT_EQ(commandLine().readCommand({L"MTEXT", L"MTEDIT"}), L"MTEXT");
     tzutPrintf(L"\nStarting");
     TzString word;

@@ -20,8 +20,9 @@ public:
         commandLine().reset();
         commandLine().attach();
         commandLine().setSource(&source_);
-        commandLine().setScreen([this](std::wstring_view text) { transcript_ += text; });
-        commandLine().setErrorScreen([this](std::wstring_view text) { errors_ += text; });
+        commandLine().setScreen([this](Shown kind, std::wstring_view text) {
+            (kind == Shown::error ? errors_ : transcript_) += text;
+        });
         setEventSink([this](Event const& event) { events_ += event.dump() + "\n"; });
     }
     Session(Session const&) = delete;

@@ -5,6 +5,7 @@
 #include <fstream>
 #include <poll.h>
 #include <pty.h>
+#include <sstream>
 #include <sys/wait.h>
 #include <termios.h>
 #include <unistd.h>
@@ -18,7 +19,11 @@ constexpr int kPatienceMilliseconds = 20000;
 // The program at a terminal of its own.
 class Terminal {
 public:
-    explicit Terminal(std::string const& editor) {
+    // The arguments of the program are apart by blanks.
+    explicit Terminal(std::string const& editor, std::string const& arguments = "") {
+        fs::remove_all(desk());
+        fs::create_directories(desk());
+        std::ofstream(desk() / "there.json") << "{}";
         winsize const size{40, 200, 0, 0};
         child_ = forkpty(&screen_, nullptr, nullptr, &size);
         if (child_ != 0) return;
@@ -27,8 +32,9 @@ public:
         setenv("XDG_CONFIG_HOME", configuration().c_str(), 1);
         unsetenv("VISUAL");
         setenv("EDITOR", editor.c_str(), 1);
+        fs::current_path(desk());
         std::string const program = std::string(std::getenv("TZ_TEST_BIN")) + "/tzdraft";
-        execl(program.c_str(), "tzdraft", nullptr);
+        execl("/bin/sh", "sh", "-c", ("exec " + program + " " + arguments).c_str(), nullptr);
         _exit(127);
     }
     Terminal(Terminal const&) = delete;
@@ -38,6 +44,8 @@ public:
         close(screen_);
     }
 
+    // The program's working folder, with a file "there.json" in it.
+    static fs::path desk() { return fs::path(testing::TempDir()) / "desk"; }
     static fs::path configuration() { return fs::path(testing::TempDir()) / "configuration"; }
 
     // Once the program edits a line; before that the terminal itself would take some keys.
@@ -61,6 +69,8 @@ public:
             if (!readMore()) return false;
         }
     }
+
+    void signal(int number) const { kill(child_, number); }
 
     // A program that does not end is killed.
     [[nodiscard]] int exitStatus() {
@@ -150,6 +160,83 @@ TEST_P(Keys, Show) {
 INSTANTIATE_TEST_SUITE_P(Typed, Keys, testing::ValuesIn(kCases), [](auto const& row) {
     return row.param.name;
 });
+
+struct CareCase {
+    char const* name;
+    char const* dialogue;  // what shows, a bar, what is typed then, a bar, and so on
+    char const* last;      // shows in the end
+};
+
+constexpr char kEnds[] = "QUIT\r\n";  // and nothing is asked
+constexpr char kQuit[] = "Quit without saving them? [Yes/No] <No>: ";
+constexpr char kReplace[] = "Replace it? [Yes/No] <No>: ";
+constexpr char kUnnamed[] = "not saved: a drawing without a name.";
+constexpr char kCircle[] = "Command: |CIRCLE\r|point: |1,2\r|Radius: |3\r|: ";
+
+// Nothing of this used to be asked, said or completed so. "*" draws a circle, and "$" begins the
+// program's arguments.
+constexpr CareCase kCare[] = {
+    {"QuitStays",         "*|QUIT\r|<No>: |\r",                                               kIdle              },
+    {"ControlDStays",     "*|\x04|<No>: |\x03",                                               kIdle              },
+    {"LeavesACommand",    "*|TEXT\r|: |\x04|<No>: |n\r|: |QUIT\r",                            kQuit              },
+    {"QuitKnowsWhatUHas", "*|NEW\r|: |QUIT\r",                                                kUnnamed           },
+    {"SavedIsSaved",      "*|SAVE\r|: |a.json\r|Saved: /|QUIT\r",                             kEnds              },
+    {"TakenBackIsSaved",  "*|U\r|: |QUIT\r",                                                  kEnds              },
+    {"SavedAtTheEnd",     "$--save b.json|*|QUIT\r",                                          kEnds              },
+    {"APickIsNoChange",   ": |CIRCLE\r|: |1,1\r|: |\x03|: |QUIT\r",                           kEnds              },
+    {"NewPushesOneOut",
+     "*|NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r",       "<No>"             },
+    {"SaveAsksFirst",     ": |SAVE\r|: |there.json\r|<No>: |\r",                              kIdle              },
+    {"SaveAsksOnce",      ": |SAVE\r|: |there.json\r|<No>: |y\r|Saved: /|SAVE\r|n>: |\r",     "Saved: /"         },
+    {"OpenSaysWhat",      ": |SAVE\r|: |c.json\r|Saved: |OPEN\r|open: |c.json\r",             "Opened: /"        },
+    {"PlotSaysWhat",      ": |PLOT\r|: |a.svg\r",                                             "/desk/a.svg."     },
+    {"TabInAText",        ": |TEXT\r|: |0,0\r|: |1\r|: |\r|: |a\tb\r|: |LIST\r|: |l\r|: |\r", "  a\tb"           },
+    {"FilesComplete",     ": |SAVE\r|: |th\t\r",                                              kReplace           },
+    {"StylesComplete",    ": |STYLE\r|: |sta\t",                                              "ndard"            },
+    {"VariablesComplete", ": |SETVAR\r|: |textsi\t\r",                                        "for textsize"     },
+    {"CommandsComplete",  ": |HELP\r|list: |qui\t\r",                                         "Ends the session."},
+    {"BeginsUnderAName",  "$plan.json|plan.json.|SAVE\r",                                     "as <plan.json>: " },
+};
+
+class Care : public testing::TestWithParam<CareCase> {};
+
+TEST_P(Care, IsTaken) {
+    fs::remove_all(Terminal::configuration());
+    std::string dialogue = GetParam().dialogue;
+    std::string arguments;
+    if (dialogue.starts_with('$')) {
+        arguments = dialogue.substr(1, dialogue.find('|') - 1);
+        dialogue.erase(0, arguments.size() + 2);
+    }
+    if (dialogue.starts_with('*')) dialogue.replace(0, 1, kCircle);
+    Terminal terminal(kNone, arguments);
+    std::istringstream turns(dialogue);
+    for (std::string shown, typed; std::getline(turns, shown, '|');) {
+        ASSERT_TRUE(terminal.shows(shown)) << shown << terminal.rest();
+        std::getline(turns, typed, '|');
+        terminal.type(typed);
+    }
+    ASSERT_TRUE(terminal.shows(GetParam().last)) << terminal.rest();
+    if (GetParam().last != kEnds) terminal.type("\x03\x04yes\r");  // leaves, whatever is asked
+    EXPECT_EQ(0, terminal.exitStatus());
+}
+
+INSTANTIATE_TEST_SUITE_P(Rows, Care, testing::ValuesIn(kCare), [](auto const& row) {
+    return row.param.name;
+});
+
+// A signal used to end the program with nothing saved.
+TEST(Signals, EndTheSessionInOrder) {
+    for (int const number : {SIGTERM, SIGHUP}) {
+        Terminal terminal(kNone, "--save kept.json");
+        ASSERT_TRUE(terminal.shows(kIdle)) << terminal.rest();
+        terminal.type("CIRCLE\r");
+        ASSERT_TRUE(terminal.shows(kCenter)) << terminal.rest();
+        terminal.signal(number);
+        EXPECT_EQ(terminal.exitStatus(), 1);
+        EXPECT_TRUE(fs::exists(Terminal::desk() / "kept.json"));
+    }
+}
 
 TEST(History, IsThereInTheNextSession) {
     fs::remove_all(Terminal::configuration());

@@ -115,7 +115,7 @@ TEST_P(Translations, SayEachModuleTextInTheirOwnWords) {
 std::set<std::wstring> reasonsOfTheSystem() {
     std::set<std::wstring> reasons;
     for (int const reason : {ENOENT, EACCES, EISDIR, ENOTDIR, ENOSPC, EFBIG, EROFS, EIO, ENOEXEC,
-                             EMFILE, ENOMEM, ELOOP, ENAMETOOLONG})
+                             EMFILE, ENOMEM, EPIPE, ELOOP, ENAMETOOLONG})
         reasons.insert(tzhost::fromUtf8(std::strerror(reason)));
     return reasons;
 }

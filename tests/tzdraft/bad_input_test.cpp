@@ -26,6 +26,9 @@ constexpr BadRow kUsage[] = {
     {"ValueMissing",    "--script",                 2, "--script: 1 required FILE missing"                  },
     {"TwoDrawings",     "a.json b.json",            2, "The following argument was not expected: b.json"    },
     {"VariableMissing", "--script /dev/null --var", 2, "--var: 1 required NAME=VALUE missing"               },
+    {"ResultNameless",  "--png ''",                 2, "--png: the file name is empty"                      },
+    {"ScriptNameless",  "--script ''",              2, "--script: the file name is empty"                   },
+    {"DrawingNameless", "''",                       2, "DRAWING: the file name is empty"                    },
 };
 
 class WrongUsage : public testing::TestWithParam<BadRow> {};
@@ -47,6 +50,8 @@ TEST(Usage, HelpAndVersionEndWithZero) {
         EXPECT_NE(run.output, "") << asked;
         EXPECT_EQ(run.errors, "") << asked;
     }
+    tztest::ProgramRun const full = tztest::startProgram("--help >/dev/full 2>&1 #");
+    EXPECT_EQ(full.status, 2);
 }
 
 struct InputFile {
@@ -79,6 +84,10 @@ std::vector<InputFile> const& inputFiles() {
         {"latin.json",    entity("\"type\": \"MTEXT\", \"contents\": \"gr\xFC\xDF\"")            },
         {"twice.json",    entity("\"type\": \"LINE\"},\n{\"handle\": \"2a\", \"type\": \"LINE\"")},
         {"settings.json", "{\"variables\": 5}"                                                   },
+        {"save.scr",      "SAVE\nnosuch/a.json\n"                                                },
+        {"plot.scr",      "PLOT\na.gif\n"                                                        },
+        {"load.scr",      "LOAD\nnosuch/a.tzx\n"                                                 },
+        {"lines.scr",     "OPEN\nno\x1B\rsuch.json\n"                                            },
     };
     return files;
 }
@@ -114,6 +123,7 @@ constexpr BadRow kUnusable[] = {
     {"ModuleMissing",    "--module {}/nosuch.tzx",      2,
      "{}/nosuch.tzx: the module cannot be loaded: {}/nosuch.tzx: cannot open shared object file: "
      "No such file or directory\n"                                                                              },
+    {"ScriptLong",       "--script {long}",             2, "{long}: the script cannot be read"},
     {"ModuleDamaged",    "--module {}/text.txt",        2, "{}/text.txt: the module cannot be loaded"           },
     {"ModuleOther",      "--module {lib}/libtz.so.1",   2, "{lib}/libtz.so.1: this is no module"                },
     {"ResourcesMissing", "--resources {}/nosuch.dll",   2, "{}/nosuch.dll: the resource library is"             },
@@ -132,6 +142,12 @@ constexpr BadRow kEarlyEnds[] = {
     {"BlockNotTaken",  "--script {}/block.scr", 1, "{}/block.scr:2: no editor takes this block"   },
     {"BlockNotEnded",  "--script {}/open.scr",  1,
      "{}/open.scr:2: this block has no end, a line >>>"                                           },
+    {"SaveFails",      "--script {}/save.scr",  1,
+     "{}/save.scr:2: nosuch/a.json: cannot be written: No such file"                              },
+    {"PlotFails",      "--script {}/plot.scr",  1, "{}/plot.scr:2: a.gif: a plot's name ends in"  },
+    {"LoadFails",      "--script {}/load.scr",  1, "{}/load.scr:2: /"                             },
+    {"OpenFails",      "--script {}/lines.scr", 1,
+     "{}/lines.scr:2: no\\U+001B\\U+000Dsuch.json: cannot be read: No such file"                  },
 };
 
 constexpr char kOld[] = "as it was";

@@ -3,6 +3,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 #include "tests/support/program_run.h"
 
 namespace {
@@ -29,6 +31,25 @@ TEST(MemoryFaults, LeaveEventsWhole) {
             EXPECT_TRUE(tztest::isClean(event)) << call << ": " << event;
         }
         EXPECT_EQ(audits, 4) << call << ": " << run.output;
+    }
+}
+
+// Calls of functions used to be beyond the plan for memory and without an audit, and a record that
+// the host did not give ended the program.
+TEST(Faults, ReachCallsOfFunctions) {
+    auto const script = scratch("call.scr", "(x \"a\")\n(x #1)\n");
+    auto const file = scratch("call.jsonl");
+    for (auto const& [operation, shown] : {std::pair("operator new", "(x \"a\") ended early"),
+                                           std::pair("tzutNewRb:*", "(x \"a\"): the argument")}) {
+        tztest::ProgramRun const run = tztest::runProgram(
+            {"--script", script.string(), "--events", file.string(), "--fail", operation});
+        EXPECT_EQ(run.status, 0) << run.errors;
+        EXPECT_EQ(run.errors, "");
+        EXPECT_NE(run.output.find(shown), std::string::npos) << run.output;
+        auto const events = tztest::eventsOf(file);
+        EXPECT_EQ(std::count_if(events.begin(), events.end(),
+                                [](auto const& event) { return event["event"] == "audit"; }),
+                  2);
     }
 }
 

@@ -100,6 +100,33 @@ TEST(Results, OfEventsLeaveOtherFilesAlone) {
     EXPECT_FALSE(tztest::eventsOf(events).empty());
 }
 
+// The program used to go on, or to end by a signal, with nothing saved.
+TEST(Results, AreWrittenWhenTheTranscriptCannotBe) {
+    auto const script = scratch("cut.scr", "CIRCLE\n1,2\n3\nCIRCLE\n");
+    auto const saved = scratch("cut.json");
+    std::string const words = "--script " + script.string() + " --save " + saved.string();
+    std::string const errors = scratch("cut.err").string();
+    for (char const* const output : {">/dev/full", "| true"}) {
+        fs::remove(saved);
+        (void)tztest::startProgram(words + " 2>" + errors + " " + output + " #");
+        EXPECT_TRUE(
+            tztest::bytesOf(errors).starts_with("tzdraft: the transcript cannot be written: "))
+            << output << tztest::bytesOf(errors);
+        EXPECT_NE(tztest::bytesOf(saved).find("\"tz-drawing\""), std::string::npos) << output;
+    }
+    EXPECT_EQ(tztest::startProgram(words + " >/dev/full 2>&1 #").status, 1);
+}
+
+// The transcript used to go into the file that took the number of standard output.
+TEST(Results, StayApartFromStreamsThatAreClosed) {
+    auto const script = scratch("quit.scr", "QUIT\n");
+    auto const events = scratch("closed.jsonl");
+    tztest::ProgramRun const run = tztest::startProgram(
+        "--script " + script.string() + " --events " + events.string() + " <&- >&- 2>&- #");
+    EXPECT_EQ(run.status, 0);
+    EXPECT_FALSE(tztest::eventsOf(events).empty());
+}
+
 TEST(Results, ThatCanBeWrittenAreAndTheLineNamesThem) {
     auto const script = scratch("quit.scr", "QUIT\n");
     std::string const saved = scratch("saved.json").string();

@@ -1,9 +1,9 @@
 #include "apps/tzdraft/commands/ask.h"
 
 #include <algorithm>
-#include <optional>
 
 #include "apps/tzdraft/local_text.h"
+#include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/units.h"
@@ -78,15 +78,29 @@ Asked askUntilDecided(wchar_t const* keywords, Ask ask, int flags = 0) {
 }  // namespace
 
 Answer<TzString> askText(wchar_t const* question, TzString const& defaultText) {
-    TzString const prompt = defaultText.isEmpty() ? TzString::formatted(L"\n%ls: ", question)
-                                                  : withDefault(question, defaultText);
+    return askName(question, {}, defaultText);
+}
+
+Answer<TzString>
+askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultName) {
+    TzString const prompt = defaultName.isEmpty() ? TzString::formatted(L"\n%ls: ", question)
+                                                  : withDefault(question, defaultName);
     Answer<TzString> answer;
-    answer.asked = askUntilDecided(nullptr, [&] { return tzedGetString(1, prompt, answer.value); });
+    answer.asked = askUntilDecided(nullptr, [&] {
+        tzhost::commandLine().offer(offer);
+        return tzedGetString(1, prompt, answer.value);
+    });
     if (answer.asked == Asked::given && answer.value.isEmpty()) {
-        answer.value = defaultText;
-        if (defaultText.isEmpty()) answer.asked = Asked::empty;
+        answer.value = defaultName;
+        if (defaultName.isEmpty()) answer.asked = Asked::empty;
     }
     return answer;
+}
+
+std::optional<std::filesystem::path> askFile(wchar_t const* question, TzString const& defaultFile) {
+    Answer<TzString> const file = askName(question, {tzhost::Offer::Kind::files}, defaultFile);
+    if (file.asked != Asked::given) return std::nullopt;
+    return std::filesystem::path(file.value.toUtf8());
 }
 
 Answer<TzString>

@@ -1,5 +1,9 @@
 #pragma once
 
+#include <filesystem>
+#include <optional>
+
+#include "host/command_line/answer_source.h"
 #include "tz/ge/point3d.h"
 #include "tz/text/string.h"
 
@@ -19,6 +23,12 @@ struct Answer {
 // Without a default an empty answer is `empty`; with one it gives the default.
 [[nodiscard]] Answer<TzString> askText(wchar_t const* question,
                                        TzString const& defaultText = TzString());
+// The same for a name, which completion may be offered for (choices.h).
+[[nodiscard]] Answer<TzString>
+askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultName = TzString());
+// The name of a file; nothing for none.
+[[nodiscard]] std::optional<std::filesystem::path>
+askFile(wchar_t const* question, TzString const& defaultFile = TzString());
 // The global word of the keyword; the default is one of the words. `keywords` are the global words,
 // blanks between them; their local text has the local ones in the same order, and those are shown.
 [[nodiscard]] Answer<TzString>

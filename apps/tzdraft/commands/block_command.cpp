@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
@@ -104,7 +105,7 @@ void moveInto(TzDbObjectId id, std::vector<TzDbObjectId> const& entities, TzGePo
 }  // namespace
 
 void blockCommand() {
-    Answer<TzString> const name = askText(localText(L"Name of the new block"));
+    Answer<TzString> const name = askName(localText(L"Name of the new block"), offerBlocks());
     if (name.asked != Asked::given) return;
     PointAnswer const base = askPoint(localText(L"Base point"), nullptr);
     if (base.asked != Asked::given) return;

@@ -2,56 +2,66 @@
 
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/unsaved.h"
 #include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
-#include "tz/ed/print.h"
+#include "host/command_line/command_line.h"
+#include "host/text/utf8.h"
 
 namespace tzdraft {
 namespace {
 
-void printError(std::string const& error) {
-    tzutPrintf(L"\n%ls\n", TzString::fromUtf8(error).kwszPtr());
+// The whole path, as far as the system tells.
+std::wstring shownPath(std::filesystem::path const& file) {
+    std::error_code unknown;
+    std::filesystem::path const whole = std::filesystem::absolute(file, unknown);
+    return tzhost::fromUtf8((unknown ? file : whole).lexically_normal().string());
 }
 
-// Asks for a file and hands it to an operation of the session.
+// Hands a file to an operation of the session. A person is told what was done, since the name may
+// have been proposed, completed or relative; a failure is told to everybody.
 template <class Operation>
-void withFile(wchar_t const* question, TzString const& defaultFile, Operation operation) {
-    Answer<TzString> const file = askText(question, defaultFile);
-    if (file.asked != Asked::given) return;
+void doWith(std::filesystem::path const& file, wchar_t const* done, Operation operation) {
+    tzhost::CommandLine& line = tzhost::commandLine();
     std::string error;
-    if (!operation(std::filesystem::path(file.value.toUtf8()), error)) printError(error);
+    if (!operation(file, error)) {
+        line.sayFailure(tzhost::fromUtf8(error));
+    } else if (line.isPerson()) {
+        line.say(TzString::formatted(localText(done), shownPath(file).c_str()).str());
+    }
 }
 
 }  // namespace
 
 void newCommand() {
-    Session::current().makeNew();
+    if (mayReplace()) Session::current().makeNew();
 }
 
 void openCommand() {
-    withFile(localText(L"Drawing to open"), TzString(),
-             [](std::filesystem::path const& file, std::string& error) {
-                 return Session::current().open(file, error);
-             });
+    auto const file = askFile(localText(L"Drawing to open"));
+    if (!file || !mayReplace()) return;
+    doWith(*file, forLocalText(L"Opened: %ls."), [](auto const& from, std::string& error) {
+        return Session::current().open(from, error);
+    });
 }
 
 void saveCommand() {
     TzString const present = TzString::fromUtf8(Session::current().drawing().file().string());
-    withFile(localText(L"Save drawing as"), present,
-             [](std::filesystem::path const& file, std::string& error) {
-                 return Session::current().save(file, error);
-             });
+    auto const file = askFile(localText(L"Save drawing as"), present);
+    if (!file || !mayOverwrite(*file)) return;
+    doWith(*file, forLocalText(L"Saved: %ls."),
+           [](auto const& to, std::string& error) { return Session::current().save(to, error); });
 }
 
 void plotCommand() {
-    withFile(localText(L"File to plot to"), TzString(),
-             [](std::filesystem::path const& file, std::string& error) {
-                 return Session::current().plot(file, error);
-             });
+    auto const file = askFile(localText(L"File to plot to"));
+    if (!file) return;
+    doWith(*file, forLocalText(L"Plotted: %ls."),
+           [](auto const& to, std::string& error) { return Session::current().plot(to, error); });
 }
 
 void quitCommand() {
-    Session::current().quit();
+    if (mayLeave()) Session::current().quit();
 }
 
 }  // namespace tzdraft

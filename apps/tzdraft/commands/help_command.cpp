@@ -3,9 +3,11 @@
 
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/help_topics.h"
 #include "apps/tzdraft/local_text.h"
 #include "host/runtime/command_stack.h"
+#include "host/runtime/documents.h"
 #include "tz/ed/print.h"
 
 namespace tzdraft {
@@ -31,14 +33,24 @@ void listCommands() {
     tzutPrintf(L"\n");
 }
 
+// The name under which a command or a function is there now; empty for anything else. Topics
+// outlive the module that registered them, and its help file tells about more than it registers.
+TzString registeredName(TzString const& typed) {
+    if (auto const* const command = tzhost::commandStack().find(typed)) return command->globalName;
+    tzhost::Document const* const document = tzhost::documents().current();
+    auto const* const function = document ? document->functions.find(typed) : nullptr;
+    return function ? function->name : TzString();
+}
+
 }  // namespace
 
 void helpCommand() {
-    Answer<TzString> const name = askText(localText(L"Command, or Enter for the list"));
+    Answer<TzString> const name =
+        askName(localText(L"Command, or Enter for the list"), offerCommands());
     if (name.isCancelled()) return;
     if (name.asked == Asked::empty) return listCommands();
-    tzhost::Command const* const command = tzhost::commandStack().find(name.value);
-    std::wstring const text = helpFor(command ? command->globalName : name.value);
+    TzString const registered = registeredName(name.value);
+    std::wstring const text = registered.isEmpty() ? std::wstring() : helpFor(registered);
     if (text.empty()) {
         tzutPrintf(localText(L"\nThere is no help on \"%ls\".\n"), name.value.kwszPtr());
     } else {

@@ -2,6 +2,7 @@
 
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/local_text.h"
@@ -110,7 +111,7 @@ void postWith(std::unique_ptr<TzDbBlockReference> reference, std::vector<Wanted>
 }  // namespace
 
 void insertCommand() {
-    Answer<TzString> const name = askText(localText(L"Block to insert"));
+    Answer<TzString> const name = askName(localText(L"Block to insert"), offerBlocks());
     if (name.asked != Asked::given) return;
     TzDbObjectId const block = blockNamed(name.value);
     if (block.isNull()) {

@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/color_text.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/local_text.h"
@@ -32,7 +33,7 @@ void makeCurrent(TzDbObjectId layer) {
 
 bool make() {
     Answer<TzString> const name =
-        askText(localText(L"Name of the new layer, which becomes current"));
+        askName(localText(L"Name of the new layer, which becomes current"), offerLayers());
     if (name.asked != Asked::given) return !name.isCancelled();
     TzDbLayerTable* table = nullptr;
     if (Session::current().drawing().getLayerTable(table, TzDb::kForWrite) != Tzad::eOk)
@@ -46,7 +47,8 @@ bool make() {
 }
 
 bool set() {
-    Answer<TzString> const name = askText(localText(L"Layer to make current"), currentLayerName());
+    Answer<TzString> const name =
+        askName(localText(L"Layer to make current"), offerLayers(), currentLayerName());
     if (name.asked == Asked::given) makeCurrent(layerNamed(name.value));
     return !name.isCancelled();
 }
@@ -54,7 +56,7 @@ bool set() {
 // Changes the layer that the user names.
 template <class Change>
 bool changeNamed(wchar_t const* question, Change change) {
-    Answer<TzString> const name = askText(question, currentLayerName());
+    Answer<TzString> const name = askName(question, offerLayers(), currentLayerName());
     if (name.asked != Asked::given) return !name.isCancelled();
     TzDbObjectId const id = layerNamed(name.value);
     Opened<TzDbLayerTableRecord> const layer(id, TzDb::kForWrite);

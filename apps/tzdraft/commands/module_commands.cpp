@@ -6,9 +6,8 @@
 namespace tzdraft {
 
 void loadCommand() {
-    Answer<TzString> const file =
-        askText(localText(L"Module to load"), Session::current().moduleName());
-    if (file.asked == Asked::given) Session::current().loadLater(file.value.toUtf8());
+    auto const file = askFile(localText(L"Module to load"), Session::current().moduleName());
+    if (file) Session::current().loadLater(*file);
 }
 
 void unloadCommand() {

@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/local_text.h"
 #include "host/command_line/command_line.h"
 #include "host/settings/variable_table.h"
@@ -34,7 +35,7 @@ tzhost::WriteResult write(TzString const& name, std::wstring const& value) {
 }  // namespace
 
 void setvarCommand() {
-    Answer<TzString> const name = askText(localText(L"Variable name or [?]"));
+    Answer<TzString> const name = askName(localText(L"Variable name or [?]"), offerVariables());
     if (name.asked != Asked::given) return;
     if (name.value == L"?") return listVariables();
     tzhost::Variables& variables = tzhost::Variables::instance();

@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/local_text.h"
 #include "apps/tzdraft/session.h"
@@ -139,7 +140,7 @@ void styleCommand() {
                                                        TzDb::kForRead);
         if (present) name = present->getName();
     }
-    if (!take(askText(localText(L"Text style name"), name), name)) return;
+    if (!take(askName(localText(L"Text style name"), offerStyles(), name), name)) return;
     StyleAnswers values = startingValues(name);
     if (!askAll(values)) return;
     TzDbObjectId const id = styleNamed(name);

@@ -1,0 +1,54 @@
+#include "apps/tzdraft/commands/unsaved.h"
+
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/session.h"
+#include "host/command_line/command_line.h"
+#include "host/text/utf8.h"
+
+namespace tzdraft {
+namespace {
+
+// Says what it is about, and asks; no is the default.
+bool isMeant(wchar_t const* what, std::wstring const& about, wchar_t const* question) {
+    tzhost::commandLine().say(TzString::formatted(localText(what), about.c_str()).str());
+    return askYesNo(localText(question), false).value;
+}
+
+std::wstring listed(std::vector<std::wstring> const& names) {
+    std::wstring list;
+    for (std::wstring const& each : names)
+        list += (list.empty() ? L"" : L", ") + each;
+    return list;
+}
+
+}  // namespace
+
+bool mayLeave() {
+    Session const& session = Session::current();
+    if (!tzhost::commandLine().isPerson() || session.savesAtEnd()) return true;
+    std::vector<std::wstring> const names = session.unsaved();
+    return names.empty() || isMeant(forLocalText(L"Changes are not saved: %ls."), listed(names),
+                                    forLocalText(L"Quit without saving them?"));
+}
+
+bool mayReplace() {
+    Session const& session = Session::current();
+    if (!tzhost::commandLine().isPerson() || session.savesAtEnd()) return true;
+    std::wstring const oldest = session.unsavedToDrop();
+    return oldest.empty() ||
+           isMeant(forLocalText(L"U keeps no more drawings; changes not saved would be lost: %ls."),
+                   oldest, forLocalText(L"Go on without saving them?"));
+}
+
+bool mayOverwrite(std::filesystem::path const& file) {
+    std::error_code unknown;
+    if (!tzhost::commandLine().isPerson() || Session::current().isOwn(file) ||
+        !std::filesystem::is_regular_file(file, unknown)) {
+        return true;
+    }
+    return isMeant(forLocalText(L"There is a file of that name: %ls."),
+                   tzhost::fromUtf8(file.string()), forLocalText(L"Replace it?"));
+}
+
+}  // namespace tzdraft

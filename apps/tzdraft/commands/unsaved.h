@@ -1,0 +1,18 @@
+#pragma once
+
+#include <filesystem>
+
+// Questions that keep a person from losing work. Each says what would be lost and returns whether
+// to go on; Enter and Ctrl-C stay. A script means what it says, so that nothing asks there.
+namespace tzdraft {
+
+// Whether the session may end: with --save it may.
+[[nodiscard]] bool mayLeave();
+// Whether another drawing may take the place of the open one. Only the oldest one that U could
+// bring back is lost by that, if there are as many as are kept.
+[[nodiscard]] bool mayReplace();
+// Whether a file may be written over: it is not there yet, this session opened or wrote it, or the
+// person says so.
+[[nodiscard]] bool mayOverwrite(std::filesystem::path const& file);
+
+}  // namespace tzdraft
