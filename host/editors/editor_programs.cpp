@@ -42,7 +42,7 @@ EditorConfiguration& editorConfiguration() {
 
 std::string textEditorProgram() {
     std::string const& configured = editorConfiguration().textEditor;
-    if (!configured.empty() || commandLine().isScripted()) return configured;
+    if (!configured.empty() || !commandLine().isPerson()) return configured;
     for (char const* const name : kUsualEditors) {
         if (std::string program = findProgram(name); !program.empty()) return program;
     }

@@ -74,7 +74,7 @@ TEST(Programs, GetTheSignalThatEndsTheSession) {
 class Terminal : public tzhost::AnswerSource {
 public:
     tzhost::Answer next(tzhost::AnswerRequest const&) override { return {}; }
-    [[nodiscard]] bool isTerminal() const override { return true; }
+    [[nodiscard]] bool isPerson() const override { return true; }
 };
 
 // There used to be no editor without a word of the user's.

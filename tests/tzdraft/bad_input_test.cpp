@@ -123,7 +123,7 @@ constexpr BadRow kUnusable[] = {
     {"ModuleMissing",    "--module {}/nosuch.tzx",      2,
      "{}/nosuch.tzx: the module cannot be loaded: {}/nosuch.tzx: cannot open shared object file: "
      "No such file or directory\n"                                                                              },
-    {"ScriptLong",       "--script {long}",             2, "{long}: the script cannot be read"},
+    {"ScriptLong",       "--script {long}",             2, "{long}: the script cannot be read"                  },
     {"ModuleDamaged",    "--module {}/text.txt",        2, "{}/text.txt: the module cannot be loaded"           },
     {"ModuleOther",      "--module {lib}/libtz.so.1",   2, "{lib}/libtz.so.1: this is no module"                },
     {"ResourcesMissing", "--resources {}/nosuch.dll",   2, "{}/nosuch.dll: the resource library is"             },

@@ -27,7 +27,7 @@ void listVariables() {
 tzhost::WriteResult write(TzString const& name, std::wstring const& value) {
     tzhost::Variables& variables = tzhost::Variables::instance();
     bool const choosesProgram = name.compareNoCase(L"MTEXTED") == 0;
-    if (choosesProgram && tzhost::commandLine().isScripted())
+    if (choosesProgram && !tzhost::commandLine().isPerson())
         return variables.overrideFromText(name.str(), value);
     return variables.setFromText(name.str(), value, tzhost::Writer::user);
 }
