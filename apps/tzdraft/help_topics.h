@@ -4,7 +4,7 @@
 
 #include "tz/text/string.h"
 
-// The texts behind the help that commands and functions registered.
+// The texts of the help topics that commands and functions registered.
 //
 // A module registers topics by name. Their texts stand in a file beside the module, with its name
 // and the ending ".help": UTF-8, each topic a line "[NAME]" and the lines up to the next one, the

@@ -8,7 +8,7 @@
 #include "host/command_line/answer_source.h"
 
 // The program from its options to its exit status, also for tests, which run it in their own
-// process: each run begins with everything at its start and leaves nothing behind.
+// process: each run begins from scratch and leaves nothing that the next one could see.
 namespace tzdraft {
 
 struct Screens {

@@ -71,7 +71,7 @@ void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
         tzhost::documents().close();
     }
     std::swap(drawing_, drawing);
-    setVariables();  // ahead of what the drawing itself shows in them
+    setVariables();  // before the drawing itself shows its style in them
     tzhost::setWorkingDrawing(drawing_.get());
     if (drawing) retired_.push_back(std::move(drawing));
     if (isInCommand_) drawing_->undoLog().begin();

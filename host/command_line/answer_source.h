@@ -5,7 +5,7 @@
 // time.
 //
 // A source decides what is special in a line for the kind of question at hand and gives everything
-// else back as it was written. It never throws but for memory.
+// else back as it was written. It throws for want of memory alone.
 
 #include <optional>
 #include <string>

@@ -9,7 +9,7 @@
 //   line.attach();
 //   while (auto command = line.readCommand()) run(*command);
 //
-// Not thread-safe. Never throws but for memory.
+// Not thread-safe. Throws for want of memory alone.
 
 #include <functional>
 #include <optional>

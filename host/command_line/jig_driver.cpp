@@ -91,7 +91,7 @@ void TzEdJigDriver::redraw() const {
 }
 
 TzEdJig::DragStatus TzEdJigDriver::run() {
-    // The first sample comes ahead of the prompt, since a jig may set its keywords there.
+    // The first sample comes before the prompt, since a jig may set its keywords there.
     int const first = sample();
     if (!goesOn(first)) {
         int const status = tzhost::commandLine().failed(first);

@@ -5,7 +5,7 @@
 //
 //   auto const words = KeywordList::parse(L"Breite Höhe _Width Height");
 //   words->match(L"b");        // 0: the capitals abbreviate a word
-//   words->match(L"_height");  // 1: behind "_" only global words count
+//   words->match(L"_height");  // 1: after "_" only global words count
 //   words->global(1);          // "Height"
 
 #include <optional>
@@ -18,8 +18,8 @@ namespace tzhost {
 class KeywordList {
 public:
     KeywordList() = default;
-    // Words apart by blanks, the local ones first; behind " _" stand as many global ones, or no "
-    // _" and the words are both. Nothing when the two lists differ in length.
+    // Words with blanks between them, the local ones first; after " _" as many global ones.
+    // Without " _" the words are both. Nothing when the two lists differ in length.
     [[nodiscard]] static std::optional<KeywordList> parse(std::wstring_view list);
 
     // The index of the word that an answer means: the word itself, its capitals, or a leading part

@@ -20,7 +20,7 @@ constexpr double kInchesPerFoot = 12.0;
 // `value` is not negative in any of these.
 using LinearWriter = void (*)(std::string& text, double value, int precision);
 
-// Adds feet, when there are any, in front of `inches` whose digits up to the point or blank are
+// Adds feet, when there are any, before `inches` whose digits up to the point or blank are
 // whole.
 void writeFeet(std::string& text, std::string inches, std::size_t wholeDigits) {
     std::string feet = inches.substr(0, wholeDigits);

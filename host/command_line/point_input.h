@@ -9,7 +9,7 @@
 
 namespace tzhost {
 
-// "x,y", "x,y,z", "distance<angle", each with "@" in front for one from `last`, or "@" alone for
+// "x,y", "x,y,z", "distance<angle", each after "@" for one from `last`, or "@" alone for
 // `last`. Lengths stand in any linear unit; a bare angle in the drawing's unit. Nothing for any
 // other text.
 [[nodiscard]] std::optional<TzGePoint3d> readPoint(std::wstring_view text, TzGePoint3d const& last);

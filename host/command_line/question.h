@@ -72,8 +72,8 @@ public:
     void setPrompt(std::wstring prompt) { prompt_ = std::move(prompt); }
     [[nodiscard]] Armed const& armed() const { return armed_; }
 
-    // The reader gets answers without blanks around them, but for a string question, which gets
-    // them as they are.
+    // The reader gets answers without blanks around them; that of a string question gets
+    // the line as it is.
     [[nodiscard]] int ask(Reader const& read);
 
 private:

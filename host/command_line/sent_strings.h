@@ -1,7 +1,7 @@
 #pragma once
 
 // Answers from the strings that were sent to a document's command line, as if they had been typed:
-// a line end ends an answer, and so does a blank that does not stand behind a comma. The end of the
+// a line end ends an answer, and so does a blank that does not follow a comma. The end of the
 // strings ends the last answer. The character 3 cancels.
 
 #include <string>

@@ -2,7 +2,7 @@
 
 // What stands on the text screen, and where its cursor is. A prompt or a line of the host's starts
 // on a new line unless the cursor stands at the start of one; so does a message that asks for it
-// with a line feed in front, and the first message after an answer. The Enter of an answer moves
+// with a leading line feed, and the first message after an answer. The Enter of an answer moves
 // nothing.
 //
 //   Transcript transcript;
@@ -18,7 +18,7 @@
 
 namespace tzhost {
 
-// What a text on the screen is. The line feed ahead of a prompt or a line belongs to it.
+// What a text on the screen is. The line feed before a prompt or a line belongs to it.
 enum class Shown {
     prompt,
     answer,

@@ -33,7 +33,7 @@ public:
     // Digits with a fraction and an exponent, without a sign. A number too small to be held reads
     // as 0.
     bool readNumber(double& value);
-    // A number, a fraction such as 1/2, or both, apart by blanks or a dash.
+    // A number, a fraction such as 1/2, or both with blanks or a dash between them.
     bool readMixed(double& value);
 
 private:

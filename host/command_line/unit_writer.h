@@ -6,7 +6,7 @@
 
 namespace tzhost {
 
-// A finite number with that many decimals, as "%.*f" writes it, but without a sign in front of a
+// A finite number with that many decimals, as "%.*f" writes it, but without a sign before a
 // zero.
 void writeFixed(std::string& text, double value, int decimals);
 // The same as "%.*E" writes it, with at least two digits of exponent.

@@ -21,7 +21,7 @@ void clearCommandHooks();
 
 enum class AnswersFrom { user, script };
 
-// Runs a command: CMDACTIVE, the hooks, the events, and the audit behind it. Returns what the
+// Runs a command: CMDACTIVE, the hooks, the events, and the audit after it. Returns what the
 // command left over; an exception of the command passes on after all of that.
 Audit runCommand(Command const& command, AnswersFrom answers);
 

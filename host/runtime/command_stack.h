@@ -36,7 +36,7 @@ public:
     int removeGroup(wchar_t const* group) override;
 
     // The command that a typed name means: a local name first, then a global one, without regard to
-    // case; "." and "_" ahead of the name are skipped, and "_" admits the global name alone. Null
+    // case; "." and "_" before the name are skipped, and "_" admits the global name alone. Null
     // when there is none.
     [[nodiscard]] Command const* find(TzString const& typed) const;
     [[nodiscard]] std::deque<Command> const& commands() const { return commands_; }

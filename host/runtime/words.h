@@ -1,6 +1,6 @@
 #pragma once
 
-// Words on a line, apart by blanks or tabs.
+// Words on a line, with blanks or tabs between them.
 //
 //   for (std::wstring_view const word : splitWords(L" w 0,0 5,5"))
 //       if (isSameWord(word, L"W")) ...

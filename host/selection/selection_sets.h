@@ -12,7 +12,7 @@ void nameNewSet(EntityIds ids, long long* name);
 void nameNoSet(long long* name);
 // The entities of a set as they were selected, erased ones included; null for a name of no set.
 [[nodiscard]] EntityIds const* findSet(long long const* name);
-// Frees the sets that a command left behind. Called when it has ended and its audit has counted
+// Frees the sets that a command did not free. Called when it has ended and its audit has counted
 // them.
 void freeAllSets();
 

@@ -91,7 +91,7 @@ wchar_t const* asGlobal(wchar_t const* words) {
     return words;
 }
 
-// The row that a line means: local words go ahead of global ones, and "_word" is only global.
+// The row that a line means: a local word wins over a global one, and "_word" is only global.
 WordRow const* rowMeant(Words const& words) {
     std::wstring_view word = words.front();
     if (word.starts_with(L'_')) return rowOf(word.substr(1), words.size(), asGlobal);

@@ -59,7 +59,7 @@ private:
         return letters_ == Case::ignored ? tzToLower(c) : c;
     }
 
-    // Whether the element of the pattern at `in` takes a character; `next` is the element behind
+    // Whether the element of the pattern at `in` takes a character; `next` is the element after
     // it.
     [[nodiscard]] bool matchesOne(wchar_t c, std::size_t in, std::size_t& next) const {
         if (in >= pattern_.size()) return false;

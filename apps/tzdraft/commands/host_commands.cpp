@@ -16,7 +16,7 @@ struct HostCommand {
     wchar_t const* name;  // the global one; its local text is the local one
     void (*body)();
     int flags;            // as the command stack takes them
-    wchar_t const* help;  // one sentence, or several apart by line feeds
+    wchar_t const* help;  // one sentence a line
 };
 
 // Flags: whether the command sees the selection made before it.

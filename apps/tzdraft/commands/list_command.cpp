@@ -104,7 +104,7 @@ bool listAs(TzDbEntity const& entity, void (*list)(Entity const&)) {
     return as != nullptr;
 }
 
-// "TzDbLine" and so on: the name behind the prefix is the drafter's word.
+// "TzDbLine" and so on: the name after the prefix is the drafter's word.
 std::wstring kindOf(TzDbEntity const& entity) {
     std::wstring name = std::wstring(entity.isA()->name()).substr(4);
     for (wchar_t const* const each : kKinds) {
