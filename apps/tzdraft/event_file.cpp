@@ -1,6 +1,6 @@
 #include "apps/tzdraft/event_file.h"
 
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/base/event_sink.h"
 
 namespace tzdraft {

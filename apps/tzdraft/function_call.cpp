@@ -3,8 +3,8 @@
 #include <memory>
 #include <string>
 
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/database/open_state.h"
 #include "host/runtime/functions.h"
@@ -38,7 +38,7 @@ Arguments entityArgument(std::wstring_view digits) {
     auto const handle = tzhost::readHandle(tzhost::toUtf8(digits));
     Arguments argument(handle ? tzutNewRb(Tzad::eResultEntityName) : nullptr);
     if (!argument) return nullptr;
-    TzDbObjectId const id = Session::current().drawing().objectAt(*handle);
+    TzDbObjectId const id = ProgramSession::current().drawing().objectAt(*handle);
     if (tzdbGetTzsName(argument->resval.rlname, id) != Tzad::eOk) return nullptr;
     return argument;
 }

@@ -4,8 +4,8 @@
 #include <cstring>
 #include <utility>
 
-#include "apps/tzdraft/options.h"
-#include "apps/tzdraft/program.h"
+#include "apps/tzdraft/draft_options.h"
+#include "apps/tzdraft/draft_program.h"
 #include "host/files/standard_streams.h"
 
 namespace {

@@ -2,7 +2,7 @@
 
 #include <cstdlib>
 
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/editors/editor_programs.h"
 #include "host/files/file_bytes.h"

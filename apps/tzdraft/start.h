@@ -3,7 +3,7 @@
 #include <filesystem>
 #include <string>
 
-#include "apps/tzdraft/options.h"
+#include "apps/tzdraft/draft_options.h"
 
 // What the host needs to know before a drawing opens.
 namespace tzdraft {

@@ -24,10 +24,10 @@ struct SelectionAnswer {
     EntityIds ids;
 };
 
-// Handles with blanks between them, each taken once; "w" or "c" with two points; "all", "last", "previous",
-// "add", "remove"; or one point, which takes the newest entity whose box holds it. Words count
-// without case, their first letters and a leading "_" too. Points become the last point. Nothing
-// for any other text, and for handles of what is not in the active space.
+// Handles with blanks between them, each taken once; "w" or "c" with two points; "all", "last",
+// "previous", "add", "remove"; or one point, which takes the newest entity whose box holds it.
+// Words count without case, their first letters and a leading "_" too. Points become the last
+// point. Nothing for any other text, and for handles of what is not in the active space.
 [[nodiscard]] std::optional<SelectionAnswer> readSelection(std::wstring_view text);
 
 }  // namespace tzhost

@@ -5,7 +5,7 @@
 #include <deque>
 
 #include "host/runtime/documents.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tz/ed/print.h"
 #include "tz/ed/prompts.h"
 #include "tz/rx/status.h"
@@ -13,7 +13,7 @@
 namespace {
 
 using tzhost::commandLine;
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 // Every command up to the end of the input, apart by bars.
 std::wstring commands() {
@@ -24,8 +24,8 @@ std::wstring commands() {
 }
 
 TEST(IdlePrompt, ReadsCommandsAndStepsOverTheRest) {
-    Session const session(";; a comment\nMTEXT\n\n^C\n<<<\nx\n>>>\n" + std::string(40000, 'x') +
-                          "\nQUIT");
+    ScriptedSession const session(";; a comment\nMTEXT\n\n^C\n<<<\nx\n>>>\n" +
+                                  std::string(40000, 'x') + "\nQUIT");
     EXPECT_EQ(commands(), L"MTEXT||QUIT|");
     EXPECT_EQ(session.errors(), L"script:5: no editor takes this block\n");
     EXPECT_EQ(session.transcript(), L"Command: MTEXT\nCommand: \nCommand: ^C\nCommand: \n"
@@ -34,7 +34,7 @@ TEST(IdlePrompt, ReadsCommandsAndStepsOverTheRest) {
 
 // Names used to reach the terminal with what it obeys in them.
 TEST(Screen, ShowsControlCharactersAndKeepsErrorsInALine) {
-    Session const session("a\rb\n<<<\n>>>\n");
+    ScriptedSession const session("a\rb\n<<<\n>>>\n");
     tzutPrintf(L"\nL\x1B[6n\x9B\t\x7F\n");
     TzString text;
     EXPECT_EQ(tzedGetString(1, L"\nName <\a>: ", text), Tzad::ePromptNormal);
@@ -47,14 +47,14 @@ TEST(Screen, ShowsControlCharactersAndKeepsErrorsInALine) {
 }
 
 TEST(IdlePrompt, EndsWithoutAFault) {
-    Session const session("");
+    ScriptedSession const session("");
     EXPECT_EQ(commands(), L"");
     EXPECT_FALSE(commandLine().hasFailed());
     EXPECT_EQ(session.events(), "");
 }
 
 TEST(IdlePrompt, TakesSentStringsAheadOfTheScript) {
-    Session const session("from the script\n");
+    ScriptedSession const session("from the script\n");
     tzhost::documents().open(nullptr);
     auto* const document = tzhost::documents().current();
     ASSERT_EQ(tzDocManagerPtr()->sendStringToExecute(document, L"_TEST 1.5 ", true, false, true),
@@ -97,7 +97,7 @@ private:
 };
 
 TEST(Terminals, ShowEachLineOnce) {
-    Session const session("");
+    ScriptedSession const session("");
     std::wstring screen;
     Terminal terminal(screen, {L"MTEXT", L"b", L"7"});
     commandLine().setSource(&terminal);

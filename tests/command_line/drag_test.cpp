@@ -6,7 +6,7 @@
 #include "host/command_line/point_input.h"
 #include "host/database/drawing.h"
 #include "host/database/user_system.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tz/db/entity.h"
 #include "tz/ed/jig.h"
 #include "tz/ed/telemetry.h"
@@ -14,7 +14,7 @@
 
 namespace {
 
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 std::string shown(TzGePoint3d const& point) {
     return TzString::formatted(L"(%.6g,%.6g,%.6g)", point.x + 0.0, point.y + 0.0, point.z + 0.0)
@@ -83,7 +83,7 @@ protected:
 
     static void moveCursorHome() {
         tzhost::setUserSystem({});
-        Session const session("~0,0\n");
+        ScriptedSession const session("~0,0\n");
         (void)NotingJig().drag();
     }
 
@@ -114,7 +114,7 @@ constexpr DragRow kDrags[] = {
 
 class DragTable : public Drags, public testing::WithParamInterface<DragRow> {};
 TEST_P(DragTable, SamplesAndDraws) {
-    Session const session(std::string(GetParam().script) + "\n");
+    ScriptedSession const session(std::string(GetParam().script) + "\n");
     tzhost::setLastPoint({10, 20, 30});
     NotingJig jig;
     jig.controls = static_cast<TzEdJig::UserInputControls>(GetParam().controls);
@@ -126,7 +126,7 @@ INSTANTIATE_TEST_SUITE_P(Scripts, DragTable, testing::ValuesIn(kDrags), [](auto 
 });
 
 TEST_F(Drags, GoOnWhereTheCursorStands) {
-    Session const session("5,5\n\n6,6\n");
+    ScriptedSession const session("5,5\n\n6,6\n");
     NotingJig jig;
     EXPECT_EQ(jig.run(), "s(0,0,0) u d s(5,5,0) u d 0");
     // The jig sees no change, and the first sample is drawn all the same.
@@ -141,7 +141,7 @@ TEST_F(Drags, GoOnWhereTheCursorStands) {
 
 // It used to go through world coordinates and back, which rounded it.
 TEST_F(Drags, LeaveTheLastPointAsItWasTyped) {
-    Session const session("62.1,14.3\n");
+    ScriptedSession const session("62.1,14.3\n");
     ASSERT_TRUE(tzhost::setUserSystem({
         {100000.3, 7.7, 0},
         {0.8,      0.6, 0},
@@ -153,7 +153,7 @@ TEST_F(Drags, LeaveTheLastPointAsItWasTyped) {
 }
 
 TEST_F(Drags, EndWithWhatTheSamplerSays) {
-    Session const session("1,1\n2,2\n");
+    ScriptedSession const session("1,1\n2,2\n");
     NotingJig jig;
     jig.answer = TzEdJig::kOther;
     EXPECT_EQ(jig.run(), "s(0,0,0) -5");
@@ -167,7 +167,7 @@ TEST_F(Drags, EndWithWhatTheSamplerSays) {
 }
 
 TEST_F(Drags, KeepToTheAxesInOrthoMode) {
-    Session const session("7,3\n2,9\n2,9\n");
+    ScriptedSession const session("7,3\n2,9\n2,9\n");
     (void)drawing_->setOrthomode(true);
     NotingJig jig;
     jig.controls = TzEdJig::kGovernedByOrthoMode;
@@ -180,7 +180,7 @@ TEST_F(Drags, KeepToTheAxesInOrthoMode) {
 }
 
 TEST_F(Drags, EndUnderEndlessFaults) {
-    Session const session("1,1\n");
+    ScriptedSession const session("1,1\n");
     for (char const* const operation : {"TzEdJig::drag", "TzEdJig::acquirePoint"}) {
         static std::string_view failing;
         failing = operation;
@@ -198,7 +198,7 @@ TEST_F(Drags, EndUnderEndlessFaults) {
 }
 
 TEST_F(Drags, TellEvents) {
-    Session const session("~1,2\nW\n");
+    ScriptedSession const session("~1,2\nW\n");
     NotingJig jig;
     jig.keywords = L"Width";
     jig.controls = TzEdJig::kAccept3dCoordinates;

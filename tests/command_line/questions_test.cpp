@@ -6,7 +6,7 @@
 
 #include "host/base/fault_point.h"
 #include "host/command_line/point_input.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tz/ed/print.h"
 #include "tz/ed/prompt_objects.h"
 #include "tz/ed/prompts.h"
@@ -15,7 +15,7 @@
 
 namespace {
 
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 std::string numbers(std::initializer_list<double> values) {
     std::string text;
@@ -150,7 +150,7 @@ constexpr QuestionRow kQuestions[] = {
 
 class Questions : public testing::TestWithParam<QuestionRow> {};
 TEST_P(Questions, End) {
-    Session const session(std::string(GetParam().script) + "\n");
+    ScriptedSession const session(std::string(GetParam().script) + "\n");
     tzhost::setLastPoint({10, 20, 30});
     double const base[3] = {1, 1, 0};
     ASSERT_EQ(tzedInitGet(GetParam().flags, L"Breite Höhe _Width Height"), Tzad::ePromptNormal);
@@ -167,7 +167,7 @@ INSTANTIATE_TEST_SUITE_P(Answers, Questions, testing::ValuesIn(kQuestions), [](a
 });
 
 TEST(Question, WithoutBaseAsksForTwoPoints) {
-    Session const session("0,0\nx\n3,4\n10,10\n10,5\n");
+    ScriptedSession const session("0,0\nx\n3,4\n10,10\n10,5\n");
     EXPECT_EQ(kDistance(nullptr), "5100 5");
     EXPECT_EQ(kAngle(nullptr), "5100 4.71239");
     EXPECT_EQ(session.transcript(), L"? 0,0\nSecond point: x\nA length is needed, or a point.\n"
@@ -177,7 +177,7 @@ TEST(Question, WithoutBaseAsksForTwoPoints) {
 }
 
 TEST(Question, SpendsTheArmedFlags) {
-    Session const session("\n\nb\n");
+    ScriptedSession const session("\n\nb\n");
     ASSERT_EQ(tzedInitGet(1, L"Breite"), Tzad::ePromptNormal);
     ASSERT_EQ(tzedInitGet(0, nullptr), Tzad::ePromptNormal);
     EXPECT_EQ(askReal(nullptr), "5000");
@@ -188,7 +188,7 @@ TEST(Question, SpendsTheArmedFlags) {
 }
 
 TEST(Question, AtTheEndOfTheInputIsCancelled) {
-    Session const session("7\nx");
+    ScriptedSession const session("7\nx");
     EXPECT_EQ(askReal(nullptr), "5100 7");
     EXPECT_FALSE(tzhost::commandLine().hasFailed());
     EXPECT_EQ(askReal(nullptr), "-5002");
@@ -197,7 +197,7 @@ TEST(Question, AtTheEndOfTheInputIsCancelled) {
 }
 
 TEST(Question, ThatFailsWithoutEndIsCancelled) {
-    Session const session("1\n");
+    ScriptedSession const session("1\n");
     auto const before = tzhost::setFaultHook(
         [](std::string_view operation, int&) { return operation == "tzedGetReal"; });
     int rounds = 0;
@@ -213,14 +213,14 @@ TEST(Question, ThatFailsWithoutEndIsCancelled) {
 }
 
 TEST(Question, ReportsFaultsOfTheScript) {
-    Session const session("<<<\ntext\n>>>\n8\n");
+    ScriptedSession const session("<<<\ntext\n>>>\n8\n");
     EXPECT_EQ(askReal(nullptr), "5100 8");
     EXPECT_EQ(session.errors(), L"script:1: no editor takes this block\n");
     EXPECT_TRUE(tzhost::commandLine().hasFailed());
 }
 
 TEST(Question, TellsEvents) {
-    Session const session("x\nb\n");
+    ScriptedSession const session("x\nb\n");
     ASSERT_EQ(tzedInitGet(6, L"Breite _Width"), Tzad::ePromptNormal);
     EXPECT_EQ(kDistance(nullptr), "-5005");
     tzutPrintf(L"\n%d é", 5);
@@ -234,7 +234,7 @@ TEST(Question, TellsEvents) {
 }
 
 TEST(Transcript, EndsEachLineOnce) {
-    Session const session("5\n6\n\n7\n");
+    ScriptedSession const session("5\n6\n\n7\n");
     tzutPrintf(L"Height is %d", 1);
     (void)askReal(nullptr);
     tzutPrintf(L"\n");
@@ -252,7 +252,7 @@ TEST(Transcript, EndsEachLineOnce) {
 }
 
 TEST(PromptObjects, AskAgainAndAgain) {
-    Session const session("s\n\n\n_R\n45\n");
+    ScriptedSession const session("s\n\n\n_R\n45\n");
     TzEdPromptKeyword word;
     word.setMessageAndKeywords(L"Change: ", L"Style Rotate");
     EXPECT_EQ(word.getKeyword(), Tzad::ePromptNormal);
@@ -269,7 +269,7 @@ TEST(PromptObjects, AskAgainAndAgain) {
 }
 
 TEST(PromptObjects, GiveTheirDefault) {
-    Session const session("\n1,1\n");
+    ScriptedSession const session("\n1,1\n");
     TzEdPromptAngle angle(L"Angle: ");
     angle.setBasePoint({1, 0, 0});
     angle.setDefaultValue(2);

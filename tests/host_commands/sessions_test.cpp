@@ -3,7 +3,7 @@
 #include <fstream>
 #include <sstream>
 
-#include "apps/tzdraft/program.h"
+#include "apps/tzdraft/draft_program.h"
 #include "tests/support/session_cases.h"
 
 namespace {

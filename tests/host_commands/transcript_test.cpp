@@ -4,7 +4,7 @@
 #include <filesystem>
 #include <fstream>
 
-#include "apps/tzdraft/program.h"
+#include "apps/tzdraft/draft_program.h"
 
 namespace {
 

@@ -5,7 +5,7 @@
 #include <cstdlib>
 #include <optional>
 
-#include "apps/tzdraft/options.h"
+#include "apps/tzdraft/draft_options.h"
 #include "tests/support/program_run.h"
 
 namespace {

@@ -16,13 +16,13 @@ namespace {
 namespace fs = std::filesystem;
 using tztest::scratch;
 
-struct Session {
+struct LanguageSession {
     std::string screen;
     std::string drawing;
 };
 
 // Runs a script, on the drawing of its name if there is one.
-Session playFile(fs::path const& file, char const* language) {
+LanguageSession playFile(fs::path const& file, char const* language) {
     fs::path const saved = scratch("session.json");
     fs::path const settings = scratch("settings.json", "{}");
     std::vector<std::string> arguments{"--locale", language,      "--settings", settings.string(),
@@ -35,7 +35,7 @@ Session playFile(fs::path const& file, char const* language) {
     return {run.output, tztest::bytesOf(saved)};
 }
 
-Session play(char const* script, char const* language) {
+LanguageSession play(char const* script, char const* language) {
     return playFile(tztest::sourceFolder() / "tests/languages" / script, language);
 }
 

@@ -6,7 +6,7 @@
 #include "host/database/drawing.h"
 #include "host/runtime/documents.h"
 #include "host/settings/variables.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 
 // An open drawing with a script's answers, for tests that hold a text of their own and call the
 // module's code directly.
@@ -34,6 +34,6 @@ public:
     [[nodiscard]] std::wstring const& transcript() const { return session_.transcript(); }
 
 private:
-    tzhost::test::Session session_;
+    tzhost::test::ScriptedSession session_;
     std::unique_ptr<tzhost::Drawing> drawing_;
 };

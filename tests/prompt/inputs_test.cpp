@@ -12,12 +12,12 @@
 #include "module/prompt/point_input.h"
 #include "module/prompt/real_input.h"
 #include "module/prompt/string_input.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tests/prompt/texts.h"
 
 namespace {
 
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 enum class Default : bool { no, yes };
 
@@ -168,7 +168,7 @@ TEST_P(Inputs, AskAndRead) {
     std::string result;
     std::wstring transcript;
     {
-        Session const session(row.answer);
+        ScriptedSession const session(row.answer);
         result = row.ask(table, row.flags, row.given);
         transcript = session.transcript();
     }
@@ -186,7 +186,7 @@ INSTANTIATE_TEST_SUITE_P(Rows, Inputs, testing::ValuesIn(kAsks), [](auto const& 
 TEST(Questions, HandKeywordsAndFlagsToTheHost) {
     constexpr unsigned int kIds[] = {kManyWords, kWithComma, kTranslated};
     CKeywordTable table(kIds, 3);
-    Session const session("a\n");
+    ScriptedSession const session("a\n");
     CTzsRealInput input(0x85, table, L"");
     EXPECT_EQ(input.KeywordList(), L"Abc Twowords,Alias Höhe _Gh Twowords Height");
     EXPECT_EQ(input.PromptString(), L"A = (b c)/Two words/Höhe");
@@ -201,7 +201,7 @@ TEST(Questions, HandKeywordsAndFlagsToTheHost) {
 // Each asking forgets the answer before it.
 TEST(Questions, RememberTheLastAnswerAlone) {
     CKeywordTable none;
-    Session const session("first\n\n");
+    ScriptedSession const session("first\n\n");
     CTzsStringInput input(0, none, L"Pick", true);
     EXPECT_EQ(input.Prompt(), statusNormal);
     EXPECT_EQ(input.GetInput(), L"first");

@@ -5,13 +5,13 @@
 #include "host/base/fault_point.h"
 #include "host/database/drawing.h"
 #include "module/prompt/jig_input.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tests/prompt/texts.h"
 #include "tz/gi/draw.h"
 
 namespace {
 
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 // Follows the cursor and notes what the host does with it.
 class Preview : public CTzsJigEntity {
@@ -74,7 +74,7 @@ constexpr EndRow kEnds[] = {
     {-6, statusError,   0          },
 };
 TEST_F(Drags, EndInAStatus) {
-    Session const session("");
+    ScriptedSession const session("");
     Preview preview;
     CKeywordTable table(kIds, 3);
     CTzsJigInput input(kControls, table, &preview, L"Drag");
@@ -87,7 +87,7 @@ TEST_F(Drags, EndInAStatus) {
 }
 
 TEST_F(Drags, LetThePreviewFollowTheCursor) {
-    Session const session("~1,2\n~1,2\nhöhe\n3,4\n");
+    ScriptedSession const session("~1,2\n~1,2\nhöhe\n3,4\n");
     Preview preview;
     CKeywordTable table(kIds, 3);
     CTzsJigInput input(kControls, table, &preview, L"Drag");
@@ -105,7 +105,7 @@ TEST_F(Drags, LetThePreviewFollowTheCursor) {
 }
 
 TEST_F(Drags, WithoutKeywordsAndOnThePaperOfTheirOwn) {
-    Session const session("\n");
+    ScriptedSession const session("\n");
     Preview preview;
     CKeywordTable none;
     CTzsJigInput input(kControls, none, &preview, L"Drag");

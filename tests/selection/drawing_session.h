@@ -6,7 +6,7 @@
 #include "host/base/audit.h"
 #include "host/database/drawing.h"
 #include "host/runtime/documents.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tz/db/block_table.h"
 #include "tz/db/mtext.h"
 #include "tz/db/shapes.h"

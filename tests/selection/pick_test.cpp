@@ -10,7 +10,7 @@
 namespace {
 
 using tzhost::test::OpenDrawing;
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 // A block "Inner" with a line from 0,0 to 1,1; "Outer" refers to it at 10,0 and holds a line from
 // 0,0 to 4,0; the model refers to "Outer" at 100,0 with an attribute at 100,50 and holds a line
@@ -101,7 +101,7 @@ constexpr PickRow kPicks[] = {
 class PickTable : public Picks, public testing::WithParamInterface<PickRow> {};
 
 TEST_P(PickTable, AtTheTop) {
-    Session const session(expanded(GetParam().script) + "\n");
+    ScriptedSession const session(expanded(GetParam().script) + "\n");
     tzhost::setLastPoint({7, 8, 9});
     ASSERT_EQ(tzedInitGet(1, L"Point"), Tzad::ePromptNormal);
     long long name[2] = {};
@@ -116,7 +116,7 @@ TEST_P(PickTable, AtTheTop) {
 }
 
 TEST_P(PickTable, Nested) {
-    Session const session(expanded(GetParam().script) + "\n");
+    ScriptedSession const session(expanded(GetParam().script) + "\n");
     ASSERT_EQ(tzedInitGet(1, L"Point"), Tzad::ePromptNormal);
     long long name[2] = {};
     double point[3] = {};
@@ -146,7 +146,7 @@ TEST_F(Picks, BackwardTextsAreWhereTheyAreDrawn) {
     ASSERT_EQ(tzdbOpenObject(style, id, TzDb::kForWrite), Tzad::eOk);
     EXPECT_EQ(style->setFlagBits(2), Tzad::eOk);
     EXPECT_EQ(style->close(), Tzad::eOk);
-    Session const session("99,50.5\n");
+    ScriptedSession const session("99,50.5\n");
     long long name[2] = {};
     double point[3] = {};
     EXPECT_EQ(tzedEntSel(nullptr, name, point), Tzad::ePromptNormal);
@@ -154,7 +154,7 @@ TEST_F(Picks, BackwardTextsAreWhereTheyAreDrawn) {
 }
 
 TEST_F(Picks, AtAGivenPointAskNothing) {
-    Session const session("");
+    ScriptedSession const session("");
     long long name[2] = {};
     double point[3] = {102, 0, 0};
     EXPECT_EQ(tzedNEntSelP(nullptr, name, point, 1, nullptr, nullptr), Tzad::ePromptNormal);

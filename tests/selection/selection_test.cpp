@@ -14,7 +14,7 @@ namespace {
 
 using tzhost::test::handlesOf;
 using tzhost::test::OpenDrawing;
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 // The drawing: line "1" from 0,0 to 2,0; line "2" from 5,5 to 7,7; text "3" about 20,20 turned by
 // 45 degrees; line "4" from 0,0 to 1,1 on a locked layer; line "5" in paper space.
@@ -76,7 +76,7 @@ protected:
                        wchar_t const* mode = nullptr,
                        void const* first = nullptr,
                        resbuf const* filter = nullptr) {
-        Session const session(expanded(script));
+        ScriptedSession const session(expanded(script));
         long long set[2] = {7, 7};
         int const status = tzedSSGet(mode, first, nullptr, filter, set);
         transcript_ = TzString(session.transcript()).toUtf8();
@@ -175,7 +175,7 @@ TEST_F(Selections, RememberThePreviousOne) {
 }
 
 TEST_F(Selections, TakeOverTheImpliedOne) {
-    Session const session(expanded("$1 $2\n\n"));
+    ScriptedSession const session(expanded("$1 $2\n\n"));
     long long set[2] = {};
     ASSERT_EQ(tzedSSGet(nullptr, nullptr, nullptr, nullptr, set), Tzad::ePromptNormal);
     EXPECT_EQ(tzedSSSetFirst(nullptr, set), Tzad::ePromptNormal);
@@ -357,7 +357,7 @@ private:
 
 TEST_F(Selections, HandKeywordsToTheCallbackAndGoOn) {
     KeywordCallback const callback;
-    Session const session(expanded("I\nright\n$1\noptionen\n\na\n_options\n^C\nall\n\n"));
+    ScriptedSession const session(expanded("I\nright\n$1\noptionen\n\na\n_options\n^C\nall\n\n"));
     ASSERT_EQ(tzedInitGet(1, L"Ausrichten Optionen _alIgnment Options"), Tzad::ePromptNormal);
     long long set[2] = {};
     wchar_t const* const pair[2] = {L"Select: ", L""};
@@ -368,7 +368,7 @@ TEST_F(Selections, HandKeywordsToTheCallbackAndGoOn) {
 }
 
 TEST_F(Selections, GiveKeywordsBackWithoutTheCallback) {
-    Session const session(expanded("$1\nopt\n"));
+    ScriptedSession const session(expanded("$1\nopt\n"));
     ASSERT_EQ(tzedInitGet(1, L"Options"), Tzad::ePromptNormal);
     long long set[2] = {};
     EXPECT_EQ(tzedSSGet(nullptr, nullptr, nullptr, nullptr, set), Tzad::ePromptKeyword);
@@ -378,7 +378,7 @@ TEST_F(Selections, GiveKeywordsBackWithoutTheCallback) {
 }
 
 TEST_F(Selections, SetsKnowTheirEnds) {
-    Session const session(expanded("$1\n\n"));
+    ScriptedSession const session(expanded("$1\n\n"));
     long long set[2] = {};
     ASSERT_EQ(tzedSSGet(nullptr, nullptr, nullptr, nullptr, set), Tzad::ePromptNormal);
     EXPECT_EQ(tzhost::audit().selectionSets, 1);

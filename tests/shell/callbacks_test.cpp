@@ -14,14 +14,14 @@
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
 #include "host/runtime/module_linker.h"
-#include "tests/command_line/session.h"
+#include "tests/command_line/scripted_session.h"
 #include "tz/db/mtext.h"
 #include "tz/mte/easy_object.h"
 
 namespace {
 
 using tzhost::AnswersFrom;
-using tzhost::test::Session;
+using tzhost::test::ScriptedSession;
 
 class Commands : public testing::Test {
 protected:
@@ -81,7 +81,8 @@ class WaysOfText : public Commands, public testing::WithParamInterface<WayRow> {
 TEST_P(WaysOfText, AreChosenByDialogsScriptAndMacro) {
     WayRow const& row = GetParam();
     auto& variables = tzhost::Variables::instance();
-    Session const session(row.editor ? "0,0\n5,5\n<<<\ntyped\n>>>\n" : "0,0\n5,5\ntyped\n\n");
+    ScriptedSession const session(row.editor ? "0,0\n5,5\n<<<\ntyped\n>>>\n"
+                                             : "0,0\n5,5\ntyped\n\n");
     ASSERT_TRUE(variables.set(L"DIALOGS", row.dialogs, tzhost::Writer::user).isDone());
     ASSERT_TRUE(variables.set(L"MACROPLAYBACK", row.macroPlayback, tzhost::Writer::user).isDone());
     tzhost::Command const* const command = tzhost::commandStack().find(row.command);
@@ -111,7 +112,7 @@ TEST_F(Commands, LeaveTheirMarkWhenAnExceptionPasses) {
 #endif
     auto const& variables = tzhost::Variables::instance();
     tzhost::Command const& command = *tzhost::commandStack().find(L"-MTEXT");
-    Session const session("0,0\n^C\n");
+    ScriptedSession const session("0,0\n^C\n");
     dragged = false;
     tzhost::setFaultHook(failMemoryAfterDrag);
     EXPECT_THROW((void)tzhost::runCommand(command, AnswersFrom::script), std::bad_alloc);
@@ -124,7 +125,7 @@ TEST_F(Commands, LeaveTheirMarkWhenAnExceptionPasses) {
 
 TEST_F(Commands, LeaveNothingWhenCancelled) {
     for (char const* script : {"^C\n", "0,0\n^C\n", "0,0\n5,5\n^C\n", "0,0\n5,5\ntyped\n^C\n"}) {
-        Session const session(script);
+        ScriptedSession const session(script);
         EXPECT_TRUE(tzhost::runCommand(*tzhost::commandStack().find(L"-MTEXT"), AnswersFrom::script)
                         .clean());
         EXPECT_EQ(texts(), "");

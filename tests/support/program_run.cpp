@@ -7,7 +7,7 @@
 #include <fstream>
 #include <sstream>
 
-#include "apps/tzdraft/program.h"
+#include "apps/tzdraft/draft_program.h"
 
 namespace tztest {
 namespace {

@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "apps/tzdraft/options.h"
+#include "apps/tzdraft/draft_options.h"
 
 // The program in the test's own process, with the real module and the resources of this build.
 //

@@ -4,7 +4,7 @@
 #include <cstdlib>
 #include <fstream>
 
-#include "apps/tzdraft/program.h"
+#include "apps/tzdraft/draft_program.h"
 #include "tests/support/event_lines.h"
 
 namespace tztest {

@@ -11,8 +11,8 @@
 #include <random>
 #include <string_view>
 
-#include "apps/tzdraft/program.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/draft_program.h"
+#include "apps/tzdraft/program_session.h"
 #include "host/command_line/script_source.h"
 #include "host/drawing_file/drawing_file.h"
 #include "host/runtime/command_runner.h"
@@ -53,7 +53,7 @@ std::filesystem::path scratchFile() {
 
 // The drawing as a file would hold it, without the last point; empty when it cannot be saved.
 std::string savedDrawing() {
-    if (!tzhost::writeDrawing(tzdraft::Session::current().drawing(), scratchFile()).empty())
+    if (!tzhost::writeDrawing(tzdraft::ProgramSession::current().drawing(), scratchFile()).empty())
         return {};
     std::ifstream in(scratchFile(), std::ios::binary);
     std::string text{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()};
@@ -156,7 +156,7 @@ tzhost::Answer SweepSource::begin(tzhost::Answer const& line) {
     recorded_ = {};
     plans_.clear();
     plan_ = 0;
-    undoSteps_ = tzdraft::Session::current().drawing().undoLog().steps();
+    undoSteps_ = tzdraft::ProgramSession::current().drawing().undoLog().steps();
     implied_ = tzhost::impliedSelection();
     before_ = savedDrawing();
     faults_.clear();
@@ -227,7 +227,7 @@ void SweepSource::finishTry() {
 }
 
 void SweepSource::takeBack() {
-    tzhost::UndoLog& log = tzdraft::Session::current().drawing().undoLog();
+    tzhost::UndoLog& log = tzdraft::ProgramSession::current().drawing().undoLog();
     while (log.steps() > undoSteps_ && log.takeBack()) {
     }
 }

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
 #include "tz/ed/prompts.h"

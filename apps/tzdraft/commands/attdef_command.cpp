@@ -1,6 +1,6 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/text_command.h"
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/database/geometry.h"
 #include "tz/ed/print.h"
 

@@ -4,8 +4,8 @@
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/database/user_system.h"
 #include "tz/db/block_table.h"
 #include "tz/db/field.h"
@@ -84,7 +84,8 @@ bool copyInto(TzDbBlockTableRecord& block, TzDbEntity const& entity, TzGeMatrix3
 // A new block of that name; the null id when the name is taken or no name of a block.
 TzDbObjectId newBlock(TzString const& name) {
     TzDbBlockTable* table = nullptr;
-    if (Session::current().drawing().getBlockTable(table, TzDb::kForWrite) != Tzad::eOk) return {};
+    if (ProgramSession::current().drawing().getBlockTable(table, TzDb::kForWrite) != Tzad::eOk)
+        return {};
     Opened<TzDbBlockTable> const opened(table);
     if (table->has(name)) return {};
     return findOrAdd<TzDbBlockTableRecord>(table, name);

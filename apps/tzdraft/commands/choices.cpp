@@ -1,6 +1,6 @@
 #include "apps/tzdraft/commands/choices.h"
 
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/symbol_names.h"
 #include "host/runtime/command_stack.h"
@@ -19,7 +19,7 @@ tzhost::Offer offerFrom(Names (*list)()) {
 }
 
 tzhost::Drawing& drawing() {
-    return Session::current().drawing();
+    return ProgramSession::current().drawing();
 }
 
 Names variableNames() {

@@ -1,7 +1,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/placing.h"
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "tz/db/shapes.h"
 
 namespace tzdraft {

@@ -3,8 +3,8 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/unsaved.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/text/utf8.h"
 
@@ -34,34 +34,37 @@ void doWith(std::filesystem::path const& file, wchar_t const* done, Operation op
 }  // namespace
 
 void newCommand() {
-    if (mayReplace()) Session::current().makeNew();
+    if (mayReplace()) ProgramSession::current().makeNew();
 }
 
 void openCommand() {
     auto const file = askFile(localText(L"Drawing to open"));
     if (!file || !mayReplace()) return;
     doWith(*file, forLocalText(L"Opened: %ls."), [](auto const& from, std::string& error) {
-        return Session::current().open(from, error);
+        return ProgramSession::current().open(from, error);
     });
 }
 
 void saveCommand() {
-    TzString const present = TzString::fromUtf8(Session::current().drawing().file().string());
+    TzString const present =
+        TzString::fromUtf8(ProgramSession::current().drawing().file().string());
     auto const file = askFile(localText(L"Save drawing as"), present);
     if (!file || !mayOverwrite(*file)) return;
-    doWith(*file, forLocalText(L"Saved: %ls."),
-           [](auto const& to, std::string& error) { return Session::current().save(to, error); });
+    doWith(*file, forLocalText(L"Saved: %ls."), [](auto const& to, std::string& error) {
+        return ProgramSession::current().save(to, error);
+    });
 }
 
 void plotCommand() {
     auto const file = askFile(localText(L"File to plot to"));
     if (!file) return;
-    doWith(*file, forLocalText(L"Plotted: %ls."),
-           [](auto const& to, std::string& error) { return Session::current().plot(to, error); });
+    doWith(*file, forLocalText(L"Plotted: %ls."), [](auto const& to, std::string& error) {
+        return ProgramSession::current().plot(to, error);
+    });
 }
 
 void quitCommand() {
-    if (mayLeave()) Session::current().quit();
+    if (mayLeave()) ProgramSession::current().quit();
 }
 
 }  // namespace tzdraft

@@ -5,7 +5,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/help_topics.h"
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
 #include "tz/ed/print.h"

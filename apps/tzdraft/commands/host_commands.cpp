@@ -3,7 +3,7 @@
 #include <array>
 
 #include "apps/tzdraft/commands/bodies.h"
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/runtime/command_stack.h"
 #include "tz/ed/command_stack.h"
 #include "tz/rx/registry.h"

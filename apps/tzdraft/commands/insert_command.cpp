@@ -5,8 +5,8 @@
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/record.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "tz/db/block_table.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
@@ -69,7 +69,7 @@ bool askValues(std::vector<Wanted>& all) {
 }
 
 TzDbObjectId blockNamed(TzString const& name) {
-    tzhost::Drawing const& drawing = Session::current().drawing();
+    tzhost::Drawing const& drawing = ProgramSession::current().drawing();
     TzDbObjectId const id = tzhost::Drawing::find(drawing.blockTableId(), name.str());
     bool const isSpace = id == drawing.modelSpace() || id == drawing.paperSpace();
     return isSpace ? TzDbObjectId() : id;

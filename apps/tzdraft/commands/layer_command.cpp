@@ -3,8 +3,8 @@
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/color_text.h"
 #include "apps/tzdraft/commands/record.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "tz/ed/print.h"
 
 namespace tzdraft {
@@ -13,7 +13,8 @@ namespace {
 TzDbObjectId layerNamed(TzString const& name) {
     TzDbLayerTable* table = nullptr;
     TzDbObjectId id;
-    if (Session::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk) return id;
+    if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk)
+        return id;
     Opened<TzDbLayerTable> const opened(table);
     if (table->getIdAt(name, id) != Tzad::eOk) {
         tzutPrintf(localText(L"\nThere is no layer \"%ls\".\n"), name.kwszPtr());
@@ -22,13 +23,14 @@ TzDbObjectId layerNamed(TzString const& name) {
 }
 
 TzString currentLayerName() {
-    Opened<TzDbLayerTableRecord> const layer(Session::current().drawing().clayer(), TzDb::kForRead);
+    Opened<TzDbLayerTableRecord> const layer(ProgramSession::current().drawing().clayer(),
+                                             TzDb::kForRead);
     return layer ? TzString(layer->getName()) : TzString();
 }
 
 void makeCurrent(TzDbObjectId layer) {
     if (!layer.isNull())
-        (void)Session::current().drawing().setClayer(layer);  // a layer's id is taken
+        (void)ProgramSession::current().drawing().setClayer(layer);  // a layer's id is taken
 }
 
 bool make() {
@@ -36,7 +38,7 @@ bool make() {
         askName(localText(L"Name of the new layer, which becomes current"), offerLayers());
     if (name.asked != Asked::given) return !name.isCancelled();
     TzDbLayerTable* table = nullptr;
-    if (Session::current().drawing().getLayerTable(table, TzDb::kForWrite) != Tzad::eOk)
+    if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForWrite) != Tzad::eOk)
         return true;
     Opened<TzDbLayerTable> const opened(table);
     TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name.value);
@@ -89,7 +91,8 @@ bool unlock() {
 bool list() {
     TzDbLayerTable* table = nullptr;
     TzDbSymbolTableIterator* found = nullptr;
-    if (Session::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk) return true;
+    if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk)
+        return true;
     Opened<TzDbLayerTable> const opened(table);
     if (table->newIterator(found) != Tzad::eOk) return true;
     std::unique_ptr<TzDbSymbolTableIterator> const walk(found);

@@ -4,7 +4,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/settings/variables.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"

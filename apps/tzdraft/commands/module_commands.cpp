@@ -1,17 +1,17 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 
 namespace tzdraft {
 
 void loadCommand() {
-    auto const file = askFile(localText(L"Module to load"), Session::current().moduleName());
-    if (file) Session::current().loadLater(*file);
+    auto const file = askFile(localText(L"Module to load"), ProgramSession::current().moduleName());
+    if (file) ProgramSession::current().loadLater(*file);
 }
 
 void unloadCommand() {
-    Session::current().unloadLater();
+    ProgramSession::current().unloadLater();
 }
 
 }  // namespace tzdraft

@@ -1,7 +1,7 @@
 #include "apps/tzdraft/commands/placing.h"
 
 #include "apps/tzdraft/commands/record.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
 #include "host/database/geometry.h"
 #include "host/database/user_system.h"
 #include "tz/db/block_table.h"
@@ -26,7 +26,7 @@ double UserPlane::rotation(double radians) const {
 }
 
 TzDbEntity* postOpen(std::unique_ptr<TzDbEntity> entity) {
-    Opened<TzDbBlockTableRecord> const space(Session::current().drawing().activeSpace(),
+    Opened<TzDbBlockTableRecord> const space(ProgramSession::current().drawing().activeSpace(),
                                              TzDb::kForWrite);
     TzDbObjectId id;
     if (!space || space->appendTzDbEntity(id, entity.get()) != Tzad::eOk) return nullptr;

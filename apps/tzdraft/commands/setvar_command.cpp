@@ -1,7 +1,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/settings/variable_table.h"
 #include "host/settings/variables.h"

@@ -2,8 +2,8 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/record.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "tz/db/extensions.h"
 #include "tz/ed/print.h"
 
@@ -111,7 +111,7 @@ Tzad::ErrorStatus write(TzDbTextStyleTableRecord& style, StyleAnswers const& val
 
 TzDbObjectId styleNamed(TzString const& name) {
     TzDbTextStyleTable* table = nullptr;
-    if (Session::current().drawing().getTextStyleTable(table, TzDb::kForWrite) != Tzad::eOk)
+    if (ProgramSession::current().drawing().getTextStyleTable(table, TzDb::kForWrite) != Tzad::eOk)
         return {};
     Opened<TzDbTextStyleTable> const opened(table);
     return findOrAdd<TzDbTextStyleTableRecord>(table, name);
@@ -121,7 +121,7 @@ TzDbObjectId styleNamed(TzString const& name) {
 StyleAnswers startingValues(TzString const& name) {
     TzDbTextStyleTable* table = nullptr;
     TzDbObjectId id;
-    if (Session::current().drawing().getTextStyleTable(table, TzDb::kForRead) != Tzad::eOk)
+    if (ProgramSession::current().drawing().getTextStyleTable(table, TzDb::kForRead) != Tzad::eOk)
         return {};
     Opened<TzDbTextStyleTable> const opened(table);
     StyleAnswers values;
@@ -136,8 +136,8 @@ StyleAnswers startingValues(TzString const& name) {
 void styleCommand() {
     TzString name;
     {
-        Opened<TzDbTextStyleTableRecord> const present(Session::current().drawing().textstyle(),
-                                                       TzDb::kForRead);
+        Opened<TzDbTextStyleTableRecord> const present(
+            ProgramSession::current().drawing().textstyle(), TzDb::kForRead);
         if (present) name = present->getName();
     }
     if (!take(askName(localText(L"Text style name"), offerStyles(), name), name)) return;
@@ -152,7 +152,7 @@ void styleCommand() {
     if (write(*style.get(), values) != Tzad::eOk) {
         tzutPrintf(localText(L"\nOne of these values cannot be kept; the others are.\n"));
     }
-    if (Session::current().drawing().setTextstyle(id) == Tzad::eOk) {
+    if (ProgramSession::current().drawing().setTextstyle(id) == Tzad::eOk) {
         tzutPrintf(localText(L"\n\"%ls\" is now the current text style.\n"), name.kwszPtr());
     }
 }

@@ -2,8 +2,8 @@
 
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/record.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/settings/variables.h"
 #include "tz/db/host_services.h"
 #include "tz/db/symbol_table.h"
@@ -13,7 +13,7 @@ namespace {
 
 // The height of a style that has one of its own, else 0.
 double heightOfStyle() {
-    Opened<TzDbTextStyleTableRecord> const style(Session::current().drawing().textstyle(),
+    Opened<TzDbTextStyleTableRecord> const style(ProgramSession::current().drawing().textstyle(),
                                                  TzDb::kForRead);
     return style ? style->textSize() : 0;
 }

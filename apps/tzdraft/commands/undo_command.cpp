@@ -1,12 +1,13 @@
 #include "apps/tzdraft/commands/bodies.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "tz/ed/print.h"
 
 namespace tzdraft {
 
 void undoCommand() {
-    if (!Session::current().undo()) tzutPrintf(localText(L"\nThere is nothing to take back.\n"));
+    if (!ProgramSession::current().undo())
+        tzutPrintf(localText(L"\nThere is nothing to take back.\n"));
 }
 
 }  // namespace tzdraft

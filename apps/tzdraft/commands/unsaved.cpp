@@ -1,8 +1,8 @@
 #include "apps/tzdraft/commands/unsaved.h"
 
 #include "apps/tzdraft/commands/ask.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/text/utf8.h"
 
@@ -25,7 +25,7 @@ std::wstring listed(std::vector<std::wstring> const& names) {
 }  // namespace
 
 bool mayLeave() {
-    Session const& session = Session::current();
+    ProgramSession const& session = ProgramSession::current();
     if (!tzhost::commandLine().isPerson() || session.savesAtEnd()) return true;
     std::vector<std::wstring> const names = session.unsaved();
     return names.empty() || isMeant(forLocalText(L"Changes are not saved: %ls."), listed(names),
@@ -33,7 +33,7 @@ bool mayLeave() {
 }
 
 bool mayReplace() {
-    Session const& session = Session::current();
+    ProgramSession const& session = ProgramSession::current();
     if (!tzhost::commandLine().isPerson() || session.savesAtEnd()) return true;
     std::wstring const oldest = session.unsavedToDrop();
     return oldest.empty() ||
@@ -43,7 +43,7 @@ bool mayReplace() {
 
 bool mayOverwrite(std::filesystem::path const& file) {
     std::error_code unknown;
-    if (!tzhost::commandLine().isPerson() || Session::current().isOwn(file) ||
+    if (!tzhost::commandLine().isPerson() || ProgramSession::current().isOwn(file) ||
         !std::filesystem::is_regular_file(file, unknown)) {
         return true;
     }

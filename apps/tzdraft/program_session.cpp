@@ -1,10 +1,10 @@
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
 
 #include <algorithm>
 #include <array>
 #include <utility>
 
-#include "apps/tzdraft/local_text.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/base/memory_faults.h"
 #include "host/command_line/command_line.h"
 #include "host/display/plot.h"
@@ -16,7 +16,7 @@
 namespace tzdraft {
 namespace {
 
-Session* running = nullptr;
+ProgramSession* running = nullptr;
 
 struct PlotEnding {
     char const* ending;
@@ -45,11 +45,11 @@ std::filesystem::path plainPath(std::filesystem::path const& file) {
 
 }  // namespace
 
-Session::Session() {
+ProgramSession::ProgramSession() {
     running = this;
 }
 
-Session::~Session() {
+ProgramSession::~ProgramSession() {
     if (drawing_) {
         tzhost::documents().close();
         tzhost::setWorkingDrawing(nullptr);
@@ -57,13 +57,13 @@ Session::~Session() {
     running = nullptr;
 }
 
-Session& Session::current() {
+ProgramSession& ProgramSession::current() {
     return *running;
 }
 
 // Whole or not at all: without a document in the end no command could run.
-void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
-                        std::function<void()> const& setVariables) {
+void ProgramSession::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
+                               std::function<void()> const& setVariables) {
     tzhost::MemoryFaultPause const isWhole;
     if (drawing_) {
         // What the command has done so far to the drawing that goes stays one step of its undo.
@@ -78,8 +78,8 @@ void Session::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
     tzhost::documents().open(drawing_.get());
 }
 
-void Session::replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
-                             std::function<void()> const& setVariables) {
+void ProgramSession::replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
+                                    std::function<void()> const& setVariables) {
     bool const hadDrawing = drawing_ != nullptr;
     tzhost::Variables::Snapshot variables = tzhost::Variables::instance().snapshot();
     replaceBy(std::move(drawing), setVariables);
@@ -89,16 +89,16 @@ void Session::replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
     retired_.pop_back();
 }
 
-void Session::makeNew() {
+void ProgramSession::makeNew() {
     replaceForUndo(tzhost::Drawing::create(), [] { tzhost::setKeptVariables({}); });
 }
 
-void Session::makeNew(std::filesystem::path const& file) {
+void ProgramSession::makeNew(std::filesystem::path const& file) {
     makeNew();
     drawing_->setFile(file);
 }
 
-bool Session::open(std::filesystem::path const& file, std::string& error) {
+bool ProgramSession::open(std::filesystem::path const& file, std::string& error) {
     tzhost::DrawingRead read = tzhost::readDrawing(file);
     if (!read.drawing) {
         error = read.error;
@@ -112,7 +112,7 @@ bool Session::open(std::filesystem::path const& file, std::string& error) {
     return true;
 }
 
-std::vector<std::wstring> Session::unsaved() const {
+std::vector<std::wstring> ProgramSession::unsaved() const {
     std::vector<std::wstring> names;
     if (!drawing_->undoLog().isSaved()) names.push_back(nameOf(*drawing_));
     for (Replaced const& each : replaced_) {
@@ -121,17 +121,17 @@ std::vector<std::wstring> Session::unsaved() const {
     return names;
 }
 
-std::wstring Session::unsavedToDrop() const {
+std::wstring ProgramSession::unsavedToDrop() const {
     if (replaced_.size() < kMostReplaced) return {};
     tzhost::Drawing& oldest = *replaced_.front().drawing;
     return oldest.undoLog().isSaved() ? std::wstring() : nameOf(oldest);
 }
 
-bool Session::isOwn(std::filesystem::path const& file) const {
+bool ProgramSession::isOwn(std::filesystem::path const& file) const {
     return ownFiles_.count(plainPath(file)) > 0;
 }
 
-bool Session::undo() {
+bool ProgramSession::undo() {
     if (drawing_->undoLog().takeBack()) return true;
     if (replaced_.empty()) return false;
     Replaced before = std::move(replaced_.back());
@@ -141,7 +141,7 @@ bool Session::undo() {
     return true;
 }
 
-bool Session::save(std::filesystem::path const& file, std::string& error) {
+bool ProgramSession::save(std::filesystem::path const& file, std::string& error) {
     error = tzhost::writeDrawing(*drawing_, file);
     if (!error.empty()) return false;
     drawing_->setFile(file);
@@ -150,7 +150,7 @@ bool Session::save(std::filesystem::path const& file, std::string& error) {
     return true;
 }
 
-bool Session::plot(std::filesystem::path const& file, std::string& error) const {
+bool ProgramSession::plot(std::filesystem::path const& file, std::string& error) const {
     auto const at =
         std::find_if(kPlotEndings.begin(), kPlotEndings.end(),
                      [&](PlotEnding const& each) { return file.extension() == each.ending; });
@@ -161,19 +161,19 @@ bool Session::plot(std::filesystem::path const& file, std::string& error) const 
     return plotAs(at->format, file, error);
 }
 
-bool Session::plotAs(tzhost::PlotFormat format,
-                     std::filesystem::path const& file,
-                     std::string& error) const {
+bool ProgramSession::plotAs(tzhost::PlotFormat format,
+                            std::filesystem::path const& file,
+                            std::string& error) const {
     auto const problem = tzhost::plotDrawing(*drawing_, format, file.string());
     if (problem) error = *problem;
     return !problem;
 }
 
-TzString Session::moduleName() const {
+TzString ProgramSession::moduleName() const {
     return TzString::fromUtf8(module_.filename().string());
 }
 
-void Session::loadLater(std::filesystem::path file) {
+void ProgramSession::loadLater(std::filesystem::path file) {
     std::error_code gone;  // of a working folder: the loader then says that nothing is there
     file = file.has_parent_path() ? std::filesystem::absolute(file, gone)
                                   : module_.parent_path() / file;
@@ -184,7 +184,7 @@ void Session::loadLater(std::filesystem::path file) {
     });
 }
 
-void Session::unloadLater() {
+void ProgramSession::unloadLater() {
     postponed_.emplace_back([] {
         auto const& modules = tzhost::dynamicLinker().modules();
         std::string error = localText("No module is loaded.");
@@ -193,17 +193,17 @@ void Session::unloadLater() {
     });
 }
 
-void Session::doPostponed() {
+void ProgramSession::doPostponed() {
     for (auto const& action : std::exchange(postponed_, {}))
         action();
 }
 
-void Session::beginCommand() {
+void ProgramSession::beginCommand() {
     isInCommand_ = true;
     drawing_->undoLog().begin();
 }
 
-void Session::endCommand() {
+void ProgramSession::endCommand() {
     drawing_->undoLog().end();
     retired_.clear();
     if (replaced_.size() > kMostReplaced) replaced_.pop_front();

@@ -13,9 +13,9 @@
 
 namespace tzhost::test {
 
-class Session {
+class ScriptedSession {
 public:
-    explicit Session(std::string_view script) : source_(script) {
+    explicit ScriptedSession(std::string_view script) : source_(script) {
         Variables::instance().resetKept(KeptIn::drawing);
         commandLine().reset();
         commandLine().attach();
@@ -25,9 +25,9 @@ public:
         });
         setEventSink([this](Event const& event) { events_ += event.dump() + "\n"; });
     }
-    Session(Session const&) = delete;
-    Session& operator=(Session const&) = delete;
-    ~Session() {
+    ScriptedSession(ScriptedSession const&) = delete;
+    ScriptedSession& operator=(ScriptedSession const&) = delete;
+    ~ScriptedSession() {
         setEventSink({});
         commandLine().reset();
     }

@@ -4,7 +4,7 @@
 #include <memory>
 #include <string_view>
 
-#include "apps/tzdraft/options.h"
+#include "apps/tzdraft/draft_options.h"
 #include "host/command_line/answer_source.h"
 
 // The program from its options to its exit status, also for tests, which run it in their own

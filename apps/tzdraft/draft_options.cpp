@@ -1,4 +1,4 @@
-#include "apps/tzdraft/options.h"
+#include "apps/tzdraft/draft_options.h"
 
 #include <CLI/CLI.hpp>
 #include <cerrno>

@@ -16,15 +16,15 @@
 // it. Every operation that can fail says why in one line, with the file in it.
 namespace tzdraft {
 
-class Session {
+class ProgramSession {
 public:
-    Session();
-    Session(Session const&) = delete;
-    Session& operator=(Session const&) = delete;
-    ~Session();
+    ProgramSession();
+    ProgramSession(ProgramSession const&) = delete;
+    ProgramSession& operator=(ProgramSession const&) = delete;
+    ~ProgramSession();
 
     // The running session, which the bodies of the program's commands work on.
-    [[nodiscard]] static Session& current();
+    [[nodiscard]] static ProgramSession& current();
 
     // An empty drawing in place of the one that is open.
     void makeNew();

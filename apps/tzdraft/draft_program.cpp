@@ -1,4 +1,4 @@
-#include "apps/tzdraft/program.h"
+#include "apps/tzdraft/draft_program.h"
 
 #include <exception>
 #include <new>
@@ -13,8 +13,8 @@
 #include "apps/tzdraft/end_signals.h"
 #include "apps/tzdraft/event_file.h"
 #include "apps/tzdraft/function_call.h"
-#include "apps/tzdraft/local_text.h"
-#include "apps/tzdraft/session.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
 #include "host/base/audit.h"
@@ -74,7 +74,7 @@ private:
     Screens screens_;
     std::unique_ptr<tzhost::AnswerSource> source_;
     EventFile events_;
-    Session session_;
+    ProgramSession session_;
     tzhost::FaultPlan faults_;
     SettingsState settings_ = SettingsState::unusable;
     std::vector<std::string> problems_;  // with results, one line each
