@@ -55,10 +55,21 @@ void appendName(std::string& text, DialectFont const& font) {
     }
 }
 
+void appendFont(std::string& text, std::size_t number, DialectFont const& font) {
+    text += '{';
+    appendWord(text, "f", static_cast<long long>(number));
+    appendWord(text, familyWord(font.family));
+    if (font.pitch > 0) appendWord(text, "fprq", font.pitch);
+    appendWord(text, "fcharset", font.charset);
+    text += ' ';
+    appendName(text, font);
+    text += ";}";
+}
+
 }  // namespace
 
 int DialectWriter::addFont(DialectFont const& font) {
-    fonts_.push_back(font);
+    fonts_.push_back({font});
     return static_cast<int>(fonts_.size()) - 1;
 }
 
@@ -69,10 +80,12 @@ int DialectWriter::colorNumber(unsigned int rgb) {
 }
 
 void DialectWriter::setLook(DialectLook const& look) {
+    writeMark();
     if (look == look_) return;
     closeLook();
     if (look == DialectLook()) return;
     protectStackSign();
+    if (look.font >= 0) fonts_[static_cast<std::size_t>(look.font)].isUsed = true;
     body_ += '{';
     appendLook(body_, look);
     body_ += ' ';
@@ -92,6 +105,7 @@ void DialectWriter::closeLook() {
 // escaped pair; a line end in between, which it skips, keeps it from finding one there.
 void DialectWriter::ascii(std::string_view text) {
     if (text.empty()) return;
+    writeMark();
     hasContent_ = true;
     bool const isBehindBackslash = !body_.empty() && body_.back() == '\\';
     if (isBehindBackslash && std::string_view("flpt").find(text[0]) != std::string_view::npos)
@@ -102,6 +116,7 @@ void DialectWriter::ascii(std::string_view text) {
 }
 
 void DialectWriter::character(wchar_t c) {
+    writeMark();
     if (c > kLastEscaped) {
         stackSignAt_ = kNowhere;
         body_ += toUtf8(std::wstring_view(&c, 1));
@@ -109,7 +124,7 @@ void DialectWriter::character(wchar_t c) {
         stackSignAt_ = kNowhere;
         body_ += "\\~";
     } else if (c >= 0x80) {
-        openWord();
+        protectStackSign();
         appendWord(body_, "u", c);
         body_ += '?';
     } else if (c == '\\' || c == '{' || c == '}') {
@@ -123,32 +138,26 @@ void DialectWriter::character(wchar_t c) {
     hasContent_ = true;
 }
 
-void DialectWriter::tab(DialectLook const& look) {
-    setLines(look);
-    openWord();
-    body_ += "\\tab ";
-    hasContent_ = true;
+void DialectWriter::tab() {
+    writeWord("\\tab ");
 }
 
-void DialectWriter::line(DialectLook const& look) {
-    setLines(look);
-    openWord();
-    body_ += "\\line ";
-    hasContent_ = true;
+void DialectWriter::line() {
+    writeWord("\\line ");
 }
 
-void DialectWriter::setLines(DialectLook const& look) {
-    if (look.isUnderlined != look_.isUnderlined || look.isStruck != look_.isStruck) setLook(look);
+void DialectWriter::writeWord(char const* word) {
+    writeMark();
+    protectStackSign();
+    body_ += word;
+    hasContent_ = true;
 }
 
 void DialectWriter::endStack() {
     if (!isInStack_) return;
     isInStack_ = false;
+    writeMark();
     body_ += "{\\dn6}";
-}
-
-void DialectWriter::openWord() {
-    protectStackSign();
 }
 
 // Behind an escaped backslash and an "S" the reader swallows words up to the next text. The "S"
@@ -160,15 +169,20 @@ void DialectWriter::protectStackSign() {
 }
 
 void DialectWriter::endParagraph(DialectParagraph const& paragraph, DialectLook const& mark) {
-    if (!hasContent_)
-        setLook(mark);
-    else if (mark == DialectLook())
-        closeLook();
-    protectStackSign();
+    writeMark();
     insertSettings(paragraph);
+    mark_ = mark;
+    hasMark_ = true;
+    hasContent_ = false;
+}
+
+void DialectWriter::writeMark() {
+    if (!hasMark_) return;
+    hasMark_ = false;
+    setLook(mark_);
+    protectStackSign();
     body_ += "\\par\n";
     paragraphStart_ = body_.size();
-    hasContent_ = false;
 }
 
 // Settings hold for the whole paragraph and are known at its end.
@@ -181,22 +195,16 @@ void DialectWriter::insertSettings(DialectParagraph const& paragraph) {
         appendWord(words, "tx", stop);
     words += ' ';
     body_.insert(paragraphStart_, words);
+    if (stackSignAt_ != kNowhere) stackSignAt_ += words.size();
 }
 
 std::string DialectWriter::head() const {
     std::string text = "{\\rtf1\\ansi";
-    if (!fonts_.empty()) text += "{\\fonttbl";
+    std::string fonts;
     for (std::size_t i = 0; i < fonts_.size(); ++i) {
-        DialectFont const& font = fonts_[i];
-        appendWord(text += '{', "f", static_cast<long long>(i));
-        appendWord(text, familyWord(font.family));
-        if (font.pitch > 0) appendWord(text, "fprq", font.pitch);
-        appendWord(text, "fcharset", font.charset);
-        text += ' ';
-        appendName(text, font);
-        text += ";}";
+        if (fonts_[i].isUsed) appendFont(fonts, i, fonts_[i].face);
     }
-    if (!fonts_.empty()) text += '}';
+    if (!fonts.empty()) text += "{\\fonttbl" + fonts + "}";
     if (!colors_.empty()) text += "{\\colortbl";
     for (unsigned int const rgb : colors_) {
         appendWord(text, "red", rgb & 0xFF);
@@ -210,6 +218,8 @@ std::string DialectWriter::head() const {
 
 std::string DialectWriter::finish(DialectParagraph const& last) {
     if (hasContent_) endParagraph(last, look_);
+    mark_ = look_;  // the last one has the look of what is ahead, whatever its own
+    writeMark();
     closeLook();
     body_ += '}';
     body_.insert(0, head());

@@ -65,16 +65,15 @@ public:
     void ascii(std::string_view text);
     // A character of Unicode; no control character.
     void character(wchar_t c);
-    // These keep the look that was set last, but for the lines under and over them.
-    void tab(DialectLook const& look);
-    void line(DialectLook const& look);
+    void tab();
+    void line();
     // Ends what a stack's mark began, for a reader to whom all text behind such a mark belongs to
     // it.
     void endStack();
 
     // Whether the paragraph has anything in it.
     [[nodiscard]] bool hasContent() const { return hasContent_; }
-    // The look is that of the mark, which shows where the paragraph is empty.
+    // The look is that of the mark. It is of no use at the end of the document.
     void endParagraph(DialectParagraph const& paragraph, DialectLook const& mark);
 
     // The whole document. A paragraph that was not ended is one of these settings.
@@ -84,19 +83,25 @@ private:
     static constexpr std::size_t kNowhere = static_cast<std::size_t>(-1);
 
     void closeLook();
-    void openWord();
-    void setLines(DialectLook const& look);
+    void writeWord(char const* word);
+    void writeMark();
     void protectStackSign();
     void insertSettings(DialectParagraph const& paragraph);
     [[nodiscard]] std::string head() const;
 
-    std::vector<DialectFont> fonts_;
+    struct Font {
+        DialectFont face;
+        bool isUsed = false;  // the table has it
+    };
+    std::vector<Font> fonts_;
     std::vector<unsigned int> colors_;
     std::map<unsigned int, int> colorNumbers_;
     std::string body_;
     std::size_t paragraphStart_ = 0;
     std::size_t stackSignAt_ = kNowhere;  // of an "S" that may be taken for a stack's sign
     DialectLook look_;                    // the one in force; a group is open when it has words
+    DialectLook mark_;                    // of a paragraph that has ended
+    bool hasMark_ = false;                // its end is not yet written
     bool hasContent_ = false;
     bool isInStack_ = false;
 };

@@ -86,7 +86,9 @@ void RtfDocument::onSymbol(char symbol) {
     case '\\':
     case '{':
     case '}': putCharacter(symbol); break;
-    default: break;  // places to break words, and marks of formulas and indexes
+    default:  // others are places to break words, and marks of formulas and indexes
+        if (symbol >= 'A' && symbol <= 'Z') putCharacter(symbol);
+        break;
     }
 }
 

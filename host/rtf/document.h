@@ -105,6 +105,7 @@ private:
     [[nodiscard]] DialectParagraph paragraphOf(Settings const& settings) const;
     void forgetTables();
     void beginContent();
+    void putCellTab();
     void putText(std::string_view text);
     void putCharacters(std::wstring_view text);
     void putCharacter(wchar_t c);
@@ -116,6 +117,7 @@ private:
     void setOff(RtfToken const& token, int field);
     void setDestination(RtfToken const& token, int destination);
     void beginTable(RtfToken const& token, int table);
+    void beginListText(RtfToken const& token, int argument);
     void dropPicture(RtfToken const& token, int argument);
     void dropNote(RtfToken const& token, int argument);
     void dropHeader(RtfToken const& token, int argument);

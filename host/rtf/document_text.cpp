@@ -120,10 +120,18 @@ DialectParagraph RtfDocument::paragraphOf(Settings const& settings) const {
 void RtfDocument::beginContent() {
     last_ = run().settings;
     if (isBehindCell_)
-        writer_.tab({});
+        putCellTab();
     else if (isBehindInnerEnd_ && writer_.hasContent())
         writer_.ascii(" ");
     isBehindCell_ = isBehindInnerEnd_ = false;
+}
+
+// No line goes from cell to cell.
+void RtfDocument::putCellTab() {
+    DialectLook look = run().plainLook;
+    look.isUnderlined = look.isStruck = false;
+    writer_.setLook(look);
+    writer_.tab();
 }
 
 void RtfDocument::putText(std::string_view text) {

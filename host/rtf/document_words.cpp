@@ -31,6 +31,10 @@ void RtfDocument::setDestination(RtfToken const&, int destination) {
     state_.set(RtfField::destination, destination);
 }
 
+void RtfDocument::beginListText(RtfToken const&, int) {
+    state_.set(RtfField::inListText, 1);
+}
+
 // A table that is there twice goes on, but for that of the colours, whose numbers are places.
 void RtfDocument::beginTable(RtfToken const&, int table) {
     if (table == kColorTable) colors_.clear();
@@ -71,13 +75,15 @@ void RtfDocument::putUnicode(RtfToken const& token, int) {
 void RtfDocument::putTab(RtfToken const&, int) {
     if (run().isHidden) return;
     beginContent();
-    writer_.tab(run().plainLook);
+    writer_.setLook(run().plainLook);
+    writer_.tab();
 }
 
 void RtfDocument::putLine(RtfToken const&, int) {
     if (run().isHidden) return;
     beginContent();
-    writer_.line(run().plainLook);
+    writer_.setLook(run().plainLook);
+    writer_.line();
 }
 
 // In a table the row is the paragraph.
@@ -95,7 +101,7 @@ void RtfDocument::breakParagraph(RtfToken const& token, int argument) {
 
 void RtfDocument::endCell(RtfToken const&, int) {
     isBehindInnerEnd_ = false;
-    if (isBehindCell_) writer_.tab({});
+    if (isBehindCell_) putCellTab();
     isBehindCell_ = true;
 }
 
@@ -124,9 +130,11 @@ void RtfDocument::addTab(RtfToken const& token, int) {
     state_.set(RtfField::tabs, tabs_.withStop(state_.get(RtfField::tabs), token.value));
 }
 
+// The number of a list item keeps the style of its paragraph.
 void RtfDocument::resetParagraph(RtfToken const&, int) {
     for (std::size_t i = kRtfLookFields; i < kRtfStyleFields; ++i)
         state_.set(static_cast<RtfField>(i), kRtfUnset);
+    if (state_.get(RtfField::inListText) != 0) return;
     state_.set(RtfField::paragraphStyle, kRtfUnset);
     state_.set(RtfField::inTable, 0);
 }

@@ -5,6 +5,7 @@ namespace tzhost {
 RtfState::RtfState() {
     values_.fill(kRtfUnset);
     values_[indexOf(RtfField::inTable)] = 0;
+    values_[indexOf(RtfField::inListText)] = 0;
     values_[indexOf(RtfField::stackMark)] = 0;
     values_[indexOf(RtfField::substitutes)] = 1;
     values_[indexOf(RtfField::destination)] = 0;

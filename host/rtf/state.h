@@ -36,6 +36,7 @@ enum class RtfField : std::uint8_t {
     paragraphStyle,
     characterStyle,
     inTable,
+    inListText,   // the number or bullet of a list
     stackMark,    // the characters are a mark of a stack
     substitutes,  // characters that stand behind a `\u` for who does not know it
     destination,
@@ -43,7 +44,7 @@ enum class RtfField : std::uint8_t {
 
 inline constexpr std::size_t kRtfLookFields = 9;
 inline constexpr std::size_t kRtfStyleFields = 12;  // a style has those up to here
-inline constexpr std::size_t kRtfFields = 18;
+inline constexpr std::size_t kRtfFields = 19;
 
 // Of a field that nothing has set.
 inline constexpr int kRtfUnset = -2147483647 - 1;

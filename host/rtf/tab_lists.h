@@ -14,7 +14,8 @@ public:
     static constexpr int kEmpty = 0;
     static constexpr int kMostStops = 32;  // the reader of the dialect knows no more
 
-    // The list with a stop, in twips, added. Stops below 1 and those beyond the most are left out.
+    // The list with a stop, in twips, added. Stops that it has, those below 1 and those beyond the
+    // most are left out.
     [[nodiscard]] int withStop(int list, int twips);
     // Its stops in the order in which they were added; none of a number that is no list.
     [[nodiscard]] std::vector<int> stopsOf(int list) const;
@@ -25,6 +26,7 @@ private:
         int twips;
         int count;
     };
+    [[nodiscard]] bool hasStop(int list, int twips) const;
     [[nodiscard]] bool isList(int list) const {
         return list > kEmpty && static_cast<std::size_t>(list) <= nodes_.size();
     }

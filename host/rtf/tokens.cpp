@@ -92,7 +92,7 @@ RtfToken RtfTokens::next() {
 RtfToken RtfTokens::afterBackslash() {
     if (rest_.empty()) return {};
     char const c = rest_.front();
-    if (isLetter(c)) return word();
+    if (c >= 'a' && c <= 'z') return word();
     (void)take(1);
     if (c == '\'') return escapedByte();
     if (isLineEnd(c)) return {Kind::word, "par"};

@@ -9,41 +9,18 @@
 #include <gtest/gtest.h>
 
 #include "tests/markup/conversions.h"
+#include "tests/markup/visible_text.h"
 
 namespace {
 
 namespace fs = std::filesystem;
 using markuptest::shown;
+using markuptest::visibleText;
 
 std::wstring contentsOf(fs::path const& file) {
     std::ostringstream bytes;
     bytes << std::ifstream(file, std::ios::binary).rdbuf();
     return TzString::fromUtf8(bytes.str()).str();
-}
-
-// The characters of a markup, a line for each paragraph. Knows the codes that the reader writes.
-std::wstring visibleText(std::wstring const& markup) {
-    std::wstring text;
-    for (std::size_t at = 0; at < markup.size(); ++at) {
-        wchar_t const c = markup[at];
-        if (c == L'{' || c == L'}') continue;
-        if (c != L'\\') {
-            text += c;
-            continue;
-        }
-        wchar_t const code = markup[++at];
-        if (code == L'P') {
-            text += L'\n';
-        } else if (code == L'U') {
-            text += static_cast<wchar_t>(std::stoul(markup.substr(at + 2, 4), nullptr, 16));
-            at += 5;
-        } else if (std::wstring_view(L"FfHCcpA").find(code) != std::wstring_view::npos) {
-            at = markup.find(L';', at);
-        } else if (std::wstring_view(L"LlOo").find(code) == std::wstring_view::npos) {
-            text += code;
-        }
-    }
-    return text + L'\n';
 }
 
 TEST(Documents, OfOtherProgramsKeepTheirText) {

@@ -79,7 +79,7 @@ constexpr Case kLooks[] = {
     {"UnknownWords",     "{\\loch\\af3\\hich a{\\lang1033 b}}"sv,                                   "\\pard ab"                   },
  // The mark of a paragraph has no look of its own unless the paragraph is empty.
     {"Marks",            "{\\b a}\\par{\\b\\par}{\\fs20\\par}b"sv,
-     "\\pard {\\fs24\\b a\\par\n\\pard \\par\n}\\pard {\\fs20 \\par\n}\\pard {\\fs24 b"                                           },
+     "\\pard {\\fs24\\b a}{\\fs24 \\par\n\\pard }{\\fs24\\b \\par\n\\pard }{\\fs20 \\par\n}\\pard {\\fs24 b"                      },
 };
 INSTANTIATE_TEST_SUITE_P(Looks, Bodies, testing::ValuesIn(kLooks), kName);
 
