@@ -5,6 +5,7 @@
 #include "host/base/fault_point.h"
 #include "host/files/ini_data.h"
 #include "host/fonts/machine_catalogue.h"
+#include "host/fonts/machine_fonts.h"
 
 namespace {
 
@@ -121,10 +122,10 @@ bool CatalogueFontInfo::FontInfoFromTypeFaceName(CStdStrW const& face, CFontInfo
 }
 
 CStdStrW CatalogueFontInfo::TypefaceNativeToEnglish(CStdStrW const& face) const {
-    FontFamilyRow const* const family = findFamily("CFontInfo::TypefaceNativeToEnglish", face);
-    if (family == nullptr || tzCompareNoCase(family->english.c_str(), face.c_str()) == 0)
-        return face;
-    return family->english;
+    if (tzhost::faultAt("CFontInfo::TypefaceNativeToEnglish")) return face;
+    CStdStrW const english = tzhost::englishNameOf(face);
+    bool const isEnglish = english.empty() || tzCompareNoCase(english.c_str(), face.c_str()) == 0;
+    return isEnglish ? face : english;
 }
 
 CStdStrW CatalogueFontInfo::TypefaceEnglishToNative(CStdStrW const& face) const {

@@ -6,6 +6,7 @@
 #include <unordered_map>
 
 #include "host/files/ini_data.h"
+#include "host/fonts/machine_fonts.h"
 #include "host/text/utf8.h"
 
 namespace tzhost {
@@ -17,36 +18,6 @@ int integerOf(FcPattern* pattern, char const* property, int otherwise) {
     return FcPatternGetInteger(pattern, property, 0, &value) == FcResultMatch ? value : otherwise;
 }
 
-bool flagOf(FcPattern* pattern, char const* property) {
-    FcBool value = FcFalse;
-    return FcPatternGetBool(pattern, property, 0, &value) == FcResultMatch && value == FcTrue;
-}
-
-std::string textOf(FcPattern* pattern, char const* property, int index) {
-    FcChar8* value = nullptr;
-    if (FcPatternGetString(pattern, property, index, &value) != FcResultMatch) return {};
-    return reinterpret_cast<char const*>(value);  // fontconfig's characters are unsigned
-}
-
-struct FamilyName {
-    std::wstring name;
-    bool isEnglish;
-};
-
-// The family names of a pattern. A font with one name only has it in English, whatever it says.
-std::vector<FamilyName> namesOf(FcPattern* pattern) {
-    std::vector<FamilyName> names;
-    for (int i = 0;; ++i) {
-        std::wstring name = fromUtf8(textOf(pattern, FC_FAMILY, i));
-        if (name.empty()) break;
-        names.push_back({std::move(name), textOf(pattern, FC_FAMILYLANG, i) == "en"});
-    }
-    bool const hasEnglish = std::any_of(names.begin(), names.end(),
-                                        [](FamilyName const& each) { return each.isEnglish; });
-    if (!hasEnglish && !names.empty()) names[0].isEnglish = true;
-    return names;
-}
-
 std::wstring withoutFolder(std::wstring_view path) {
     std::size_t const slash = path.find_last_of(L"/\\");
     return std::wstring(slash == path.npos ? path : path.substr(slash + 1));
@@ -54,7 +25,7 @@ std::wstring withoutFolder(std::wstring_view path) {
 
 FontForm formOf(FcPattern* pattern) {
     FontForm form;
-    form.path = textOf(pattern, FC_FILE, 0);
+    form.path = fontText(pattern, FC_FILE, 0);
     form.fileName = withoutFolder(fromUtf8(form.path));
     form.index = integerOf(pattern, FC_INDEX, 0);
     form.weight = integerOf(pattern, FC_WEIGHT, FC_WEIGHT_REGULAR);
@@ -96,18 +67,14 @@ FontCatalogue const& FontCatalogue::instance() {
     return catalogue;
 }
 
-FontCatalogue::FontCatalogue() : config_(FcInitLoadConfigAndFonts(), &FcConfigDestroy) {
-    FcFontSet const* const fonts = config_ ? FcConfigGetFonts(config_.get(), FcSetSystem) : nullptr;
-    for (int i = 0; fonts != nullptr && i < fonts->nfont; ++i)
-        add(fonts->fonts[i]);
+FontCatalogue::FontCatalogue() {
+    for (FcPattern* const pattern : machineFonts())
+        add(pattern);
     nameForms();
 }
 
 void FontCatalogue::add(FcPattern* pattern) {
-    // Bitmap fonts cannot be drawn at any size; a variable font is listed once more as each of its
-    // named forms.
-    if (!flagOf(pattern, FC_SCALABLE) || flagOf(pattern, FC_VARIABLE)) return;
-    auto const names = namesOf(pattern);
+    auto const names = familyNames(pattern);
     if (names.empty()) return;
     FontForm const& form = forms_.emplace_back(formOf(pattern));
     auto const english = std::find_if(names.begin(), names.end(),

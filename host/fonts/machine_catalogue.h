@@ -11,7 +11,6 @@
 
 #include <deque>
 #include <map>
-#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -32,7 +31,7 @@ struct FontForm {
     int slant = FC_SLANT_ROMAN;
     int width = FC_WIDTH_NORMAL;
     bool isFixedPitch = false;
-    FcCharSet const* characters = nullptr;  // of the catalogue's
+    FcCharSet const* characters = nullptr;  // of the process
 
     [[nodiscard]] bool isBold() const { return weight >= FC_WEIGHT_DEMIBOLD; }
     [[nodiscard]] bool isItalic() const { return slant != FC_SLANT_ROMAN; }
@@ -69,8 +68,6 @@ private:
     void add(FcPattern* pattern);
     void nameForms();
 
-    std::unique_ptr<FcConfig, void (*)(FcConfig*)>
-        config_;                                    // owns the patterns and their character sets
     std::deque<FontForm> forms_;                    // keep their places
     std::map<std::wstring, FontFamilyRow> byName_;  // in lower case
     std::map<std::wstring, FontForm const*> byFile_;

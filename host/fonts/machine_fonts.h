@@ -1,0 +1,32 @@
+#pragma once
+
+// The outline fonts of the machine as fontconfig lists them, and their names. Read once, at the
+// first question; everything lives with the process.
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include <fontconfig/fontconfig.h>
+
+namespace tzhost {
+
+// Fonts that can be drawn at any size, each form of a font by itself.
+[[nodiscard]] std::vector<FcPattern*> const& machineFonts();
+
+// A property in UTF-8, empty when there are not as many values.
+[[nodiscard]] std::string fontText(FcPattern* pattern, char const* property, int index);
+
+struct FamilyName {
+    std::wstring name;
+    bool isEnglish;
+};
+// The family names of a font. One with a single name has it in English, whatever it says.
+[[nodiscard]] std::vector<FamilyName> familyNames(FcPattern* pattern);
+
+// The English family name of a font that has the given one in any language, case not counting;
+// empty for a name that no font has. Costs less than the catalogue, which knows the forms too, and
+// gives the same: the first font with a name decides.
+[[nodiscard]] std::wstring englishNameOf(std::wstring_view face);
+
+}  // namespace tzhost
