@@ -226,7 +226,9 @@ TEST(Files, ThatMemoryCannotHoldAreNamed) {
 // The second file's font used to come back as the face that the first had lent to another.
 TEST(Files, OfABatchGiveWhatTheyGiveAlone) {
     fs::create_directories("batch");
-    write("own.ini", "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\n[Proxy Fonts]\nProxy 1=Drawn\n");
+    write(
+        "own.ini",
+        "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\nother.shx=Else,0,0,0,0\n[Proxy Fonts]\nProxy 1=Drawn\n");
     write("lends.txt", "\\Fnone;a");
     write("mapped.txt", "{\\Fhouse|c0;b}");
     for (char const* files : {"mapped.txt", "lends.txt mapped.txt"}) {
