@@ -22,10 +22,10 @@ struct DirectionRow {
     char const* help;
 };
 constexpr DirectionRow kDirections[] = {
-    {"to-rtf",     Direction::toRtf,     ".rtf",   "markup to RTF"                             },
-    {"to-mtext",   Direction::toMtext,   ".mtext", "RTF to markup"                             },
+    {"to-rtf", Direction::toRtf, ".rtf", "markup to RTF"},
+    {"to-mtext", Direction::toMtext, ".mtext", "RTF to markup"},
     {"round-trip", Direction::roundTrip, ".mtext", "markup to RTF to markup within one session"},
-    {"normalise",  Direction::normalise, ".rtf",   "any RTF to the RTF that to-mtext reads"    },
+    {"normalise", Direction::normalise, ".rtf", "any RTF to the RTF that to-mtext reads"},
 };
 
 // What an RTF size can say: half-points of 10 twips.

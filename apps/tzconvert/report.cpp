@@ -9,16 +9,16 @@ namespace {
 
 nlohmann::ordered_json resultsOf(MarkupFindings const& found) {
     return {
-        {"incidents",       found.incidents              },
-        {"tracking",        found.wholeText.tracking     },
-        {"widthFactor",     found.wholeText.charWidth    },
-        {"oblique",         found.wholeText.oblique      },
-        {"baseAlignment",   found.wholeText.baseAlignment},
-        {"minFontSize",     found.minFontSize            },
-        {"maxFontSize",     found.maxFontSize            },
-        {"initialFontSize", found.initialFontSize        },
-        {"currentFontSize", found.currentFontSize        },
-        {"stacksSeen",      found.stacksSeen             },
+        {"incidents", found.incidents},
+        {"tracking", found.wholeText.tracking},
+        {"widthFactor", found.wholeText.charWidth},
+        {"oblique", found.wholeText.oblique},
+        {"baseAlignment", found.wholeText.baseAlignment},
+        {"minFontSize", found.minFontSize},
+        {"maxFontSize", found.maxFontSize},
+        {"initialFontSize", found.initialFontSize},
+        {"currentFontSize", found.currentFontSize},
+        {"stacksSeen", found.stacksSeen},
     };
 }
 
@@ -32,9 +32,7 @@ std::string reportText(Options const& options, std::vector<FileReport> const& re
     } else {
         root = nlohmann::ordered_json::array();
         for (FileReport const& report : reports) {
-            nlohmann::ordered_json entry = {
-                {"file", report.file}
-            };
+            nlohmann::ordered_json entry = {{"file", report.file}};
             entry.update(resultsOf(report.found));
             root.push_back(entry);
         }

@@ -296,11 +296,9 @@ void Run::writeResults() {
     };
     writeResult(options_.save,
                 [&](std::string& error) { return session_.save(options_.save, error); });
-    for (Plot const& plot : {
-             Plot{options_.svg, tzhost::PlotFormat::svg},
-             Plot{options_.png, tzhost::PlotFormat::png},
-             Plot{options_.pdf, tzhost::PlotFormat::pdf}
-    }) {
+    for (Plot const& plot :
+         {Plot{options_.svg, tzhost::PlotFormat::svg}, Plot{options_.png, tzhost::PlotFormat::png},
+          Plot{options_.pdf, tzhost::PlotFormat::pdf}}) {
         writeResult(plot.file, [&](std::string& error) {
             return session_.plotAs(plot.format, plot.file, error);
         });

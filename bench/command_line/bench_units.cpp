@@ -23,11 +23,11 @@ struct Unit {
     wchar_t const* text;
 };
 constexpr Unit kUnits[] = {
-    {"scientific",    "%.4E", "1.2345E+03", L"1.2345E+03"    },
-    {"decimal",       "%.4f", "1234.5000",  L"1234.5000"     },
-    {"feetDecimals",  "%.4f", "1234.5000",  L"102'-10.5000\""},
-    {"feetFractions", "%.4f", "1234.5000",  L"102'-10 1/2\"" },
-    {"fractions",     "%.4f", "1234.5000",  L"1234 1/2"      },
+    {"scientific", "%.4E", "1.2345E+03", L"1.2345E+03"},
+    {"decimal", "%.4f", "1234.5000", L"1234.5000"},
+    {"feetDecimals", "%.4f", "1234.5000", L"102'-10.5000\""},
+    {"feetFractions", "%.4f", "1234.5000", L"102'-10 1/2\""},
+    {"fractions", "%.4f", "1234.5000", L"1234 1/2"},
 };
 
 void writeLength(benchmark::State& state) {

@@ -38,17 +38,17 @@ struct CommandRow {
     bool changes;  // leaves a step to take back
 };
 constexpr CommandRow kCommands[] = {
-    {"erase",     L"ERASE",  "#6\n\n",                        true },
-    {"eraseLast", L"ERASE",  "last\n\n",                      true },
-    {"list",      L"LIST",   "#6\n\n",                        false},
-    {"newText",   L"-MTEXT", "0,-5\n10,-9\nAnother note\n\n", true },
+    {"erase", L"ERASE", "#6\n\n", true},
+    {"eraseLast", L"ERASE", "last\n\n", true},
+    {"list", L"LIST", "#6\n\n", false},
+    {"newText", L"-MTEXT", "0,-5\n10,-9\nAnother note\n\n", true},
 };
 
 constexpr CommandRow kOnAll[] = {
-    {"heightOfAll", L"-MTEDIT",         "all\n\n5\n",           true},
-    {"styleOfAll",  L"MTEXTPROPERTIES", "all\n\nStyle\nTwo\n",  true},
-    {"turnAll",     L"MTEXTPROPERTIES", "all\n\nRotate\n45\n",  true},
-    {"justifyAll",  L"MTEXTPROPERTIES", "all\n\nJustify\nMC\n", true},
+    {"heightOfAll", L"-MTEDIT", "all\n\n5\n", true},
+    {"styleOfAll", L"MTEXTPROPERTIES", "all\n\nStyle\nTwo\n", true},
+    {"turnAll", L"MTEXTPROPERTIES", "all\n\nRotate\n45\n", true},
+    {"justifyAll", L"MTEXTPROPERTIES", "all\n\nJustify\nMC\n", true},
 };
 
 // The program's commands and the module's, with undo around each.

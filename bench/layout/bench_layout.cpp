@@ -39,12 +39,6 @@ void layOut(benchmark::State& state) {
     }
 }
 
-BENCHMARK(layOut)
-    ->ArgsProduct({
-        {0,  1  },
-        {10, 300}
-})
-    ->UseManualTime()
-    ->Unit(benchmark::kMillisecond);
+BENCHMARK(layOut)->ArgsProduct({{0, 1}, {10, 300}})->UseManualTime()->Unit(benchmark::kMillisecond);
 
 }  // namespace

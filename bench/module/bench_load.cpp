@@ -31,10 +31,8 @@ struct Opened {
 };
 
 Opened openBoth(fs::path const& module) {
-    return {
-        {dlopen(module.c_str(), RTLD_NOW | RTLD_LOCAL), dlclose},
-        TzRxResourceInstance(L"TzmtedRes.dll")
-    };
+    return {{dlopen(module.c_str(), RTLD_NOW | RTLD_LOCAL), dlclose},
+            TzRxResourceInstance(L"TzmtedRes.dll")};
 }
 
 // Unloads the module at its end.

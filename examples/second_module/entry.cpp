@@ -33,9 +33,9 @@ struct Command {
     wchar_t const* help;
 };
 constexpr std::array kCommands{
-    Command{L"MARK",      markCommand,  L"Places a numbered mark that points at something."    },
-    Command{L"MARKLIST",  listCommand,  L"Lists texts with their places and fonts."            },
-    Command{L"MARKNOTE",  noteCommand,  L"Writes and edits notes and the texts of attributes." },
+    Command{L"MARK", markCommand, L"Places a numbered mark that points at something."},
+    Command{L"MARKLIST", listCommand, L"Lists texts with their places and fonts."},
+    Command{L"MARKNOTE", noteCommand, L"Writes and edits notes and the texts of attributes."},
     Command{L"MARKSETUP", setupCommand, L"Tells how the program is set up for texts and fonts."},
 };
 

@@ -140,14 +140,10 @@ struct Choice {
     void (*body)();
 };
 constexpr std::array kChoices{
-    Choice{L"Attribute",  writeAttribute },
-    Choice{L"Definition", writeDefinition},
-    Choice{L"Entity",     editHeldText   },
-    Choice{L"Identity",   editById       },
-    Choice{L"Markup",     editMarkup     },
-    Choice{L"NEw",        writeNew       },
-    Choice{L"NOthing",    writeNothing   },
-    Choice{L"Selected",   editSelected   },
+    Choice{L"Attribute", writeAttribute}, Choice{L"Definition", writeDefinition},
+    Choice{L"Entity", editHeldText},      Choice{L"Identity", editById},
+    Choice{L"Markup", editMarkup},        Choice{L"NEw", writeNew},
+    Choice{L"NOthing", writeNothing},     Choice{L"Selected", editSelected},
 };
 
 }  // namespace

@@ -17,24 +17,12 @@ struct CharsetRow {
 
 // Both ways; set 1, the system's, is not listed.
 constexpr CharsetRow kCharsets[] = {
-    {kAnsiCharset,        1252 },
-    {kSymbolCharset,      42   },
-    {kMacCharset,         10000},
-    {kShiftJisCharset,    932  },
-    {kHangulCharset,      949  },
-    {kJohabCharset,       1361 },
-    {kGb2312Charset,      936  },
-    {kChineseBig5Charset, 950  },
-    {kGreekCharset,       1253 },
-    {kTurkishCharset,     1254 },
-    {kVietnameseCharset,  1258 },
-    {kHebrewCharset,      1255 },
-    {kArabicCharset,      1256 },
-    {kBalticCharset,      1257 },
-    {kRussianCharset,     1251 },
-    {kThaiCharset,        874  },
-    {kEastEuropeCharset,  1250 },
-    {kOemCharset,         437  },
+    {kAnsiCharset, 1252},    {kSymbolCharset, 42},       {kMacCharset, 10000},
+    {kShiftJisCharset, 932}, {kHangulCharset, 949},      {kJohabCharset, 1361},
+    {kGb2312Charset, 936},   {kChineseBig5Charset, 950}, {kGreekCharset, 1253},
+    {kTurkishCharset, 1254}, {kVietnameseCharset, 1258}, {kHebrewCharset, 1255},
+    {kArabicCharset, 1256},  {kBalticCharset, 1257},     {kRussianCharset, 1251},
+    {kThaiCharset, 874},     {kEastEuropeCharset, 1250}, {kOemCharset, 437},
 };
 
 struct LeadBytes {
@@ -44,14 +32,8 @@ struct LeadBytes {
 };
 
 constexpr LeadBytes kLeadBytes[] = {
-    {932,  0x81, 0x9F},
-    {932,  0xE0, 0xFC},
-    {936,  0x81, 0xFE},
-    {949,  0x81, 0xFE},
-    {950,  0x81, 0xFE},
-    {1361, 0x84, 0xD3},
-    {1361, 0xD8, 0xDE},
-    {1361, 0xE0, 0xF9},
+    {932, 0x81, 0x9F}, {932, 0xE0, 0xFC},  {936, 0x81, 0xFE},  {949, 0x81, 0xFE},
+    {950, 0x81, 0xFE}, {1361, 0x84, 0xD3}, {1361, 0xD8, 0xDE}, {1361, 0xE0, 0xF9},
 };
 
 struct NameRow {
@@ -61,12 +43,8 @@ struct NameRow {
 
 // Pages that iconv does not know as "CP" and their number.
 constexpr NameRow kNames[] = {
-    {10000, "MACINTOSH"},
-    {20127, "ASCII"    },
-    {20866, "KOI8-R"   },
-    {21866, "KOI8-U"   },
-    {54936, "GB18030"  },
-    {51932, "EUC-JP"   },
+    {10000, "MACINTOSH"}, {20127, "ASCII"},   {20866, "KOI8-R"},
+    {21866, "KOI8-U"},    {54936, "GB18030"}, {51932, "EUC-JP"},
 };
 
 // Pages 28591 to 28606 are the parts 1 to 16 of ISO 8859.

@@ -26,19 +26,17 @@ struct Steps {
     double perDegree;
     int secondDecimals;
 };
-constexpr std::array<Steps, kFinest + 1> kSteps{
-    {
-     {1, 0},
-     {60, 0},
-     {60, 0},
-     {3600, 0},
-     {3600, 0},
-     {36e3, 1},
-     {36e4, 2},
-     {36e5, 3},
-     {36e6, 4},
-     }
-};
+constexpr std::array<Steps, kFinest + 1> kSteps{{
+    {1, 0},
+    {60, 0},
+    {60, 0},
+    {3600, 0},
+    {3600, 0},
+    {36e3, 1},
+    {36e4, 2},
+    {36e5, 3},
+    {36e6, 4},
+}};
 
 using AngularWriter = void (*)(std::string& text, double radians, int precision);
 
@@ -100,14 +98,12 @@ struct Quarter {
     char second;
     double toward;  // degrees at which the bearing is zero
 };
-constexpr std::array<Quarter, 4> kQuarters{
-    {
-     {0, "E", 'N', 'E', 90},
-     {90, "N", 'N', 'W', 90},
-     {180, "W", 'S', 'W', 270},
-     {270, "S", 'S', 'E', 270},
-     }
-};
+constexpr std::array<Quarter, 4> kQuarters{{
+    {0, "E", 'N', 'E', 90},
+    {90, "N", 'N', 'W', 90},
+    {180, "W", 'S', 'W', 270},
+    {270, "S", 'S', 'E', 270},
+}};
 
 // Straight directions are one letter.
 void writeSurveyors(std::string& text, double radians, int precision) {
@@ -131,15 +127,13 @@ struct AngularUnit {
     AngularWriter write;
     double radians;
 };
-constexpr std::array<AngularUnit, 5> kUnits{
-    {
-     {writeDegrees, 1 / kDegreesPerRadian},
-     {writeDegreesAndMinutes, 1 / kDegreesPerRadian},
-     {writeGrads, 1 / kGradsPerRadian},
-     {writeRadians, 1},
-     {writeSurveyors, 1 / kDegreesPerRadian},
-     }
-};
+constexpr std::array<AngularUnit, 5> kUnits{{
+    {writeDegrees, 1 / kDegreesPerRadian},
+    {writeDegreesAndMinutes, 1 / kDegreesPerRadian},
+    {writeGrads, 1 / kGradsPerRadian},
+    {writeRadians, 1},
+    {writeSurveyors, 1 / kDegreesPerRadian},
+}};
 
 bool isUnit(int unit) {
     return unit >= 0 && unit < static_cast<int>(kUnits.size());

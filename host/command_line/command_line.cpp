@@ -59,12 +59,7 @@ void CommandLine::reset() {
 void CommandLine::print(std::wstring_view text) {
     if (text.empty()) return;
     if (voice_ == Voice::module) {
-        reportEvent([&] {
-            return Event{
-                {"event", "print"     },
-                {"text",  toUtf8(text)}
-            };
-        });
+        reportEvent([&] { return Event{{"event", "print"}, {"text", toUtf8(text)}}; });
     }
     transcript_.message(text);
 }
@@ -154,8 +149,7 @@ std::optional<std::wstring> CommandLine::readCommand(std::vector<std::wstring> w
         document->typed.clear();
     }
     AnswerRequest const request{
-        QuestionKind::command, localText(kIdlePrompt), {Offer::Kind::words, std::move(words)}
-    };
+        QuestionKind::command, localText(kIdlePrompt), {Offer::Kind::words, std::move(words)}};
     while (true) {
         Answer answer = ask(request);
         if (answer.kind == Answer::Kind::line) return std::move(answer.text);
@@ -185,11 +179,7 @@ int CommandLine::failed(int status) {
 
 int CommandLine::answered(std::wstring_view line, int status) const {
     reportEvent([&] {
-        return Event{
-            {"event",  "answer"    },
-            {"line",   toUtf8(line)},
-            {"status", status      }
-        };
+        return Event{{"event", "answer"}, {"line", toUtf8(line)}, {"status", status}};
     });
     return status;
 }

@@ -51,13 +51,11 @@ Question::Question(QuestionKind kind, wchar_t const* prompt, Armed armed)
     : line_(commandLine()), kind_(kind), prompt_(prompt ? prompt : L""), armed_(std::move(armed)),
       offer_(usualOffer(kind, armed_.words)) {
     reportEvent([&] {
-        return Event{
-            {"event",    "prompt"           },
-            {"kind",     nameOf(kind_)      },
-            {"text",     toUtf8(prompt_)    },
-            {"keywords", toUtf8(armed_.list)},
-            {"flags",    armed_.flags       }
-        };
+        return Event{{"event", "prompt"},
+                     {"kind", nameOf(kind_)},
+                     {"text", toUtf8(prompt_)},
+                     {"keywords", toUtf8(armed_.list)},
+                     {"flags", armed_.flags}};
     });
 }
 

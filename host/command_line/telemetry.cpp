@@ -13,13 +13,11 @@ void reportPoint(int component,
     if (!data.hasPoint) return;
     TzGePoint3d const& point = data.point;
     tzhost::reportEvent([&] {
-        return tzhost::Event{
-            {"event",     "telemetryPoint"                                 },
-            {"component", component                                        },
-            {"name",      tzhost::utf8(name)                               },
-            {"which",     which                                            },
-            {"point",     tzhost::Event::array({point.x, point.y, point.z})}
-        };
+        return tzhost::Event{{"event", "telemetryPoint"},
+                             {"component", component},
+                             {"name", tzhost::utf8(name)},
+                             {"which", which},
+                             {"point", tzhost::Event::array({point.x, point.y, point.z})}};
     });
 }
 
@@ -30,13 +28,11 @@ TzTelemetryCmdHelper::TzTelemetryCmdHelper(int component, wchar_t const* name)
 
 void TzTelemetryCmdHelper::SendEvent(int phase, int value, wchar_t const* /*data*/) const {
     tzhost::reportEvent([&] {
-        return tzhost::Event{
-            {"event",     "telemetry"        },
-            {"component", component_         },
-            {"name",      tzhost::utf8(name_)},
-            {"phase",     phase              },
-            {"value",     value              }
-        };
+        return tzhost::Event{{"event", "telemetry"},
+                             {"component", component_},
+                             {"name", tzhost::utf8(name_)},
+                             {"phase", phase},
+                             {"value", value}};
     });
 }
 

@@ -245,17 +245,15 @@ void registerDatabaseClasses() {
 }
 
 TzString entityKind(TzRxClass const* descriptor) {
-    std::array<std::pair<TzRxClass const*, wchar_t const*>, 7> const kKinds{
-        {
-         {TzDbMText::desc(), L"MTEXT"},
-         {TzDbText::desc(), L"TEXT"},
-         {TzDbAttributeDefinition::desc(), L"ATTDEF"},
-         {TzDbAttribute::desc(), L"ATTRIB"},
-         {TzDbLine::desc(), L"LINE"},
-         {TzDbCircle::desc(), L"CIRCLE"},
-         {TzDbBlockReference::desc(), L"INSERT"},
-         }
-    };
+    std::array<std::pair<TzRxClass const*, wchar_t const*>, 7> const kKinds{{
+        {TzDbMText::desc(), L"MTEXT"},
+        {TzDbText::desc(), L"TEXT"},
+        {TzDbAttributeDefinition::desc(), L"ATTDEF"},
+        {TzDbAttribute::desc(), L"ATTRIB"},
+        {TzDbLine::desc(), L"LINE"},
+        {TzDbCircle::desc(), L"CIRCLE"},
+        {TzDbBlockReference::desc(), L"INSERT"},
+    }};
     for (auto const& [each, kind] : kKinds) {
         if (each == descriptor) return kind;
     }

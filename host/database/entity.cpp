@@ -89,11 +89,9 @@ void markHighlighted(TzDbObjectRecord& record, bool on) {
     if (record.highlighted != on) tzhost::audit().highlighted += on ? 1 : -1;
     record.highlighted = on;
     tzhost::reportEvent([&] {
-        return tzhost::Event{
-            {"event",  "highlight"                                    },
-            {"handle", tzhost::utf8(tzhost::handleText(record.handle))},
-            {"on",     on                                             }
-        };
+        return tzhost::Event{{"event", "highlight"},
+                             {"handle", tzhost::utf8(tzhost::handleText(record.handle))},
+                             {"on", on}};
     });
 }
 

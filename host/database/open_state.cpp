@@ -17,10 +17,7 @@ namespace {
 void reportWrite(TzDbObjectRecord const& record) {
     if (!eventsWanted() || !record.object->isKindOf(TzDbEntity::desc())) return;
     reportEvent([&] {
-        return Event{
-            {"event",  "write"                        },
-            {"handle", utf8(handleText(record.handle))}
-        };
+        return Event{{"event", "write"}, {"handle", utf8(handleText(record.handle))}};
     });
 }
 

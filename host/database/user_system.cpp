@@ -77,13 +77,11 @@ Event threeNumbers(Triple const& value) {
 
 void reportSystem(char const* action, UserSystem const& system) {
     reportEvent([&] {
-        return Event{
-            {"event",  "ucs"                      },
-            {"action", action                     },
-            {"origin", threeNumbers(system.origin)},
-            {"x",      threeNumbers(system.xAxis) },
-            {"y",      threeNumbers(system.yAxis) }
-        };
+        return Event{{"event", "ucs"},
+                     {"action", action},
+                     {"origin", threeNumbers(system.origin)},
+                     {"x", threeNumbers(system.xAxis)},
+                     {"y", threeNumbers(system.yAxis)}};
     });
 }
 

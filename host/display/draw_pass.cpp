@@ -62,9 +62,7 @@ void DrawPass::drawNested(TzGiDrawable& drawable) {
 
 bool DrawPass::take(TzDbEntity const& entity, wchar_t const* type, TzGePoint3d const& position) {
     if (entities_ == Entities::strokes || &entity == top_) return false;
-    list_.push_back({
-        traits_.pen(), DrawnEntity{type, transform() * position}
-    });
+    list_.push_back({traits_.pen(), DrawnEntity{type, transform() * position}});
     return true;
 }
 

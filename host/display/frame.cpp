@@ -31,34 +31,26 @@ Event eventOf(DrawPen const& pen, DrawnLines const& lines) {
     for (TzGePoint3d const& each : lines.points)
         points.push_back(tripleOf(each));
     if (lines.closed && !lines.points.empty()) points.push_back(tripleOf(lines.points.front()));
-    return {
-        {"op",         "polyline"              },
-        {"points",     std::move(points)       },
-        {"color",      colorOf(pen.color)      },
-        {"lineWeight", pen.lineWeight          },
-        {"linetype",   linetypeOf(pen.linetype)}
-    };
+    return {{"op", "polyline"},
+            {"points", std::move(points)},
+            {"color", colorOf(pen.color)},
+            {"lineWeight", pen.lineWeight},
+            {"linetype", linetypeOf(pen.linetype)}};
 }
 
 Event eventOf(DrawPen const& pen, DrawnText const& text) {
-    return {
-        {"op",        "text"                  },
-        {"string",    utf8(text.text)         },
-        {"position",  tripleOf(text.position) },
-        {"normal",    tripleOf(text.normal)   },
-        {"direction", tripleOf(text.direction)},
-        {"size",      text.style.textSize()   },
-        {"vertical",  text.style.isVertical() },
-        {"color",     colorOf(pen.color)      }
-    };
+    return {{"op", "text"},
+            {"string", utf8(text.text)},
+            {"position", tripleOf(text.position)},
+            {"normal", tripleOf(text.normal)},
+            {"direction", tripleOf(text.direction)},
+            {"size", text.style.textSize()},
+            {"vertical", text.style.isVertical()},
+            {"color", colorOf(pen.color)}};
 }
 
 Event eventOf(DrawPen const& /*pen*/, DrawnEntity const& entity) {
-    return {
-        {"op",       "entity"                 },
-        {"type",     utf8(entity.type)        },
-        {"position", tripleOf(entity.position)}
-    };
+    return {{"op", "entity"}, {"type", utf8(entity.type)}, {"position", tripleOf(entity.position)}};
 }
 
 }  // namespace
@@ -69,10 +61,7 @@ Event frameEvent(DrawList const& list) {
         draw.push_back(
             std::visit([&](auto const& what) { return eventOf(op.pen, what); }, op.what));
     }
-    return {
-        {"event", "frame"        },
-        {"draw",  std::move(draw)}
-    };
+    return {{"event", "frame"}, {"draw", std::move(draw)}};
 }
 
 void reportFrame(TzDbEntity* entity, TzDbDatabase* database) {

@@ -36,8 +36,8 @@ struct Page {
 };
 // In the order of PlotFormat: pixels of 1/96 inch, and points of 1/72 inch.
 constexpr Page kPages[] = {
-    {1600.0, 900.0,  96.0 / 25.4, 1.0},
-    {1600.0, 900.0,  96.0 / 25.4, 1.0},
+    {1600.0, 900.0, 96.0 / 25.4, 1.0},
+    {1600.0, 900.0, 96.0 / 25.4, 1.0},
     {841.89, 595.28, 72.0 / 25.4, 0.5},
 };
 constexpr double kMargin = 0.05;  // of the page's smaller side
@@ -203,7 +203,7 @@ bool Painter::isTooSmall(PlotShape const& letters) const {
 void Painter::paintBaseline(PlotShape const& letters) {
     std::vector<OutlineStep> const line{
         {OutlineKind::move, {letters.from}},
-        {OutlineKind::line, {letters.to}  },
+        {OutlineKind::line, {letters.to}},
     };
     if (!addPath(line)) return;
     setStroke(letters);

@@ -14,18 +14,18 @@ constexpr int kVersion = 1;
 }  // namespace
 
 DrawingReader::MemberRow const DrawingReader::kRows[] = {
-    {"format",           &DrawingReader::readFormat      },
-    {"version",          &DrawingReader::readVersion     },
-    {"variables",        &DrawingReader::variables       },
-    {"ucs",              &DrawingReader::ucs             },
-    {"paperUcs",         &DrawingReader::paperUcs        },
-    {"layers",           &DrawingReader::layers          },
-    {"currentLayer",     &DrawingReader::currentLayer    },
-    {"linetypes",        &DrawingReader::linetypes       },
-    {"textStyles",       &DrawingReader::textStyles      },
+    {"format", &DrawingReader::readFormat},
+    {"version", &DrawingReader::readVersion},
+    {"variables", &DrawingReader::variables},
+    {"ucs", &DrawingReader::ucs},
+    {"paperUcs", &DrawingReader::paperUcs},
+    {"layers", &DrawingReader::layers},
+    {"currentLayer", &DrawingReader::currentLayer},
+    {"linetypes", &DrawingReader::linetypes},
+    {"textStyles", &DrawingReader::textStyles},
     {"currentTextStyle", &DrawingReader::currentTextStyle},
-    {"workingSet",       &DrawingReader::workingSet      },
-    {"workingAngle",     &DrawingReader::workingAngle    },
+    {"workingSet", &DrawingReader::workingSet},
+    {"workingAngle", &DrawingReader::workingAngle},
 };
 
 void DrawingReader::readFormat(JsonValue const& value) {

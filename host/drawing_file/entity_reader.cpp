@@ -156,12 +156,12 @@ void EntityReader::read(JsonValue const& value, TzDbObjectRecord* owner) {
         void (EntityReader::*read)(JsonValue const& value, TzDbObjectRecord& owner);
     };
     static constexpr TypeRow kRows[] = {
-        {"MTEXT",  &EntityReader::readAs<TzDbMText,               MTextImp>     },
-        {"TEXT",   &EntityReader::readAs<TzDbText,                TextImp>      },
+        {"MTEXT", &EntityReader::readAs<TzDbMText, MTextImp>},
+        {"TEXT", &EntityReader::readAs<TzDbText, TextImp>},
         {"ATTDEF", &EntityReader::readAs<TzDbAttributeDefinition, DefinitionImp>},
-        {"LINE",   &EntityReader::readAs<TzDbLine,                LineImp>      },
-        {"CIRCLE", &EntityReader::readAs<TzDbCircle,              CircleImp>    },
-        {"INSERT", &EntityReader::readAs<TzDbBlockReference,      InsertImp>    },
+        {"LINE", &EntityReader::readAs<TzDbLine, LineImp>},
+        {"CIRCLE", &EntityReader::readAs<TzDbCircle, CircleImp>},
+        {"INSERT", &EntityReader::readAs<TzDbBlockReference, InsertImp>},
     };
     JsonValue const* const type = value.find("type");
     if (!type) {
@@ -191,9 +191,7 @@ void EntityReader::refuseCycles() {
     for (OpenReference const& each : references_) {
         TzDbObjectRecord const* const start = each.reference->owner;
         if (!marks.emplace(start, Mark::open).second) continue;
-        std::vector<Visit> path{
-            {start, 0}
-        };
+        std::vector<Visit> path{{start, 0}};
         while (!path.empty()) {
             auto& [block, next] = path.back();
             auto const at = inside.find(block);

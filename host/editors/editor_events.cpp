@@ -16,21 +16,10 @@ struct SettingsField {
 };
 
 constexpr SettingsField kSettingsFields[] = {
-    {0,   Field::byte},
-    {4,   Field::byte},
-    {5,   Field::byte},
-    {6,   Field::byte},
-    {12,  Field::word},
-    {16,  Field::real},
-    {40,  Field::real},
-    {192, Field::word},
-    {196, Field::word},
-    {200, Field::word},
-    {204, Field::word},
-    {208, Field::word},
-    {212, Field::half},
-    {216, Field::word},
-    {220, Field::word},
+    {0, Field::byte},   {4, Field::byte},   {5, Field::byte},   {6, Field::byte},
+    {12, Field::word},  {16, Field::real},  {40, Field::real},  {192, Field::word},
+    {196, Field::word}, {200, Field::word}, {204, Field::word}, {208, Field::word},
+    {212, Field::half}, {216, Field::word}, {220, Field::word},
 };
 
 template <class Number>
@@ -70,11 +59,7 @@ Event describe(IPESettings const& settings) {
 
 void reportEditor(char const* kind, bool accepted, IPESettings const* settings) {
     reportEvent([&] {
-        Event event{
-            {"event",    "editor"},
-            {"kind",     kind    },
-            {"accepted", accepted}
-        };
+        Event event{{"event", "editor"}, {"kind", kind}, {"accepted", accepted}};
         if (settings) event["settings"] = describe(*settings);
         return event;
     });

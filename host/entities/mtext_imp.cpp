@@ -62,11 +62,9 @@ MTextLayoutInput MTextImp::input() const {
     input.lineSpacingFactor = lineSpacingFactor;
     input.attachment = attachment;
     if (columns) {
-        input.columns = {
-            columns->columnType,   columns->autoHeight,
-            columns->columnCount,  columns->columnWidth,
-            columns->columnGutter, {columns->heights.begin(), columns->heights.end()}
-        };
+        input.columns = {columns->columnType,   columns->autoHeight,
+                         columns->columnCount,  columns->columnWidth,
+                         columns->columnGutter, {columns->heights.begin(), columns->heights.end()}};
     }
     return input;
 }

@@ -60,10 +60,10 @@ struct CodeRow {
 
 // The first word of a code and what computes it.
 constexpr CodeRow kCodes[] = {
-    {L"\\Date",   dateValue    },
-    {L"\\File",   fileValue    },
-    {L"\\Object", objectValue  },
-    {L"\\Var",    variableValue},
+    {L"\\Date", dateValue},
+    {L"\\File", fileValue},
+    {L"\\Object", objectValue},
+    {L"\\Var", variableValue},
 };
 
 Value valueOf(std::wstring_view code, Drawing const* drawing) {

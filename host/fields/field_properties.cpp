@@ -35,87 +35,87 @@ struct PropertyRow {
 
 // Names may stand twice, for several classes; the first row with a value counts.
 constexpr PropertyRow kProperties[] = {
-    {L"type",       [](TzDbObject const& o) -> Value { return entityKind(o.isA()).str(); }},
+    {L"type", [](TzDbObject const& o) -> Value { return entityKind(o.isA()).str(); }},
     {L"handle",
-     [](TzDbObject const& o) -> Value { return handleText(o.objectId().handle()).str(); } },
+     [](TzDbObject const& o) -> Value { return handleText(o.objectId().handle()).str(); }},
     {L"layer",
      [](TzDbObject const& o) {
          return from<TzDbEntity>(o, [](auto const& e) { return e.layer().str(); });
-     }                                                                                    },
+     }},
     {L"contents",
      [](TzDbObject const& o) {
          return from<TzDbMText>(o, [](auto const& e) { return e.contents().str(); });
-     }                                                                                    },
+     }},
     {L"text",
      [](TzDbObject const& o) {
          return from<TzDbText>(o, [](auto const& e) { return e.textString().str(); });
-     }                                                                                    },
+     }},
     {L"tag",
      [](TzDbObject const& o) {
          return from<TzDbAttribute>(o, [](auto const& e) { return e.tag().str(); });
-     }                                                                                    },
+     }},
     {L"tag",
      [](TzDbObject const& o) {
          return from<TzDbAttributeDefinition>(o, [](auto const& e) { return e.tag().str(); });
-     }                                                                                    },
+     }},
     {L"style",
      [](TzDbObject const& o) {
          return from<TzDbMText>(o, [](auto const& e) { return nameOf(e.textStyle()); });
-     }                                                                                    },
+     }},
     {L"style",
      [](TzDbObject const& o) {
          return from<TzDbText>(o, [](auto const& e) { return nameOf(e.textStyle()); });
-     }                                                                                    },
+     }},
     {L"textHeight",
      [](TzDbObject const& o) {
          return from<TzDbMText>(o, [](auto const& e) { return writeReal(e.textHeight()); });
-     }                                                                                    },
+     }},
     {L"textHeight",
      [](TzDbObject const& o) {
          return from<TzDbText>(o, [](auto const& e) { return writeReal(e.height()); });
-     }                                                                                    },
+     }},
     {L"width",
      [](TzDbObject const& o) {
          return from<TzDbMText>(o, [](auto const& e) { return writeReal(e.width()); });
-     }                                                                                    },
+     }},
     {L"location",
      [](TzDbObject const& o) {
          return from<TzDbMText>(o, [](auto const& e) { return pointText(e.location()); });
-     }                                                                                    },
+     }},
     {L"position",
      [](TzDbObject const& o) {
          return from<TzDbText>(o, [](auto const& e) { return pointText(e.position()); });
-     }                                                                                    },
+     }},
     {L"position",
      [](TzDbObject const& o) {
          return from<TzDbBlockReference>(o, [](auto const& e) { return pointText(e.position()); });
-     }                                                                                    },
+     }},
     {L"block",
      [](TzDbObject const& o) {
          return from<TzDbBlockReference>(
              o, [](auto const& e) { return nameOf(e.blockTableRecord()); });
-     }                                                                                    },
+     }},
     {L"start",
      [](TzDbObject const& o) {
          return from<TzDbLine>(o, [](auto const& e) { return pointText(e.startPoint()); });
-     }                                                                                    },
+     }},
     {L"end",
      [](TzDbObject const& o) {
          return from<TzDbLine>(o, [](auto const& e) { return pointText(e.endPoint()); });
-     }                                                                                    },
+     }},
     {L"length",
      [](TzDbObject const& o) {
          return from<TzDbLine>(
              o, [](auto const& e) { return writeReal(e.startPoint().distanceTo(e.endPoint())); });
-     }                                                                                    },
+     }},
     {L"center",
      [](TzDbObject const& o) {
          return from<TzDbCircle>(o, [](auto const& e) { return pointText(e.center()); });
-     }                                                                                    },
+     }},
     {L"radius",
      [](TzDbObject const& o) {
          return from<TzDbCircle>(o, [](auto const& e) { return writeReal(e.radius()); });
-     }                                                                                    },
+     }},
 };
 
 }  // namespace

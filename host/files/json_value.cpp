@@ -17,13 +17,7 @@ struct Escape {
 
 // Characters that are written as a backslash and a letter; other control characters as \u00XX.
 constexpr Escape kEscapes[] = {
-    {'"',  '"' },
-    {'\\', '\\'},
-    {'\b', 'b' },
-    {'\f', 'f' },
-    {'\n', 'n' },
-    {'\r', 'r' },
-    {'\t', 't' },
+    {'"', '"'}, {'\\', '\\'}, {'\b', 'b'}, {'\f', 'f'}, {'\n', 'n'}, {'\r', 'r'}, {'\t', 't'},
 };
 
 void writeCharacter(std::string& out, char c) {

@@ -50,8 +50,7 @@ bool isUncasedLetter(wchar_t c) {
         wchar_t first, last;
     };
     constexpr std::array<Range, 4> kRanges{
-        {{0x5D0, 0x5EA}, {0x621, 0x64A}, {0x671, 0x6D3}, {0xE01, 0xE4E}}
-    };
+        {{0x5D0, 0x5EA}, {0x621, 0x64A}, {0x671, 0x6D3}, {0xE01, 0xE4E}}};
     for (Range const& range : kRanges) {
         if (c >= range.first && c <= range.last) return true;
     }

@@ -21,14 +21,10 @@ struct FamilyWord {
 // Words in a face's name that tell its family, the first that is found counting. The catalogue
 // itself knows nothing of serifs.
 constexpr FamilyWord kFamilyWords[] = {
-    {L"sans",        FontFamily::kSwiss     },
-    {L"serif",       FontFamily::kRoman     },
-    {L"roman",       FontFamily::kRoman     },
-    {L"times",       FontFamily::kRoman     },
-    {L"script",      FontFamily::kScript    },
-    {L"handwriting", FontFamily::kScript    },
-    {L"symbol",      FontFamily::kDecorative},
-    {L"dingbats",    FontFamily::kDecorative},
+    {L"sans", FontFamily::kSwiss},        {L"serif", FontFamily::kRoman},
+    {L"roman", FontFamily::kRoman},       {L"times", FontFamily::kRoman},
+    {L"script", FontFamily::kScript},     {L"handwriting", FontFamily::kScript},
+    {L"symbol", FontFamily::kDecorative}, {L"dingbats", FontFamily::kDecorative},
 };
 
 FontPitch pitchOf(FontForm const& form) {

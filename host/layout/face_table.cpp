@@ -21,8 +21,8 @@ struct StrokeRow {
 // Stroke fonts by what their names tell; the first row that fits counts, and the last fits all.
 constexpr std::array kStrokeFaces{
     StrokeRow{L"mono", L"DejaVu Sans Mono", false},
-    StrokeRow{L"ital", L"DejaVu Sans",      true },
-    StrokeRow{L"",     L"DejaVu Sans",      false},
+    StrokeRow{L"ital", L"DejaVu Sans", true},
+    StrokeRow{L"", L"DejaVu Sans", false},
 };
 
 std::wstring lowerCase(std::wstring const& text) {

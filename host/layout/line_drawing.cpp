@@ -14,12 +14,10 @@ struct DecorationRow {
     double offset;  // from the baseline, in text heights
 };
 
-constexpr std::array<DecorationRow, 2> kDecorations{
-    {
-     {RuleKind::underline, &LineFormat::underline, -0.2},
-     {RuleKind::overline, &LineFormat::overline, 1.2},
-     }
-};
+constexpr std::array<DecorationRow, 2> kDecorations{{
+    {RuleKind::underline, &LineFormat::underline, -0.2},
+    {RuleKind::overline, &LineFormat::overline, 1.2},
+}};
 
 // A decoration that is being drawn out along the line.
 struct OpenRule {
@@ -109,11 +107,8 @@ void LineDrawer::close(DecorationRow const& row, OpenRule& rule) {
         return;
     }
     double const y = origin_.y + row.offset * rule.height;
-    layout_.rules.push_back({
-        row.kind, {origin_.x + rule.from, y},
-         {origin_.x + rule.to,   y},
-         rule.color
-    });
+    layout_.rules.push_back(
+        {row.kind, {origin_.x + rule.from, y}, {origin_.x + rule.to, y}, rule.color});
     rule.open = false;
 }
 

@@ -94,26 +94,16 @@ struct CodeRow {
 
 // The codes with arguments or effects; escaped characters and unknown codes are handled apart.
 constexpr std::array kCodes{
-    CodeRow{L'A', &Reader::readStackAlignment },
-    CodeRow{L'C', &Reader::readColorIndex     },
-    CodeRow{L'F', &Reader::readFontFile       },
-    CodeRow{L'H', &Reader::readHeight         },
-    CodeRow{L'L', &Reader::startUnderline     },
-    CodeRow{L'M', &Reader::readMultibyte      },
-    CodeRow{L'O', &Reader::startOverline      },
-    CodeRow{L'P', &Reader::endParagraph       },
-    CodeRow{L'Q', &Reader::readOblique        },
-    CodeRow{L'S', &Reader::readStack          },
-    CodeRow{L'T', &Reader::readTracking       },
-    CodeRow{L'U', &Reader::readUnicode        },
-    CodeRow{L'W', &Reader::readWidthFactor    },
-    CodeRow{L'c', &Reader::readColorRgb       },
-    CodeRow{L'f', &Reader::readFontFace       },
-    CodeRow{L'l', &Reader::endUnderline       },
-    CodeRow{L'm', &Reader::readMultibyte      },
-    CodeRow{L'o', &Reader::endOverline        },
-    CodeRow{L'p', &Reader::readParagraphFormat},
-    CodeRow{L'u', &Reader::readUnicode        },
+    CodeRow{L'A', &Reader::readStackAlignment},  CodeRow{L'C', &Reader::readColorIndex},
+    CodeRow{L'F', &Reader::readFontFile},        CodeRow{L'H', &Reader::readHeight},
+    CodeRow{L'L', &Reader::startUnderline},      CodeRow{L'M', &Reader::readMultibyte},
+    CodeRow{L'O', &Reader::startOverline},       CodeRow{L'P', &Reader::endParagraph},
+    CodeRow{L'Q', &Reader::readOblique},         CodeRow{L'S', &Reader::readStack},
+    CodeRow{L'T', &Reader::readTracking},        CodeRow{L'U', &Reader::readUnicode},
+    CodeRow{L'W', &Reader::readWidthFactor},     CodeRow{L'c', &Reader::readColorRgb},
+    CodeRow{L'f', &Reader::readFontFace},        CodeRow{L'l', &Reader::endUnderline},
+    CodeRow{L'm', &Reader::readMultibyte},       CodeRow{L'o', &Reader::endOverline},
+    CodeRow{L'p', &Reader::readParagraphFormat}, CodeRow{L'u', &Reader::readUnicode},
 };
 static_assert(std::is_sorted(kCodes.begin(), kCodes.end(), [](CodeRow const& a, CodeRow const& b) {
     return a.code < b.code;
@@ -124,14 +114,12 @@ struct EscapeRow {
     wchar_t character;
 };
 
-constexpr std::array<EscapeRow, 4> kEscapes{
-    {
-     {L'\\', L'\\'},
-     {L'{', L'{'},
-     {L'}', L'}'},
-     {L'~', kHardSpace},
-     }
-};
+constexpr std::array<EscapeRow, 4> kEscapes{{
+    {L'\\', L'\\'},
+    {L'{', L'{'},
+    {L'}', L'}'},
+    {L'~', kHardSpace},
+}};
 
 Reader::Reader(std::wstring const& contents, MarkupFormat const& initial)
     : begin_(contents.c_str()), cursor_(begin_), stacks_(contents) {

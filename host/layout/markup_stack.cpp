@@ -20,13 +20,11 @@ struct SignRow {
     StackKind kind;
 };
 
-constexpr std::array<SignRow, 3> kStackSigns{
-    {
-     {L'/', StackKind::over},
-     {L'#', StackKind::fraction},
-     {L'^', StackKind::tolerance},
-     }
-};
+constexpr std::array<SignRow, 3> kStackSigns{{
+    {L'/', StackKind::over},
+    {L'#', StackKind::fraction},
+    {L'^', StackKind::tolerance},
+}};
 
 // Where a walk over the arguments of a stack stands. Their end is found with the character after
 // an escape pair taken unseen; the stack character is looked for with Unicode codes left out.

@@ -49,8 +49,8 @@ struct KindRow {
 
 // In the order of StackKind.
 constexpr std::array kKinds{
-    KindRow{1.6, &StackMaker::layOver     },
-    KindRow{0.9, &StackMaker::layFraction },
+    KindRow{1.6, &StackMaker::layOver},
+    KindRow{0.9, &StackMaker::layFraction},
     KindRow{1.4, &StackMaker::layTolerance},
 };
 

@@ -35,24 +35,17 @@ void print(std::wstring_view text) {
 }
 
 void debug(std::wstring_view text) {
-    reportEvent([&] {
-        return Event{
-            {"event", "debug"     },
-            {"text",  toUtf8(text)}
-        };
-    });
+    reportEvent([&] { return Event{{"event", "debug"}, {"text", toUtf8(text)}}; });
     if (debugSink != nullptr) debugSink->debug(text);
 }
 
 void notify(Notification const& notification) {
     bool const isWarning = notification.kind == NotificationKind::warning;
     reportEvent([&] {
-        return Event{
-            {"event", isWarning ? "warning" : "messageBox"},
-            {"id",    toUtf8(notification.id)             },
-            {"text",  toUtf8(notification.text)           },
-            {"style", notification.style                  }
-        };
+        return Event{{"event", isWarning ? "warning" : "messageBox"},
+                     {"id", toUtf8(notification.id)},
+                     {"text", toUtf8(notification.text)},
+                     {"style", notification.style}};
     });
     if (notificationSink != nullptr) notificationSink->notify(notification);
 }

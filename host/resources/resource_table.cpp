@@ -19,10 +19,10 @@ struct SectionRow {
 };
 
 constexpr SectionRow kSections[] = {
-    {"[texts]",           ResourceRules::texts         },
-    {"[keywords]",        ResourceRules::keywords      },
-    {"[fixed]",           ResourceRules::fixed         },
-    {"[warnings]",        ResourceRules::warnings      },
+    {"[texts]", ResourceRules::texts},
+    {"[keywords]", ResourceRules::keywords},
+    {"[fixed]", ResourceRules::fixed},
+    {"[warnings]", ResourceRules::warnings},
     {"[warning formats]", ResourceRules::warningFormats},
 };
 

@@ -11,9 +11,9 @@ struct ComponentRow {
     int shift;
 };
 constexpr ComponentRow kComponents[] = {
-    {"red",   0 },
-    {"green", 8 },
-    {"blue",  16},
+    {"red", 0},
+    {"green", 8},
+    {"blue", 16},
 };
 
 }  // namespace

@@ -17,12 +17,8 @@ struct FamilyRow {
     int family;
 };
 constexpr FamilyRow kFamilies[] = {
-    {"fnil",    0x00},
-    {"froman",  0x10},
-    {"fswiss",  0x20},
-    {"fmodern", 0x30},
-    {"fscript", 0x40},
-    {"fdecor",  0x50},
+    {"fnil", 0x00},    {"froman", 0x10},  {"fswiss", 0x20},
+    {"fmodern", 0x30}, {"fscript", 0x40}, {"fdecor", 0x50},
 };
 
 // The value, or 0 when it is none of 0 to `most`.

@@ -79,12 +79,7 @@ ClassDescriptor* insertClass(wchar_t const* name, wchar_t const* parent, TzRxCre
 
 void reportClass(wchar_t const* name, bool on) {
     reportEvent([&] {
-        return Event{
-            {"event", "register"},
-            {"what",  "class"   },
-            {"name",  utf8(name)},
-            {"on",    on        }
-        };
+        return Event{{"event", "register"}, {"what", "class"}, {"name", utf8(name)}, {"on", on}};
     });
 }
 

@@ -24,26 +24,20 @@ Audit& worst() {
 
 void reportPhase(Command const& command, char const* phase) {
     reportEvent([&] {
-        return Event{
-            {"event", "command"               },
-            {"name",  utf8(command.globalName)},
-            {"phase", phase                   }
-        };
+        return Event{{"event", "command"}, {"name", utf8(command.globalName)}, {"phase", phase}};
     });
 }
 
 void reportAudit(Audit const& left) {
     reportEvent([&] {
-        return Event{
-            {"event",           "audit"             },
-            {"openObjects",     left.openObjects    },
-            {"selectionSets",   left.selectionSets  },
-            {"filters",         left.filters        },
-            {"gestureHandlers", left.gestureHandlers},
-            {"highlighted",     left.highlighted    },
-            {"ucsStack",        left.ucsStack       },
-            {"keywordCallback", left.keywordCallback}
-        };
+        return Event{{"event", "audit"},
+                     {"openObjects", left.openObjects},
+                     {"selectionSets", left.selectionSets},
+                     {"filters", left.filters},
+                     {"gestureHandlers", left.gestureHandlers},
+                     {"highlighted", left.highlighted},
+                     {"ucsStack", left.ucsStack},
+                     {"keywordCallback", left.keywordCallback}};
     });
 }
 

@@ -21,15 +21,13 @@ std::map<TzString, TzString, NoCaseLess>& helpTopics() {
 
 void reportCommand(Command const& command, bool on) {
     reportEvent([&] {
-        return Event{
-            {"event", "register"              },
-            {"what",  "command"               },
-            {"name",  utf8(command.globalName)},
-            {"on",    on                      },
-            {"local", utf8(command.localName) },
-            {"group", utf8(command.group)     },
-            {"flags", command.flags           }
-        };
+        return Event{{"event", "register"},
+                     {"what", "command"},
+                     {"name", utf8(command.globalName)},
+                     {"on", on},
+                     {"local", utf8(command.localName)},
+                     {"group", utf8(command.group)},
+                     {"flags", command.flags}};
     });
 }
 
@@ -106,13 +104,11 @@ int tzedSetFunHelp(wchar_t const* name,
     if (!name || !*name) return Tzad::ePromptError;
     tzhost::helpTopics()[name] = topic;
     tzhost::reportEvent([&] {
-        return tzhost::Event{
-            {"event", "register"         },
-            {"what",  "help"             },
-            {"name",  tzhost::utf8(name) },
-            {"on",    true               },
-            {"topic", tzhost::utf8(topic)}
-        };
+        return tzhost::Event{{"event", "register"},
+                             {"what", "help"},
+                             {"name", tzhost::utf8(name)},
+                             {"on", true},
+                             {"topic", tzhost::utf8(topic)}};
     });
     return Tzad::ePromptNormal;
 }

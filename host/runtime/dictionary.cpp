@@ -39,12 +39,10 @@ public:
         TzRxObject* const removed = Dictionary::remove(name);
         if (removed) {
             reportEvent([&] {
-                return Event{
-                    {"event", "register"},
-                    {"what",  "service" },
-                    {"name",  utf8(name)},
-                    {"on",    false     }
-                };
+                return Event{{"event", "register"},
+                             {"what", "service"},
+                             {"name", utf8(name)},
+                             {"on", false}};
             });
         }
         return removed;
@@ -91,11 +89,7 @@ TzRxObject* tzrxRegisterService(wchar_t const* name) {
     services.atPut(name, service);
     tzhost::reportEvent([&] {
         return tzhost::Event{
-            {"event", "register"        },
-            {"what",  "service"         },
-            {"name",  tzhost::utf8(name)},
-            {"on",    true              }
-        };
+            {"event", "register"}, {"what", "service"}, {"name", tzhost::utf8(name)}, {"on", true}};
     });
     return service;
 }

@@ -34,13 +34,11 @@ private:
 
 void reportFunction(TzString const& name, int code, bool on) {
     reportEvent([&] {
-        return Event{
-            {"event", "register"},
-            {"what",  "function"},
-            {"name",  utf8(name)},
-            {"on",    on        },
-            {"code",  code      }
-        };
+        return Event{{"event", "register"},
+                     {"what", "function"},
+                     {"name", utf8(name)},
+                     {"on", on},
+                     {"code", code}};
     });
 }
 

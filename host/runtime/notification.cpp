@@ -5,12 +5,7 @@
 namespace tzhost {
 
 void reportNotification(char const* name) {
-    reportEvent([&] {
-        return Event{
-            {"event", "notify"},
-            {"name",  name    }
-        };
-    });
+    reportEvent([&] { return Event{{"event", "notify"}, {"name", name}}; });
 }
 
 }  // namespace tzhost

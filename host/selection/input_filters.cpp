@@ -78,13 +78,7 @@ void runFilters(int wanted, EntityIds& ids, Hook const& hook) {
 }
 
 void reportFilter(char const* action, int flags) {
-    reportEvent([&] {
-        return Event{
-            {"event",  "filter"},
-            {"action", action  },
-            {"flags",  flags   }
-        };
-    });
+    reportEvent([&] { return Event{{"event", "filter"}, {"action", action}, {"flags", flags}}; });
 }
 
 // Only a document that is open has input.

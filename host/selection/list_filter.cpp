@@ -41,10 +41,10 @@ struct CodeRow {
 };
 
 constexpr CodeRow kCodes[] = {
-    {0,                       kindOf },
-    {7,                       styleOf},
-    {8,                       layerOf},
-    {Tzad::eResultEntityKind, kindOf },
+    {0, kindOf},
+    {7, styleOf},
+    {8, layerOf},
+    {Tzad::eResultEntityKind, kindOf},
 };
 
 CodeRow const* findCode(int code) {

@@ -75,10 +75,7 @@ bool areaHolds(std::vector<TzGePoint2d> const& area, TzGePoint2d const& point) {
 }  // namespace
 
 FlatBox FlatBox::between(TzGePoint2d const& a, TzGePoint2d const& b) {
-    return {
-        {std::min(a.x, b.x), std::min(a.y, b.y)},
-        {std::max(a.x, b.x), std::max(a.y, b.y)}
-    };
+    return {{std::min(a.x, b.x), std::min(a.y, b.y)}, {std::max(a.x, b.x), std::max(a.y, b.y)}};
 }
 
 bool FlatBox::holds(TzGePoint2d const& point) const {

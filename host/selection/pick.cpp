@@ -40,7 +40,7 @@ std::vector<Inside> insidesOf(Picked const& reference) {
     auto const* const insert = objectOf<TzDbBlockReference>(reference.id);
     if (insert == nullptr) return {};
     return {
-        {itemsOf(reference.id),               reference.placed                           },
+        {itemsOf(reference.id), reference.placed},
         {itemsOf(insert->blockTableRecord()), reference.placed * insert->blockTransform()},
     };
 }

@@ -12,12 +12,8 @@ struct WayRow {
 };
 
 constexpr WayRow kWays[] = {
-    {L'I', SelectionWay::implied },
-    {L'X', SelectionWay::all     },
-    {L'L', SelectionWay::last    },
-    {L'P', SelectionWay::previous},
-    {L'W', SelectionWay::window  },
-    {L'C', SelectionWay::crossing},
+    {L'I', SelectionWay::implied},  {L'X', SelectionWay::all},    {L'L', SelectionWay::last},
+    {L'P', SelectionWay::previous}, {L'W', SelectionWay::window}, {L'C', SelectionWay::crossing},
 };
 
 // Behind a colon.

@@ -65,13 +65,10 @@ struct WordRow {
 };
 
 constexpr WordRow kWords[] = {
-    {forLocalText(L"window w"),   readWindow,   3},
-    {forLocalText(L"crossing c"), readCrossing, 3},
-    {forLocalText(L"all all"),    readAll,      1},
-    {forLocalText(L"last l"),     readLast,     1},
-    {forLocalText(L"previous p"), readPrevious, 1},
-    {forLocalText(L"add a"),      readAdd,      1},
-    {forLocalText(L"remove r"),   readRemove,   1},
+    {forLocalText(L"window w"), readWindow, 3},     {forLocalText(L"crossing c"), readCrossing, 3},
+    {forLocalText(L"all all"), readAll, 1},         {forLocalText(L"last l"), readLast, 1},
+    {forLocalText(L"previous p"), readPrevious, 1}, {forLocalText(L"add a"), readAdd, 1},
+    {forLocalText(L"remove r"), readRemove, 1},
 };
 
 // The row of a word that stands on a line of `count` words.

@@ -13,11 +13,9 @@ namespace {
 void reportWrite(wchar_t const* name, tzhost::VariableValue const& value) {
     tzhost::reportEvent([&] {
         std::wstring const capitals(tzhost::findVariable(name)->name);
-        return tzhost::Event{
-            {"event", "variable"              },
-            {"name",  tzhost::toUtf8(capitals)},
-            {"value", tzhost::toJson(value)   }
-        };
+        return tzhost::Event{{"event", "variable"},
+                             {"name", tzhost::toUtf8(capitals)},
+                             {"value", tzhost::toJson(value)}};
     });
 }
 

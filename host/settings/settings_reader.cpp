@@ -76,15 +76,15 @@ struct MemberRow {
 };
 
 constexpr MemberRow kMembers[] = {
-    {"variables",      &Reader::variables                       },
-    {"product",        &Reader::product                         },
-    {"registry",       &Reader::registry                        },
-    {"productKey",     &Reader::text<&Settings::productKey>     },
-    {"denied",         &Reader::texts<&Settings::denied>        },
-    {"fabric",         &Reader::fabric                          },
+    {"variables", &Reader::variables},
+    {"product", &Reader::product},
+    {"registry", &Reader::registry},
+    {"productKey", &Reader::text<&Settings::productKey>},
+    {"denied", &Reader::texts<&Settings::denied>},
+    {"fabric", &Reader::fabric},
     {"inPlaceEditors", &Reader::texts<&Settings::inPlaceEditors>},
-    {"rtfEditor",      &Reader::text<&Settings::rtfEditor>      },
-    {"textEditor",     &Reader::text<&Settings::textEditor>     },
+    {"rtfEditor", &Reader::text<&Settings::rtfEditor>},
+    {"textEditor", &Reader::text<&Settings::textEditor>},
 };
 
 constexpr std::array<std::wstring_view, 2> kRoots{L"hkey_current_user", L"hkey_local_machine"};

@@ -50,9 +50,8 @@ std::vector<OutlineStep> stepsOf(cairo_path_t const& path) {
         case CAIRO_PATH_MOVE_TO: steps.push_back({OutlineKind::move, {pointOf(data[1])}}); break;
         case CAIRO_PATH_LINE_TO: steps.push_back({OutlineKind::line, {pointOf(data[1])}}); break;
         case CAIRO_PATH_CURVE_TO:
-            steps.push_back({
-                OutlineKind::curve, {pointOf(data[1]), pointOf(data[2]), pointOf(data[3])}
-            });
+            steps.push_back(
+                {OutlineKind::curve, {pointOf(data[1]), pointOf(data[2]), pointOf(data[3])}});
             break;
         case CAIRO_PATH_CLOSE_PATH: steps.push_back({OutlineKind::close, {}}); break;
         }

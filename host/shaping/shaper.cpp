@@ -78,9 +78,7 @@ shapeText(std::wstring const& text, std::vector<ShapeSpan> const& spans, Ligatur
 }
 
 ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face, Ligatures ligatures) {
-    std::vector<ShapeSpan> const whole{
-        {text.size(), face}
-    };
+    std::vector<ShapeSpan> const whole{{text.size(), face}};
     ShapedText const shaped = shapeText(text, whole, ligatures);
     ShapedLine line;
     for (ShapedCharacter const& character : shaped.characters) {
@@ -95,9 +93,7 @@ ShapedLine shapeLine(std::wstring const& text, LayoutFace const& face, Ligatures
 
 std::vector<std::wstring> splitLetters(std::wstring const& text, LayoutFace const& face) {
     std::vector<std::wstring> letters;
-    std::vector<ShapeSpan> const whole{
-        {text.size(), face}
-    };
+    std::vector<ShapeSpan> const whole{{text.size(), face}};
     ShapedText const shaped = shapeText(text, whole, Ligatures::off);
     for (std::size_t i = 0; i < text.size(); ++i) {
         if (letters.empty() || shaped.characters[i].opensLetter) {

@@ -48,9 +48,7 @@ private:
 
 void Outliner::outline() {
     Utf8Text const utf8 = utf8Of(run_.text);
-    std::vector<ShapeSpan> const whole{
-        {run_.text.size(), run_.face}
-    };
+    std::vector<ShapeSpan> const whole{{run_.text.size(), run_.face}};
     PangoDirection const direction = run_.rightToLeft ? PANGO_DIRECTION_RTL : PANGO_DIRECTION_LTR;
     Ligatures const ligatures = run_.tracking != 1.0 ? Ligatures::off : Ligatures::on;
     std::vector<TextItem> const items = itemize(utf8, whole, direction, ligatures);

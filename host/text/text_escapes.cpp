@@ -16,11 +16,7 @@ struct Escape {
 
 // The letter behind the backslash, the character that it stands for.
 constexpr Escape kEscapes[] = {
-    {L'n',  L'\n'},
-    {L'r',  L'\r'},
-    {L't',  L'\t'},
-    {L's',  L' ' },
-    {L'\\', L'\\'},
+    {L'n', L'\n'}, {L'r', L'\r'}, {L't', L'\t'}, {L's', L' '}, {L'\\', L'\\'},
 };
 
 constexpr std::size_t kHexDigits = 4;

@@ -44,15 +44,9 @@ struct LengthRow {
 
 // The longer of two spellings stands first.
 constexpr LengthRow kLengths[] = {
-    {L"hh", Length::hh},
-    {L"h",  Length::h },
-    {L"ll", Length::ll},
-    {L"l",  Length::l },
-    {L"j",  Length::j },
-    {L"z",  Length::z },
-    {L"t",  Length::t },
-    {L"L",  Length::L },
-    {L"q",  Length::ll},
+    {L"hh", Length::hh}, {L"h", Length::h}, {L"ll", Length::ll},
+    {L"l", Length::l},   {L"j", Length::j}, {L"z", Length::z},
+    {L"t", Length::t},   {L"L", Length::L}, {L"q", Length::ll},
 };
 
 // Runs a format over its arguments. `arguments_` is used up in the order of the conversions.

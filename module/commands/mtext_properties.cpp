@@ -107,8 +107,8 @@ struct Property {
     void (*change)(long long const (&set)[2]);
 };
 constexpr Property kProperties[] = {
-    {L'R', changeTextRotate },
-    {L'S', changeTextStyle  },
+    {L'R', changeTextRotate},
+    {L'S', changeTextStyle},
     {L'J', changeTextJustify},
 };
 

@@ -47,9 +47,9 @@ bool CEnumerateMappedFonts::EnumeratedKey(TzString const& key) {
 void CMTextFontMapDatabase::BuildDatabase() {
     // Later sections take the place of earlier ones.
     std::pair<wchar_t const*, MapType> const sections[] = {
-        {gszIniSHXSectMapDatabase,        MapTypeShx       },
+        {gszIniSHXSectMapDatabase, MapTypeShx},
         {gszIniPostscriptSectMapDatabase, MapTypePostscript},
-        {gszIniMiscSectMapDatabase,       MapTypeMisc      },
+        {gszIniMiscSectMapDatabase, MapTypeMisc},
     };
     for (auto const& [section, type] : sections) {
         CEnumerateMappedFonts(this, gsIniFileDatabase, section, type).EnumerateSection();

@@ -21,19 +21,17 @@ struct BoxPlace {
 };
 
 // In the order of the numbers, from 1.
-inline constexpr std::array<BoxPlace, 9> kAttachmentPlaces{
-    {
-     {BoxColumn::left, BoxRow::top},
-     {BoxColumn::centre, BoxRow::top},
-     {BoxColumn::right, BoxRow::top},
-     {BoxColumn::left, BoxRow::middle},
-     {BoxColumn::centre, BoxRow::middle},
-     {BoxColumn::right, BoxRow::middle},
-     {BoxColumn::left, BoxRow::bottom},
-     {BoxColumn::centre, BoxRow::bottom},
-     {BoxColumn::right, BoxRow::bottom},
-     }
-};
+inline constexpr std::array<BoxPlace, 9> kAttachmentPlaces{{
+    {BoxColumn::left, BoxRow::top},
+    {BoxColumn::centre, BoxRow::top},
+    {BoxColumn::right, BoxRow::top},
+    {BoxColumn::left, BoxRow::middle},
+    {BoxColumn::centre, BoxRow::middle},
+    {BoxColumn::right, BoxRow::middle},
+    {BoxColumn::left, BoxRow::bottom},
+    {BoxColumn::centre, BoxRow::bottom},
+    {BoxColumn::right, BoxRow::bottom},
+}};
 
 [[nodiscard]] constexpr bool isAttachment(int number) {
     return number >= 1 && number <= 9;

@@ -8,8 +8,5 @@ wchar_t const* gszEndOfStackToken = L"\\s";
 TzString g_sInitialFont;
 TzString gsMtextRegistryKey;
 
-TzStackCharacters const g_stackCharacters{
-    {L'/', L'#', L'^'},
-    L"TzmtedRes.dll"
-};
+TzStackCharacters const g_stackCharacters{{L'/', L'#', L'^'}, L"TzmtedRes.dll"};
 wchar_t const* const g_pszStackChars = reinterpret_cast<wchar_t const*>(&g_stackCharacters);

@@ -57,17 +57,13 @@ TzGePoint3d attachmentPoint(BoxCorners const& corners,
 BoxEdges edgesOf(BoxCorners const& corners, LineFlow flow) {
     auto const& [topLeft, bottomLeft, topRight, bottomRight] = corners;
     if (flow == LineFlow::vertical) {
-        return {
-            {{{topRight, topLeft}, {bottomLeft, bottomRight}}},
-            { bottomLeft,                                         topLeft},
-            { bottomRight,                                        topRight}
-        };
+        return {{{{topRight, topLeft}, {bottomLeft, bottomRight}}},
+                {bottomLeft, topLeft},
+                {bottomRight, topRight}};
     }
-    return {
-        {{{bottomLeft, topLeft}, {topRight, bottomRight}}},
-        { topLeft,                                        topRight},
-        { bottomLeft,                                     bottomRight}
-    };
+    return {{{{bottomLeft, topLeft}, {topRight, bottomRight}}},
+            {topLeft, topRight},
+            {bottomLeft, bottomRight}};
 }
 
 std::array<TzGePoint3d, 8>

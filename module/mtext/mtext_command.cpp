@@ -21,9 +21,9 @@ struct ColumnSetting {
     bool autoHeight;
 };
 constexpr ColumnSetting kColumnSettings[] = {
-    {0, TzDbMText::kNoColumns,      false, false},
-    {1, TzDbMText::kDynamicColumns, true,  true },
-    {2, TzDbMText::kDynamicColumns, true,  false},
+    {0, TzDbMText::kNoColumns, false, false},
+    {1, TzDbMText::kDynamicColumns, true, true},
+    {2, TzDbMText::kDynamicColumns, true, false},
 };
 
 double workingAngle() {

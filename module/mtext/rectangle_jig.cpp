@@ -41,9 +41,9 @@ struct EdgeDrawing {
     void (CTzsMtextJig::*bottom)(TzGiWorldDraw*) const;
 };
 constexpr EdgeDrawing kEdgesByRow[] = {
-    {&CTzsMtextJig::DrawClosedTop, &CTzsMtextJig::DrawOpenBottom  },
-    {&CTzsMtextJig::DrawOpenTop,   &CTzsMtextJig::DrawOpenBottom  },
-    {&CTzsMtextJig::DrawOpenTop,   &CTzsMtextJig::DrawClosedBottom},
+    {&CTzsMtextJig::DrawClosedTop, &CTzsMtextJig::DrawOpenBottom},
+    {&CTzsMtextJig::DrawOpenTop, &CTzsMtextJig::DrawOpenBottom},
+    {&CTzsMtextJig::DrawOpenTop, &CTzsMtextJig::DrawClosedBottom},
 };
 
 }  // namespace

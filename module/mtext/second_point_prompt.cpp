@@ -78,17 +78,15 @@ struct Option {
     unsigned keyword;
     Next (*ask)(SecondCorner&);
 };
-constexpr std::array<Option, 7> kOptions{
-    {
-     {kText.height, askHeight},
-     {kText.justify, askAttachment},
-     {kText.lineSpacing, askLineSpacing},
-     {kText.rotation, askRotation},
-     {kText.style, askStyle},
-     {kText.width, askWidth},
-     {kText.columns, askColumns},
-     }
-};
+constexpr std::array<Option, 7> kOptions{{
+    {kText.height, askHeight},
+    {kText.justify, askAttachment},
+    {kText.lineSpacing, askLineSpacing},
+    {kText.rotation, askRotation},
+    {kText.style, askStyle},
+    {kText.width, askWidth},
+    {kText.columns, askColumns},
+}};
 
 Next askOption(unsigned keyword, SecondCorner& at) {
     for (Option const& option : kOptions) {

@@ -22,23 +22,20 @@ struct Command {
 
 // Registered in this order. The last one is added on its own: with another flag, silently and
 // without help.
-constexpr std::array<Command, 7> kCommands{
-    {
-     {&gsEditMtext_GlobalName, &gsEditMtext_LocalName, L"MTEDIT", kText.mteditCommand,
-         EditMtextCallback},
-     {&gsCompatibleEditMtext_GlobalName, &gsCompatibleEditMtext_LocalName, L"-MTEDIT",
-         kText.plainMteditCommand, CompatibleEditMtextCallback},
-     {&gsAlignText_GlobalName, &gsAlignText_LocalName, L"TEXTALIGN", kText.textalignCommand,
-         AlignTextCallback},
-     {&gsMtext_GlobalName, &gsMtext_LocalName, L"MTEXT", kText.mtextCommand,
-         ImprovedMtextCallback},
-     {&gsCompatibleMtext_GlobalName, &gsCompatibleMtext_LocalName, L"-MTEXT",
-         kText.plainMtextCommand, CompatibleMtextCallback},
-     {&gsMtprop_GlobalName, &gsMtprop_LocalName, L"MTPROP", kText.mtpropCommand, MtpropCallback},
-     {&gsMtextProperties_GlobalName, &gsMtextProperties_LocalName, L"MTEXTPROPERTIES",
-         kText.mtextpropertiesCommand, MtextPropertiesCallback},
-     }
-};
+constexpr std::array<Command, 7> kCommands{{
+    {&gsEditMtext_GlobalName, &gsEditMtext_LocalName, L"MTEDIT", kText.mteditCommand,
+     EditMtextCallback},
+    {&gsCompatibleEditMtext_GlobalName, &gsCompatibleEditMtext_LocalName, L"-MTEDIT",
+     kText.plainMteditCommand, CompatibleEditMtextCallback},
+    {&gsAlignText_GlobalName, &gsAlignText_LocalName, L"TEXTALIGN", kText.textalignCommand,
+     AlignTextCallback},
+    {&gsMtext_GlobalName, &gsMtext_LocalName, L"MTEXT", kText.mtextCommand, ImprovedMtextCallback},
+    {&gsCompatibleMtext_GlobalName, &gsCompatibleMtext_LocalName, L"-MTEXT",
+     kText.plainMtextCommand, CompatibleMtextCallback},
+    {&gsMtprop_GlobalName, &gsMtprop_LocalName, L"MTPROP", kText.mtpropCommand, MtpropCallback},
+    {&gsMtextProperties_GlobalName, &gsMtextProperties_LocalName, L"MTEXTPROPERTIES",
+     kText.mtextpropertiesCommand, MtextPropertiesCallback},
+}};
 
 constexpr int kSeesSelection = 0x2;
 constexpr int kSeesSelectionWithoutDialogs = 0x800002;

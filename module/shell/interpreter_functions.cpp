@@ -19,13 +19,11 @@ struct Function {
     FunctionCode code;
 };
 
-constexpr std::array<Function, 3> kFunctions{
-    {
-     {&gsEditMtext_GlobalName, kEdit},
-     {&gsAlignText_GlobalName, kAlign},
-     {&gsMtprop_GlobalName, kProperties},
-     }
-};
+constexpr std::array<Function, 3> kFunctions{{
+    {&gsEditMtext_GlobalName, kEdit},
+    {&gsAlignText_GlobalName, kAlign},
+    {&gsMtprop_GlobalName, kProperties},
+}};
 
 }  // namespace
 

@@ -89,13 +89,11 @@ TEST_F(FileBytes, StayOldWhenTheyCannotBeWritten) {
     ASSERT_TRUE(tzhost::writeFileSafely(path("locked"), "old"));
     ASSERT_EQ(::chmod(path("locked").c_str(), 0444), 0);
     std::string const longName(300, 'n');
-    for (auto const& [name, problem] : {
-             std::pair{"no/such/file",   "No such file or directory"        },
-             {"folder",         "Is a directory"                   },
-             {"a",              "Too many levels of symbolic links"},
-             {"locked",         "it is read-only"                  },
-             {longName.c_str(), "File name too long"               }
-    }) {
+    for (auto const& [name, problem] : {std::pair{"no/such/file", "No such file or directory"},
+                                        {"folder", "Is a directory"},
+                                        {"a", "Too many levels of symbolic links"},
+                                        {"locked", "it is read-only"},
+                                        {longName.c_str(), "File name too long"}}) {
         EXPECT_EQ(tzhost::SafeFile(path(name)).reason(), problem) << name;
         EXPECT_FALSE(tzhost::writeFileSafely(path(name), "new")) << name;
     }
@@ -165,11 +163,11 @@ struct FolderRow {
 // A relative folder used to be looked for in the working folder, where a stranger's settings chose
 // the editor.
 constexpr FolderRow kFolders[] = {
-    {"Given",        "/x",    "/h",    "/x/tzdraft"        },
-    {"Home",         nullptr, "/h",    "/h/.config/tzdraft"},
-    {"Relative",     "x",     "/h",    "/h/.config/tzdraft"},
-    {"NoHome",       nullptr, nullptr, ""                  },
-    {"RelativeHome", "",      ".",     ""                  },
+    {"Given", "/x", "/h", "/x/tzdraft"},
+    {"Home", nullptr, "/h", "/h/.config/tzdraft"},
+    {"Relative", "x", "/h", "/h/.config/tzdraft"},
+    {"NoHome", nullptr, nullptr, ""},
+    {"RelativeHome", "", ".", ""},
 };
 class ConfigurationFolder : public testing::TestWithParam<FolderRow> {};
 TEST_P(ConfigurationFolder, IsNeverRelative) {

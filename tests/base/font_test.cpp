@@ -19,16 +19,16 @@ struct FaceRow {
     wchar_t const* file;
 };
 constexpr FaceRow kFaces[] = {
-    {"Regular",    L"Liberation Sans", false, false, L"LiberationSans-Regular.ttf"   },
-    {"Bold",       L"Liberation Sans", true,  false, L"LiberationSans-Bold.ttf"      },
-    {"BoldItalic", L"LIBERATION SANS", true,  true,  L"LiberationSans-BoldItalic.ttf"},
-    {"OnlyBold",   L"DejaVu Sans",     true,  false, L"DejaVuSans-Bold.ttf"          },
-    {"NoItalic",   L"DejaVu Sans",     true,  true,  L"DejaVuSans-Bold.ttf"          },
-    {"NoBold",     L"DejaVu Serif",    true,  false, L"DejaVuSerif.ttf"              },
-    {"Unknown",    L"Arial",           false, false, L""                             }, // a stand-in would be Liberation Sans
-    {"Generic",    L"sans-serif",      false, false, L""                             },
-    {"Part",       L"DejaVu",          false, false, L""                             },
-    {"Empty",      L"",                false, false, L""                             },
+    {"Regular", L"Liberation Sans", false, false, L"LiberationSans-Regular.ttf"},
+    {"Bold", L"Liberation Sans", true, false, L"LiberationSans-Bold.ttf"},
+    {"BoldItalic", L"LIBERATION SANS", true, true, L"LiberationSans-BoldItalic.ttf"},
+    {"OnlyBold", L"DejaVu Sans", true, false, L"DejaVuSans-Bold.ttf"},
+    {"NoItalic", L"DejaVu Sans", true, true, L"DejaVuSans-Bold.ttf"},
+    {"NoBold", L"DejaVu Serif", true, false, L"DejaVuSerif.ttf"},
+    {"Unknown", L"Arial", false, false, L""},  // a stand-in would be Liberation Sans
+    {"Generic", L"sans-serif", false, false, L""},
+    {"Part", L"DejaVu", false, false, L""},
+    {"Empty", L"", false, false, L""},
 };
 class Faces : public testing::TestWithParam<FaceRow> {};
 TEST_P(Faces, HaveTheirFiles) {
@@ -52,19 +52,19 @@ struct FileRow {
     int pitchAndFamily;
 };
 constexpr FileRow kFiles[] = {
-    {"Sans",       L"DejaVuSans.ttf",                 L"DejaVu Sans",         false, false, 0,   0x22},
-    {"InAFolder",  L"c:\\fonts\\DEJAVUSANS-BOLD.TTF", L"DejaVu Sans",         true,  false, 0,   0x22},
-    {"Mono",       L"/usr/fonts/DejaVuSansMono.ttf",  L"DejaVu Sans Mono",    false, false, 0,   0x31},
-    {"Serif",      L"DejaVuSerif.ttf",                L"DejaVu Serif",        false, false, 0,   0x12},
-    {"Italic",     L"LiberationSans-Italic.ttf",      L"Liberation Sans",     false, true,  0,   0x22},
-    {"Hebrew",     L"NotoSansHebrew-Regular.ttf",     L"Noto Sans Hebrew",    false, false, 177, 0x22},
-    {"Arabic",     L"NotoSansArabic-Regular.ttf",     L"Noto Sans Arabic",    false, false, 178, 0x22},
-    {"Thai",       L"NotoSansThai-Regular.ttf",       L"Noto Sans Thai",      false, false, 222, 0x22},
-    {"Armenian",   L"NotoSansArmenian-Regular.ttf",   L"Noto Sans Armenian",  false, false, 1,   0x22},
-    {"EastAsian",  L"DroidSansFallbackFull.ttf",      L"Droid Sans Fallback", false, false, 128, 0x22},
-    {"StrokeFont", L"txt.shx",                        L"",                    false, false, 0,   0   },
-    {"Unknown",    L"arial.ttf",                      L"",                    false, false, 0,   0   },
-    {"Empty",      L"",                               L"",                    false, false, 0,   0   },
+    {"Sans", L"DejaVuSans.ttf", L"DejaVu Sans", false, false, 0, 0x22},
+    {"InAFolder", L"c:\\fonts\\DEJAVUSANS-BOLD.TTF", L"DejaVu Sans", true, false, 0, 0x22},
+    {"Mono", L"/usr/fonts/DejaVuSansMono.ttf", L"DejaVu Sans Mono", false, false, 0, 0x31},
+    {"Serif", L"DejaVuSerif.ttf", L"DejaVu Serif", false, false, 0, 0x12},
+    {"Italic", L"LiberationSans-Italic.ttf", L"Liberation Sans", false, true, 0, 0x22},
+    {"Hebrew", L"NotoSansHebrew-Regular.ttf", L"Noto Sans Hebrew", false, false, 177, 0x22},
+    {"Arabic", L"NotoSansArabic-Regular.ttf", L"Noto Sans Arabic", false, false, 178, 0x22},
+    {"Thai", L"NotoSansThai-Regular.ttf", L"Noto Sans Thai", false, false, 222, 0x22},
+    {"Armenian", L"NotoSansArmenian-Regular.ttf", L"Noto Sans Armenian", false, false, 1, 0x22},
+    {"EastAsian", L"DroidSansFallbackFull.ttf", L"Droid Sans Fallback", false, false, 128, 0x22},
+    {"StrokeFont", L"txt.shx", L"", false, false, 0, 0},
+    {"Unknown", L"arial.ttf", L"", false, false, 0, 0},
+    {"Empty", L"", L"", false, false, 0, 0},
 };
 class Files : public testing::TestWithParam<FileRow> {};
 TEST_P(Files, HaveTheirFaces) {

@@ -45,25 +45,26 @@ struct IniRow {
     wchar_t const* seen;  // of section "A"
 };
 constexpr IniRow kIniRows[] = {
-    {"Plain",                  "[A]\nk=v\n",                     L"k=v|"                },
-    {"FileOrder",              "[A]\nz=1\na=2\nm=3\n",           L"z=1|a=2|m=3|"        },
-    {"BlanksAround",           "[A]\r\n  k \t= v , w  \r\n",     L"k=v , w|"            },
-    {"BehindTheFirstEquals",   "[A]\nk=a=b;c#d\n",               L"k=a=b;c#d|"          },
-    {"CommentsAtTheStartOnly", "[A]\n;k=v\n#j=v\nl=v ; w\n",     L"l=v ; w|"            },
-    {"WrittenTwice",           "[A]\nk=1\nx=2\nK=3\n",           L"k=3|x=2|K=3|"        },
-    {"SectionInAnotherCase",   "[a]\nk=v\n",                     L"k=v|"                },
-    {"SectionInTwoPieces",     "[A]\nk=1\n[B]\nk=2\n[A]\nj=3\n", L"k=1|j=3|"            },
-    {"NoValue",                "[A]\ni=1\nk=\nj\n l \n",         L"i=1|k=|j=|l=|"       },
-    {"Bom",                    "\xEF\xBB\xBF[A]\nk=v\n",         L"k=v|"                },
+    {"Plain", "[A]\nk=v\n", L"k=v|"},
+    {"FileOrder", "[A]\nz=1\na=2\nm=3\n", L"z=1|a=2|m=3|"},
+    {"BlanksAround", "[A]\r\n  k \t= v , w  \r\n", L"k=v , w|"},
+    {"BehindTheFirstEquals", "[A]\nk=a=b;c#d\n", L"k=a=b;c#d|"},
+    {"CommentsAtTheStartOnly", "[A]\n;k=v\n#j=v\nl=v ; w\n", L"l=v ; w|"},
+    {"WrittenTwice", "[A]\nk=1\nx=2\nK=3\n", L"k=3|x=2|K=3|"},
+    {"SectionInAnotherCase", "[a]\nk=v\n", L"k=v|"},
+    {"SectionInTwoPieces", "[A]\nk=1\n[B]\nk=2\n[A]\nj=3\n", L"k=1|j=3|"},
+    {"NoValue", "[A]\ni=1\nk=\nj\n l \n", L"i=1|k=|j=|l=|"},
+    {"Bom", "\xEF\xBB\xBF[A]\nk=v\n", L"k=v|"},
     {"Utf8WithoutCase",
      "[A]\nGr\xC3\x96\xC3\x9F"
      "e=\xE6\xBC\xA2\ngr\xC3\xB6\xC3\x9F"
-     "e=2\n",                                                    L"GrÖße=2|größe=2|"},
-    {"QuotesStay",             "[A]\nk=\"v\"\n",                 L"k=\"v\"|"            },
-    {"NoMultiLine",            "[A]\nk=<<<X\nj=1\n",             L"k=<<<X|j=1|"         },
-    {"Stops",                  "[A]\na=1\nstop=2\nz=3\n",        L"a=1|stop=2|"         },
-    {"OtherSection",           "[B]\nk=v\n",                     L""                    },
-    {"Empty",                  "",                               L""                    },
+     "e=2\n",
+     L"GrÖße=2|größe=2|"},
+    {"QuotesStay", "[A]\nk=\"v\"\n", L"k=\"v\"|"},
+    {"NoMultiLine", "[A]\nk=<<<X\nj=1\n", L"k=<<<X|j=1|"},
+    {"Stops", "[A]\na=1\nstop=2\nz=3\n", L"a=1|stop=2|"},
+    {"OtherSection", "[B]\nk=v\n", L""},
+    {"Empty", "", L""},
 };
 class IniReading : public IniFile, public testing::WithParamInterface<IniRow> {};
 TEST_P(IniReading, SeesKeysInOrder) {
@@ -108,17 +109,15 @@ TEST(IniNumbers, ReadLeadingDigitsAndWrap) {
         wchar_t const* text;
         int value;
     };
-    for (Row const& row : {
-             Row{L"12",         12             },
-             {L" \t-7x",     -7             },
-             {L"+3",         3              },
-             {L"",           0              },
-             {L"x1",         0              },
-             {L"- 1",        0              },
-             {L"2147483648", -2147483647 - 1},
-             {L"4294967297", 1              },
-             {L"1.9",        1              }
-    }) {
+    for (Row const& row : {Row{L"12", 12},
+                           {L" \t-7x", -7},
+                           {L"+3", 3},
+                           {L"", 0},
+                           {L"x1", 0},
+                           {L"- 1", 0},
+                           {L"2147483648", -2147483647 - 1},
+                           {L"4294967297", 1},
+                           {L"1.9", 1}}) {
         EXPECT_EQ(ms_wtoi(row.text), row.value) << row.text;
     }
     EXPECT_EQ(ms_wtoi(nullptr), 0);

@@ -38,14 +38,14 @@ struct FaultRow {
     char const* fault;
 };
 constexpr FaultRow kFaults[] = {
-    {"NoTab",           "Yes Ja\n",                  "1: expected a text, a tab and its translation"},
-    {"NotUtf8",         "Yes\tJ\xE4\n",              "1: the line is not UTF-8"                     },
-    {"NoEscape",        "Yes\t\\q\n",                "1: a backslash opens no escape"               },
-    {"Empty",           "Yes\t\n",                   "1: a text is empty"                           },
-    {"Twice",           "Yes\tJa\nNo\tJ\nYes\tJo",   "3: stands in line 1 too"                      },
-    {"OtherConversion", "#\n%d found\t%ls gefunden", "2: the conversions differ"                    },
-    {"MoreConversions", "found\t%n gefunden",        "1: the conversions differ"                    },
-    {"OrderChanged",    "%ls at %d\tbei %d: %ls",    "1: the conversions differ"                    },
+    {"NoTab", "Yes Ja\n", "1: expected a text, a tab and its translation"},
+    {"NotUtf8", "Yes\tJ\xE4\n", "1: the line is not UTF-8"},
+    {"NoEscape", "Yes\t\\q\n", "1: a backslash opens no escape"},
+    {"Empty", "Yes\t\n", "1: a text is empty"},
+    {"Twice", "Yes\tJa\nNo\tJ\nYes\tJo", "3: stands in line 1 too"},
+    {"OtherConversion", "#\n%d found\t%ls gefunden", "2: the conversions differ"},
+    {"MoreConversions", "found\t%n gefunden", "1: the conversions differ"},
+    {"OrderChanged", "%ls at %d\tbei %d: %ls", "1: the conversions differ"},
 };
 
 // A text with a fault is shown in English: a format would take the wrong arguments.

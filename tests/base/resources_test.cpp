@@ -18,11 +18,7 @@ namespace {
 namespace fs = std::filesystem;
 
 tzhost::ResourceTexts const kTexts{
-    {3,      L""                     },
-    {127,    L"TEXTALIGN"            },
-    {1043,   L"Größe \x1F600 _Size"},
-    {0xF039, L"%d found\n"           }
-};
+    {3, L""}, {127, L"TEXTALIGN"}, {1043, L"Größe \x1F600 _Size"}, {0xF039, L"%d found\n"}};
 
 TEST(ResourceFile, GivesBackWhatWasWritten) {
     auto const file = tzhost::ResourceFile::fromBytes(tzhost::writeResourceFile(kTexts));
@@ -53,13 +49,14 @@ struct EscapeRow {
     std::wstring_view line;
 };
 constexpr EscapeRow kEscapes[] = {
-    {"Plain",           L"Größe {TEXTSIZE}", L"Größe {TEXTSIZE}"},
-    {"LinesAndTabs",    L"\na\tb\r",           L"\\na\\tb\\r"       },
-    {"BlanksAtTheEnds", L" a b ",              L"\\sa b\\s"         },
-    {"Backslash",       L"\\P",                L"\\\\P"             },
+    {"Plain", L"Größe {TEXTSIZE}", L"Größe {TEXTSIZE}"},
+    {"LinesAndTabs", L"\na\tb\r", L"\\na\\tb\\r"},
+    {"BlanksAtTheEnds", L" a b ", L"\\sa b\\s"},
+    {"Backslash", L"\\P", L"\\\\P"},
     {"Control",
      L"\x7"
-     L"b\x9D",                                 L"\\u0007b\\u009D"   },
+     L"b\x9D",
+     L"\\u0007b\\u009D"},
 };
 class Escapes : public testing::TestWithParam<EscapeRow> {};
 TEST_P(Escapes, GoBothWays) {
@@ -83,32 +80,32 @@ struct TableRow {
     char const* fault;        // empty: none
 };
 constexpr TableRow kTables[] = {
-    {"Clean",                "# c\n\n[keywords]\n1\tJustify _Justify\r\n[texts]\n0x2\t%s of %d%%", nullptr,               ""                                            },
-    {"NoTab",                "1 text",                                                             nullptr,               "o:1: expected an id, a tab and a text"       },
-    {"BadId",                "x1\ttext",                                                           nullptr,               "o:1: expected an id, a tab and a text"       },
-    {"BadEscape",            "\n1\t\\q",                                                           nullptr,               "o:2: a backslash opens no escape"            },
-    {"NotUtf8",              "1\t\xC3",                                                            nullptr,               "o:1: the text is not UTF-8"                  },
-    {"UnknownSection",       "[text]",                                                             nullptr,               "o:1: no such section: [text]"                },
-    {"TwiceTheId",           "1\ta\n0x1\tb",                                                       nullptr,               "o:2: the id 1 stands in line 1 too"          },
-    {"StrayPercent",         "1\t50% of",                                                          nullptr,               "o:1: a percent sign opens no conversion"     },
-    {"PercentAtTheEnd",      "1\t50%",                                                             nullptr,               "o:1: a percent sign opens no conversion"     },
-    {"KeywordUnsplit",       "[keywords]\n1\tJustify",                                             nullptr,               "o:2: the keyword has no \" _\""              },
-    {"KeywordHalf",          "[keywords]\n1\tJustify _",                                           nullptr,
-     "o:2: the keyword lacks a local or global text"                                                                                                                    },
-    {"KeywordThrice",        "[keywords]\n1\ta _b _c",                                             nullptr,               "o:2: the keyword has two \" _\""             },
-    {"WarningWithPercent",   "[warnings]\n1\t100%%",                                               nullptr,
-     "o:2: a warning text has a percent sign"                                                                                                                           },
-    {"WarningFormatDoubled", "[warning formats]\n1\t%d%%",                                         nullptr,
-     "o:2: a warning format has a percent sign that is no %d"                                                                                                           },
-    {"Missing",              "1\ta\n2\tb",                                                         "1\ta",                "t: the id 2 is missing"                      },
-    {"Extra",                "1\ta",                                                               "1\ta\n2\tb",          "t:2: the original has no id 2"               },
-    {"Turned",               "1\t%s %d",                                                           "1\t%d %s",            "t:1: other conversions than the original has"},
-    {"WideIsTheSame",        "1\t%s %.3f",                                                         "1\t%ls %8f",          ""                                            },
-    {"OtherGlobal",          "[keywords]\n1\ta _A",                                                "[keywords]\n1\tb _B",
-     "t:2: another global text than the original's"                                                                                                                     },
-    {"OtherLocal",           "[keywords]\n1\ta _A",                                                "[keywords]\n1\tb _A", ""                                            },
-    {"FixedChanged",         "[fixed]\n1\ta",                                                      "[fixed]\n1\tb",
-     "t:2: differs from the original, and may not"                                                                                                                      },
+    {"Clean", "# c\n\n[keywords]\n1\tJustify _Justify\r\n[texts]\n0x2\t%s of %d%%", nullptr, ""},
+    {"NoTab", "1 text", nullptr, "o:1: expected an id, a tab and a text"},
+    {"BadId", "x1\ttext", nullptr, "o:1: expected an id, a tab and a text"},
+    {"BadEscape", "\n1\t\\q", nullptr, "o:2: a backslash opens no escape"},
+    {"NotUtf8", "1\t\xC3", nullptr, "o:1: the text is not UTF-8"},
+    {"UnknownSection", "[text]", nullptr, "o:1: no such section: [text]"},
+    {"TwiceTheId", "1\ta\n0x1\tb", nullptr, "o:2: the id 1 stands in line 1 too"},
+    {"StrayPercent", "1\t50% of", nullptr, "o:1: a percent sign opens no conversion"},
+    {"PercentAtTheEnd", "1\t50%", nullptr, "o:1: a percent sign opens no conversion"},
+    {"KeywordUnsplit", "[keywords]\n1\tJustify", nullptr, "o:2: the keyword has no \" _\""},
+    {"KeywordHalf", "[keywords]\n1\tJustify _", nullptr,
+     "o:2: the keyword lacks a local or global text"},
+    {"KeywordThrice", "[keywords]\n1\ta _b _c", nullptr, "o:2: the keyword has two \" _\""},
+    {"WarningWithPercent", "[warnings]\n1\t100%%", nullptr,
+     "o:2: a warning text has a percent sign"},
+    {"WarningFormatDoubled", "[warning formats]\n1\t%d%%", nullptr,
+     "o:2: a warning format has a percent sign that is no %d"},
+    {"Missing", "1\ta\n2\tb", "1\ta", "t: the id 2 is missing"},
+    {"Extra", "1\ta", "1\ta\n2\tb", "t:2: the original has no id 2"},
+    {"Turned", "1\t%s %d", "1\t%d %s", "t:1: other conversions than the original has"},
+    {"WideIsTheSame", "1\t%s %.3f", "1\t%ls %8f", ""},
+    {"OtherGlobal", "[keywords]\n1\ta _A", "[keywords]\n1\tb _B",
+     "t:2: another global text than the original's"},
+    {"OtherLocal", "[keywords]\n1\ta _A", "[keywords]\n1\tb _A", ""},
+    {"FixedChanged", "[fixed]\n1\ta", "[fixed]\n1\tb",
+     "t:2: differs from the original, and may not"},
 };
 class Tables : public testing::TestWithParam<TableRow> {};
 TEST_P(Tables, AreChecked) {
@@ -147,9 +144,7 @@ protected:
     }
 
     static void put(fs::path const& file, wchar_t const* text) {
-        ASSERT_TRUE(tzhost::writeFileSafely(file.string(), tzhost::writeResourceFile({
-                                                               {1, text}
-        })));
+        ASSERT_TRUE(tzhost::writeFileSafely(file.string(), tzhost::writeResourceFile({{1, text}})));
     }
     static TzString textOf(TzRxResourceInstance const& instance) {
         TzString text = L"untouched";
@@ -168,14 +163,12 @@ TEST_F(ResourceInstance, IsFoundByLanguage) {
         char const* locale;
         wchar_t const* text;
     };
-    for (Row const& row : {
-             Row{"",            L"Yes"},
-             {"en",          L"Yes"},
-             {"de",          L"Ja" },
-             {"de_AT.UTF-8", L"Ja" },
-             {"fr",          L"Yes"},
-             {"../de",       L"Yes"}
-    }) {
+    for (Row const& row : {Row{"", L"Yes"},
+                           {"en", L"Yes"},
+                           {"de", L"Ja"},
+                           {"de_AT.UTF-8", L"Ja"},
+                           {"fr", L"Yes"},
+                           {"../de", L"Yes"}}) {
         tzhost::setResourceSearch({folder_.string(), row.locale, ""});
         EXPECT_EQ(textOf(TzRxResourceInstance(L"Texts.dll")), row.text) << row.locale;
     }

@@ -28,13 +28,13 @@ struct NumberRow {
     wchar_t const* text;
 };
 constexpr NumberRow kNumbers[] = {
-    {"Short",                L"%g",              0.2,     L"0.2"       },
-    {"FourDigits",           L"\\H%0.4gx;",      1.23456, L"\\H1.235x;"},
-    {"Fixed",                L"%8.3f|",          -1.5,    L"  -1.500|" },
-    {"LeftInWidth",          L"%-8.1e|",         1.0,     L"1.0e+00 |" },
-    {"Percent",              L"%g%%",            50.0,    L"50%"       },
-    {"EndsInsideConversion", L"%g then %",       1.0,     L"1 then "   },
-    {"UnknownConversion",    L"%g then %y more", 1.0,     L"1 then "   },
+    {"Short", L"%g", 0.2, L"0.2"},
+    {"FourDigits", L"\\H%0.4gx;", 1.23456, L"\\H1.235x;"},
+    {"Fixed", L"%8.3f|", -1.5, L"  -1.500|"},
+    {"LeftInWidth", L"%-8.1e|", 1.0, L"1.0e+00 |"},
+    {"Percent", L"%g%%", 50.0, L"50%"},
+    {"EndsInsideConversion", L"%g then %", 1.0, L"1 then "},
+    {"UnknownConversion", L"%g then %y more", 1.0, L"1 then "},
 };
 class FormattedNumber : public testing::TestWithParam<NumberRow> {};
 TEST_P(FormattedNumber, ReadsAs) {
@@ -72,13 +72,13 @@ struct Utf8Row {
     std::size_t bad;
 };
 constexpr Utf8Row kUtf8[] = {
-    {"Plain",        "abc",                                  L"abc",                      tzhost::kAllUtf8},
-    {"EveryLength",  "\xC3\xA9\xE6\xBC\xA2\xF0\x9F\x98\x80", L"é漢\x1F600",             tzhost::kAllUtf8},
-    {"Overlong",     "a\xC0\x80",                            L"a\xFFFD\xFFFD",            1               },
-    {"Surrogate",    "\xED\xA0\x80",                         L"\xFFFD\xFFFD\xFFFD",       0               },
-    {"AboveTheLast", "\xF4\x90\x80\x80",                     L"\xFFFD\xFFFD\xFFFD\xFFFD", 0               },
-    {"CutOff",       "ab\xE6\xBC",                           L"ab\xFFFD\xFFFD",           2               },
-    {"LoneTail",     "\x80z",                                L"\xFFFDz",                  0               },
+    {"Plain", "abc", L"abc", tzhost::kAllUtf8},
+    {"EveryLength", "\xC3\xA9\xE6\xBC\xA2\xF0\x9F\x98\x80", L"é漢\x1F600", tzhost::kAllUtf8},
+    {"Overlong", "a\xC0\x80", L"a\xFFFD\xFFFD", 1},
+    {"Surrogate", "\xED\xA0\x80", L"\xFFFD\xFFFD\xFFFD", 0},
+    {"AboveTheLast", "\xF4\x90\x80\x80", L"\xFFFD\xFFFD\xFFFD\xFFFD", 0},
+    {"CutOff", "ab\xE6\xBC", L"ab\xFFFD\xFFFD", 2},
+    {"LoneTail", "\x80z", L"\xFFFDz", 0},
 };
 class Utf8 : public testing::TestWithParam<Utf8Row> {};
 TEST_P(Utf8, ReadsAs) {
@@ -103,16 +103,8 @@ struct CaseRow {
     wchar_t lower;
 };
 constexpr CaseRow kCases[] = {
-    {L'A',    L'a'   },
-    {L'Z',    L'z'   },
-    {0xC4,    0xE4   },
-    {0x178,   0xFF   },
-    {0x100,   0x101  },
-    {L'Ω',   L'ω'  },
-    {L'Ж',   L'ж'  },
-    {0x531,   0x561  },
-    {0x10400, 0x10428},
-    {0x1E00,  0x1E01 },
+    {L'A', L'a'}, {L'Z', L'z'}, {0xC4, 0xE4},   {0x178, 0xFF},      {0x100, 0x101},
+    {L'Ω', L'ω'}, {L'Ж', L'ж'}, {0x531, 0x561}, {0x10400, 0x10428}, {0x1E00, 0x1E01},
 };
 TEST(LetterCase, GoesBothWays) {
     for (CaseRow const& row : kCases) {

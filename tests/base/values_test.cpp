@@ -15,12 +15,8 @@ struct PartRow {
     wchar_t const* part;
 };
 constexpr PartRow kParts[] = {
-    {"Whole",          0,  99, L"abcde"},
-    {"Inside",         1,  2,  L"bc"   },
-    {"BeforeTheStart", -3, 2,  L"ab"   },
-    {"BehindTheEnd",   9,  2,  L""     },
-    {"NoneOfIt",       2,  0,  L""     },
-    {"Negative",       2,  -1, L""     },
+    {"Whole", 0, 99, L"abcde"},  {"Inside", 1, 2, L"bc"}, {"BeforeTheStart", -3, 2, L"ab"},
+    {"BehindTheEnd", 9, 2, L""}, {"NoneOfIt", 2, 0, L""}, {"Negative", 2, -1, L""},
 };
 class StringParts : public testing::TestWithParam<PartRow> {};
 TEST_P(StringParts, ClampToTheText) {
@@ -42,14 +38,12 @@ TEST(String, FindsAndReplaces) {
         int count;
         wchar_t const* result;
     };
-    for (Row const& row : {
-             Row{L"aaa",   L"a",  L"aa",   3, L"aaaaaa"   },
-             {L"aaa",   L"aa", L"b",    1, L"ba"       },
-             {L"abc",   L"",   L"x",    0, L"abc"      },
-             {L"abc",   L"b",  L"",     1, L"ac"       },
-             {L"\\a\\", L"\\", L"\\\\", 2, L"\\\\a\\\\"},
-             {L"",      L"a",  L"b",    0, L""         }
-    }) {
+    for (Row const& row : {Row{L"aaa", L"a", L"aa", 3, L"aaaaaa"},
+                           {L"aaa", L"aa", L"b", 1, L"ba"},
+                           {L"abc", L"", L"x", 0, L"abc"},
+                           {L"abc", L"b", L"", 1, L"ac"},
+                           {L"\\a\\", L"\\", L"\\\\", 2, L"\\\\a\\\\"},
+                           {L"", L"a", L"b", 0, L""}}) {
         TzString text = row.text;
         EXPECT_EQ(text.replace(row.what, row.by), row.count) << row.text;
         EXPECT_EQ(text, row.result);

@@ -43,29 +43,29 @@ struct WriteRow {
     std::wstring_view reason;  // empty: taken
 };
 constexpr WriteRow kWrites[] = {
-    {"ShortAtItsLimit",      L"LUNITS",        L"5",          L""                                             },
-    {"ShortAboveItsLimit",   L"LUNITS",        L"6",          L"LUNITS takes a whole number from 1 to 5."     },
-    {"ShortBelowItsLimit",   L"lunits",        L"0",          L"LUNITS takes a whole number from 1 to 5."     },
-    {"ShortWithFraction",    L"LUNITS",        L"2.5",        L"LUNITS takes a whole number from 1 to 5."     },
-    {"ShortBeyondItsType",   L"TEXTALIGNMODE", L"32768",      L"TEXTALIGNMODE takes a whole number."          },
-    {"AnyShort",             L"TEXTALIGNMODE", L"-32768",     L""                                             },
-    {"OneOrMore",            L"CVPORT",        L"0",          L"CVPORT takes a whole number, 1 or more."      },
-    {"RealAtZero",           L"TEXTSIZE",      L"0",          L""                                             },
-    {"RealBelowZero",        L"TEXTSIZE",      L"-1e-300",    L"TEXTSIZE takes a number, 0 or more."          },
-    {"AboveZero",            L"VIEWSIZE",      L"0",          L"VIEWSIZE takes a number above 0."             },
-    {"NotFinite",            L"TEXTSIZE",      L"1e999",      L"TEXTSIZE takes a number, 0 or more."          },
-    {"NotANumber",           L"TEXTSIZE",      L"nan",        L"TEXTSIZE takes a number, 0 or more."          },
-    {"NoNumber",             L"TEXTSIZE",      L"",           L"TEXTSIZE takes a number, 0 or more."          },
-    {"BetweenReals",         L"TSPACEFAC",     L"4.0001",     L"TSPACEFAC takes a number from 0.25 to 4."     },
-    {"Point",                L"LASTPOINT",     L"1,-2.5,3e2", L""                                             },
-    {"PlanarPoint",          L"LASTPOINT",     L"1,2",        L""                                             },
-    {"PointOfOne",           L"LASTPOINT",     L"1",          L"LASTPOINT takes a point x,y,z."               },
-    {"PointOfFour",          L"LASTPOINT",     L"1,2,3,4",    L"LASTPOINT takes a point x,y,z."               },
-    {"ZeroDirection",        L"VIEWDIR",       L"0,0,0",      L"VIEWDIR takes a point x,y,z other than 0,0,0."},
-    {"EmptyText",            L"TEXTLAYER",     L"",           L""                                             },
-    {"ReadOnly",             L"CMDACTIVE",     L"1",          L"CMDACTIVE is read-only."                      },
-    {"ReadOnlyWithNonsense", L"CMDACTIVE",     L"x",          L"CMDACTIVE is read-only."                      },
-    {"Unknown",              L"NOSUCH",        L"1",          L"There is no system variable \"NOSUCH\"."      },
+    {"ShortAtItsLimit", L"LUNITS", L"5", L""},
+    {"ShortAboveItsLimit", L"LUNITS", L"6", L"LUNITS takes a whole number from 1 to 5."},
+    {"ShortBelowItsLimit", L"lunits", L"0", L"LUNITS takes a whole number from 1 to 5."},
+    {"ShortWithFraction", L"LUNITS", L"2.5", L"LUNITS takes a whole number from 1 to 5."},
+    {"ShortBeyondItsType", L"TEXTALIGNMODE", L"32768", L"TEXTALIGNMODE takes a whole number."},
+    {"AnyShort", L"TEXTALIGNMODE", L"-32768", L""},
+    {"OneOrMore", L"CVPORT", L"0", L"CVPORT takes a whole number, 1 or more."},
+    {"RealAtZero", L"TEXTSIZE", L"0", L""},
+    {"RealBelowZero", L"TEXTSIZE", L"-1e-300", L"TEXTSIZE takes a number, 0 or more."},
+    {"AboveZero", L"VIEWSIZE", L"0", L"VIEWSIZE takes a number above 0."},
+    {"NotFinite", L"TEXTSIZE", L"1e999", L"TEXTSIZE takes a number, 0 or more."},
+    {"NotANumber", L"TEXTSIZE", L"nan", L"TEXTSIZE takes a number, 0 or more."},
+    {"NoNumber", L"TEXTSIZE", L"", L"TEXTSIZE takes a number, 0 or more."},
+    {"BetweenReals", L"TSPACEFAC", L"4.0001", L"TSPACEFAC takes a number from 0.25 to 4."},
+    {"Point", L"LASTPOINT", L"1,-2.5,3e2", L""},
+    {"PlanarPoint", L"LASTPOINT", L"1,2", L""},
+    {"PointOfOne", L"LASTPOINT", L"1", L"LASTPOINT takes a point x,y,z."},
+    {"PointOfFour", L"LASTPOINT", L"1,2,3,4", L"LASTPOINT takes a point x,y,z."},
+    {"ZeroDirection", L"VIEWDIR", L"0,0,0", L"VIEWDIR takes a point x,y,z other than 0,0,0."},
+    {"EmptyText", L"TEXTLAYER", L"", L""},
+    {"ReadOnly", L"CMDACTIVE", L"1", L"CMDACTIVE is read-only."},
+    {"ReadOnlyWithNonsense", L"CMDACTIVE", L"x", L"CMDACTIVE is read-only."},
+    {"Unknown", L"NOSUCH", L"1", L"There is no system variable \"NOSUCH\"."},
 };
 class VariableWrites : public SystemVariables, public testing::WithParamInterface<WriteRow> {};
 TEST_P(VariableWrites, AreTakenOrRefused) {
@@ -88,12 +88,8 @@ TEST_F(SystemVariables, ReadAsRecords) {
         wchar_t const* name;
         int type;
     };
-    for (Row const& row : {
-             Row{L"lunits",      5003},
-             {L"TEXTSIZE",    5001},
-             {L"MTJIGSTRING", 5005},
-             {L"VIEWDIR",     5009}
-    }) {
+    for (Row const& row :
+         {Row{L"lunits", 5003}, {L"TEXTSIZE", 5001}, {L"MTJIGSTRING", 5005}, {L"VIEWDIR", 5009}}) {
         resbuf value{};
         ASSERT_EQ(tzedGetVar(row.name, &value), Tzad::ePromptNormal);
         EXPECT_EQ(value.restype, row.type);

@@ -99,17 +99,17 @@ struct DragRow {
 
 // The cursor stands at the origin; the keywords are "Width Height" and the last point 10,20,30.
 constexpr DragRow kDrags[] = {
-    {"PickElsewhere", "5,5",             0,      "s(0,0,0) u d s(5,5,0) u d 0"             },
-    {"PickWhereItIs", "0,0",             0,      "s(0,0,0) u d 0"                          },
-    {"Moves",         "~1,2\n~3,4\n3,4", 0,      "s(0,0,0) u d s(1,2,0) u d s(3,4,0) u d 0"},
-    {"MovesNowhere",  "~1,2\n~1,2\n",    0,      "s(0,0,0) u d s(1,2,0) u d s-6 -1"        },
-    {"Enter",         "",                0x1000, "s(0,0,0) u d -1"                         },
-    {"Keyword",       "h",               0,      "s(0,0,0) u d 2"                          },
-    {"Cancel",        "~1,1\n^C",        0,      "s(0,0,0) u d s(1,1,0) u d -4"            },
-    {"Refused",       "x\n~y\n~\n",      0,      "s(0,0,0) u d -1"                         },
-    {"Relative",      "@1,1",            0x1000, "s(0,0,0) u d s(11,21,30) u d 0"          },
-    {"Flat",          "1,2,3",           1,      "s(0,0,0) u d s(1,2,0) u d 0"             },
-    {"InSpace",       "1,2,3",           0x1080, "s(0,0,0) u d s(1,2,3) u d 0"             },
+    {"PickElsewhere", "5,5", 0, "s(0,0,0) u d s(5,5,0) u d 0"},
+    {"PickWhereItIs", "0,0", 0, "s(0,0,0) u d 0"},
+    {"Moves", "~1,2\n~3,4\n3,4", 0, "s(0,0,0) u d s(1,2,0) u d s(3,4,0) u d 0"},
+    {"MovesNowhere", "~1,2\n~1,2\n", 0, "s(0,0,0) u d s(1,2,0) u d s-6 -1"},
+    {"Enter", "", 0x1000, "s(0,0,0) u d -1"},
+    {"Keyword", "h", 0, "s(0,0,0) u d 2"},
+    {"Cancel", "~1,1\n^C", 0, "s(0,0,0) u d s(1,1,0) u d -4"},
+    {"Refused", "x\n~y\n~\n", 0, "s(0,0,0) u d -1"},
+    {"Relative", "@1,1", 0x1000, "s(0,0,0) u d s(11,21,30) u d 0"},
+    {"Flat", "1,2,3", 1, "s(0,0,0) u d s(1,2,0) u d 0"},
+    {"InSpace", "1,2,3", 0x1080, "s(0,0,0) u d s(1,2,3) u d 0"},
 };
 
 class DragTable : public Drags, public testing::WithParamInterface<DragRow> {};
@@ -131,10 +131,7 @@ TEST_F(Drags, GoOnWhereTheCursorStands) {
     EXPECT_EQ(jig.run(), "s(0,0,0) u d s(5,5,0) u d 0");
     // The jig sees no change, and the first sample is drawn all the same.
     EXPECT_EQ(jig.run(), "s(5,5,0) d -1");
-    ASSERT_TRUE(tzhost::setUserSystem({
-        {0, 0, 7},
-        TzGeVector3d::kYAxis, -TzGeVector3d::kXAxis
-    }));
+    ASSERT_TRUE(tzhost::setUserSystem({{0, 0, 7}, TzGeVector3d::kYAxis, -TzGeVector3d::kXAxis}));
     EXPECT_EQ(jig.run(), "s(5,5,0) d s(-6,6,7) u d 0");
     EXPECT_TRUE(tzhost::lastPoint().isEqualTo({6, 6, 0}));
 }
@@ -142,11 +139,7 @@ TEST_F(Drags, GoOnWhereTheCursorStands) {
 // It used to go through world coordinates and back, which rounded it.
 TEST_F(Drags, LeaveTheLastPointAsItWasTyped) {
     ScriptedSession const session("62.1,14.3\n");
-    ASSERT_TRUE(tzhost::setUserSystem({
-        {100000.3, 7.7, 0},
-        {0.8,      0.6, 0},
-        {-0.6,     0.8, 0}
-    }));
+    ASSERT_TRUE(tzhost::setUserSystem({{100000.3, 7.7, 0}, {0.8, 0.6, 0}, {-0.6, 0.8, 0}}));
     (void)NotingJig().drag();
     EXPECT_EQ(tzhost::lastPoint().x, 62.1);
     EXPECT_EQ(tzhost::lastPoint().y, 14.3);

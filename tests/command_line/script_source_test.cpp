@@ -54,33 +54,34 @@ constexpr auto kPoint = QuestionKind::point;
 constexpr auto kString = QuestionKind::string;
 
 constexpr ScriptRow kScripts[] = {
-    {"Lines",           "1,2\n\n3\n",               kPoint,  "",    "[1,2] [] [3] end"                               },
-    {"NoLineEnd",       "1,2",                      kPoint,  "",    "[1,2] end"                                      },
-    {"Nothing",         "",                         kPoint,  "",    "end"                                            },
-    {"CarriageReturns", "a\r\n\r\nb\r\n",           kPoint,  "",    "[a] [] [b] end"                                 },
+    {"Lines", "1,2\n\n3\n", kPoint, "", "[1,2] [] [3] end"},
+    {"NoLineEnd", "1,2", kPoint, "", "[1,2] end"},
+    {"Nothing", "", kPoint, "", "end"},
+    {"CarriageReturns", "a\r\n\r\nb\r\n", kPoint, "", "[a] [] [b] end"},
     {"ByteOrderMark",
      "\xEF\xBB\xBF"
-     "a\n",                                         kPoint,  "",    "[a] end"                                        },
-    {"Comments",        ";; one\na\n;;two\nb;;\n",  kPoint,  "",    "[a] [b;;] end"                                  },
-    {"Cancel",          "^C\n^C  \n^Cx\n",          kPoint,  "",    "cancel cancel [^Cx] end"                        },
-    {"StringKeepsAll",  " ^C\n<<<\n;;c\n~1\n^C\n",  kString, "",    "[ ^C] [<<<] [~1] cancel end"                    },
-    {"Block",           "<<<\na\n\nb\n>>>\nc\n",    kPoint,  "B",   "block{a\n\nb} [c] end"                          },
-    {"EmptyBlock",      "<<<\n>>>\n",               kPoint,  "B",   "block{} end"                                    },
-    {"BlockLeft",       "<<<\na\n>>>cancel\n",      kPoint,  "B",   "left{a} end"                                    },
-    {"BlockEscape",     "<<<\n>>>>\n>>>>>\n>>>\n",  kPoint,  "B",   "block{>>>\n>>>>>} end"                          },
-    {"BlockKeepsMarks", "<<<\n;;a\n^C\n>>>\n",      kPoint,  "B",   "block{;;a\n^C} end"                             },
-    {"CommentAhead",    ";;x\n<<<\na\n>>>\n",       kPoint,  "B",   "block{a} end"                                   },
-    {"NoBlockNext",     "a\n<<<\nb\n>>>\n",         kPoint,  "BAB", "none [a] block{b} end"                          },
-    {"TwoBlocks",       "<<<\na\n>>>\n<<<\nb\n>>>", kPoint,  "BB",  "block{a} block{b} end"                          },
-    {"UntakenBlock",    "a\n<<<\nb\n>>>\nc\n",      kPoint,  "",
-     "[a] fault(script:2: no editor takes this block) [c] end"                                                       },
-    {"BlockWithoutEnd", "\n<<<\nb\n",               kPoint,  "AB",
-     "[] left{} fault(script:2: this block has no end, a line >>> or >>>cancel) end"                                 },
-    {"BlockNotUtf8",    "<<<\n\xFF\n>>>\n",         kPoint,  "B",
-     "left{} fault(script:2: this line is not UTF-8) end"                                                            },
-    {"NotUtf8AtEditor", "\xFF\n<<<\na\n>>>\n",      kPoint,  "B",
-     "left{} fault(script:1: this line is not UTF-8) end"                                                            },
-    {"NotUtf8",         "a\n\xFF\nb\n",             kPoint,  "",    "[a] fault(script:2: this line is not UTF-8) end"},
+     "a\n",
+     kPoint, "", "[a] end"},
+    {"Comments", ";; one\na\n;;two\nb;;\n", kPoint, "", "[a] [b;;] end"},
+    {"Cancel", "^C\n^C  \n^Cx\n", kPoint, "", "cancel cancel [^Cx] end"},
+    {"StringKeepsAll", " ^C\n<<<\n;;c\n~1\n^C\n", kString, "", "[ ^C] [<<<] [~1] cancel end"},
+    {"Block", "<<<\na\n\nb\n>>>\nc\n", kPoint, "B", "block{a\n\nb} [c] end"},
+    {"EmptyBlock", "<<<\n>>>\n", kPoint, "B", "block{} end"},
+    {"BlockLeft", "<<<\na\n>>>cancel\n", kPoint, "B", "left{a} end"},
+    {"BlockEscape", "<<<\n>>>>\n>>>>>\n>>>\n", kPoint, "B", "block{>>>\n>>>>>} end"},
+    {"BlockKeepsMarks", "<<<\n;;a\n^C\n>>>\n", kPoint, "B", "block{;;a\n^C} end"},
+    {"CommentAhead", ";;x\n<<<\na\n>>>\n", kPoint, "B", "block{a} end"},
+    {"NoBlockNext", "a\n<<<\nb\n>>>\n", kPoint, "BAB", "none [a] block{b} end"},
+    {"TwoBlocks", "<<<\na\n>>>\n<<<\nb\n>>>", kPoint, "BB", "block{a} block{b} end"},
+    {"UntakenBlock", "a\n<<<\nb\n>>>\nc\n", kPoint, "",
+     "[a] fault(script:2: no editor takes this block) [c] end"},
+    {"BlockWithoutEnd", "\n<<<\nb\n", kPoint, "AB",
+     "[] left{} fault(script:2: this block has no end, a line >>> or >>>cancel) end"},
+    {"BlockNotUtf8", "<<<\n\xFF\n>>>\n", kPoint, "B",
+     "left{} fault(script:2: this line is not UTF-8) end"},
+    {"NotUtf8AtEditor", "\xFF\n<<<\na\n>>>\n", kPoint, "B",
+     "left{} fault(script:1: this line is not UTF-8) end"},
+    {"NotUtf8", "a\n\xFF\nb\n", kPoint, "", "[a] fault(script:2: this line is not UTF-8) end"},
 };
 
 class Script : public testing::TestWithParam<ScriptRow> {};
@@ -123,13 +124,14 @@ struct SentRow {
 };
 
 constexpr SentRow kSent[] = {
-    {"Blanks",      L"MTEXT 0,0 5,5 ", "[MTEXT] [0,0] [5,5]"     },
-    {"BehindComma", L"1, 2 3",         "[1, 2] [3]"              },
-    {"LineEnds",    L"a\nb\r\nc\rd",   "[a] [b] [c] [d]"         },
-    {"Enter",       L"a  \nb",         "[a] [] [] [b]"           },
+    {"Blanks", L"MTEXT 0,0 5,5 ", "[MTEXT] [0,0] [5,5]"},
+    {"BehindComma", L"1, 2 3", "[1, 2] [3]"},
+    {"LineEnds", L"a\nb\r\nc\rd", "[a] [b] [c] [d]"},
+    {"Enter", L"a  \nb", "[a] [] [] [b]"},
     {"Cancels",
      L"\x03\x03"
-     L"a\x03",                         "cancel cancel [a] cancel"},
+     L"a\x03",
+     "cancel cancel [a] cancel"},
 };
 
 class Sent : public testing::TestWithParam<SentRow> {};

@@ -30,71 +30,82 @@ constexpr auto kFlat = Tzad::eDegenerateGeometry;
 
 // Values at the edge of what a text takes.
 constexpr SetterCase kSetters[] = {
-    {"HeightZero",        [](T& t) { return t.setTextHeight(0); },                      kOut                  },
-    {"HeightLeast",       [](T& t) { return t.setTextHeight(kTiny); },                  kOk                   },
-    {"HeightNan",         [](T& t) { return t.setTextHeight(kNan); },                   kOut                  },
-    {"HeightInfinite",    [](T& t) { return t.setTextHeight(kInfinity); },              kOut                  },
-    {"WidthZero",         [](T& t) { return t.setWidth(0); },                           kOk                   },
-    {"WidthNegative",     [](T& t) { return t.setWidth(-kTiny); },                      kOut                  },
-    {"SpacingLeast",      [](T& t) { return t.setLineSpacingFactor(0.25); },            kOk                   },
-    {"SpacingBelow",      [](T& t) { return t.setLineSpacingFactor(0.2499999999); },    kOut                  },
-    {"SpacingMost",       [](T& t) { return t.setLineSpacingFactor(4); },               kOk                   },
-    {"SpacingNan",        [](T& t) { return t.setLineSpacingFactor(kNan); },            kOut                  },
+    {"HeightZero", [](T& t) { return t.setTextHeight(0); }, kOut},
+    {"HeightLeast", [](T& t) { return t.setTextHeight(kTiny); }, kOk},
+    {"HeightNan", [](T& t) { return t.setTextHeight(kNan); }, kOut},
+    {"HeightInfinite", [](T& t) { return t.setTextHeight(kInfinity); }, kOut},
+    {"WidthZero", [](T& t) { return t.setWidth(0); }, kOk},
+    {"WidthNegative", [](T& t) { return t.setWidth(-kTiny); }, kOut},
+    {"SpacingLeast", [](T& t) { return t.setLineSpacingFactor(0.25); }, kOk},
+    {"SpacingBelow", [](T& t) { return t.setLineSpacingFactor(0.2499999999); }, kOut},
+    {"SpacingMost", [](T& t) { return t.setLineSpacingFactor(4); }, kOk},
+    {"SpacingNan", [](T& t) { return t.setLineSpacingFactor(kNan); }, kOut},
     {"LocationNan",
      [](T& t) {
          return t.setLocation({0, kNan, 0});
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"LocationFar",
      [](T& t) {
          return t.setLocation({1e300, 0, 0});
-     },                                                                                 kOk                   },
+     },
+     kOk},
     {"NormalZero",
      [](T& t) {
          return t.setNormal({0, 0, 0});
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"NormalBelowZero",
      [](T& t) {
          return t.setNormal({0, 0, 1e-10});
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"NormalLong",
      [](T& t) {
          return t.setNormal({1e200, 1e200, 0});
-     },                                                                                 kOk                   },
+     },
+     kOk},
     {"DirectionParallel",
      [](T& t) {
          return t.setDirection({0, 0, -2});
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"DirectionSlanted",
      [](T& t) {
          return t.setDirection({1, 0, 1});
-     },                                                                                 kOk                   },
-    {"AttachmentNone",    [](T& t) { return t.setAttachment(T::AttachmentPoint{0}); },  kOut                  },
-    {"AttachmentTen",     [](T& t) { return t.setAttachment(T::AttachmentPoint{10}); }, kOut                  },
-    {"RotationInfinite",  [](T& t) { return t.setRotation(kInfinity); },                kFlat                 },
-    {"ColumnsNone",       [](T& t) { return t.setStaticColumns(1, 0, 0); },             kOut                  },
-    {"GutterNegative",    [](T& t) { return t.setColumnGutterWidth(-1); },              kOut                  },
-    {"BackgroundSmall",   [](T& t) { return t.setBackgroundScaleFactor(0.99); },        kOut                  },
-    {"StyleNull",         [](T& t) { return t.setTextStyle(TzDbObjectId::kNull); },     Tzad::eWrongObjectType},
-    {"LayerNull",         [](T& t) { return t.setLayer(TzDbObjectId::kNull); },         Tzad::eWrongObjectType},
-    {"ColorAbove",        [](T& t) { return t.setColorIndex(257); },                    kOut                  },
+     },
+     kOk},
+    {"AttachmentNone", [](T& t) { return t.setAttachment(T::AttachmentPoint{0}); }, kOut},
+    {"AttachmentTen", [](T& t) { return t.setAttachment(T::AttachmentPoint{10}); }, kOut},
+    {"RotationInfinite", [](T& t) { return t.setRotation(kInfinity); }, kFlat},
+    {"ColumnsNone", [](T& t) { return t.setStaticColumns(1, 0, 0); }, kOut},
+    {"GutterNegative", [](T& t) { return t.setColumnGutterWidth(-1); }, kOut},
+    {"BackgroundSmall", [](T& t) { return t.setBackgroundScaleFactor(0.99); }, kOut},
+    {"StyleNull", [](T& t) { return t.setTextStyle(TzDbObjectId::kNull); }, Tzad::eWrongObjectType},
+    {"LayerNull", [](T& t) { return t.setLayer(TzDbObjectId::kNull); }, Tzad::eWrongObjectType},
+    {"ColorAbove", [](T& t) { return t.setColorIndex(257); }, kOut},
     {"Flattened",
      [](T& t) {
          return t.transformBy(TzGeMatrix3d::projection(TzGePlane(), TzGeVector3d::kZAxis));
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"MovedTooFar",
      [](T& t) {
          return t.transformBy(TzGeMatrix3d::translation({kInfinity, 0, 0}));
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"ColumnsTooLarge",
      [](T& t) {
          (void)t.setStaticColumns(1e200, 0, 2);
          return t.transformBy(TzGeMatrix3d::scaling(1e200));
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
     {"GrownTooLarge",
      [](T& t) {
          (void)t.setTextHeight(1e200);
          return t.transformBy(TzGeMatrix3d::scaling(1e200));
-     },                                                                                 kFlat                 },
+     },
+     kFlat},
 };
 
 class Setters : public testing::TestWithParam<SetterCase> {};
@@ -155,11 +166,11 @@ struct TransformCase {
 };
 
 TransformCase const kTransforms[] = {
-    {"Moved",  TzGeMatrix3d::translation({1, 2, 3}), {2, 2, 3},             {1, 0, 0},                            2                                                       },
-    {"Turned", TzGeMatrix3d::rotation(kRight,        TzGeVector3d::kZAxis), {0, 1, 0},                            {0, 1, 0},                                                2},
-    {"Upright",        TzGeMatrix3d::rotation(kRight,                                    TzGeVector3d::kXAxis),                     {1, 0, 0}, {1, 0, 0},                            2},
-    {"Grown",       TzGeMatrix3d::scaling(1e6),                                           {1e6, 0, 0},                                                          {1, 0, 0},                                                              2e6                                     },
-    {"Shrunk",     TzGeMatrix3d::scaling(1e-12),                                         {1e-12, 0, 0},                                                       {1, 0, 0},2e-12},
+    {"Moved", TzGeMatrix3d::translation({1, 2, 3}), {2, 2, 3}, {1, 0, 0}, 2},
+    {"Turned", TzGeMatrix3d::rotation(kRight, TzGeVector3d::kZAxis), {0, 1, 0}, {0, 1, 0}, 2},
+    {"Upright", TzGeMatrix3d::rotation(kRight, TzGeVector3d::kXAxis), {1, 0, 0}, {1, 0, 0}, 2},
+    {"Grown", TzGeMatrix3d::scaling(1e6), {1e6, 0, 0}, {1, 0, 0}, 2e6},
+    {"Shrunk", TzGeMatrix3d::scaling(1e-12), {1e-12, 0, 0}, {1, 0, 0}, 2e-12},
 };
 
 class Transforms : public testing::TestWithParam<TransformCase> {};

@@ -17,24 +17,24 @@ struct FieldCase {
 };
 
 constexpr FieldCase kFields[] = {
-    {"Variable",      L"n=%<\\Var LUNITS>%;",                  L"n=2;",           Tzad::eOk               },
-    {"LowerCase",     L"%<\\Var textsize>%",                   L"0.2",            Tzad::eOk               },
-    {"NoVariable",    L"%<\\Var NOSUCH>%",                     L"####",           Tzad::eFieldNotEvaluated},
-    {"Date",          L"%<\\Date>%",                           L"2001-09-09",     Tzad::eOk               },
-    {"File",          L"%<\\File>%",                           L"plan.json",      Tzad::eOk               },
-    {"ObjectText",    L"%<\\Object 1 contents>%",              L"abc",            Tzad::eOk               },
-    {"ObjectHeight",  L"%<\\Object 1 TextHeight>%",            L"0.2",            Tzad::eOk               },
-    {"NoObject",      L"%<\\Object FF contents>%",             L"####",           Tzad::eFieldNotEvaluated},
-    {"WideHandle",    L"%<\\Object \u0131 contents>%",         L"####",
-     Tzad::eFieldNotEvaluated                                                                             }, // read as 1
-    {"TablesHandle",  L"%<\\Object 4000000000000000 handle>%", L"####",           Tzad::eFieldNotEvaluated},
-    {"NoProperty",    L"%<\\Object 1 radius>%",                L"####",           Tzad::eFieldNotEvaluated},
-    {"HandleTooLong", L"%<\\Object 11112222333344445 x>%",     L"####",           Tzad::eFieldNotEvaluated},
-    {"UnknownWord",   L"a %<\\Weather>% b",                    L"a #### b",       Tzad::eFieldNotEvaluated},
-    {"TwoCodes",      L"%<\\Var LUNITS>%%<\\Var LUPREC>%",     L"24",             Tzad::eOk               },
-    {"NotClosed",     L"%<\\Var LUNITS",                       L"%<\\Var LUNITS", Tzad::eOk               },
-    {"NoCode",        L"50 %< 60",                             L"50 %< 60",       Tzad::eOk               },
-    {"InnerStart",    L"%<\\Var %<\\Var LUNITS>%>%",           L"####>%",         Tzad::eFieldNotEvaluated},
+    {"Variable", L"n=%<\\Var LUNITS>%;", L"n=2;", Tzad::eOk},
+    {"LowerCase", L"%<\\Var textsize>%", L"0.2", Tzad::eOk},
+    {"NoVariable", L"%<\\Var NOSUCH>%", L"####", Tzad::eFieldNotEvaluated},
+    {"Date", L"%<\\Date>%", L"2001-09-09", Tzad::eOk},
+    {"File", L"%<\\File>%", L"plan.json", Tzad::eOk},
+    {"ObjectText", L"%<\\Object 1 contents>%", L"abc", Tzad::eOk},
+    {"ObjectHeight", L"%<\\Object 1 TextHeight>%", L"0.2", Tzad::eOk},
+    {"NoObject", L"%<\\Object FF contents>%", L"####", Tzad::eFieldNotEvaluated},
+    {"WideHandle", L"%<\\Object \u0131 contents>%", L"####",
+     Tzad::eFieldNotEvaluated},  // read as 1
+    {"TablesHandle", L"%<\\Object 4000000000000000 handle>%", L"####", Tzad::eFieldNotEvaluated},
+    {"NoProperty", L"%<\\Object 1 radius>%", L"####", Tzad::eFieldNotEvaluated},
+    {"HandleTooLong", L"%<\\Object 11112222333344445 x>%", L"####", Tzad::eFieldNotEvaluated},
+    {"UnknownWord", L"a %<\\Weather>% b", L"a #### b", Tzad::eFieldNotEvaluated},
+    {"TwoCodes", L"%<\\Var LUNITS>%%<\\Var LUPREC>%", L"24", Tzad::eOk},
+    {"NotClosed", L"%<\\Var LUNITS", L"%<\\Var LUNITS", Tzad::eOk},
+    {"NoCode", L"50 %< 60", L"50 %< 60", Tzad::eOk},
+    {"InnerStart", L"%<\\Var %<\\Var LUNITS>%>%", L"####>%", Tzad::eFieldNotEvaluated},
 };
 
 class Fields : public testing::TestWithParam<FieldCase>, protected DrawingFixture {};

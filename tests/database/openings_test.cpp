@@ -20,24 +20,24 @@ struct Walk {
 };
 
 Walk const kWalks[] = {
-    {"ReadTwice",          "RRcc",   {0, 0, 0, 0},           0},
-    {"WriteBlocksRead",    "WRc",    {0, 45, 0},             0},
-    {"WriteBlocksWrite",   "WWc",    {0, 83, 0},             0},
-    {"ReadBlocksWrite",    "RWc",    {0, 15, 0},             0},
-    {"Upgrade",            "Rudcc",  {0, 0, 0, 0, 1010},     0},
-    {"UpgradeOfTwo",       "RRuccu", {0, 0, 15, 0, 0, 1010}, 0},
-    {"UpgradeTwice",       "Ruuc",   {0, 0, 83, 0},          0},
-    {"UpgradeOfWriter",    "Wuc",    {0, 83, 0},             0},
-    {"UpgradeOfClosed",    "u",      {1010},                 0},
-    {"DowngradeOfReader",  "Rdc",    {0, 1011, 0},           0},
-    {"DowngradeLetsRead",  "WdRcc",  {0, 0, 0, 0, 0},        0},
-    {"LockedForRead",      "lRc",    {0, 0, 0},              0},
-    {"LockedForWrite",     "lW",     {0, 87},                0},
-    {"LockedUpgrade",      "lRuc",   {0, 0, 87, 0},          0},
-    {"LockedWhileOpen",    "WldRcc", {0, 0, 0, 0, 0, 0},     0},
-    {"Erased",             "WecRW",  {0, 0, 0, 1009, 1009},  0},
-    {"ReaderDoesNotErase", "Rec",    {0, 1011, 0},           0},
-    {"LeftOpen",           "RR",     {0, 0},                 2},
+    {"ReadTwice", "RRcc", {0, 0, 0, 0}, 0},
+    {"WriteBlocksRead", "WRc", {0, 45, 0}, 0},
+    {"WriteBlocksWrite", "WWc", {0, 83, 0}, 0},
+    {"ReadBlocksWrite", "RWc", {0, 15, 0}, 0},
+    {"Upgrade", "Rudcc", {0, 0, 0, 0, 1010}, 0},
+    {"UpgradeOfTwo", "RRuccu", {0, 0, 15, 0, 0, 1010}, 0},
+    {"UpgradeTwice", "Ruuc", {0, 0, 83, 0}, 0},
+    {"UpgradeOfWriter", "Wuc", {0, 83, 0}, 0},
+    {"UpgradeOfClosed", "u", {1010}, 0},
+    {"DowngradeOfReader", "Rdc", {0, 1011, 0}, 0},
+    {"DowngradeLetsRead", "WdRcc", {0, 0, 0, 0, 0}, 0},
+    {"LockedForRead", "lRc", {0, 0, 0}, 0},
+    {"LockedForWrite", "lW", {0, 87}, 0},
+    {"LockedUpgrade", "lRuc", {0, 0, 87, 0}, 0},
+    {"LockedWhileOpen", "WldRcc", {0, 0, 0, 0, 0, 0}, 0},
+    {"Erased", "WecRW", {0, 0, 0, 1009, 1009}, 0},
+    {"ReaderDoesNotErase", "Rec", {0, 1011, 0}, 0},
+    {"LeftOpen", "RR", {0, 0}, 2},
 };
 
 class Openings : public testing::TestWithParam<Walk>, protected DrawingFixture {
@@ -97,9 +97,9 @@ struct WritableRow {
     bool writable;
 };
 constexpr WritableRow kWritableRows[] = {
-    {"OfReader",       TzDb::kForRead,  false, true },
-    {"OfWriter",       TzDb::kForWrite, false, true },
-    {"OfLockedReader", TzDb::kForRead,  true,  false},
+    {"OfReader", TzDb::kForRead, false, true},
+    {"OfWriter", TzDb::kForWrite, false, true},
+    {"OfLockedReader", TzDb::kForRead, true, false},
 };
 
 class Writable : public testing::TestWithParam<WritableRow>, protected DrawingFixture {};

@@ -26,69 +26,69 @@ void change(TzDbObjectId id, Tzad::ErrorStatus (*act)(T& object)) {
 }
 
 Deed const kDeeds[] = {
-    {"Append",      [](DrawingFixture& f, TzDbObjectId) { f.addText(L"new"); }},
+    {"Append", [](DrawingFixture& f, TzDbObjectId) { f.addText(L"new"); }},
     {"AppendMany",
-     [](DrawingFixture& f,                TzDbObjectId) {
+     [](DrawingFixture& f, TzDbObjectId) {
          for (int i = 0; i < 5; ++i)
              f.add(new TzDbLine);
-     }                                              },
+     }},
     {"Erase",
-     [](DrawingFixture&,                  TzDbObjectId id) {
+     [](DrawingFixture&, TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) { return text.erase(); });
-     }                                                },
+     }},
     {"ChangeTwice",
-     [](DrawingFixture&,                  TzDbObjectId id) {
+     [](DrawingFixture&, TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) { return text.setContents(L"one"); });
          change<TzDbMText>(id, [](TzDbMText& text) {
              EXPECT_EQ(text.setContents(L"two"), Tzad::eOk);
              EXPECT_EQ(text.setStaticColumns(3, 1, 2), Tzad::eOk);
              return text.setBackgroundFill(true);
          });
-     }                                                },
+     }},
     {"Move",
-     [](DrawingFixture&,                  TzDbObjectId id) {
+     [](DrawingFixture&, TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) {
              return text.transformBy(TzGeMatrix3d::translation({1, 2, 3}));
          });
-     }                                                },
+     }},
     {"Field",
-     [](DrawingFixture&,                  TzDbObjectId id) {
+     [](DrawingFixture&, TzDbObjectId id) {
          change<TzDbMText>(id,
                            [](TzDbMText& text) { return text.setContents(L"%<\\Var LUNITS>%"); });
-     }                                                },
+     }},
     {"Layer",
-     [](DrawingFixture& f,                TzDbObjectId id) {
+     [](DrawingFixture& f, TzDbObjectId id) {
          TzDbObjectId const layer = f.addLayer(L"New");
          TzDbMText* text = nullptr;
          ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
          EXPECT_EQ(text->setLayer(layer), Tzad::eOk);
          EXPECT_EQ(text->close(), Tzad::eOk);
          EXPECT_EQ(f.drawing->setClayer(layer), Tzad::eOk);
-     }                                              },
+     }},
     {"Rename",
-     [](DrawingFixture& f,                TzDbObjectId) {
+     [](DrawingFixture& f, TzDbObjectId) {
          change<TzDbLayerTableRecord>(f.drawing->clayer(), [](TzDbLayerTableRecord& layer) {
              return layer.setName(L"Walls");
          });
-     }                                              },
+     }},
     {"Style",
-     [](DrawingFixture& f,                TzDbObjectId) {
+     [](DrawingFixture& f, TzDbObjectId) {
          change<TzDbTextStyleTableRecord>(
              f.drawing->textstyle(),
              [](TzDbTextStyleTableRecord& style) { return style.setXScale(2.0); });
-     }                                              },
+     }},
     {"Variables",
-     [](DrawingFixture&,                  TzDbObjectId) {
+     [](DrawingFixture&, TzDbObjectId) {
          (void)Variables::instance().set(L"TEXTSIZE", 7.5, tzhost::Writer::module);
          (void)Variables::instance().set(L"TILEMODE", short{0}, tzhost::Writer::user);
-     }                                                },
+     }},
     {"UserSystem",
-     [](DrawingFixture&,                  TzDbObjectId) {
+     [](DrawingFixture&, TzDbObjectId) {
          TzGeMatrix3d const turned = TzGeMatrix3d::rotation(0.5, TzGeVector3d::kXAxis);
          ASSERT_EQ(tzedSetCurrentUCS(turned), 0);
          ASSERT_EQ(tzedSetCurrentUCS(TzGeMatrix3d()), 0);
          EXPECT_EQ(tzedRestorePreviousUCS(), 0);
-     }                                                },
+     }},
 };
 
 class Undo : public testing::TestWithParam<Deed>, protected DrawingFixture {
@@ -139,18 +139,18 @@ INSTANTIATE_TEST_SUITE_P(Deeds, Undo, testing::ValuesIn(kDeeds), [](auto const& 
 // Commands that leave all as it was. Each was a step, so that U seemed to do nothing.
 Deed const kIdleDeeds[] = {
     {"SameValue",
-     [](DrawingFixture&,   TzDbObjectId id) {
+     [](DrawingFixture&, TzDbObjectId id) {
          change<TzDbMText>(id, [](TzDbMText& text) { return text.setContents(L"abc"); });
-     }  },
+     }},
     {"ThereAndBack",
-     [](DrawingFixture&,   TzDbObjectId id) {
+     [](DrawingFixture&, TzDbObjectId id) {
          for (auto const seen : {TzDb::kInvisible, TzDb::kVisible}) {
              TzDbMText* text = nullptr;
              ASSERT_EQ(tzdbOpenObject(text, id, TzDb::kForWrite), Tzad::eOk);
              EXPECT_EQ(text->setVisibility(seen), Tzad::eOk);
              EXPECT_EQ(text->close(), Tzad::eOk);
          }
-     }  },
+     }},
     {"AppendAndErase",
      [](DrawingFixture& f, TzDbObjectId) {
          change<TzDbMText>(f.addText(L"new"), [](TzDbMText& text) { return text.erase(); });

@@ -50,10 +50,7 @@ std::string frameOf(Body const& body) {
 }
 
 TEST(Frames, TellLinesInTheirOrderAndMergeNothing) {
-    TzGePoint3d const line[] = {
-        {0, 0,    0},
-        {1, -0.0, 0}
-    };
+    TzGePoint3d const line[] = {{0, 0, 0}, {1, -0.0, 0}};
     EXPECT_EQ(
         frameOf([&](TzGiWorldDraw& draw) {
             draw.geometry().polyline(2, line);
@@ -119,10 +116,7 @@ TEST(Frames, LeaveOutWhatIsInvisible) {
 }
 
 TEST(Passes, GiveTheTraitsBackAfterEachDrawable) {
-    TzGePoint3d const line[] = {
-        {0, 0, 0},
-        {1, 0, 0}
-    };
+    TzGePoint3d const line[] = {{0, 0, 0}, {1, 0, 0}};
     Preview inner([&](TzGiWorldDraw& draw) {
         draw.subEntityTraits().setColor(0);
         draw.geometry().polyline(2, line);
@@ -142,10 +136,7 @@ TEST(Passes, GiveTheTraitsBackAfterEachDrawable) {
 }
 
 TEST(Passes, EndWhereDrawablesDrawEachOther) {
-    TzGePoint3d const line[] = {
-        {0, 0, 0},
-        {1, 0, 0}
-    };
+    TzGePoint3d const line[] = {{0, 0, 0}, {1, 0, 0}};
     TzDbEntity* self = nullptr;
     Preview endless([&](TzGiWorldDraw& draw) {
         draw.geometry().polyline(2, line);

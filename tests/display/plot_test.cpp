@@ -30,12 +30,7 @@ DrawOp square(int color, int fill, double left, double bottom, double size) {
     double const right = left + size;
     double const top = bottom + size;
     return lines(color, fill,
-                 {
-                     {left,  bottom, 0},
-                     {right, bottom, 0},
-                     {right, top,    0},
-                     {left,  top,    0}
-    });
+                 {{left, bottom, 0}, {right, bottom, 0}, {right, top, 0}, {left, top, 0}});
 }
 
 DrawOp text(wchar_t const* string, double size) {
@@ -71,16 +66,16 @@ struct InkCase {
 };
 // name, colour, the block's colour, fill type, kind of shape, 0xRRGGBB
 constexpr InkCase kInks[] = {
-    {"Index",            1,   256, kFillNothing, PlotKind::stroke, 0xFF0000},
-    {"SevenIsBlack",     7,   256, kFillNothing, PlotKind::stroke, 0x000000},
-    {"Grey",             9,   256, kFillNothing, PlotKind::stroke, 0xC0C0C0},
-    {"ByLayerOfNone",    256, 256, kFillNothing, PlotKind::stroke, 0x000000},
-    {"ByBlockOfNone",    0,   0,   kFillNothing, PlotKind::stroke, 0x000000},
-    {"ByBlock",          0,   3,   kFillNothing, PlotKind::stroke, 0x00FF00},
-    {"FilledWhiteStays", 7,   256, kFillColor,   PlotKind::fill,   0xFFFFFF},
-    {"FilledColor",      2,   256, kFillColor,   PlotKind::fill,   0xFFFF00},
-    {"PageHidesColor",   2,   256, kFillPage,    PlotKind::fill,   0xFFFFFF},
-    {"LettersOnAFill",   7,   256, kFillColor,   PlotKind::stroke, 0x000000},
+    {"Index", 1, 256, kFillNothing, PlotKind::stroke, 0xFF0000},
+    {"SevenIsBlack", 7, 256, kFillNothing, PlotKind::stroke, 0x000000},
+    {"Grey", 9, 256, kFillNothing, PlotKind::stroke, 0xC0C0C0},
+    {"ByLayerOfNone", 256, 256, kFillNothing, PlotKind::stroke, 0x000000},
+    {"ByBlockOfNone", 0, 0, kFillNothing, PlotKind::stroke, 0x000000},
+    {"ByBlock", 0, 3, kFillNothing, PlotKind::stroke, 0x00FF00},
+    {"FilledWhiteStays", 7, 256, kFillColor, PlotKind::fill, 0xFFFFFF},
+    {"FilledColor", 2, 256, kFillColor, PlotKind::fill, 0xFFFF00},
+    {"PageHidesColor", 2, 256, kFillPage, PlotKind::fill, 0xFFFFFF},
+    {"LettersOnAFill", 7, 256, kFillColor, PlotKind::stroke, 0x000000},
 };
 class Inks : public testing::TestWithParam<InkCase> {};
 TEST_P(Inks, StandOutFromThePage) {
@@ -129,23 +124,13 @@ TEST(Plots, PaintInTheOrderOfDrawing) {
 
 TEST(Plots, LookAlongTheView) {
     // A square on edge in plan is a square from the front.
-    DrawOp wall = lines(1, kFillColor,
-                        {
-                            {0, 9, 0},
-                            {4, 9, 0},
-                            {4, 9, 4},
-                            {0, 9, 4}
-    });
+    DrawOp wall = lines(1, kFillColor, {{0, 9, 0}, {4, 9, 0}, {4, 9, 4}, {0, 9, 4}});
     EXPECT_EQ(plotted({wall}, ViewAxes({0, -1, 0})).count(0xFF0000), 810 * 810);
     EXPECT_EQ(plotted({wall}).count(0xFF0000), 0);
 }
 
 TEST(Plots, DrawAsWideAsTheWeightSays) {
-    DrawOp line = lines(1, kFillNothing,
-                        {
-                            {0, 0, 0},
-                            {8, 0, 0}
-    });
+    DrawOp line = lines(1, kFillNothing, {{0, 0, 0}, {8, 0, 0}});
     auto const thickness = [&] {
         Picture const picture = plotted({line});
         int found = 0;
@@ -161,12 +146,8 @@ TEST(Plots, DrawAsWideAsTheWeightSays) {
 
 TEST(Plots, DashWhatIsNotTooFine) {
     PlotShape line;
-    makeScene(
-        {
-            lines(1, kFillNothing, {{0, 0, 0}, {10, 0, 0}}
-              )
-    },
-        ViewAxes())([&](PlotShape const& shape) { line = shape; });
+    makeScene({lines(1, kFillNothing, {{0, 0, 0}, {10, 0, 0}})},
+              ViewAxes())([&](PlotShape const& shape) { line = shape; });
     auto const inked = [&](std::vector<double> dashes) {
         line.dashes = std::move(dashes);
         line.lineWeight = 1.0;
@@ -211,14 +192,10 @@ TEST(Plots, PlaceTextsByTheirStyle) {
 }
 
 TEST(Plots, SurviveShapesOfNoUse) {
-    DrawList const list = {
-        lines(1, kFillNothing, {{kNan, 0, 0},         {1, 0, 0}}
-          ), lines(1, kFillNothing, {{2, 2, 0}           }
-          ),
-        lines(1, kFillNothing, {{1e300, 1e300, 0}, {-1e300, -1e300, 0}         }
-          ), text(L"", 1),
-        text(L"edge", kNan)
-    };
+    DrawList const list = {lines(1, kFillNothing, {{kNan, 0, 0}, {1, 0, 0}}),
+                           lines(1, kFillNothing, {{2, 2, 0}}),
+                           lines(1, kFillNothing, {{1e300, 1e300, 0}, {-1e300, -1e300, 0}}),
+                           text(L"", 1), text(L"edge", kNan)};
     for (PlotFormat const format : {PlotFormat::svg, PlotFormat::png, PlotFormat::pdf}) {
         EXPECT_FALSE(painted(makeScene(list, ViewAxes()), format).empty());
         EXPECT_FALSE(painted([](ShapeTaker const&) {}, format).empty());

@@ -41,18 +41,18 @@ struct PointRow {
     int pointsAfter;
 };
 constexpr PointRow kPointRows[] = {
-    {"NoRegistry",       "",                                   false, 16, 320,  2560, 120, 16     },
-    {"ScreenSizeCounts", R"("Normal Point Size": 40)",         false, 20, 400,  2560, 120, 20     },
-    {"FixedWindow",      R"("Normal Point Size": 40)",         true,  20, 800,  2560, 120, 40     },
-    {"NormalTooSmall",   R"("Normal Point Size": 4)",          true,  16, 160,  2560, 120, 4      },
-    {"NormalTooLarge",   R"("Normal Point Size": 100)",        true,  16, 1440, 2560, 120, 100    },
-    {"NormalBeyondInt",  R"("Normal Point Size": 4294967295)", true,  16, 1440, 2560, 120, INT_MAX},
-    {"NormalIsText",     R"("Normal Point Size": "40")",       true,  30, 320,  2560, 120, 16     },
-    {"MostBelowNormal",  R"("Max Point Size": 10)",            false, 16, 320,  320,  120, 16     },
-    {"MostTooLarge",     R"("Max Point Size": 300)",           false, 16, 320,  5120, 120, 16     },
-    {"LeastIgnored",     R"("Min Point Size": 5)",             false, 16, 320,  2560, 120, 16     },
-    {"LeastAboveNormal", R"("Min Point Size": 20)",            false, 16, 320,  2560, 320, 16     },
-    {"LeastTaken",       R"("Min Point Size": 10)",            false, 16, 320,  2560, 200, 16     },
+    {"NoRegistry", "", false, 16, 320, 2560, 120, 16},
+    {"ScreenSizeCounts", R"("Normal Point Size": 40)", false, 20, 400, 2560, 120, 20},
+    {"FixedWindow", R"("Normal Point Size": 40)", true, 20, 800, 2560, 120, 40},
+    {"NormalTooSmall", R"("Normal Point Size": 4)", true, 16, 160, 2560, 120, 4},
+    {"NormalTooLarge", R"("Normal Point Size": 100)", true, 16, 1440, 2560, 120, 100},
+    {"NormalBeyondInt", R"("Normal Point Size": 4294967295)", true, 16, 1440, 2560, 120, INT_MAX},
+    {"NormalIsText", R"("Normal Point Size": "40")", true, 30, 320, 2560, 120, 16},
+    {"MostBelowNormal", R"("Max Point Size": 10)", false, 16, 320, 320, 120, 16},
+    {"MostTooLarge", R"("Max Point Size": 300)", false, 16, 320, 5120, 120, 16},
+    {"LeastIgnored", R"("Min Point Size": 5)", false, 16, 320, 2560, 120, 16},
+    {"LeastAboveNormal", R"("Min Point Size": 20)", false, 16, 320, 2560, 320, 16},
+    {"LeastTaken", R"("Min Point Size": 10)", false, 16, 320, 2560, 200, 16},
 };
 
 TEST(EditorState, TakesItsPointsFromTheRegistry) {

@@ -23,16 +23,16 @@ struct PlacementRow {
 };
 constexpr double kQuarter = std::numbers::pi / 2;
 constexpr PlacementRow kPlacementRows[] = {
-  // 9 pixels of text: 9 + 1 points; the window takes its least size, 100 by 16.
-    {"Level",            0,         0,   0,        0.1,  {954, 534},  {954, 534, 1054, 550},  10, 1},
-    {"TooSmallToRead",   0,         0,   0,        0.05, {954, 534},  {954, 534, 1054, 550},  5,  0},
- // Corners one above the other: 300 by 40 stand in.
-    {"Upright",          0,         0,   kQuarter, 0.1,  {954, 534},  {954, 534, 1254, 574},  16, 0},
-    {"NearTheTop",       0,         5.5, 0,        0.1,  {954, 100},  {954, 100, 1054, 116},  10, 0},
-    {"LeftOfTheDesktop", -12,       0,   0,        0.1,  {50, 534},   {50, 534, 150, 550},    10, 0},
-    {"RightEdge",        10.6,      0,   0,        0.1,  {1908, 534}, {1819, 534, 1919, 550}, 10, 0},
-    {"AtTheCorner",      -96.0 / 9, 6,   0,        0.1,  {960, 540},  {960, 540, 1060, 556},  10, 0},
-    {"NotOnAnyScreen",   1e300,     0,   0,        0.1,  {960, 540},  {960, 540, 1260, 580},  16, 0},
+    // 9 pixels of text: 9 + 1 points; the window takes its least size, 100 by 16.
+    {"Level", 0, 0, 0, 0.1, {954, 534}, {954, 534, 1054, 550}, 10, 1},
+    {"TooSmallToRead", 0, 0, 0, 0.05, {954, 534}, {954, 534, 1054, 550}, 5, 0},
+    // Corners one above the other: 300 by 40 stand in.
+    {"Upright", 0, 0, kQuarter, 0.1, {954, 534}, {954, 534, 1254, 574}, 16, 0},
+    {"NearTheTop", 0, 5.5, 0, 0.1, {954, 100}, {954, 100, 1054, 116}, 10, 0},
+    {"LeftOfTheDesktop", -12, 0, 0, 0.1, {50, 534}, {50, 534, 150, 550}, 10, 0},
+    {"RightEdge", 10.6, 0, 0, 0.1, {1908, 534}, {1819, 534, 1919, 550}, 10, 0},
+    {"AtTheCorner", -96.0 / 9, 6, 0, 0.1, {960, 540}, {960, 540, 1060, 556}, 10, 0},
+    {"NotOnAnyScreen", 1e300, 0, 0, 0.1, {960, 540}, {960, 540, 1260, 580}, 16, 0},
 };
 
 void place(TzDbMText& text, PlacementRow const& row) {
@@ -84,10 +84,10 @@ struct BackslashRow {
     wchar_t const* doubled;
 };
 constexpr BackslashRow kBackslashRows[] = {
-    {L"a\\Pb",                              L"a\\Pb"                                     },
-    {L"\\L%<\\Date>%\\l",                   L"\\L%<\\\\Date>%\\l"                        },
+    {L"a\\Pb", L"a\\Pb"},
+    {L"\\L%<\\Date>%\\l", L"\\L%<\\\\Date>%\\l"},
     {L"%<\\Var A>%\\P%<\\Object 2A\\\\x>%", L"%<\\\\Var A>%\\P%<\\\\Object 2A\\\\\\\\x>%"},
-    {L"open %<\\Date",                      L"open %<\\Date"                             },
+    {L"open %<\\Date", L"open %<\\Date"},
 };
 TEST(FieldBackslashes, AreDoubledInsideFieldsAlone) {
     for (BackslashRow const& row : kBackslashRows) {

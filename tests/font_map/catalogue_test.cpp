@@ -86,14 +86,10 @@ TEST_F(Catalogue, DumpsItsTables) {
 TEST_F(Catalogue, LearnsTheFontFolderOnce) {
     auto& folders = tzhost::settings().registry[L"hkey_current_user\\software\\microsoft\\windows\\"
                                                 L"currentversion\\explorer\\shell folders"];
-    folders = {
-        {L"Fonts", L"C:\\Windows\\Fonts"}
-    };
+    folders = {{L"Fonts", L"C:\\Windows\\Fonts"}};
     CTzadFontMapDatabase::InitSystemLocations();
     EXPECT_EQ(CTzadFontMapDatabase::GetSystemFontPath(), L"C:\\Windows\\Fonts");
-    folders = {
-        {L"Fonts", L"D:\\Fonts"}
-    };
+    folders = {{L"Fonts", L"D:\\Fonts"}};
     CTzadFontMapDatabase::PopulateDatabaseFromRegistry();
     EXPECT_EQ(CTzadFontMapDatabase::GetSystemFontPath(), L"C:\\Windows\\Fonts");
 }
@@ -102,18 +98,17 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
     std::wstring const fonts =
         L"hkey_local_machine\\software\\microsoft\\windows nt\\currentversion\\fonts";
     tzhost::settings().registry[fonts] = {
-        {L"Plain Face",                             L"plain.fot"    },
-        {L"Number",                                 std::uint32_t{5}},
-        {L"Alone One (All)",                        L"alone.ttc"    },
-        {L"First & Second Face & Third (TrueType)", L"set.ttc"      },
-        {L"Short",                                  L".fot"         },
-        {L"Five",                                   L"X.FOT"        },
-        {L"Numbers & Letters (TrueType)",           std::uint32_t{5}},
-        {L"Others & Letters (TrueType)",            L"letters.ttc"  },
+        {L"Plain Face", L"plain.fot"},
+        {L"Number", std::uint32_t{5}},
+        {L"Alone One (All)", L"alone.ttc"},
+        {L"First & Second Face & Third (TrueType)", L"set.ttc"},
+        {L"Short", L".fot"},
+        {L"Five", L"X.FOT"},
+        {L"Numbers & Letters (TrueType)", std::uint32_t{5}},
+        {L"Others & Letters (TrueType)", L"letters.ttc"},
     };
     tzhost::settings().registry[L"hkey_local_machine\\software\\product\\altfontnames"] = {
-        {L"Alternate", L"alternate.ttf"}
-    };
+        {L"Alternate", L"alternate.ttf"}};
     tzhost::settings().productKey = L"SOFTWARE\\Product";
     CTzadFontMapDatabase::PopulateDatabaseFromRegistry();
     // The walk closes both lists again, so that nothing is found after it.
@@ -124,21 +119,12 @@ TEST_F(Catalogue, FindsFilesInTheRegistry) {
         wchar_t const* face;
         wchar_t const* file;
     };
-    for (Row const& row : {
-             Row{L"Plain Face",        L"plain.ttf"    },
-             Row{L"@Plain Face",       L"plain.ttf"    },
-             Row{L"Alternate",         L"alternate.ttf"},
-             Row{L"First",             L"set.ttc"      },
-             Row{L"Second Face (Any)", L"set.ttc"      },
-             Row{L"Third",             L"set.ttc"      },
-             Row{L"Second",            L"set.ttc"      },
-             Row{L"Alone One",         L""             },
-             Row{L"Number",            L""             },
-             Row{L"Short",             L".fot"         },
-             Row{L"Five",              L"X.ttf"        },
-             Row{L"Letters",           L"letters.ttc"  },
-             Row{L"Missing",           L""             }
-    }) {
+    for (Row const& row : {Row{L"Plain Face", L"plain.ttf"}, Row{L"@Plain Face", L"plain.ttf"},
+                           Row{L"Alternate", L"alternate.ttf"}, Row{L"First", L"set.ttc"},
+                           Row{L"Second Face (Any)", L"set.ttc"}, Row{L"Third", L"set.ttc"},
+                           Row{L"Second", L"set.ttc"}, Row{L"Alone One", L""}, Row{L"Number", L""},
+                           Row{L"Short", L".fot"}, Row{L"Five", L"X.ttf"},
+                           Row{L"Letters", L"letters.ttc"}, Row{L"Missing", L""}}) {
         EXPECT_EQ(CTzadFontMapDatabase::GetFileNameFromFaceName(row.face), row.file) << row.face;
     }
     regLocation().Close();

@@ -82,9 +82,9 @@ private:
     std::string before_;
 };
 std::map<std::string, Fonts::MapType> const ShippedMap::kTypes{
-    {"SHX Map",        Fonts::MapTypeShx       },
+    {"SHX Map", Fonts::MapTypeShx},
     {"Postscript Map", Fonts::MapTypePostscript},
-    {"Misc Map",       Fonts::MapTypeMisc      },
+    {"Misc Map", Fonts::MapTypeMisc},
 };
 
 Look lookOf(

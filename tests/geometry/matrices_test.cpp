@@ -25,18 +25,18 @@ struct MatrixCase {
     TzGePoint3d to;
 };
 const MatrixCase kMatrices[] = {
-    {"Identity",          TzGeMatrix3d(),                          {1, 2, 3},                                       {1, 2, 3}                                                                       },
-    {"Translation",       TzGeMatrix3d::translation({10, 20, 30}), {1, 2, 3},                                       {11, 22, 33}                                                                    },
-    {"QuarterTurn",       TzGeMatrix3d::rotation(kPi / 2,          {0, 0, 2},                                       {10, 0, 0}),                                                                      {11, 0, 5}, {10, 1, 5}},
-    {"Scaling",         TzGeMatrix3d::scaling(3,                                                {1, 1, 1}),                                                                                       {2, 1, 0},                                                                                                                                        {4, 1, -2}},
-    {"TinyScaling",          TzGeMatrix3d::scaling(1e-7),                                       {1, 2, 3},{1e-7, 2e-7, 3e-7}},
-    {"System",          systemOf({5, 6, 7},{0, 1, 0},                                         {-1, 0, 0},                                                                                                                                                                                      {0, 0, 1}), {1, 2, 3}, {3, 7, 10}},
-    {"Mirror",          systemOf({0, 0, 0},                                               {-1, 0, 0},                                            {0, 1, 0},{0, 0, 1}), {1, 2, 3}, {-1, 2, 3}},
-    {"Skew",                   systemOf({0, 0, 0},                                                   {1, 0, 0},                                                                       {1, 1, 0},                                                                                               {0, 2, 4}), {1, 1, 1}, {2, 3, 4}},
+    {"Identity", TzGeMatrix3d(), {1, 2, 3}, {1, 2, 3}},
+    {"Translation", TzGeMatrix3d::translation({10, 20, 30}), {1, 2, 3}, {11, 22, 33}},
+    {"QuarterTurn", TzGeMatrix3d::rotation(kPi / 2, {0, 0, 2}, {10, 0, 0}), {11, 0, 5}, {10, 1, 5}},
+    {"Scaling", TzGeMatrix3d::scaling(3, {1, 1, 1}), {2, 1, 0}, {4, 1, -2}},
+    {"TinyScaling", TzGeMatrix3d::scaling(1e-7), {1, 2, 3}, {1e-7, 2e-7, 3e-7}},
+    {"System", systemOf({5, 6, 7}, {0, 1, 0}, {-1, 0, 0}, {0, 0, 1}), {1, 2, 3}, {3, 7, 10}},
+    {"Mirror", systemOf({0, 0, 0}, {-1, 0, 0}, {0, 1, 0}, {0, 0, 1}), {1, 2, 3}, {-1, 2, 3}},
+    {"Skew", systemOf({0, 0, 0}, {1, 0, 0}, {1, 1, 0}, {0, 2, 4}), {1, 1, 1}, {2, 3, 4}},
     {"RightAppliesFirst",
      TzGeMatrix3d::translation({1, 0, 0}) * TzGeMatrix3d::scaling(2),
      {1, 1, 1},
-     {3, 2, 2}                                                                                                                                                                                                                              },
+     {3, 2, 2}},
     {"PostMult",
      TzGeMatrix3d::scaling(2).postMultBy(TzGeMatrix3d::translation({1, 0, 0})),
      {1, 1, 1},
@@ -44,7 +44,7 @@ const MatrixCase kMatrices[] = {
     {"PreMult",
      TzGeMatrix3d::scaling(2).preMultBy(TzGeMatrix3d::translation({1, 0, 0})),
      {1, 1, 1},
-     {3, 2, 2}                                                                                                                                },
+     {3, 2, 2}},
 };
 class Matrices : public testing::TestWithParam<MatrixCase> {};
 TEST_P(Matrices, GoThereAndBack) {
@@ -95,12 +95,12 @@ struct ProjectionCase {
 };
 // On the plane z = 2.
 constexpr ProjectionCase kProjections[] = {
-    {"Straight",           {0, 0, 1},  {3, 4, 9}, {3, 4, 2} },
-    {"Against",            {0, 0, -5}, {3, 4, 9}, {3, 4, 2} },
-    {"Slanted",            {1, 0, 1},  {3, 4, 9}, {-4, 4, 2}},
-    {"OnThePlaneStays",    {1, 2, 3},  {3, 4, 2}, {3, 4, 2} },
-    {"AlongThePlaneStays", {1, 2, 0},  {3, 4, 9}, {3, 4, 9} },
-    {"NoDirectionStays",   {0, 0, 0},  {3, 4, 9}, {3, 4, 9} },
+    {"Straight", {0, 0, 1}, {3, 4, 9}, {3, 4, 2}},
+    {"Against", {0, 0, -5}, {3, 4, 9}, {3, 4, 2}},
+    {"Slanted", {1, 0, 1}, {3, 4, 9}, {-4, 4, 2}},
+    {"OnThePlaneStays", {1, 2, 3}, {3, 4, 2}, {3, 4, 2}},
+    {"AlongThePlaneStays", {1, 2, 0}, {3, 4, 9}, {3, 4, 9}},
+    {"NoDirectionStays", {0, 0, 0}, {3, 4, 9}, {3, 4, 9}},
 };
 class Projections : public testing::TestWithParam<ProjectionCase> {};
 TEST_P(Projections, PointsAndMatricesAgree) {

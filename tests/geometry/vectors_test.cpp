@@ -29,20 +29,20 @@ struct RelationCase {
     char const* relation;
 };
 constexpr RelationCase kRelations[] = {
-    {"Same",              {1, 2, 3},       {1, 2, 3},                     "pce"},
-    {"Longer",            {1, 2, 3},       {1e9, 2e9, 3e9},               "pc" },
-    {"Opposite",          {0, 5, 0},       {0, -1e-3, 0},                 "p"  },
-    {"RightAngle",        {0, 5, 0},       {7, 0, 1e6},                   "r"  },
-    {"TiltWithin",        {1, 0, 0},       {1e6, 0.9e-4, 0},              "pc" },
-    {"TiltBeyond",        {1, 0, 0},       {1e6, 1.1e-4, 0},              ""   },
-    {"LeanWithin",        {1, 0, 0},       {0.9e-4, 1e6, 0},              "r"  },
-    {"LeanBeyond",        {1, 0, 0},       {1.1e-4, 1e6, 0},              ""   },
-    {"ShortHasDirection", {1.1e-10, 0, 0}, {1, 0, 0},                     "pc" },
-    {"TooShort",          {1e-10, 0, 0},   {1, 0, 0},                     ""   },
-    {"TooShortAcross",    {1, 0, 0},       {0, 1e-10, 0},                 ""   },
-    {"ZeroAndZero",       {0, 0, 0},       {0, 0, 0},                     "e"  },
-    {"EqualWithin",       {1, 1, 1},       {1, 1, 1 + 0.9e-10},           "pce"},
-    {"EqualBeyond",       {1, 1, 1},       {1, 1 + 0.8e-10, 1 + 0.8e-10}, "pc" },
+    {"Same", {1, 2, 3}, {1, 2, 3}, "pce"},
+    {"Longer", {1, 2, 3}, {1e9, 2e9, 3e9}, "pc"},
+    {"Opposite", {0, 5, 0}, {0, -1e-3, 0}, "p"},
+    {"RightAngle", {0, 5, 0}, {7, 0, 1e6}, "r"},
+    {"TiltWithin", {1, 0, 0}, {1e6, 0.9e-4, 0}, "pc"},
+    {"TiltBeyond", {1, 0, 0}, {1e6, 1.1e-4, 0}, ""},
+    {"LeanWithin", {1, 0, 0}, {0.9e-4, 1e6, 0}, "r"},
+    {"LeanBeyond", {1, 0, 0}, {1.1e-4, 1e6, 0}, ""},
+    {"ShortHasDirection", {1.1e-10, 0, 0}, {1, 0, 0}, "pc"},
+    {"TooShort", {1e-10, 0, 0}, {1, 0, 0}, ""},
+    {"TooShortAcross", {1, 0, 0}, {0, 1e-10, 0}, ""},
+    {"ZeroAndZero", {0, 0, 0}, {0, 0, 0}, "e"},
+    {"EqualWithin", {1, 1, 1}, {1, 1, 1 + 0.9e-10}, "pce"},
+    {"EqualBeyond", {1, 1, 1}, {1, 1 + 0.8e-10, 1 + 0.8e-10}, "pc"},
 };
 class VectorRelations : public testing::TestWithParam<RelationCase> {};
 TEST_P(VectorRelations, HoldBothWays) {
@@ -61,11 +61,11 @@ struct AngleCase {
     double angle;
 };
 const AngleCase kAngles[] = {
-    {"Quarter",   {2, 0, 0}, {0, -3, 0},                                    kPi / 2  },
-    {"Half",      {1, 1, 0}, {-4, -4, 0},                                   kPi      },
-    {"Zero",      {0, 0, 0}, {1, 0, 0},                                     0        },
- // Through the cosine this came out as 0.
-    {"Tiny",      {1, 0, 0}, {1, 1e-9, 0},                                  1e-9     },
+    {"Quarter", {2, 0, 0}, {0, -3, 0}, kPi / 2},
+    {"Half", {1, 1, 0}, {-4, -4, 0}, kPi},
+    {"Zero", {0, 0, 0}, {1, 0, 0}, 0},
+    // Through the cosine this came out as 0.
+    {"Tiny", {1, 0, 0}, {1, 1e-9, 0}, 1e-9},
     {"OneDegree", {0, 1, 0}, {std::sin(kPi / 180), std::cos(kPi / 180), 0}, kPi / 180},
 };
 class VectorAngles : public testing::TestWithParam<AngleCase> {};
@@ -86,12 +86,12 @@ struct TurnCase {
     TzGeVector3d result;
 };
 const TurnCase kTurns[] = {
-    {"AnticlockwiseAboutZ",  {1, 0, 0}, kPi / 2,     {0, 0, 9},  {0, 1, 0} },
-    {"ClockwiseAboutMinusZ", {1, 0, 0}, kPi / 2,     {0, 0, -1}, {0, -1, 0}},
-    {"AboutX",               {0, 1, 0}, kPi / 2,     {1, 0, 0},  {0, 0, 1} },
-    {"AlongTheAxisStays",    {2, 2, 2}, 1.0,         {1, 1, 1},  {2, 2, 2} },
-    {"ThirdAboutDiagonal",   {1, 0, 0}, 2 * kPi / 3, {1, 1, 1},  {0, 1, 0} },
-    {"ZeroAxisTurnsNothing", {1, 2, 3}, 1.0,         {0, 0, 0},  {1, 2, 3} },
+    {"AnticlockwiseAboutZ", {1, 0, 0}, kPi / 2, {0, 0, 9}, {0, 1, 0}},
+    {"ClockwiseAboutMinusZ", {1, 0, 0}, kPi / 2, {0, 0, -1}, {0, -1, 0}},
+    {"AboutX", {0, 1, 0}, kPi / 2, {1, 0, 0}, {0, 0, 1}},
+    {"AlongTheAxisStays", {2, 2, 2}, 1.0, {1, 1, 1}, {2, 2, 2}},
+    {"ThirdAboutDiagonal", {1, 0, 0}, 2 * kPi / 3, {1, 1, 1}, {0, 1, 0}},
+    {"ZeroAxisTurnsNothing", {1, 2, 3}, 1.0, {0, 0, 0}, {1, 2, 3}},
 };
 class VectorTurns : public testing::TestWithParam<TurnCase> {};
 TEST_P(VectorTurns, FollowTheRightHand) {
@@ -142,16 +142,16 @@ struct AxisCase {
 };
 double const kLimit = 1.0 / 64.0;
 const AxisCase kAxes[] = {
-    {"World",         {0, 0, 1},                                          {1, 0, 0} },
-    {"FromBelow",     {0, 0, -1},                                         {-1, 0, 0}},
-    {"Front",         {0, -1, 0},                                         {1, 0, 0} },
-    {"Side",          {7, 0, 0},                                          {0, 1, 0} },
-    {"ZeroIsWorld",   {0, 0, 0},                                          {1, 0, 0} },
- // Just inside the cone about Z the Y axis rules, at its edge the Z axis does.
+    {"World", {0, 0, 1}, {1, 0, 0}},
+    {"FromBelow", {0, 0, -1}, {-1, 0, 0}},
+    {"Front", {0, -1, 0}, {1, 0, 0}},
+    {"Side", {7, 0, 0}, {0, 1, 0}},
+    {"ZeroIsWorld", {0, 0, 0}, {1, 0, 0}},
+    // Just inside the cone about Z the Y axis rules, at its edge the Z axis does.
     {"InsideTheCone",
      {kLimit - 1e-9, 0, std::sqrt(1 - kLimit * kLimit)},
-     {0.9998779222195, 0, -0.015625}                                                },
-    {"AtItsEdge",     {kLimit, 0, std::sqrt(1 - kLimit * kLimit)},        {0, 1, 0} },
+     {0.9998779222195, 0, -0.015625}},
+    {"AtItsEdge", {kLimit, 0, std::sqrt(1 - kLimit * kLimit)}, {0, 1, 0}},
     {"BeyondInYOnly", {0, kLimit + 1e-9, std::sqrt(1 - kLimit * kLimit)}, {-1, 0, 0}},
 };
 class ArbitraryAxes : public testing::TestWithParam<AxisCase> {};

@@ -18,17 +18,17 @@ std::vector<std::wstring> const kWords{L"LIST",   L"LINE",        L"LOAD",   L"M
                                        L"-MTEXT", L"Überschrift", L"_MTEXT", L"_CIRCLE"};
 
 WordCase const kWordCases[] = {
-    {"OneWord",                  L"MT",      L"EXT",     L""               },
-    {"SmallLetters",             L"mt",      L"ext",     L""               },
-    {"Dash",                     L"-",       L"MTEXT",   L""               },
-    {"GlobalMark",               L"_mtex",   L"t",       L""               },
-    {"BehindABlank",             L"all loa", L"d",       L""               },
-    {"CommonPart",               L"L",       L"",        L"LINE LIST LOAD "},
-    {"CommonPartLonger",         L"li",      L"",        L"LINE LIST "     },
-    {"LettersBeyondA7",          L"über",   L"schrift", L""               },
-    {"GlobalWordsBehindTheMark", L"_",       L"",        L"_CIRCLE _MTEXT "},
-    {"Whole",                    L"LINE",    L"",        L""               },
-    {"None",                     L"x",       L"",        L""               },
+    {"OneWord", L"MT", L"EXT", L""},
+    {"SmallLetters", L"mt", L"ext", L""},
+    {"Dash", L"-", L"MTEXT", L""},
+    {"GlobalMark", L"_mtex", L"t", L""},
+    {"BehindABlank", L"all loa", L"d", L""},
+    {"CommonPart", L"L", L"", L"LINE LIST LOAD "},
+    {"CommonPartLonger", L"li", L"", L"LINE LIST "},
+    {"LettersBeyondA7", L"über", L"schrift", L""},
+    {"GlobalWordsBehindTheMark", L"_", L"", L"_CIRCLE _MTEXT "},
+    {"Whole", L"LINE", L"", L""},
+    {"None", L"x", L"", L""},
 };
 
 std::wstring joined(std::vector<std::wstring> const& words) {

@@ -18,30 +18,31 @@ struct TranscriptCase {
 };
 
 TranscriptCase const kCases[] = {
-    {"HelpOnOne",               "HELP\nU\n",                                        "Takes the last command back; it asks nothing.\n"              },
-    {"HelpOnAModulesCommand",   "HELP\n_mtext\n",                                   "Writes a multi-line text between two corners, in"             },
-    {"HelpOnWhatIsGone",        "UNLOAD\nHELP\n_mtext\n",                           "There is no help on \"_mtext\".\n"                            },
-    {"ControlCharactersShow",   "TEXT\n0,0\n\n\n\x1B[6n\xC2\x9B\nLIST\nlast\n\n",
-     "text             \\U+001B[6n\\U+009B\n"                                                                                                      },
-    {"HelpOnNothing",           "HELP\nDANCE\n",                                    "There is no help on \"DANCE\".\n"                             },
-    {"HelpLists",               "HELP\n\n",                                         "CIRCLE           Draws a circle from its center and radius.\n"},
-    {"ListTells",               "CIRCLE\n1,2\n3\nLIST\nlast\n\n",
-     "Circle  #1, layer \"0\"\n  center           1.0000, 2"                                                                                       },
-    {"SelectedIsListed",        "CIRCLE\n0,0\n1\nSELECT\nlast\n\nLIST\n",           "Command: LIST\nCircle  #1"                                    },
+    {"HelpOnOne", "HELP\nU\n", "Takes the last command back; it asks nothing.\n"},
+    {"HelpOnAModulesCommand", "HELP\n_mtext\n", "Writes a multi-line text between two corners, in"},
+    {"HelpOnWhatIsGone", "UNLOAD\nHELP\n_mtext\n", "There is no help on \"_mtext\".\n"},
+    {"ControlCharactersShow", "TEXT\n0,0\n\n\n\x1B[6n\xC2\x9B\nLIST\nlast\n\n",
+     "text             \\U+001B[6n\\U+009B\n"},
+    {"HelpOnNothing", "HELP\nDANCE\n", "There is no help on \"DANCE\".\n"},
+    {"HelpLists", "HELP\n\n", "CIRCLE           Draws a circle from its center and radius.\n"},
+    {"ListTells", "CIRCLE\n1,2\n3\nLIST\nlast\n\n",
+     "Circle  #1, layer \"0\"\n  center           1.0000, 2"},
+    {"SelectedIsListed", "CIRCLE\n0,0\n1\nSELECT\nlast\n\nLIST\n", "Command: LIST\nCircle  #1"},
     {"SelectedIsForOneCommand", "CIRCLE\n0,0\n1\nSELECT\nlast\n\nLIST\nLIST\n^C\n",
-     "Command: LIST\nSelect objects: ^C"                                                                                                           },
-    {"NothingToTakeBack",       "U\n",                                              "There is nothing to take back.\n"                             },
-    {"NoModuleLeft",            "UNLOAD\nUNLOAD\n",                                 "Command: UNLOAD\nNo module is loaded.\n"                      },
-    {"NamesForRecords",         "LAYER\nM\n lead\n\n",                              "\" lead\" cannot be the name of a layer.\n"                   },
- // The style of the file used to be current while the variable said "Standard".
+     "Command: LIST\nSelect objects: ^C"},
+    {"NothingToTakeBack", "U\n", "There is nothing to take back.\n"},
+    {"NoModuleLeft", "UNLOAD\nUNLOAD\n", "Command: UNLOAD\nNo module is loaded.\n"},
+    {"NamesForRecords", "LAYER\nM\n lead\n\n", "\" lead\" cannot be the name of a layer.\n"},
+    // The style of the file used to be current while the variable said "Standard".
     {"OpenedStyleIsShown",
      "STYLE\nBig\n\n\n\n\n\n\n\n\n"
-     "SAVE\nbig.json\nNEW\nOPEN\nbig.json\nSETVAR\nTEXTSTYLE\n\n",                  "TEXTSTYLE <Big>:"                                             },
-    {"GoneWithItsModule",       "UNLOAD\nMTEXT\n",                                  "There is no command \"MTEXT\".\n"                             },
-    {"LoadedTwice",             "LOAD\n\n",                                         "tzmted.tzx: this module is loaded already\n",                   tzdraft::kFailed},
-    {"NoSuchModule",                         "LOAD\nmissing.tzx\n",
-     "missing.tzx: the module cannot be loaded: ",                                                                                tzdraft::kFailed},
-    {"EnterRepeatsNothingInAScript",         "U\n\nHELP\nU\n",                                                           "back.\nCommand: \nCommand: HELP\n"             },
+     "SAVE\nbig.json\nNEW\nOPEN\nbig.json\nSETVAR\nTEXTSTYLE\n\n",
+     "TEXTSTYLE <Big>:"},
+    {"GoneWithItsModule", "UNLOAD\nMTEXT\n", "There is no command \"MTEXT\".\n"},
+    {"LoadedTwice", "LOAD\n\n", "tzmted.tzx: this module is loaded already\n", tzdraft::kFailed},
+    {"NoSuchModule", "LOAD\nmissing.tzx\n",
+     "missing.tzx: the module cannot be loaded: ", tzdraft::kFailed},
+    {"EnterRepeatsNothingInAScript", "U\n\nHELP\nU\n", "back.\nCommand: \nCommand: HELP\n"},
 };
 
 class Transcripts : public testing::TestWithParam<TranscriptCase> {};

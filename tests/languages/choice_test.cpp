@@ -70,26 +70,22 @@ struct EnvironmentRow {
     char const* expected;
 };
 constexpr EnvironmentRow kEnvironments[] = {
-    {"AllFirst",         "de_DE.UTF-8", "en_US.UTF-8", "en_US.UTF-8",  kGerman },
-    {"MessagesNext",     nullptr,       "de",          "en_US.UTF-8",  kGerman },
-    {"LangLast",         nullptr,       nullptr,       "de_CH.UTF-8",  kGerman },
-    {"EmptyIsNone",      "",            "",            "de_DE@euro",   kGerman },
-    {"CIsEnglish",       "C.UTF-8",     "de_DE.UTF-8", "de_DE.UTF-8",  kEnglish},
-    {"PosixIsEnglish",   nullptr,       "POSIX",       "de_DE.UTF-8",  kEnglish},
-    {"UnknownIsEnglish", nullptr,       nullptr,       "tlh_XX.UTF-8", kEnglish},
-    {"NoPath",           nullptr,       nullptr,       "../lib/de",    kEnglish},
-    {"NothingIsEnglish", nullptr,       nullptr,       nullptr,        kEnglish},
+    {"AllFirst", "de_DE.UTF-8", "en_US.UTF-8", "en_US.UTF-8", kGerman},
+    {"MessagesNext", nullptr, "de", "en_US.UTF-8", kGerman},
+    {"LangLast", nullptr, nullptr, "de_CH.UTF-8", kGerman},
+    {"EmptyIsNone", "", "", "de_DE@euro", kGerman},
+    {"CIsEnglish", "C.UTF-8", "de_DE.UTF-8", "de_DE.UTF-8", kEnglish},
+    {"PosixIsEnglish", nullptr, "POSIX", "de_DE.UTF-8", kEnglish},
+    {"UnknownIsEnglish", nullptr, nullptr, "tlh_XX.UTF-8", kEnglish},
+    {"NoPath", nullptr, nullptr, "../lib/de", kEnglish},
+    {"NothingIsEnglish", nullptr, nullptr, nullptr, kEnglish},
 };
 
 class LanguageOfEnvironment : public testing::TestWithParam<EnvironmentRow> {};
 
 TEST_P(LanguageOfEnvironment, IsSpoken) {
     EnvironmentRow const& row = GetParam();
-    Environment const set{
-        {"LC_ALL",      row.all     },
-        {"LC_MESSAGES", row.messages},
-        {"LANG",        row.lang    }
-    };
+    Environment const set{{"LC_ALL", row.all}, {"LC_MESSAGES", row.messages}, {"LANG", row.lang}};
     EXPECT_EQ(spoken({}), row.expected);
 }
 
@@ -99,14 +95,10 @@ INSTANTIATE_TEST_SUITE_P(Variables,
                          [](auto const& row) { return row.param.name; });
 
 TEST(Locale, GoesAheadOfTheEnvironment) {
-    Environment const set{
-        {"LC_ALL", "de_DE.UTF-8"}
-    };
+    Environment const set{{"LC_ALL", "de_DE.UTF-8"}};
     EXPECT_EQ(spoken({"--locale", "en"}), kEnglish);
     EXPECT_EQ(spoken({"--locale", "C"}), kEnglish);
-    Environment const other{
-        {"LC_ALL", "C"}
-    };
+    Environment const other{{"LC_ALL", "C"}};
     EXPECT_EQ(spoken({"--locale", "de_AT"}), kGerman);
 }
 

@@ -13,13 +13,11 @@ namespace {
 
 using namespace tzhost;
 
-constexpr std::array<std::pair<std::wstring_view, wchar_t>, 3> kNames{
-    {
-     {L"<LF>", L'\n'},
-     {L"<TAB>", L'\t'},
-     {L"<NBSP>", L'\u00A0'},
-     }
-};
+constexpr std::array<std::pair<std::wstring_view, wchar_t>, 3> kNames{{
+    {L"<LF>", L'\n'},
+    {L"<TAB>", L'\t'},
+    {L"<NBSP>", L'\u00A0'},
+}};
 
 std::wstring withCharacters(std::wstring text) {
     for (auto const& [name, character] : kNames) {

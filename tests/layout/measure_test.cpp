@@ -23,9 +23,9 @@ struct FaceRow {
 };
 
 constexpr FaceRow kFaces[] = {
-    {L"DejaVu Sans Mono", L"Sphinx of quartz", 16 * 1233.0,                            1493.0},
-    {L"DejaVu Sans Mono", L"iiiiiiiiiiiiWWWW", 16 * 1233.0,                            1493.0},
-    {L"Liberation Sans",  L"HiIll",            1479.0 + 455.0 + 569.0 + 455.0 + 455.0, 1409.0},
+    {L"DejaVu Sans Mono", L"Sphinx of quartz", 16 * 1233.0, 1493.0},
+    {L"DejaVu Sans Mono", L"iiiiiiiiiiiiWWWW", 16 * 1233.0, 1493.0},
+    {L"Liberation Sans", L"HiIll", 1479.0 + 455.0 + 569.0 + 455.0 + 455.0, 1409.0},
 };
 
 constexpr double kHeights[] = {1e-6, 0.2, 1.0, 1e9};
@@ -111,14 +111,14 @@ struct StyleRow {
 };
 
 constexpr StyleRow kStyles[] = {
-    {"PlainStyle",                  L"abc",        1.0, 3.0},
-    {"StyleFactor",                 L"abc",        0.5, 1.5},
-    {"CodeFactorMultiplies",        L"\\W2;abc",   0.5, 3.0},
-    {"AccentsJoin",                 L"e\u0301x",   1.0, 2.0},
-    {"Tracking",                    L"\\T1.5;abc", 1.0, 4.5},
-    {"NegativeFactorIsNone",        L"\\W-2;abc",  1.0, 3.0},
-    {"ZeroStyleFactorIsNone",       L"abc",        0.0, 3.0},
-    {"Unknown face still measures", L"",           1.0, 0.0},
+    {"PlainStyle", L"abc", 1.0, 3.0},
+    {"StyleFactor", L"abc", 0.5, 1.5},
+    {"CodeFactorMultiplies", L"\\W2;abc", 0.5, 3.0},
+    {"AccentsJoin", L"e\u0301x", 1.0, 2.0},
+    {"Tracking", L"\\T1.5;abc", 1.0, 4.5},
+    {"NegativeFactorIsNone", L"\\W-2;abc", 1.0, 3.0},
+    {"ZeroStyleFactorIsNone", L"abc", 0.0, 3.0},
+    {"Unknown face still measures", L"", 1.0, 0.0},
 };
 
 TEST(Measure, FactorsScaleAdvances) {
@@ -136,11 +136,11 @@ struct FontRow {
 
 // A stroke font is drawn with a face of the table, an installed file with its own.
 constexpr FontRow kFontFiles[] = {
-    {L"txt.shx",                L"DejaVu Sans"     },
+    {L"txt.shx", L"DejaVu Sans"},
     {L"C:\\fonts\\MonoTxt.SHX", L"DejaVu Sans Mono"},
-    {L"DejaVuSansMono.ttf",     L"DejaVu Sans Mono"},
-    {L"missing.ttf",            L"DejaVu Sans"     },
-    {L"",                       L"DejaVu Sans"     },
+    {L"DejaVuSansMono.ttf", L"DejaVu Sans Mono"},
+    {L"missing.ttf", L"DejaVu Sans"},
+    {L"", L"DejaVu Sans"},
 };
 
 TEST(Measure, FontFilesStandForFaces) {

@@ -66,24 +66,24 @@ GlyphRun changed(std::wstring const& text, Change change) {
 TEST(Outline, LettersStandOnTheirRunsPlace) {
     double const slope = 0.5;
     InkRow const rows[] = {
-        {"Plain",                                                  runOf(L"H"),  {237, 50, 1196, 1543}                        },
-        {"Two",                                                    runOf(L"HH"), {237, 50, 1233 + 1196, 1543}                 },
+        {"Plain", runOf(L"H"), {237, 50, 1196, 1543}},
+        {"Two", runOf(L"HH"), {237, 50, 1233 + 1196, 1543}},
         {"Narrow",
-         changed(L"HH",                                                          [](GlyphRun& run) { run.widthFactor = 0.5; }),
+         changed(L"HH", [](GlyphRun& run) { run.widthFactor = 0.5; }),
          {100 + 68.5, 50, 100 + (1233 + 1096) * 0.5, 1543}},
         {"Tracked",
-         changed(L"HH",                                                            [](GlyphRun& run) { run.tracking = 2.0; }),
+         changed(L"HH", [](GlyphRun& run) { run.tracking = 2.0; }),
          {237, 50, 2466 + 1196, 1543}},
         {"Oblique",
-         changed(L"H",                                         [&](GlyphRun& run) { run.oblique = std::atan(slope); }),
+         changed(L"H", [&](GlyphRun& run) { run.oblique = std::atan(slope); }),
          {237, 50, 1196 + slope * 1493, 1543}},
         {"Backward",
-         changed(L"H",                                   [](GlyphRun& run) { run.mirroredX = true; }),
+         changed(L"H", [](GlyphRun& run) { run.mirroredX = true; }),
          {100 - 1096, 50, 100 - 137, 1543}},
         {"UpsideDown",
-         changed(L"H",[](GlyphRun& run) { run.mirroredY = true; }),
+         changed(L"H", [](GlyphRun& run) { run.mirroredY = true; }),
          {237, 50 - 1493, 1196, 50}},
-        {"BlankAhead",                                             runOf(L" H"),                                                           {1233 + 237, 50, 1233 + 1196, 1543}                                                                                 },
+        {"BlankAhead", runOf(L" H"), {1233 + 237, 50, 1233 + 1196, 1543}},
     };
     for (InkRow const& row : rows) {
         LayoutBox const ink = inkOf(row.run);
@@ -139,16 +139,14 @@ TEST(Letters, MarksTakeTheFaceOfTheLettersBesideThem) {
         wchar_t const* text;
         std::size_t items;  // stretches that are drawn as one
     } const rows[] = {
-        {L"\u56FE\u3001\u56FE",  1},
-        {L"\u3010\u56FE",        1},
+        {L"\u56FE\u3001\u56FE", 1},
+        {L"\u3010\u56FE", 1},
         {L"a\u3001\u3042\u56FE", 2},
-        {L"\u3001",              1},
+        {L"\u3001", 1},
     };
     for (auto const& row : rows) {
         std::wstring const text = row.text;
-        std::vector<ShapeSpan> const spans{
-            {text.size(), {L"DejaVu Sans"}}
-        };
+        std::vector<ShapeSpan> const spans{{text.size(), {L"DejaVu Sans"}}};
         EXPECT_EQ(shapeText(text, spans, Ligatures::on).items.size(), row.items)
             << TzString(text).toUtf8();
     }

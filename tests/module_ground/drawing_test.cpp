@@ -89,13 +89,13 @@ struct SizeRow {
     double size;
 };
 constexpr SizeRow kSizes[] = {
-    {"Fixed",                        2.5, false, false, L"0.5", L"0.2", 2.5},
-    {"FixedAnnotative",              2.5, true,  false, L"0.5", L"0.2", 5  },
-    {"Variable",                     0,   false, false, L"0.5", L"3",   3  },
-    {"VariableWithoutVariable",      0,   false, false, L"0.5", L"0",   0.2},
- // TEXTSIZE is scaled for the style in force, not for the one that is asked about.
-    {"VariableAnnotativeInForce",    0,   true,  true,  L"0.5", L"3",   6  },
-    {"VariableAnnotativeNotInForce", 0,   true,  false, L"0.5", L"3",   3  },
+    {"Fixed", 2.5, false, false, L"0.5", L"0.2", 2.5},
+    {"FixedAnnotative", 2.5, true, false, L"0.5", L"0.2", 5},
+    {"Variable", 0, false, false, L"0.5", L"3", 3},
+    {"VariableWithoutVariable", 0, false, false, L"0.5", L"0", 0.2},
+    // TEXTSIZE is scaled for the style in force, not for the one that is asked about.
+    {"VariableAnnotativeInForce", 0, true, true, L"0.5", L"3", 6},
+    {"VariableAnnotativeNotInForce", 0, true, false, L"0.5", L"3", 3},
 };
 class TextSizes : public InDrawing, public testing::WithParamInterface<SizeRow> {};
 TEST_P(TextSizes, FollowStyleScaleAndVariable) {
@@ -221,13 +221,11 @@ TEST_F(InDrawing, LocksAreThoseOfTheLayerAndOfTheWorkingSet) {
         bool member;
         bool locked;
     };
-    for (Row const& row : {
-             Row{false, false, false, false},
-             {true,  false, false, false},
-             {false, true,  false, false},
-             {true,  true,  true,  false},
-             {true,  true,  false, true }
-    }) {
+    for (Row const& row : {Row{false, false, false, false},
+                           {true, false, false, false},
+                           {false, true, false, false},
+                           {true, true, true, false},
+                           {true, true, false, true}}) {
         id.record()->inWorkingSet = row.member;
         tzhost::DrawingSettings settings = drawing_->settings();
         settings.workingSetExists = row.exists;

@@ -60,16 +60,14 @@ TEST(Versioner, RefusesNewerFormatsWithOneMessage) {
     };
     BoxNotes notes;
     auto* const before = tzhost::setNotificationSink(&notes);
-    for (Row const& row : {
-             Row{L"",           false},
-             {L"plain",      false},
-             {L"\\?3;text",  false},
-             {L"\\?4;text",  true },
-             {L"\\?12;",     true },
-             {L"\\?;text",   true },
-             {L"\\?x;text",  false},
-             {L"text \\?9;", false}
-    }) {
+    for (Row const& row : {Row{L"", false},
+                           {L"plain", false},
+                           {L"\\?3;text", false},
+                           {L"\\?4;text", true},
+                           {L"\\?12;", true},
+                           {L"\\?;text", true},
+                           {L"\\?x;text", false},
+                           {L"text \\?9;", false}}) {
         notes.boxes.clear();
         EXPECT_EQ(MTextVersioner(nullptr).too_new(row.contents), row.tooNew) << row.contents;
         ASSERT_EQ(notes.boxes.size(), row.tooNew ? 1U : 0U);

@@ -39,12 +39,7 @@ TEST(EasyHolders, DoWhatTheirFlagsSay) {
         char const* held;
         char const* iterated;
     };
-    for (Row const& row : {
-             Row{0, "",   "" },
-             {1, "c",  "" },
-             {2, "d",  "d"},
-             {3, "cd", "d"}
-    }) {
+    for (Row const& row : {Row{0, "", ""}, {1, "c", ""}, {2, "d", "d"}, {3, "cd", "d"}}) {
         EXPECT_EQ((notesOf<EasyObject<Noted>>(row.flags)), row.held);
         EXPECT_EQ((notesOf<EasyTable<Noted>>(row.flags)), row.held);
         EXPECT_EQ((notesOf<EasyIterator<int, Noted>>(row.flags)), row.iterated);
@@ -132,12 +127,7 @@ TEST(ElapsedTime, MarksNestedBlocks) {
 
 TEST(ClassId, IsATextOfTheCallersOwn) {
     CStdStrW text(L"before");
-    EXPECT_EQ(StringFromCLSID(
-                  _GUID{
-                      0x21401, 0, 0, {0xC0, 0, 0, 0, 0, 0, 0, 0x46}
-    },
-                  text),
-              0);
+    EXPECT_EQ(StringFromCLSID(_GUID{0x21401, 0, 0, {0xC0, 0, 0, 0, 0, 0, 0, 0x46}}, text), 0);
     EXPECT_EQ(text, L"{00021401-0000-0000-C000-000000000046}");
 }
 

@@ -21,12 +21,12 @@ struct ReadRow {
     double real;
 };
 constexpr ReadRow kReads[] = {
-    {L"LUNITS",      L"4",         L"4",           4,       4        },
-    {L"TEXTSIZE",    L"2.9",       L"2.9",         2,       2.9      },
-    {L"textsize",    L"1234567.5", L"1.23457e+06", 1234567, 1234567.5},
-    {L"TSPACEFAC",   L"0.25",      L"0.25",        0,       0.25     },
-    {L"MTJIGSTRING", L"abc {1}",   L"abc {1}",     0,       0        },
-    {L"LASTPOINT",   L"1,2,3",     L"",            0,       0        },
+    {L"LUNITS", L"4", L"4", 4, 4},
+    {L"TEXTSIZE", L"2.9", L"2.9", 2, 2.9},
+    {L"textsize", L"1234567.5", L"1.23457e+06", 1234567, 1234567.5},
+    {L"TSPACEFAC", L"0.25", L"0.25", 0, 0.25},
+    {L"MTJIGSTRING", L"abc {1}", L"abc {1}", 0, 0},
+    {L"LASTPOINT", L"1,2,3", L"", 0, 0},
 };
 TEST_F(SysVar, ReadsEachTypeAsText_WholeAndReal) {
     for (ReadRow const& row : kReads) {
@@ -76,15 +76,13 @@ TEST_F(SysVar, NamesTheCodePageBehindItsLastUnderscore) {
         wchar_t const* given;
         int page;
     };
-    for (Row const& row : {
-             Row{L"ANSI_1252",                 1252      },
-             {L"A_B_932",                   932       },
-             {L"1250",                      1250      },
-             {L"ANSI_",                     0         },
-             {L"dos437",                    0         },
-             {L"ANSI_437x",                 437       },
-             {L"ANSI_99999999999999999999", 2147483647}
-    }) {
+    for (Row const& row : {Row{L"ANSI_1252", 1252},
+                           {L"A_B_932", 932},
+                           {L"1250", 1250},
+                           {L"ANSI_", 0},
+                           {L"dos437", 0},
+                           {L"ANSI_437x", 437},
+                           {L"ANSI_99999999999999999999", 2147483647}}) {
         give(L"SYSCODEPAGE", row.given);
         EXPECT_EQ(SysCodePage(), row.page) << row.given;
     }

@@ -17,22 +17,22 @@ struct TextRow {
     wchar_t const* expanded;
 };
 constexpr TextRow kTexts[] = {
-    {"Plain",               1,  L"Height: %s\n",                        L"Height: %s\n"                },
-    {"Empty",               2,  L"",                                    L""                            },
-    {"OneVariable",         3,  L"Units {LUNITS}.",                     L"Units 2."                    },
-    {"Two",                 4,  L"{LUNITS}{TEXTSIZE}",                  L"20.2"                        },
-    {"BracesByParentheses", 5,  L"a{(}b{)}c{(",                         L"a{b}c{("                     },
-    {"EmptyName",           6,  L"a{}b",                                L"ab"                          },
-    {"UnknownVariable",     7,  L"a{NOSUCH}b",                          L"ab"                          },
-    {"PointVariable",       8,  L"a{LASTPOINT}b",                       L"ab"                          },
-    {"NoClosingBrace",      9,  L"a{LUNITS",                            L"a{LUNITS"                    },
-    {"LoneClosingBrace",    10, L"a}b{LUNITS}",                         L"a}b2"                        },
- // A name of 16 characters is looked up; one of 17 stops all expansion behind it.
-    {"Sixteen",             11, L"{ABCDEFGHIJKLMNOP}{LUNITS}",          L"2"                           },
-    {"Seventeen",           12, L"{LUNITS}{ABCDEFGHIJKLMNOPQ}{LUNITS}", L"2{ABCDEFGHIJKLMNOPQ}{LUNITS}"},
-    {"BraceInAName",        13, L"{LU{NITS}",                           L""                            },
- // What a variable holds is not looked at again.
-    {"BracesInAValue",      14, L"<{MTJIGSTRING}>",                     L"<{LUNITS}>"                  },
+    {"Plain", 1, L"Height: %s\n", L"Height: %s\n"},
+    {"Empty", 2, L"", L""},
+    {"OneVariable", 3, L"Units {LUNITS}.", L"Units 2."},
+    {"Two", 4, L"{LUNITS}{TEXTSIZE}", L"20.2"},
+    {"BracesByParentheses", 5, L"a{(}b{)}c{(", L"a{b}c{("},
+    {"EmptyName", 6, L"a{}b", L"ab"},
+    {"UnknownVariable", 7, L"a{NOSUCH}b", L"ab"},
+    {"PointVariable", 8, L"a{LASTPOINT}b", L"ab"},
+    {"NoClosingBrace", 9, L"a{LUNITS", L"a{LUNITS"},
+    {"LoneClosingBrace", 10, L"a}b{LUNITS}", L"a}b2"},
+    // A name of 16 characters is looked up; one of 17 stops all expansion behind it.
+    {"Sixteen", 11, L"{ABCDEFGHIJKLMNOP}{LUNITS}", L"2"},
+    {"Seventeen", 12, L"{LUNITS}{ABCDEFGHIJKLMNOPQ}{LUNITS}", L"2{ABCDEFGHIJKLMNOPQ}{LUNITS}"},
+    {"BraceInAName", 13, L"{LU{NITS}", L""},
+    // What a variable holds is not looked at again.
+    {"BracesInAValue", 14, L"<{MTJIGSTRING}>", L"<{LUNITS}>"},
 };
 
 int const kTextCount = [] {

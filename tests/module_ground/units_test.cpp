@@ -55,19 +55,19 @@ struct FactorRow {
     bool valid;
 };
 constexpr FactorRow kFactors[] = {
-    {"Least",                     L"4", 0.2, 0.25,    0.25,   true },
-    {"Greatest",                  L"4", 0.2, 4.0,     4.0,    true },
-    {"Between",                   L"4", 0.2, 1.5,     1.5,    true },
-    {"TooSmall",                  L"4", 0.2, 0.2498,  0.2498, false},
-    {"TooGreat",                  L"4", 0.2, 4.0001,  4.0001, false},
- // 0.25 of the distance 0.3333 is shown as 0.0833, which reads back as a factor of 0.2499.
-    {"SmallByRounding",           L"4", 0.2, 0.24995, 0.25,   true },
- // 4 times the distance 1.6667 is shown as 6.6667, which reads back as a factor of 4.00002.
-    {"GreatByRounding",           L"4", 1.0, 4.00001, 4.0,    true },
-    {"GreatBeyondRounding",       L"4", 1.0, 4.0001,  4.0001, false},
-    {"EverySmallOneAtNoDecimals", L"0", 1.0, 0.001,   0.25,   true },
-    {"Zero",                      L"4", 0.2, 0.0,     0.0,    false},
-    {"Negative",                  L"0", 1.0, -0.1,    -0.1,   false},
+    {"Least", L"4", 0.2, 0.25, 0.25, true},
+    {"Greatest", L"4", 0.2, 4.0, 4.0, true},
+    {"Between", L"4", 0.2, 1.5, 1.5, true},
+    {"TooSmall", L"4", 0.2, 0.2498, 0.2498, false},
+    {"TooGreat", L"4", 0.2, 4.0001, 4.0001, false},
+    // 0.25 of the distance 0.3333 is shown as 0.0833, which reads back as a factor of 0.2499.
+    {"SmallByRounding", L"4", 0.2, 0.24995, 0.25, true},
+    // 4 times the distance 1.6667 is shown as 6.6667, which reads back as a factor of 4.00002.
+    {"GreatByRounding", L"4", 1.0, 4.00001, 4.0, true},
+    {"GreatBeyondRounding", L"4", 1.0, 4.0001, 4.0001, false},
+    {"EverySmallOneAtNoDecimals", L"0", 1.0, 0.001, 0.25, true},
+    {"Zero", L"4", 0.2, 0.0, 0.0, false},
+    {"Negative", L"0", 1.0, -0.1, -0.1, false},
 };
 class LineSpacingFactor : public WithVariables, public testing::WithParamInterface<FactorRow> {};
 TEST_P(LineSpacingFactor, IsPulledOntoALimitThatRoundingMissed) {

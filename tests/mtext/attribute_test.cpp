@@ -44,10 +44,10 @@ void expectTranscript(OpenDrawing const& drawing, char const* shown) {
 }
 
 AttributeRow const kDialogs[] = {
-    {"AtTheOrigin",          {},        "3,4\n<<<\nafter\n>>>\n",  1, "insertion point", {3, 4, 0}, L"after",  7},
-    {"AtTheOriginCancelled", {},        "^C\n",                    0, "insertion point", {},        L"before", 7},
-    {"Elsewhere",            {1, 2, 0}, "<<<\nafter\n>>>\n",       1, "",                {1, 2, 0}, L"after",  7},
-    {"EditorLeft",           {1, 2, 0}, "<<<\nafter\n>>>cancel\n", 0, "",                {1, 2, 0}, L"before", 7},
+    {"AtTheOrigin", {}, "3,4\n<<<\nafter\n>>>\n", 1, "insertion point", {3, 4, 0}, L"after", 7},
+    {"AtTheOriginCancelled", {}, "^C\n", 0, "insertion point", {}, L"before", 7},
+    {"Elsewhere", {1, 2, 0}, "<<<\nafter\n>>>\n", 1, "", {1, 2, 0}, L"after", 7},
+    {"EditorLeft", {1, 2, 0}, "<<<\nafter\n>>>cancel\n", 0, "", {1, 2, 0}, L"before", 7},
 };
 
 class AttributeDialogs : public testing::TestWithParam<AttributeRow> {};
@@ -71,12 +71,15 @@ INSTANTIATE_TEST_SUITE_P(Rows, AttributeDialogs, testing::ValuesIn(kDialogs), []
 AttributeRow const kDefinitions[] = {
     {"Dragged",
      {},
-     "1,1\n41,-19\n",                         1,
-     "[Height/Justify/Line spacing/Rotation/Style/Width]: ",      {21, -9, 0},
-     L"before",                                                                           40},
-    {"WidthTyped", {9, 9, 0}, "1,1\nW\n12\n", 1, "Specify width", {1, 1, 0},   L"before", 12},
-    {"NoColumns",  {9, 9, 0}, "1,1\nC\n^C\n", 0, "",              {9, 9, 0},   L"before", 7 },
-    {"Cancelled",  {9, 9, 0}, "1,1\n^C\n",    0, "",              {9, 9, 0},   L"before", 7 },
+     "1,1\n41,-19\n",
+     1,
+     "[Height/Justify/Line spacing/Rotation/Style/Width]: ",
+     {21, -9, 0},
+     L"before",
+     40},
+    {"WidthTyped", {9, 9, 0}, "1,1\nW\n12\n", 1, "Specify width", {1, 1, 0}, L"before", 12},
+    {"NoColumns", {9, 9, 0}, "1,1\nC\n^C\n", 0, "", {9, 9, 0}, L"before", 7},
+    {"Cancelled", {9, 9, 0}, "1,1\n^C\n", 0, "", {9, 9, 0}, L"before", 7},
 };
 
 class AttributeDefinitions : public testing::TestWithParam<AttributeRow> {};

@@ -84,11 +84,11 @@ void lock(TzDbObjectId) {
 }
 
 GateRow const kGates[] = {
-    {"ById",                editById,      nothing,            1, L"",                   L"after" },
-    {"ByPointer",           editByPointer, nothing,            1, L"",                   L"after" },
-    {"LockedById",          editById,      lock,               3, L"on a locked layer",  L"before"},
-    {"LockedByPointer",     editByPointer, lock,               3, L"on a locked layer",  L"before"},
-    {"WorkingSetById",      editById,      activateWorkingSet, 3, L"in the working set", L"before"},
+    {"ById", editById, nothing, 1, L"", L"after"},
+    {"ByPointer", editByPointer, nothing, 1, L"", L"after"},
+    {"LockedById", editById, lock, 3, L"on a locked layer", L"before"},
+    {"LockedByPointer", editByPointer, lock, 3, L"on a locked layer", L"before"},
+    {"WorkingSetById", editById, activateWorkingSet, 3, L"in the working set", L"before"},
     {"WorkingSetByPointer", editByPointer, activateWorkingSet, 3, L"in the working set", L"before"},
 };
 
@@ -166,14 +166,14 @@ struct ContentsRow {
     bool written;
 };
 constexpr ContentsRow kContents[] = {
-    {"FieldKept",      L"n=%<\\Var LUNITS>%", "m=%<\\Var LUNITS>%\nb", L"m=%<\\Var LUNITS>%\\Pb",
-     L"m=2\\Pb",                                                                                            true },
- // The editors used to show "n=2" and to set it, which dropped the field.
-    {"FieldUnchanged", L"n=%<\\Var LUNITS>%", "n=%<\\Var LUNITS>%",    L"n=%<\\Var LUNITS>%",     L"n=2",
-     false                                                                                                       },
-    {"FieldDropped",   L"n=%<\\Var LUNITS>%", "n=2",                   L"",                       L"n=2",   true },
- // It used to be set, which made a step for undo.
-    {"Unchanged",      L"a\\Pb",              "a\nb",                  L"",                       L"a\\Pb", false},
+    {"FieldKept", L"n=%<\\Var LUNITS>%", "m=%<\\Var LUNITS>%\nb", L"m=%<\\Var LUNITS>%\\Pb",
+     L"m=2\\Pb", true},
+    // The editors used to show "n=2" and to set it, which dropped the field.
+    {"FieldUnchanged", L"n=%<\\Var LUNITS>%", "n=%<\\Var LUNITS>%", L"n=%<\\Var LUNITS>%", L"n=2",
+     false},
+    {"FieldDropped", L"n=%<\\Var LUNITS>%", "n=2", L"", L"n=2", true},
+    // It used to be set, which made a step for undo.
+    {"Unchanged", L"a\\Pb", "a\nb", L"", L"a\\Pb", false},
 };
 class EditedContents : public testing::TestWithParam<std::tuple<char const*, ContentsRow>> {};
 TEST_P(EditedContents, KeepTheirFields) {
@@ -226,12 +226,12 @@ struct RecordRow {
     char const* settings;  // how the record begins
 };
 constexpr RecordRow kRecords[] = {
-    {"View",             0, true,  false, false, false, R"({"0":1,"5":1,"16":5.0,)"           },
-    {"NoView",           1, false, false, false, false, R"({"5":1,"16":5.0,)"                 },
-    {"Attribute",        0, true,  true,  false, false, R"({"4":1,"5":1,"6":1,"16":5.0,)"     },
-    {"AttributeInPlace", 1, false, true,  false, false, R"({"0":1,"4":1,"5":1,"16":5.0,)"     },
-    {"Option13",         0, true,  false, true,  false, R"({"0":1,"5":1,"12":8192,"16":5.0,)" },
-    {"BothOptions",      0, true,  false, true,  true,  R"({"0":1,"5":1,"12":24576,"16":5.0,)"},
+    {"View", 0, true, false, false, false, R"({"0":1,"5":1,"16":5.0,)"},
+    {"NoView", 1, false, false, false, false, R"({"5":1,"16":5.0,)"},
+    {"Attribute", 0, true, true, false, false, R"({"4":1,"5":1,"6":1,"16":5.0,)"},
+    {"AttributeInPlace", 1, false, true, false, false, R"({"0":1,"4":1,"5":1,"16":5.0,)"},
+    {"Option13", 0, true, false, true, false, R"({"0":1,"5":1,"12":8192,"16":5.0,)"},
+    {"BothOptions", 0, true, false, true, true, R"({"0":1,"5":1,"12":24576,"16":5.0,)"},
 };
 
 class Records : public testing::TestWithParam<RecordRow> {};

@@ -107,14 +107,14 @@ struct FieldRow {
 constexpr char const* kAccepts = "<<<\nafter\n>>>\n";
 constexpr char const* kLeaves = "<<<\nafter\n>>>cancel\n";
 constexpr FieldRow kFields[] = {
-    {"NewText",               makeText,              kAccepts, Memory::lasts,                true },
-    {"NewTextLeft",           makeText,              kLeaves,  Memory::lasts,                false},
-    {"NewTextWithoutMemory",  makeText,              kAccepts, Memory::endsBehindTheSession, false},
-    {"Attribute",             makeAttribute,         kAccepts, Memory::lasts,                false},
- // A text outside the drawing has no place for a field; this one used to be lost.
-    {"TextOutsideTheDrawing", editOutsideTheDrawing, kAccepts, Memory::lasts,                false},
-    {"AnotherModule",         editForAnotherModule,  kAccepts, Memory::lasts,                true },
-    {"AnotherModuleLeft",     editForAnotherModule,  kLeaves,  Memory::lasts,                false},
+    {"NewText", makeText, kAccepts, Memory::lasts, true},
+    {"NewTextLeft", makeText, kLeaves, Memory::lasts, false},
+    {"NewTextWithoutMemory", makeText, kAccepts, Memory::endsBehindTheSession, false},
+    {"Attribute", makeAttribute, kAccepts, Memory::lasts, false},
+    // A text outside the drawing has no place for a field; this one used to be lost.
+    {"TextOutsideTheDrawing", editOutsideTheDrawing, kAccepts, Memory::lasts, false},
+    {"AnotherModule", editForAnotherModule, kAccepts, Memory::lasts, true},
+    {"AnotherModuleLeft", editForAnotherModule, kLeaves, Memory::lasts, false},
 };
 
 class SessionFields : public testing::TestWithParam<FieldRow> {};

@@ -62,16 +62,10 @@ struct EndRow {
     unsigned int keyword;
 };
 constexpr EndRow kEnds[] = {
-    {0,  statusNormal,  0          },
-    {1,  statusKeyword, kManyWords },
-    {3,  statusKeyword, kTranslated},
-    {4,  statusKeyword, 0          },
-    {30, statusKeyword, 0          },
-    {31, statusError,   0          },
-    {-1, statusNone,    0          },
-    {-4, statusCancel,  0          },
-    {-5, statusError,   0          },
-    {-6, statusError,   0          },
+    {0, statusNormal, 0},  {1, statusKeyword, kManyWords}, {3, statusKeyword, kTranslated},
+    {4, statusKeyword, 0}, {30, statusKeyword, 0},         {31, statusError, 0},
+    {-1, statusNone, 0},   {-4, statusCancel, 0},          {-5, statusError, 0},
+    {-6, statusError, 0},
 };
 TEST_F(Drags, EndInAStatus) {
     ScriptedSession const session("");

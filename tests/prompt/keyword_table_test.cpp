@@ -19,13 +19,13 @@ struct KeywordRow {
     wchar_t const* option;  // what the prompt shows
 };
 constexpr KeywordRow kKeywords[] = {
-    {"Plain",       kTopLeft,     L"TL _TL",                    L"TL",              L"TL",       L"TL",      L"TL"       },
-    {"Comma",       kWithComma,   L"Two words,Alias _Twowords", L"Two words,Alias", L"Twowords",
-     L"Twowords,Alias",                                                                                      L"Two words"},
-    {"ManyWords",   kManyWords,   L"A = (b c) _G (h)",          L"A = (b c)",       L"G (h)",    L"Abc",     L"A = (b c)"},
-    {"NoSeparator", kNoSeparator, L"Word",                      L"Word",            L"ord",      L"Word",    L"Word"     },
-    {"Translated",  kTranslated,  L"Höhe _Height",             L"Höhe",           L"Height",   L"Höhe",   L"Höhe"    },
-    {"SameGlobal",  kSameGlobal,  L"Altezza _Height",           L"Altezza",         L"Height",   L"Altezza", L"Altezza"  },
+    {"Plain", kTopLeft, L"TL _TL", L"TL", L"TL", L"TL", L"TL"},
+    {"Comma", kWithComma, L"Two words,Alias _Twowords", L"Two words,Alias", L"Twowords",
+     L"Twowords,Alias", L"Two words"},
+    {"ManyWords", kManyWords, L"A = (b c) _G (h)", L"A = (b c)", L"G (h)", L"Abc", L"A = (b c)"},
+    {"NoSeparator", kNoSeparator, L"Word", L"Word", L"ord", L"Word", L"Word"},
+    {"Translated", kTranslated, L"Höhe _Height", L"Höhe", L"Height", L"Höhe", L"Höhe"},
+    {"SameGlobal", kSameGlobal, L"Altezza _Height", L"Altezza", L"Height", L"Altezza", L"Altezza"},
 };
 
 int const kTextCount = [] {
@@ -60,15 +60,15 @@ struct FindRow {
     unsigned int id;  // 0: not found
 };
 constexpr FindRow kFinds[] = {
-    {L"TL",     kTopLeft   },
-    {L"tl",     kTopLeft   },
-    {L"Gh",     kManyWords },
-    {L"G (h)",  0          },
- // The first of two keywords with one global word wins; local words are not looked at.
+    {L"TL", kTopLeft},
+    {L"tl", kTopLeft},
+    {L"Gh", kManyWords},
+    {L"G (h)", 0},
+    // The first of two keywords with one global word wins; local words are not looked at.
     {L"HEIGHT", kTranslated},
-    {L"Höhe",  0          },
-    {L"T",      0          },
-    {L"",       0          },
+    {L"Höhe", 0},
+    {L"T", 0},
+    {L"", 0},
 };
 TEST(KeywordTable, FindsByTheGlobalWordAlone) {
     constexpr unsigned int kIds[] = {kTopLeft, kManyWords, kTranslated, kSameGlobal};

@@ -64,20 +64,20 @@ struct QuestionRow {
 QuestionRow const kQuestions[] = {
     {"SecondCorner",
      {1046, 1043, 1083, 1044, 1045, 1059, 1104},
-     {L"Height", L"Justify", L"Linespacing", L"Rotation", L"Style", L"Width", L"Columns"}                       },
+     {L"Height", L"Justify", L"Linespacing", L"Rotation", L"Style", L"Width", L"Columns"}},
     {"Attachment",
      {1048, 1049, 1050, 1051, 1052, 1053, 1054, 1055, 1056},
-     {L"TL", L"TC", L"TR", L"ML", L"MC", L"MR", L"BL", L"BC", L"BR"}                                            },
-    {"LineSpacing",      {1084, 1085},                       {L"Atleast", L"Exactly"}                           },
-    {"Columns",          {1107, 1106, 1108},                 {L"Dynamic", L"Static", L"Nocolumns"}              },
- // These hold all words of a question in one text.
-    {"AlignSelection",   {57663},                            {L"alIgnment", L"Options"}                         },
+     {L"TL", L"TC", L"TR", L"ML", L"MC", L"MR", L"BL", L"BC", L"BR"}},
+    {"LineSpacing", {1084, 1085}, {L"Atleast", L"Exactly"}},
+    {"Columns", {1107, 1106, 1108}, {L"Dynamic", L"Static", L"Nocolumns"}},
+    // These hold all words of a question in one text.
+    {"AlignSelection", {57663}, {L"alIgnment", L"Options"}},
     {"AlignDirection",
      {57665},
-     {L"Left", L"Center", L"Right", L"TL", L"TC", L"TR", L"ML", L"MC", L"MR", L"BL", L"BC", L"BR"}              },
-    {"AlignFirstPoint",  {57667},                            {L"Point"}                                         },
-    {"AlignSecondPoint", {57670},                            {L"Options"}                                       },
-    {"AlignSpacing",     {57672},                            {L"Distribute", L"Set", L"Horizontal", L"Vertical"}},
+     {L"Left", L"Center", L"Right", L"TL", L"TC", L"TR", L"ML", L"MC", L"MR", L"BL", L"BC", L"BR"}},
+    {"AlignFirstPoint", {57667}, {L"Point"}},
+    {"AlignSecondPoint", {57670}, {L"Options"}},
+    {"AlignSpacing", {57672}, {L"Distribute", L"Set", L"Horizontal", L"Vertical"}},
 };
 
 std::wstring listOf(std::vector<unsigned int> const& ids) {
@@ -133,13 +133,8 @@ TEST(ModuleTexts, ShowTheKeywordsThatTheyTake) {
         int prompt;
         int keywords;
     };
-    for (Row const& row : {
-             Row{57662, 57663},
-             {57664, 57665},
-             {57666, 57667},
-             {57669, 57670},
-             {57671, 57672}
-    }) {
+    for (Row const& row :
+         {Row{57662, 57663}, {57664, 57665}, {57666, 57667}, {57669, 57670}, {57671, 57672}}) {
         auto const words = tzhost::KeywordList::parse(loadResourceString(row.keywords).str());
         ASSERT_TRUE(words.has_value()) << row.keywords;
         std::wstring shown = L"[";

@@ -59,15 +59,15 @@ struct LookCase {
     char const* part;  // of its markup
 };
 constexpr LookCase kLooks[] = {
-    {"site-notes-writer",  "\\fLiberation Sans|b1|i0|c0|p0;all drains"                          },
+    {"site-notes-writer", "\\fLiberation Sans|b1|i0|c0|p0;all drains"},
     {"site-notes-writer",
      "; \\Ogravel\\o sand bed, \\fLiberation Mono|b0|i0|c0|p0;\\H0.85x;\\C242;\\c2097344;150 mm"},
-    {"site-notes-writer",  "; 1.\tSet out\\P"                                                   },
+    {"site-notes-writer", "; 1.\tSet out\\P"},
     {"site-notes-abiword",
-     "before\\fLiberation Sans|b0|i0|c0|p0; the slab, \\Las sheet 12 shows\\l"                  },
-    {"door-list-writer",   "\\U+2022\tHinges: three each\\P"                                    },
-    {"door-list-writer",   "Door\tWidth\\P"                                                     },
-    {"door-list-abiword",  "{\\fLiberation Serif|b1|i0|c0|p0;"                                  },
+     "before\\fLiberation Sans|b0|i0|c0|p0; the slab, \\Las sheet 12 shows\\l"},
+    {"door-list-writer", "\\U+2022\tHinges: three each\\P"},
+    {"door-list-writer", "Door\tWidth\\P"},
+    {"door-list-abiword", "{\\fLiberation Serif|b1|i0|c0|p0;"},
 };
 
 TEST(OfficeDocuments, KeepTheirLooks) {

@@ -37,22 +37,22 @@ struct TokenCase {
 };
 using std::string_view_literals::operator""sv;
 constexpr TokenCase kCases[] = {
-    {"Words",            "{\\rtf1\\b0 x\\i y}"sv,                        "{ \\rtf=1 \\b=0 \"x\" \\i \"y\" }"        },
-    {"WordsOfBothCases", "\\clFitText1"sv,                               "\\clFitText=1"                            },
-    {"Delimiters",       "\\b  x\\b\nx\\b\r\n x"sv,                      "\\b \" x\" \\b \"x\" \\b \" x\""          },
-    {"Numbers",          "\\a-12\\a99999999999\\a-99999999999"sv,        "\\a=-12 \\a=2147483647 \\a=-2147483647"   },
-    {"Hyphen",           "\\par-x"sv,                                    "\\par \"-x\""                             },
-    {"Symbols",          "\\*\\~\\{\\\\"sv,                              "!* !~ !{ !\\"                             },
-    {"LineEnds",         "a\r\nb\0c\\\nd\\\te"sv,                        "\"a\" \"b\" \"c\" \\par \"d\" \\tab \"e\""},
-    {"Bytes",            "\\'e9\\'E\n9\xE9\t"sv,                         "#e9 #e9 #e9 #09"                          },
-    {"BadBytes",         "\\'x\\'4x\\'"sv,                               "\"x\" #04 \"x\""                          },
-    {"Binary",           "a\\bin3 }{\\b"sv,                              "\"a\" \\bin=3 \"b\""                      },
-    {"BinaryCutOff",     "\\bin0 d\\bin-1 e\\bin4 abc"sv,
-     "\\bin=0 \"d\" \\bin=-1 \"e\" \\bin=4 \"abc\""                                                                 },
-    {"LoneBackslash",    "a\\"sv,                                        "\"a\""                                    },
- // Runs are looked at in blocks; a sign at any place of a block ends one.
-    {"LongRun",          "0123456789012345678901234567890123456789{x"sv,
-     "\"0123456789012345678901234567890123456789\" { \"x\""                                                         },
+    {"Words", "{\\rtf1\\b0 x\\i y}"sv, "{ \\rtf=1 \\b=0 \"x\" \\i \"y\" }"},
+    {"WordsOfBothCases", "\\clFitText1"sv, "\\clFitText=1"},
+    {"Delimiters", "\\b  x\\b\nx\\b\r\n x"sv, "\\b \" x\" \\b \"x\" \\b \" x\""},
+    {"Numbers", "\\a-12\\a99999999999\\a-99999999999"sv, "\\a=-12 \\a=2147483647 \\a=-2147483647"},
+    {"Hyphen", "\\par-x"sv, "\\par \"-x\""},
+    {"Symbols", "\\*\\~\\{\\\\"sv, "!* !~ !{ !\\"},
+    {"LineEnds", "a\r\nb\0c\\\nd\\\te"sv, "\"a\" \"b\" \"c\" \\par \"d\" \\tab \"e\""},
+    {"Bytes", "\\'e9\\'E\n9\xE9\t"sv, "#e9 #e9 #e9 #09"},
+    {"BadBytes", "\\'x\\'4x\\'"sv, "\"x\" #04 \"x\""},
+    {"Binary", "a\\bin3 }{\\b"sv, "\"a\" \\bin=3 \"b\""},
+    {"BinaryCutOff", "\\bin0 d\\bin-1 e\\bin4 abc"sv,
+     "\\bin=0 \"d\" \\bin=-1 \"e\" \\bin=4 \"abc\""},
+    {"LoneBackslash", "a\\"sv, "\"a\""},
+    // Runs are looked at in blocks; a sign at any place of a block ends one.
+    {"LongRun", "0123456789012345678901234567890123456789{x"sv,
+     "\"0123456789012345678901234567890123456789\" { \"x\""},
 };
 
 class Tokens : public testing::TestWithParam<TokenCase> {};

@@ -17,13 +17,13 @@ struct RuleCase {
         outcome;  // of five calls of "TzEdJig::drag": . goes on, a digit is the status, - is -1
 };
 constexpr RuleCase kRules[] = {
-    {"FirstByDefault", "TzEdJig::drag",         "x...."},
-    {"Third",          "TzEdJig::drag:3",       "..x.."},
-    {"Every",          "TzEdJig::drag:*",       "xxxxx"},
-    {"Status",         "TzEdJig::drag:2=7",     ".7..."},
-    {"NegativeStatus", "TzEdJig::drag=-1",      "-...."},
+    {"FirstByDefault", "TzEdJig::drag", "x...."},
+    {"Third", "TzEdJig::drag:3", "..x.."},
+    {"Every", "TzEdJig::drag:*", "xxxxx"},
+    {"Status", "TzEdJig::drag:2=7", ".7..."},
+    {"NegativeStatus", "TzEdJig::drag=-1", "-...."},
     {"OtherOperation", "TzEdJig::acquirePoint", "....."},
-    {"EveryStatus",    "TzEdJig::drag:*=4",     "44444"},
+    {"EveryStatus", "TzEdJig::drag:*=4", "44444"},
 };
 class FaultRules : public testing::TestWithParam<RuleCase> {};
 

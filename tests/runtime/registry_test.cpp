@@ -78,17 +78,17 @@ struct NameCase {
     wchar_t const* found;  // the global name, or null
 };
 constexpr NameCase kNames[] = {
-    {"Global",             L"PROBE",   L"PROBE" },
-    {"AnyCase",            L"probe",   L"PROBE" },
-    {"Local",              L"SONDE",   L"PROBE" },
-    {"UnderscoreGlobal",   L"_probe",  L"PROBE" },
-    {"UnderscoreNoLocal",  L"_sonde",  nullptr  },
-    {"Dot",                L".sonde",  L"PROBE" },
-    {"DotUnderscore",      L"._PROBE", L"PROBE" },
-    {"LocalBeforeGlobal",  L"OTHER",   L"PROBE2"},
-    {"GlobalByUnderscore", L"_OTHER",  L"OTHER" },
-    {"Unknown",            L"nothing", nullptr  },
-    {"Empty",              L"",        nullptr  },
+    {"Global", L"PROBE", L"PROBE"},
+    {"AnyCase", L"probe", L"PROBE"},
+    {"Local", L"SONDE", L"PROBE"},
+    {"UnderscoreGlobal", L"_probe", L"PROBE"},
+    {"UnderscoreNoLocal", L"_sonde", nullptr},
+    {"Dot", L".sonde", L"PROBE"},
+    {"DotUnderscore", L"._PROBE", L"PROBE"},
+    {"LocalBeforeGlobal", L"OTHER", L"PROBE2"},
+    {"GlobalByUnderscore", L"_OTHER", L"OTHER"},
+    {"Unknown", L"nothing", nullptr},
+    {"Empty", L"", nullptr},
 };
 class CommandNames : public testing::TestWithParam<NameCase> {};
 

@@ -83,19 +83,19 @@ struct PickRow {
 
 // Flags 1 are armed with the keyword "Point"; the last point is 7,8,9.
 constexpr PickRow kPicks[] = {
-    {"Point",           "1,1",                   "5100 $L 1,1,0",       "5100 $L 0,0 []"       },
-    {"InBlock",         "102,0",                 "5100 $R 102,0,0",     "5100 $o 100,0 [$R]"   },
-    {"InInnerBlock",    "110.5,0.5",             "5100 $R 110.5,0.5,0", "5100 $i 110,0 [$r $R]"},
-    {"BetweenParts",    "107,0.5",               "5100 $R 107,0.5,0",   "-5001"                },
-    {"Attribute",       "101,50.5",              "5100 $R 101,50.5,0",  "5100 $A 0,0 []"       },
-    {"Nothing",         "-50,-50",               "-5001",               "-5001"                },
-    {"Handle",          "#$L",                   "5100 $L 7,8,9",       "5100 $L 0,0 []"       },
-    {"NestedHandle",    "#$R/$o",                "5100 $R 7,8,9",       "5100 $o 100,0 [$R]"   },
-    {"DeepHandle",      "#$R/$r/$i",             "5100 $R 7,8,9",       "5100 $i 110,0 [$r $R]"},
-    {"AttributeHandle", "#$R/$A",                "5100 $R 7,8,9",       "5100 $A 0,0 []"       },
-    {"NotInside",       "#$R/$L\n#$o\n#\n\n#$L", "5100 $L 7,8,9",       "5100 $L 0,0 []"       },
-    {"Keyword",         "p",                     "-5005",               "-5005"                },
-    {"Cancel",          "x\n^C",                 "-5002",               "-5002"                },
+    {"Point", "1,1", "5100 $L 1,1,0", "5100 $L 0,0 []"},
+    {"InBlock", "102,0", "5100 $R 102,0,0", "5100 $o 100,0 [$R]"},
+    {"InInnerBlock", "110.5,0.5", "5100 $R 110.5,0.5,0", "5100 $i 110,0 [$r $R]"},
+    {"BetweenParts", "107,0.5", "5100 $R 107,0.5,0", "-5001"},
+    {"Attribute", "101,50.5", "5100 $R 101,50.5,0", "5100 $A 0,0 []"},
+    {"Nothing", "-50,-50", "-5001", "-5001"},
+    {"Handle", "#$L", "5100 $L 7,8,9", "5100 $L 0,0 []"},
+    {"NestedHandle", "#$R/$o", "5100 $R 7,8,9", "5100 $o 100,0 [$R]"},
+    {"DeepHandle", "#$R/$r/$i", "5100 $R 7,8,9", "5100 $i 110,0 [$r $R]"},
+    {"AttributeHandle", "#$R/$A", "5100 $R 7,8,9", "5100 $A 0,0 []"},
+    {"NotInside", "#$R/$L\n#$o\n#\n\n#$L", "5100 $L 7,8,9", "5100 $L 0,0 []"},
+    {"Keyword", "p", "-5005", "-5005"},
+    {"Cancel", "x\n^C", "-5002", "-5002"},
 };
 
 class PickTable : public Picks, public testing::WithParamInterface<PickRow> {};

@@ -99,32 +99,32 @@ struct SelectionRow {
 };
 
 constexpr SelectionRow kSelections[] = {
-    {"Handles",            "$1 $3\n$2\n\n",                                   "5100 1 3 2"  },
-    {"TwiceIsOnce",        "$1 $1\n$1\n\n",                                   "5100 1"      },
-    {"All",                "all\n\n",                                         "5100 1 2 3 4"},
-    {"Last",               "LAST\n\n",                                        "5100 4"      },
-    {"Point",              "6.5,5.5\n\n",                                     "5100 2"      },
-    {"PointTakesNewest",   "0.5,0\n\n",                                       "5100 4"      },
-    {"PointAtNothing",     "-5,-5\n6,6\n\n",                                  "5100 2"      },
-    {"Window",             "w -1,-1 3,3\n\n",                                 "5100 1 4"    },
-    {"WindowAnyCorner",    "_W 8,8 4,4\n\n",                                  "5100 2"      },
-    {"WindowHoldsNotAll",  "w -1,-1 6,6\n\n",                                 "5100 1 4"    },
-    {"Crossing",           "c 1,-1 6,6\n\n",                                  "5100 1 2 4"  },
-    {"CrossingBesideLine", "c 5,6 6,7\n$1\n\n",                               "5100 2 1"    },
-    {"CrossingMissesLine", "c 5.1,6 5.2,7\n$1\n\n",                           "5100 1"      },
- // In the box around the turned text, but not in the text.
-    {"CrossingByOutline",  "c 20.1,22 20.3,22.5\n$1\n\n",                     "5100 1"      },
-    {"CrossingInsideText", "c 21,20.6 21.1,20.7\n\n",                         "5100 3"      },
- // A refused answer leaves the last point, 0,0; the second corner is read from the first.
-    {"WindowFromLast",     "w 7,7 zz\nw @-1,-1 @4,4\n\n",                     "5100 1 4"    },
-    {"Remove",             "all\nremove\n$1 $4\nadd\n$1\n\n",                 "5100 2 3 1"  },
-    {"RemoveByCrossing",   "all\nR\nc 1,-1 6,6\n\n",                          "5100 3"      },
-    {"Nothing",            "\n",                                              "-5001 none"  },
-    {"AllRemoved",         "$1\nr\n$1\n\n",                                   "-5001 none"  },
-    {"Cancel",             "$1\n^C",                                          "-5002 none"  },
-    {"InputEnds",          "$1\n",                                            "-5002 none"  },
-    {"OtherSpace",         "$5\n$1\n\n",                                      "5100 1"      },
-    {"Refused",            "#ZZ\nwindow 1,1\nall 1\n#\n#1/\n1,1,1,1\n$1\n\n", "5100 1"      },
+    {"Handles", "$1 $3\n$2\n\n", "5100 1 3 2"},
+    {"TwiceIsOnce", "$1 $1\n$1\n\n", "5100 1"},
+    {"All", "all\n\n", "5100 1 2 3 4"},
+    {"Last", "LAST\n\n", "5100 4"},
+    {"Point", "6.5,5.5\n\n", "5100 2"},
+    {"PointTakesNewest", "0.5,0\n\n", "5100 4"},
+    {"PointAtNothing", "-5,-5\n6,6\n\n", "5100 2"},
+    {"Window", "w -1,-1 3,3\n\n", "5100 1 4"},
+    {"WindowAnyCorner", "_W 8,8 4,4\n\n", "5100 2"},
+    {"WindowHoldsNotAll", "w -1,-1 6,6\n\n", "5100 1 4"},
+    {"Crossing", "c 1,-1 6,6\n\n", "5100 1 2 4"},
+    {"CrossingBesideLine", "c 5,6 6,7\n$1\n\n", "5100 2 1"},
+    {"CrossingMissesLine", "c 5.1,6 5.2,7\n$1\n\n", "5100 1"},
+    // In the box around the turned text, but not in the text.
+    {"CrossingByOutline", "c 20.1,22 20.3,22.5\n$1\n\n", "5100 1"},
+    {"CrossingInsideText", "c 21,20.6 21.1,20.7\n\n", "5100 3"},
+    // A refused answer leaves the last point, 0,0; the second corner is read from the first.
+    {"WindowFromLast", "w 7,7 zz\nw @-1,-1 @4,4\n\n", "5100 1 4"},
+    {"Remove", "all\nremove\n$1 $4\nadd\n$1\n\n", "5100 2 3 1"},
+    {"RemoveByCrossing", "all\nR\nc 1,-1 6,6\n\n", "5100 3"},
+    {"Nothing", "\n", "-5001 none"},
+    {"AllRemoved", "$1\nr\n$1\n\n", "-5001 none"},
+    {"Cancel", "$1\n^C", "-5002 none"},
+    {"InputEnds", "$1\n", "-5002 none"},
+    {"OtherSpace", "$5\n$1\n\n", "5100 1"},
+    {"Refused", "#ZZ\nwindow 1,1\nall 1\n#\n#1/\n1,1,1,1\n$1\n\n", "5100 1"},
 };
 
 class SelectionTable : public Selections, public testing::WithParamInterface<SelectionRow> {};
@@ -207,36 +207,13 @@ TEST_F(Selections, KeepToAFilterList) {
     auto const with = [this](FilterList const& list) {
         return select("all\n\n", nullptr, nullptr, list.get());
     };
-    EXPECT_EQ(with({
-                  {0, L"MTEXT"}
-    }),
-              "5100 3");
-    EXPECT_EQ(with({
-                  {5020, L"line"}
-    }),
-              "5100 1 2 4");
-    EXPECT_EQ(with({
-                  {0, L"LINE"},
-                  {8, L"fro*"}
-    }),
-              "5100 4");
-    EXPECT_EQ(with({
-                  {8, L"0"  },
-                  {0, L"~M*"}
-    }),
-              "5100 1 2");
-    EXPECT_EQ(with({
-                  {7, L"standard"}
-    }),
-              "5100 3");
-    EXPECT_EQ(with({
-                  {0, L"CIRCLE"}
-    }),
-              "-5001 none");
-    EXPECT_EQ(with({
-                  {1, L"x"}
-    }),
-              "-5001 none");
+    EXPECT_EQ(with({{0, L"MTEXT"}}), "5100 3");
+    EXPECT_EQ(with({{5020, L"line"}}), "5100 1 2 4");
+    EXPECT_EQ(with({{0, L"LINE"}, {8, L"fro*"}}), "5100 4");
+    EXPECT_EQ(with({{8, L"0"}, {0, L"~M*"}}), "5100 1 2");
+    EXPECT_EQ(with({{7, L"standard"}}), "5100 3");
+    EXPECT_EQ(with({{0, L"CIRCLE"}}), "-5001 none");
+    EXPECT_EQ(with({{1, L"x"}}), "-5001 none");
 }
 
 // Takes out what it is told to, and notes what it is shown.

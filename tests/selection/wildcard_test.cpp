@@ -16,19 +16,19 @@ struct WildcardRow {
 };
 
 constexpr WildcardRow kPatterns[] = {
-    {L"*",        L"a Standard",  L""             },
-    {L"Std",      L"Std",         L"Std1 xStd std"},
-    {L"S?d",      L"Std Sad",     L"Sd Staad"     },
-    {L"*t*d",     L"Std td attd", L"tdx d"        },
-    {L"*a*a*b",   L"aab xaxaxb",  L"ab aa"        },
-    {L"a,b*",     L"a b bc",      L"ab c ,"       },
-    {L"[abx-z]1", L"a1 y1",       L"c1 -1 [1"     },
-    {L"[~a-c]*",  L"d dd",        L"a abc"        },
-    {L"[a,b]",    L"a b ,",       L"[a"           },
-    {L"~A*",      L"B b",         L"A Ab"         },
-    {L"~A*,Ab",   L"B Ab",        L"A Ac"         },
-    {L"[x",       L"[x",          L"x"            },
-    {L"ä?",      L"äö",        L"ä aö"       },
+    {L"*", L"a Standard", L""},
+    {L"Std", L"Std", L"Std1 xStd std"},
+    {L"S?d", L"Std Sad", L"Sd Staad"},
+    {L"*t*d", L"Std td attd", L"tdx d"},
+    {L"*a*a*b", L"aab xaxaxb", L"ab aa"},
+    {L"a,b*", L"a b bc", L"ab c ,"},
+    {L"[abx-z]1", L"a1 y1", L"c1 -1 [1"},
+    {L"[~a-c]*", L"d dd", L"a abc"},
+    {L"[a,b]", L"a b ,", L"[a"},
+    {L"~A*", L"B b", L"A Ab"},
+    {L"~A*,Ab", L"B Ab", L"A Ac"},
+    {L"[x", L"[x", L"x"},
+    {L"ä?", L"äö", L"ä aö"},
 };
 
 void expectEach(wchar_t const* names, wchar_t const* pattern, bool isMatch) {

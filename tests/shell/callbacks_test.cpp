@@ -70,11 +70,11 @@ struct WayRow {
     bool editor;
 };
 constexpr WayRow kWays[] = {
-    {"DialogsAllowed",          L"MTEXT",  1, 0, AnswersFrom::script, true },
-    {"ScriptWithoutDialogs",    L"MTEXT",  0, 0, AnswersFrom::script, false},
-    {"MacroWithoutDialogs",     L"MTEXT",  0, 1, AnswersFrom::script, true },
-    {"UserWithoutDialogs",      L"MTEXT",  0, 0, AnswersFrom::user,   true },
-    {"CommandLineForm",         L"-MTEXT", 1, 0, AnswersFrom::user,   false},
+    {"DialogsAllowed", L"MTEXT", 1, 0, AnswersFrom::script, true},
+    {"ScriptWithoutDialogs", L"MTEXT", 0, 0, AnswersFrom::script, false},
+    {"MacroWithoutDialogs", L"MTEXT", 0, 1, AnswersFrom::script, true},
+    {"UserWithoutDialogs", L"MTEXT", 0, 0, AnswersFrom::user, true},
+    {"CommandLineForm", L"-MTEXT", 1, 0, AnswersFrom::user, false},
     {"CommandLineFormInAMacro", L"-MTEXT", 1, 1, AnswersFrom::script, false},
 };
 class WaysOfText : public Commands, public testing::WithParamInterface<WayRow> {};

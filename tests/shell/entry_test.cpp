@@ -170,12 +170,12 @@ struct CallRow {
     bool wantsEntity;  // prints that it does
 };
 constexpr CallRow kCalls[] = {
-    {L"MTEDIT",    0,                       0, true },
-    {L"MTEDIT",    Tzad::eResultString,     0, true },
-    {L"MTEDIT",    Tzad::eResultEntityName, 0, false},
-    {L"MTPROP",    Tzad::eResultReal,       0, true },
-    {L"MTPROP",    Tzad::eResultEntityName, 0, false},
-    {L"TEXTALIGN", 0,                       3, false},
+    {L"MTEDIT", 0, 0, true},
+    {L"MTEDIT", Tzad::eResultString, 0, true},
+    {L"MTEDIT", Tzad::eResultEntityName, 0, false},
+    {L"MTPROP", Tzad::eResultReal, 0, true},
+    {L"MTPROP", Tzad::eResultEntityName, 0, false},
+    {L"TEXTALIGN", 0, 3, false},
     {L"TEXTALIGN", Tzad::eResultEntityName, 3, false},
 };
 TEST_F(Module, AnswersTheInterpreter) {

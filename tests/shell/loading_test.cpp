@@ -152,9 +152,7 @@ TEST_F(Loading, WithoutMemoryForItLeavesNothing) {
 // One language for as long as the module is loaded; the next load reads its texts again.
 TEST_F(Loading, ReadsItsTextsAgain) {
     for (wchar_t const* const text : {L"\nFirst.", L"\nSecond."}) {
-        changeTexts({
-            {163, text}
-        });
+        changeTexts({{163, text}});
         ASSERT_EQ(load(), "");
         useResources("nosuch.dll");
         (void)takeEvents();
@@ -166,15 +164,13 @@ TEST_F(Loading, ReadsItsTextsAgain) {
 
 // Names that differ show which of the two is handed over; topics are the global ones.
 TEST_F(Loading, RegistersLocalNamesBesideTheGlobalOnes) {
-    changeTexts({
-        {143,   L"L143"  },
-        {18372, L"L18372"},
-        {127,   L"L127"  },
-        {1062,  L"L1062" },
-        {1063,  L"L1063" },
-        {1082,  L"L1082" },
-        {52328, L"L52328"}
-    });
+    changeTexts({{143, L"L143"},
+                 {18372, L"L18372"},
+                 {127, L"L127"},
+                 {1062, L"L1062"},
+                 {1063, L"L1063"},
+                 {1082, L"L1082"},
+                 {52328, L"L52328"}});
     ASSERT_EQ(load(), "");
     std::string const seen = takeEvents();
     EXPECT_EQ(seen.substr(seen.find("command ")), R"(command MTEDIT L143 TZCORE_MTEXT 2

@@ -55,20 +55,20 @@ private:
         std::string const rest = behind(line, word.size());
         SessionCase& at = inCase_ ? current_ : common_;
         std::map<std::string, std::function<void()>> const words = {
-            {"case",     [&] { startCase(rest); }               },
-            {"from",     [&] { at.from = std::stoi(rest); }     },
-            {"show",     [&] { at.showsFrames = true; }         },
-            {"hide",     [&] { at.hidden.push_back(rest); }     },
-            {"var",      [&] { at.variables.push_back(rest); }  },
-            {"fail",     [&] { at.faults.push_back(rest); }     },
-            {"settings", [&] { at.settings = rest; }            },
-            {"drawing",  [&] { at.drawing = rest; }             },
-            {"patch",    [&] { at.drawingPatch = rest; }        },
-            {"begin",    [&] { common_.script.push_back(rest); }},
-            {"end",      [&] { end_.push_back(rest); }          },
-            {"stop",     [&] { stops_ = true; }                 },
-            {">",        [&] { at.script.push_back(rest); }     },
-            {"|",        [&] { at.expected.push_back(rest); }   },
+            {"case", [&] { startCase(rest); }},
+            {"from", [&] { at.from = std::stoi(rest); }},
+            {"show", [&] { at.showsFrames = true; }},
+            {"hide", [&] { at.hidden.push_back(rest); }},
+            {"var", [&] { at.variables.push_back(rest); }},
+            {"fail", [&] { at.faults.push_back(rest); }},
+            {"settings", [&] { at.settings = rest; }},
+            {"drawing", [&] { at.drawing = rest; }},
+            {"patch", [&] { at.drawingPatch = rest; }},
+            {"begin", [&] { common_.script.push_back(rest); }},
+            {"end", [&] { end_.push_back(rest); }},
+            {"stop", [&] { stops_ = true; }},
+            {">", [&] { at.script.push_back(rest); }},
+            {"|", [&] { at.expected.push_back(rest); }},
         };
         auto const found = words.find(word);
         if (found == words.end()) return false;

@@ -75,37 +75,37 @@ std::map<std::string, Line> const& lineOfEvent() {
         {"prompt",
          [](Json const& e) {
              return "? " + textOf(e, "kind") + "/" + memberOf(e, "flags") + " " + textOf(e, "text");
-         }                                                                                                 },
+         }},
         {"print",
          [](Json const& e) {
              // The line end behind each answer is left out.
              std::string const text = textOf(e, "text");
              return text == "\\n" ? std::string() : "print " + text;
-         }                                                                                                 },
+         }},
         {"variable",
-         [](Json const& e) { return "set " + textOf(e, "name") + " " + memberOf(e, "value"); }             },
+         [](Json const& e) { return "set " + textOf(e, "name") + " " + memberOf(e, "value"); }},
         {"telemetry",
          [](Json const& e) {
              return "telemetry " + textOf(e, "name") + " " + memberOf(e, "phase") + " " +
                     memberOf(e, "value");
-         }                                                                                                 },
+         }},
         {"telemetryPoint",
          [](Json const& e) {
              return "telemetry " + textOf(e, "which") + " " + memberOf(e, "point");
-         }                                                                                                 },
-        {"messageBox",     [](Json const& e) { return "box " + textOf(e, "text"); }                        },
+         }},
+        {"messageBox", [](Json const& e) { return "box " + textOf(e, "text"); }},
         {"warning",
-         [](Json const& e) { return "warning " + textOf(e, "id") + " " + textOf(e, "text"); }              },
+         [](Json const& e) { return "warning " + textOf(e, "id") + " " + textOf(e, "text"); }},
         {"editor",
          [](Json const& e) {
              return "editor " + textOf(e, "kind") + " accepted " + memberOf(e, "accepted") + " " +
                     memberOf(e, "settings");
-         }                                                                                                 },
+         }},
         {"highlight",
          [](Json const& e) {
              return "highlight " + textOf(e, "handle") + " " + memberOf(e, "on");
-         }                                                                                                 },
-        {"audit",          [](Json const& e) { return isClean(e) ? std::string() : "audit " + compact(e); }},
+         }},
+        {"audit", [](Json const& e) { return isClean(e) ? std::string() : "audit " + compact(e); }},
     };
     return lines;
 }

@@ -30,10 +30,7 @@ std::vector<std::filesystem::path> examples() {
 // A script with the drawing beside it.
 SweepInput inputOf(std::filesystem::path const& file) {
     std::ifstream in(file, std::ios::binary);
-    SweepInput input{
-        {std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()},
-        {                                  }
-    };
+    SweepInput input{{std::istreambuf_iterator<char>(in), std::istreambuf_iterator<char>()}, {}};
     std::filesystem::path const start = std::filesystem::path(file).replace_extension(".json");
     if (std::filesystem::exists(start)) input.drawing = start;
     return input;

@@ -46,12 +46,12 @@ struct SettingsRow {
     char const* problem;  // behind the file's name
 };
 constexpr SettingsRow kSettings[] = {
-    {"Folder",           kFolder,                                                ": Is a directory"},
-    {"Malformed",        "{\"variables\": {\"ATTIPE\": 1},\n",                   ":1: "            },
+    {"Folder", kFolder, ": Is a directory"},
+    {"Malformed", "{\"variables\": {\"ATTIPE\": 1},\n", ":1: "},
     {"DrawingsVariable", "{\"variables\": {\"ATTIPE\": 1,\n\"LUNITS\": 1}}",
-     ":2: variables.LUNITS: is not kept in the settings"                                           },
-    {"UnknownMember",    "{\"variables\": {\"ATTIPE\": 1},\n\"colour\": \"x\"}",
-     ":2: colour: there is no such setting"                                                        },
+     ":2: variables.LUNITS: is not kept in the settings"},
+    {"UnknownMember", "{\"variables\": {\"ATTIPE\": 1},\n\"colour\": \"x\"}",
+     ":2: colour: there is no such setting"},
 };
 class UnusableSettings : public testing::TestWithParam<SettingsRow> {};
 

@@ -22,11 +22,11 @@ struct ResultRow {
     char const* problem;
 };
 constexpr ResultRow kRows[] = {
-    {"Drawing", "--save",   ": cannot be written: "         },
-    {"Svg",     "--svg",    ": cannot be written: "         },
-    {"Png",     "--png",    ": cannot be written: "         },
-    {"Pdf",     "--pdf",    ": cannot be written: "         },
-    {"Events",  "--events", ": the events cannot be written"},
+    {"Drawing", "--save", ": cannot be written: "},
+    {"Svg", "--svg", ": cannot be written: "},
+    {"Png", "--png", ": cannot be written: "},
+    {"Pdf", "--pdf", ": cannot be written: "},
+    {"Events", "--events", ": the events cannot be written"},
 };
 
 class Result : public testing::TestWithParam<ResultRow> {

@@ -19,22 +19,22 @@ struct EditorRow {
     char const* made;
 };
 constexpr EditorRow kRows[] = {
-    {"Missing",     nullptr,                                   "cannot be run: No such file",               ""    },
-    {"Killed",      "kill -9 $$",                              "was killed by signal 9; the text stays",    ""    },
-    {"Failing",     "exit 3",                                  "ended with exit status 3; the text stays",  ""    },
-    {"Emptying",    ": > \"$1\"",                              "left an empty file; the text stays",        ""    },
-    {"Removing",    "rm \"$1\"",                               "left a file that cannot be read; the text", ""    },
-    {"Folder",      "rm \"$1\"; mkdir \"$1\"",                 "left a file that cannot be read; the text", ""    },
-    {"NoUtf8",      "printf 'a\\377' > \"$1\"",                "left a file that is no UTF-8; the text",    ""    },
-    {"Zero",        "printf 'a\\000b' > \"$1\"",               "left a file with a zero character",         ""    },
-    {"Silent",      ":",                                       "Nothing was written in the editor.",        ""    },
-    {"Slow",        "sleep 1; echo late > \"$1\"",             "Command: QUIT",                             "late"},
-    {"Replacing",   "echo new > n; mv n \"$1\"",               "Command: QUIT",                             "new" },
- // It used to become part of the text.
-    {"ByteOrder",   "printf '\\357\\273\\277new\\n' > \"$1\"", "Command: QUIT",                             "new" },
- // It used to wait for a writer.
-    {"Pipe",        "rm \"$1\"; mkfifo \"$1\"",                "left a file that cannot be read; the text", ""    },
-    {"WroteFailed", "echo kept > \"$1\"; kill -9 $$",          "What was edited is kept in ",               ""    },
+    {"Missing", nullptr, "cannot be run: No such file", ""},
+    {"Killed", "kill -9 $$", "was killed by signal 9; the text stays", ""},
+    {"Failing", "exit 3", "ended with exit status 3; the text stays", ""},
+    {"Emptying", ": > \"$1\"", "left an empty file; the text stays", ""},
+    {"Removing", "rm \"$1\"", "left a file that cannot be read; the text", ""},
+    {"Folder", "rm \"$1\"; mkdir \"$1\"", "left a file that cannot be read; the text", ""},
+    {"NoUtf8", "printf 'a\\377' > \"$1\"", "left a file that is no UTF-8; the text", ""},
+    {"Zero", "printf 'a\\000b' > \"$1\"", "left a file with a zero character", ""},
+    {"Silent", ":", "Nothing was written in the editor.", ""},
+    {"Slow", "sleep 1; echo late > \"$1\"", "Command: QUIT", "late"},
+    {"Replacing", "echo new > n; mv n \"$1\"", "Command: QUIT", "new"},
+    // It used to become part of the text.
+    {"ByteOrder", "printf '\\357\\273\\277new\\n' > \"$1\"", "Command: QUIT", "new"},
+    // It used to wait for a writer.
+    {"Pipe", "rm \"$1\"; mkfifo \"$1\"", "left a file that cannot be read; the text", ""},
+    {"WroteFailed", "echo kept > \"$1\"; kill -9 $$", "What was edited is kept in ", ""},
 };
 void PrintTo(EditorRow const& row, std::ostream* out) {
     *out << row.name;

@@ -26,58 +26,58 @@ constexpr int kSeesSelection = tzhost::Command::kUsesImpliedSelection;
 // name, body, flags, help
 constexpr std::array kCommands{
     HostCommand{
-                forLocalText(L"ATTDEF"), attdefCommand, kAlone,
-                forLocalText(
-            L"Makes the definition of an attribute, of one line or of several, for a block.")                },
+        forLocalText(L"ATTDEF"), attdefCommand, kAlone,
+        forLocalText(
+            L"Makes the definition of an attribute, of one line or of several, for a block.")},
     HostCommand{
-                forLocalText(L"BLOCK"),  blockCommand,  kSeesSelection,
-                forLocalText(L"Makes a block of entities, which leave the drawing; INSERT places it.")       },
+        forLocalText(L"BLOCK"), blockCommand, kSeesSelection,
+        forLocalText(L"Makes a block of entities, which leave the drawing; INSERT places it.")},
     HostCommand{forLocalText(L"CIRCLE"), circleCommand, kAlone,
-                forLocalText(L"Draws a circle from its center and radius.")                                  },
-    HostCommand{forLocalText(L"ERASE"),  eraseCommand,  kSeesSelection,
-                forLocalText(L"Erases what is selected, but for what lies on locked layers.")                },
-    HostCommand{forLocalText(L"HELP"),   helpCommand,   kAlone,
-                forLocalText(L"Lists all commands, or tells about one.")                                     },
+                forLocalText(L"Draws a circle from its center and radius.")},
+    HostCommand{forLocalText(L"ERASE"), eraseCommand, kSeesSelection,
+                forLocalText(L"Erases what is selected, but for what lies on locked layers.")},
+    HostCommand{forLocalText(L"HELP"), helpCommand, kAlone,
+                forLocalText(L"Lists all commands, or tells about one.")},
     HostCommand{forLocalText(L"INSERT"), insertCommand, kAlone,
-                forLocalText(L"Places a block, and asks for the values of its attributes.")                  },
+                forLocalText(L"Places a block, and asks for the values of its attributes.")},
     HostCommand{
-                forLocalText(L"LAYER"),  layerCommand,  kAlone,
-                forLocalText(L"Makes layers, sets the current one, colours, locks and unlocks them.")        },
-    HostCommand{forLocalText(L"LINE"),   lineCommand,   kAlone,
-                forLocalText(L"Draws lines from point to point; Enter ends.")                                },
-    HostCommand{forLocalText(L"LIST"),   listCommand,   kSeesSelection,
-                forLocalText(L"Tells what objects are, where they lie and how large they are.")              },
-    HostCommand{forLocalText(L"LOAD"),   loadCommand,   kAlone,
-                forLocalText(L"Loads a module, once this command has ended.")                                },
+        forLocalText(L"LAYER"), layerCommand, kAlone,
+        forLocalText(L"Makes layers, sets the current one, colours, locks and unlocks them.")},
+    HostCommand{forLocalText(L"LINE"), lineCommand, kAlone,
+                forLocalText(L"Draws lines from point to point; Enter ends.")},
+    HostCommand{forLocalText(L"LIST"), listCommand, kSeesSelection,
+                forLocalText(L"Tells what objects are, where they lie and how large they are.")},
+    HostCommand{forLocalText(L"LOAD"), loadCommand, kAlone,
+                forLocalText(L"Loads a module, once this command has ended.")},
     HostCommand{
-                forLocalText(L"NEW"),    newCommand,    kAlone,
-                forLocalText(
-            L"Begins a new drawing; it asks nothing, and U brings the drawing before it back.")              },
-    HostCommand{forLocalText(L"OPEN"),   openCommand,   kAlone,
-                forLocalText(L"Opens a drawing in place of this one.")                                       },
+        forLocalText(L"NEW"), newCommand, kAlone,
+        forLocalText(
+            L"Begins a new drawing; it asks nothing, and U brings the drawing before it back.")},
+    HostCommand{forLocalText(L"OPEN"), openCommand, kAlone,
+                forLocalText(L"Opens a drawing in place of this one.")},
     HostCommand{
-                forLocalText(L"PLOT"),   plotCommand,   kAlone,
-                forLocalText(
+        forLocalText(L"PLOT"), plotCommand, kAlone,
+        forLocalText(
             L"Plots the active space, fitted to its extents; the file's ending (.svg, .png, .pdf) says how.")},
-    HostCommand{forLocalText(L"QUIT"),   quitCommand,   kAlone,         forLocalText(L"Ends the session.")   },
-    HostCommand{forLocalText(L"SAVE"),   saveCommand,   kAlone,
-                forLocalText(L"Writes the drawing to a file.")                                               },
+    HostCommand{forLocalText(L"QUIT"), quitCommand, kAlone, forLocalText(L"Ends the session.")},
+    HostCommand{forLocalText(L"SAVE"), saveCommand, kAlone,
+                forLocalText(L"Writes the drawing to a file.")},
     HostCommand{forLocalText(L"SELECT"), selectCommand, kAlone,
-                forLocalText(L"Selects entities for the next command.")                                      },
+                forLocalText(L"Selects entities for the next command.")},
     HostCommand{forLocalText(L"SETVAR"), setvarCommand, kAlone,
-                forLocalText(L"Shows and sets a system variable; ? lists them.")                             },
-    HostCommand{forLocalText(L"STYLE"),  styleCommand,  kAlone,
-                forLocalText(L"Makes or changes a text style and makes it current.")                         },
-    HostCommand{forLocalText(L"TEXT"),   textCommand,   kAlone,
-                forLocalText(L"Writes a single line of text.")                                               },
-    HostCommand{forLocalText(L"U"),      undoCommand,   kAlone,
-                forLocalText(L"Takes the last command back; it asks nothing.")                               },
-    HostCommand{forLocalText(L"UCS"),    ucsCommand,    kAlone,
-                forLocalText(L"Moves and turns the user coordinate system.")                                 },
+                forLocalText(L"Shows and sets a system variable; ? lists them.")},
+    HostCommand{forLocalText(L"STYLE"), styleCommand, kAlone,
+                forLocalText(L"Makes or changes a text style and makes it current.")},
+    HostCommand{forLocalText(L"TEXT"), textCommand, kAlone,
+                forLocalText(L"Writes a single line of text.")},
+    HostCommand{forLocalText(L"U"), undoCommand, kAlone,
+                forLocalText(L"Takes the last command back; it asks nothing.")},
+    HostCommand{forLocalText(L"UCS"), ucsCommand, kAlone,
+                forLocalText(L"Moves and turns the user coordinate system.")},
     HostCommand{
-                forLocalText(L"UNLOAD"), unloadCommand, kAlone,
-                forLocalText(
-            L"Unloads the module that was loaded last, once this command has ended; it asks nothing.")       },
+        forLocalText(L"UNLOAD"), unloadCommand, kAlone,
+        forLocalText(
+            L"Unloads the module that was loaded last, once this command has ended; it asks nothing.")},
 };
 
 }  // namespace

@@ -115,12 +115,8 @@ struct Choice {
 
 constexpr wchar_t const* kWords = forLocalText(L"Make Set Color LOck Unlock ?");
 constexpr Choice kChoices[] = {
-    {L"Make",   make  },
-    {L"Set",    set   },
-    {L"Color",  color },
-    {L"LOck",   lock  },
-    {L"Unlock", unlock},
-    {L"?",      list  },
+    {L"Make", make}, {L"Set", set},       {L"Color", color},
+    {L"LOck", lock}, {L"Unlock", unlock}, {L"?", list},
 };
 
 bool act(TzString const& word) {

@@ -76,11 +76,7 @@ struct Choice {
 
 constexpr wchar_t const* kWords = forLocalText(L"World X Y Z 3point");
 constexpr Choice kChoices[] = {
-    {L"World",  world      },
-    {L"X",      turnX      },
-    {L"Y",      turnY      },
-    {L"Z",      turnZ      },
-    {L"3point", threePoints},
+    {L"World", world}, {L"X", turnX}, {L"Y", turnY}, {L"Z", turnZ}, {L"3point", threePoints},
 };
 
 }  // namespace

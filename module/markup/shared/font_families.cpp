@@ -7,11 +7,7 @@ struct FamilyRow {
     wchar_t const* word;
 };
 constexpr FamilyRow kFamilies[] = {
-    {0x10, L"froman" },
-    {0x20, L"fswiss" },
-    {0x30, L"fmodern"},
-    {0x40, L"fscript"},
-    {0x50, L"fdecor" },
+    {0x10, L"froman"}, {0x20, L"fswiss"}, {0x30, L"fmodern"}, {0x40, L"fscript"}, {0x50, L"fdecor"},
 };
 constexpr int kFamilyBits = 0xF0;
 

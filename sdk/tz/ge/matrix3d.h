@@ -79,12 +79,7 @@ public:
     bool operator!=(TzGeMatrix3d const& other) const { return !isEqualTo(other); }
 
     // Rows of columns; the last row stays 0, 0, 0, 1.
-    double entry[4][4] = {
-        {1, 0, 0, 0},
-        {0, 1, 0, 0},
-        {0, 0, 1, 0},
-        {0, 0, 0, 1}
-    };
+    double entry[4][4] = {{1, 0, 0, 0}, {0, 1, 0, 0}, {0, 0, 1, 0}, {0, 0, 0, 1}};
 
 private:
     [[nodiscard]] constexpr TzGeVector3d axis(int i) const {
