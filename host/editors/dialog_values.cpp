@@ -184,11 +184,11 @@ struct BackgroundRow {
     DialogChange (*read)(Json const& value);
 };
 constexpr BackgroundRow kBackground[] = {
-    {"fill",               readFill            },
-    {"color",              readFillColor       },
-    {"scale",              readFillScale       },
-    {"useBackgroundColor", readFillUse         },
-    {"transparency",       readFillTransparency},
+    {"fill", readFill},
+    {"color", readFillColor},
+    {"scale", readFillScale},
+    {"useBackgroundColor", readFillUse},
+    {"transparency", readFillTransparency},
 };
 
 // Members that are left out stay as they are.
@@ -224,20 +224,20 @@ std::wstring showBackground(State const& state) {
 }
 
 constexpr DialogValue kValues[] = {
-    {L"textHeight",        [](State const& state) { return writeReal(state.GetNominalTextSize()); },
-     readHeight                                                                                                       },
-    {L"attachment",        [](State const& state) { return std::to_wstring(state.GetAlignment()); },
-     readAttachment                                                                                                   },
-    {L"width",             [](State const& state) { return writeReal(state.GetWidth()); },           readWidth        },
-    {L"rotation",          [](State const& state) { return writeReal(state.GetRotation()); },        readRotation     },
-    {L"style",             [](State const& state) -> std::wstring { return state.GetStyle(); },      readStyle        },
+    {L"textHeight", [](State const& state) { return writeReal(state.GetNominalTextSize()); },
+     readHeight},
+    {L"attachment", [](State const& state) { return std::to_wstring(state.GetAlignment()); },
+     readAttachment},
+    {L"width", [](State const& state) { return writeReal(state.GetWidth()); }, readWidth},
+    {L"rotation", [](State const& state) { return writeReal(state.GetRotation()); }, readRotation},
+    {L"style", [](State const& state) -> std::wstring { return state.GetStyle(); }, readStyle},
     {L"lineSpacingStyle",
      [](State const& state) { return std::to_wstring(state.GetLineSpacingStyle()); },
-     readSpacingStyle                                                                                                 },
+     readSpacingStyle},
     {L"lineSpacingFactor",
-     [](State const& state) { return writeReal(state.GetLineSpacingFactor()); },                     readSpacingFactor},
-    {L"color",             showTextColor,                                                            readTextColor    },
-    {L"background",        showBackground,                                                           readBackground   },
+     [](State const& state) { return writeReal(state.GetLineSpacingFactor()); }, readSpacingFactor},
+    {L"color", showTextColor, readTextColor},
+    {L"background", showBackground, readBackground},
 };
 
 }  // namespace

@@ -63,8 +63,8 @@ bool editRichText(CMTextEditorInterface& state) {
         return false;
     }
     DialogChanges changes;
-    bool const isAsked = state.GetActiveTab() == CMTextEditorInterface::kPropertiesTab &&
-                         !commandLine().isScripted();
+    bool const isAsked =
+        state.GetActiveTab() == CMTextEditorInterface::kPropertiesTab && commandLine().isPerson();
     if (isAsked && !askDialogValues(state, changes)) return false;
     rtf.setChanges(std::move(changes));
     std::string const& command = editorConfiguration().richTextEditor;
@@ -88,7 +88,7 @@ struct DialogRow {
 };
 
 constexpr DialogRow kDialogs[] = {
-    {L"TzApHostRawEditorParamsFrameless", runRawEditor   },
+    {L"TzApHostRawEditorParamsFrameless", runRawEditor},
     {L"TzApHostOldEditorParamsFrameless", runDialogEditor},
 };
 
