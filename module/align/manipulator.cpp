@@ -25,9 +25,9 @@ struct Spacing {
     tagTextSpacing number;
 };
 constexpr Spacing kSpacings[] = {
-    {L"Distribute",             tagTextSpacing::Distribute            },
-    {L"SpecificSpace",          tagTextSpacing::SpecificSpace         },
-    {L"CurrentSpaceVertical",   tagTextSpacing::CurrentSpaceVertical  },
+    {L"Distribute", tagTextSpacing::Distribute},
+    {L"SpecificSpace", tagTextSpacing::SpecificSpace},
+    {L"CurrentSpaceVertical", tagTextSpacing::CurrentSpaceVertical},
     {L"CurrentSpaceHorizontal", tagTextSpacing::CurrentSpaceHorizontal},
 };
 

@@ -12,7 +12,7 @@ resbuf* TzMTextAlignSSCallbackHandler::keywordCallback(wchar_t const* keyword) {
     };
     static constexpr Handler kHandlers[] = {
         {L"alIgnment", promptAlignDirectionOpt},
-        {L"Options",   promptOptions          },
+        {L"Options", promptOptions},
     };
     TzString const word(keyword);
     for (Handler const& handler : kHandlers)

@@ -12,36 +12,32 @@ struct Justification {
     wchar_t const* keyword;
     unsigned int description;
 };
-constexpr std::array<Justification, 12> kJustifications{
-    {
-     {tagTextDirection::TL, L"TL", kText.alignTopLeft},
-     {tagTextDirection::TC, L"TC", kText.alignTopCentre},
-     {tagTextDirection::TR, L"TR", kText.alignTopRight},
-     {tagTextDirection::ML, L"ML", kText.alignMiddleLeft},
-     {tagTextDirection::MC, L"MC", kText.alignMiddleCentre},
-     {tagTextDirection::MR, L"MR", kText.alignMiddleRight},
-     {tagTextDirection::BL, L"BL", kText.alignBottomLeft},
-     {tagTextDirection::BC, L"BC", kText.alignBottomCentre},
-     {tagTextDirection::BR, L"BR", kText.alignBottomRight},
-     {tagTextDirection::Left, L"Left", kText.alignLeft},
-     {tagTextDirection::Center, L"Center", kText.alignCentre},
-     {tagTextDirection::Right, L"Right", kText.alignRight},
-     }
-};
+constexpr std::array<Justification, 12> kJustifications{{
+    {tagTextDirection::TL, L"TL", kText.alignTopLeft},
+    {tagTextDirection::TC, L"TC", kText.alignTopCentre},
+    {tagTextDirection::TR, L"TR", kText.alignTopRight},
+    {tagTextDirection::ML, L"ML", kText.alignMiddleLeft},
+    {tagTextDirection::MC, L"MC", kText.alignMiddleCentre},
+    {tagTextDirection::MR, L"MR", kText.alignMiddleRight},
+    {tagTextDirection::BL, L"BL", kText.alignBottomLeft},
+    {tagTextDirection::BC, L"BC", kText.alignBottomCentre},
+    {tagTextDirection::BR, L"BR", kText.alignBottomRight},
+    {tagTextDirection::Left, L"Left", kText.alignLeft},
+    {tagTextDirection::Center, L"Center", kText.alignCentre},
+    {tagTextDirection::Right, L"Right", kText.alignRight},
+}};
 
 struct OptionTexts {
     wchar_t const* name;
     wchar_t const* keyword;
     unsigned int description;
 };
-constexpr std::array<OptionTexts, 4> kOptions{
-    {
-     {L"Distribute", L"Distribute", kText.spacingDistribute},
-     {L"CurrentSpaceHorizontal", L"Horizontal", kText.spacingHorizontal},
-     {L"CurrentSpaceVertical", L"Vertical", kText.spacingVertical},
-     {L"SpecificSpace", L"Set", kText.spacingSet},
-     }
-};
+constexpr std::array<OptionTexts, 4> kOptions{{
+    {L"Distribute", L"Distribute", kText.spacingDistribute},
+    {L"CurrentSpaceHorizontal", L"Horizontal", kText.spacingHorizontal},
+    {L"CurrentSpaceVertical", L"Vertical", kText.spacingVertical},
+    {L"SpecificSpace", L"Set", kText.spacingSet},
+}};
 
 // The descriptions of a table, in its order.
 template <class Row, std::size_t N>

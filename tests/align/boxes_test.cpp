@@ -46,21 +46,21 @@ struct BoxRow {
     char const* box;
 };
 BoxRow const kBoxes[] = {
-    {"AsItIs",       kPlan,    {15, 18, 0}, {{10, 0, 0}, {0, 4, 0}, {}},       {},        "15 18  25 22"    },
-    {"BackToFront",  kPlan,    {25, 22, 0}, {{-10, 0, 0}, {0, -4, 0}, {}},     {},        "15 18  25 22"    },
-    {"Turned45",     kPlan,    {0, 0, 0},   {{4, 4, 0}, {-1, 1, 0}, {}},       {},        "-1 0  4 5"       },
-    {"OwnSystem",    kTurned,  {1, 1, 0},   {{4, 4, 0}, {-1, 1, 0}, {}},       {},        "0 0  5.657 1.414"},
-    {"UprightPlane", kUpright, {10, 2, 3},  {{0, 5, 0}, {0, 0, 1}, {}},        {},        "2 3  7 4"        },
-    {"ThickFirst",   kPlan,    {1, 1, 0},   {{0, 0, 7}, {3, 0, 0}, {0, 2, 0}}, {},        "1 1  4 3"        },
-    {"ThickSecond",  kPlan,    {1, 1, 0},   {{3, 0, 0}, {0, 0, 7}, {0, 2, 0}}, {},        "1 1  4 3"        },
- // Two zero sides: the third counts as the one off the plane, so its length is dropped.
-    {"OneSide",      kPlan,    {1, 1, 0},   {{}, {}, {3, 3, 0}},               {},        "1 1  1 1"        },
-    {"Above",        kPlan,    {1, 1, 9},   {{3, 0, 0}, {0, 2, 0}, {}},        {0, 0, 1}, "1 1  4 3"        },
-    {"AboveSlanted", kPlan,    {1, 1, 9},   {{3, 0, 0}, {0, 2, 0}, {}},        {1, 0, 1}, "-8 1  -5 3"      },
-    {"AboveAlong",   kPlan,    {1, 1, 9},   {{3, 0, 0}, {0, 2, 0}, {}},        {1, 0, 0}, "1 1  4 3"        },
-    {"Leaning",      kPlan,    {1, 1, 0},   {{3, 0, 4}, {0, 2, 0}, {}},        {1, 0, 1}, "0 1  1 3"        },
- // The second side alone leans: taken for flat, so nothing is moved along the direction.
-    {"LeaningUp",    kPlan,    {1, 1, 0},   {{3, 0, 0}, {0, 2, 4}, {}},        {1, 0, 1}, "1 1  4 3"        },
+    {"AsItIs", kPlan, {15, 18, 0}, {{10, 0, 0}, {0, 4, 0}, {}}, {}, "15 18  25 22"},
+    {"BackToFront", kPlan, {25, 22, 0}, {{-10, 0, 0}, {0, -4, 0}, {}}, {}, "15 18  25 22"},
+    {"Turned45", kPlan, {0, 0, 0}, {{4, 4, 0}, {-1, 1, 0}, {}}, {}, "-1 0  4 5"},
+    {"OwnSystem", kTurned, {1, 1, 0}, {{4, 4, 0}, {-1, 1, 0}, {}}, {}, "0 0  5.657 1.414"},
+    {"UprightPlane", kUpright, {10, 2, 3}, {{0, 5, 0}, {0, 0, 1}, {}}, {}, "2 3  7 4"},
+    {"ThickFirst", kPlan, {1, 1, 0}, {{0, 0, 7}, {3, 0, 0}, {0, 2, 0}}, {}, "1 1  4 3"},
+    {"ThickSecond", kPlan, {1, 1, 0}, {{3, 0, 0}, {0, 0, 7}, {0, 2, 0}}, {}, "1 1  4 3"},
+    // Two zero sides: the third counts as the one off the plane, so its length is dropped.
+    {"OneSide", kPlan, {1, 1, 0}, {{}, {}, {3, 3, 0}}, {}, "1 1  1 1"},
+    {"Above", kPlan, {1, 1, 9}, {{3, 0, 0}, {0, 2, 0}, {}}, {0, 0, 1}, "1 1  4 3"},
+    {"AboveSlanted", kPlan, {1, 1, 9}, {{3, 0, 0}, {0, 2, 0}, {}}, {1, 0, 1}, "-8 1  -5 3"},
+    {"AboveAlong", kPlan, {1, 1, 9}, {{3, 0, 0}, {0, 2, 0}, {}}, {1, 0, 0}, "1 1  4 3"},
+    {"Leaning", kPlan, {1, 1, 0}, {{3, 0, 4}, {0, 2, 0}, {}}, {1, 0, 1}, "0 1  1 3"},
+    // The second side alone leans: taken for flat, so nothing is moved along the direction.
+    {"LeaningUp", kPlan, {1, 1, 0}, {{3, 0, 0}, {0, 2, 4}, {}}, {1, 0, 1}, "1 1  4 3"},
 };
 class Boxes : public testing::TestWithParam<BoxRow> {};
 TEST_P(Boxes, LieOnThePlane) {
@@ -86,21 +86,10 @@ struct PointRow {
     TzGePoint3d point;
 };
 PointRow const kPoints[] = {
-    {0,     {15, 22, 0}},
-    {1,     {20, 22, 0}},
-    {2,     {25, 22, 0}},
-    {3,     {15, 20, 0}},
-    {4,     {20, 20, 0}},
-    {5,     {25, 20, 0}},
-    {6,     {15, 18, 0}},
-    {7,     {20, 18, 0}},
-    {8,     {25, 18, 0}},
-    {9,     {15, 22, 0}},
-    {10,    {20, 20, 0}},
-    {11,    {25, 22, 0}},
-    {12,    {15, 22, 0}},
-    {-1,    {15, 22, 0}},
-    {32767, {15, 22, 0}},
+    {0, {15, 22, 0}},  {1, {20, 22, 0}},  {2, {25, 22, 0}},     {3, {15, 20, 0}},
+    {4, {20, 20, 0}},  {5, {25, 20, 0}},  {6, {15, 18, 0}},     {7, {20, 18, 0}},
+    {8, {25, 18, 0}},  {9, {15, 22, 0}},  {10, {20, 20, 0}},    {11, {25, 22, 0}},
+    {12, {15, 22, 0}}, {-1, {15, 22, 0}}, {32767, {15, 22, 0}},
 };
 TEST(ReferencePoints, AreThoseOfTheJustification) {
     for (PointRow const& row : kPoints) {
@@ -154,9 +143,7 @@ TEST_F(TextBoxes, OfSingleLinesAreExactInTheirOwnAxes) {
     resbuf* const data = tzdbEntGet(name);
     ASSERT_EQ(tzedTextBox(data, low, high), 5100);
     tzutRelRb(data);
-    EXPECT_EQ(boxOf(id, own), textOf({
-                                  TzGePoint3d(low[0], low[1], 0), {high[0], high[1], 0}
-    }));
+    EXPECT_EQ(boxOf(id, own), textOf({TzGePoint3d(low[0], low[1], 0), {high[0], high[1], 0}}));
     // X of the arbitrary axes is the world's X, Y its Z: 0.5 radians up from there.
     EXPECT_TRUE(own.xAxis().isEqualTo({std::cos(0.5), 0, std::sin(0.5)}));
     EXPECT_TRUE(own.origin().isEqualTo({7, 8, 9}));

@@ -78,18 +78,10 @@ struct Line {
     double y;
 };
 constexpr Line kLines[] = {
-    {"Right",      60,    0   },
-    {"Left",       -60,   0   },
-    {"Up",         0,     60  },
-    {"Down",       0,     -60 },
-    {"UpRight",    40,    40  },
-    {"UpLeft",     -40,   30  },
-    {"DownLeft",   -30,   -50 },
-    {"DownRight",  50,    -20 },
-    {"Flat",       60,    0.01},
-    {"Steep",      -0.01, -60 },
-    {"AlmostFlat", 60,    1e-9},
-    {"Short",      2,     1   },
+    {"Right", 60, 0},       {"Left", -60, 0},         {"Up", 0, 60},
+    {"Down", 0, -60},       {"UpRight", 40, 40},      {"UpLeft", -40, 30},
+    {"DownLeft", -30, -50}, {"DownRight", 50, -20},   {"Flat", 60, 0.01},
+    {"Steep", -0.01, -60},  {"AlmostFlat", 60, 1e-9}, {"Short", 2, 1},
 };
 TzGeMatrix3d const kSystems[] = {
     TzGeMatrix3d(),
@@ -218,14 +210,8 @@ struct ThresholdRow {
     double degrees;
     bool error;
 };
-constexpr ThresholdRow kThresholds[] = {
-    {0,      true },
-    {0.99,   true },
-    {1.01,   false},
-    {178.99, false},
-    {179.01, true },
-    {180,    true }
-};
+constexpr ThresholdRow kThresholds[] = {{0, true},       {0.99, true},   {1.01, false},
+                                        {178.99, false}, {179.01, true}, {180, true}};
 TEST(Spacing, NeedsOneDegree) {
     TzMTextAlignOptionCurrentSpaceHorizontal option;
     for (ThresholdRow const& row : kThresholds) {
@@ -246,12 +232,7 @@ TEST(Order, IsThatAlongTheLine) {
         text->prepareForDragging(tagTextDirection::BL);
     auto const entities = entitiesOf(texts);
     auto const orderOn = [&](TzGePoint3d const& second) {
-        TzMTextAlignManipulatorGut pass(entities, nullptr, nullptr,
-                                        {
-                                            {0, 0, 0},
-                                            second
-        },
-                                        {});
+        TzMTextAlignManipulatorGut pass(entities, nullptr, nullptr, {{0, 0, 0}, second}, {});
         pass.sortEntities(entities);
         std::string order;
         for (unsigned long const index : pass.sortedIndices())
@@ -274,13 +255,11 @@ struct Question {
     double after;
 };
 TEST(Spacing, SetAsksForItsGap) {
-    for (Question const& row : {
-             Question{"2.5\n",      true,  2.5},
-             {"\n",         true,  1.5},
-             {"^C\n",       false, 1.5},
-             {"-1\n",       true,  -1 },
-             {"0,0\n3,4\n", true,  5  }
-    }) {
+    for (Question const& row : {Question{"2.5\n", true, 2.5},
+                                {"\n", true, 1.5},
+                                {"^C\n", false, 1.5},
+                                {"-1\n", true, -1},
+                                {"0,0\n3,4\n", true, 5}}) {
         OpenDrawing const drawing(row.script);
         (void)tzhost::Variables::instance().set(L"TEXTALIGNSPACINGVALUE", 1.5,
                                                 tzhost::Writer::module);
