@@ -127,13 +127,14 @@ TEST_F(FontState, GivesALookBack) {
 
 // The second code used to be the first again.
 TEST_F(FontState, WritesAFaceByTheTablesOfTheMoment) {
+    FontName const lent(L"Lent One");
     state.SetPitchAndFamily(0);
-    state.SetFontName(L"Lent One");
+    state.SetFontName(lent);
     EXPECT_EQ(emitted(), L"{\\fLent One|b0|i0|c0|p0;");
     state.SetFontName(L"Other");
     EXPECT_EQ(emitted(), L"\\fOther|b0|i0|c0|p0;");
     fonts.AddProxy(L"none.shx");
-    state.SetFontName(L"Lent One");
+    state.SetFontName(lent);
     EXPECT_EQ(emitted(), L"\\Fnone.shx|c0;");
 }
 
