@@ -1,8 +1,9 @@
 #pragma once
 
 // Counts what is lent out while a command runs. Each layer counts its own loans up and down; after
-// a command all of them must read as before it, whatever failed or was cancelled. Counting touches
-// no object that nobody touched.
+// a command every count must be what it was before the command, also when a part of it failed or
+// was cancelled. Only what lends and takes back changes a count: no object is visited to be
+// counted.
 namespace tzhost {
 
 struct Audit {
@@ -17,7 +18,8 @@ struct Audit {
     [[nodiscard]] bool clean() const;
 };
 
-// The process's counters, to be counted up and down where loans are given.
+// The counters of the process. Whoever lends something counts up, and counts down when it comes
+// back.
 [[nodiscard]] Audit& audit();
 
 }  // namespace tzhost

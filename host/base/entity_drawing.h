@@ -28,7 +28,7 @@ public:
     takeEntity(TzDbEntity const& entity, wchar_t const* type, TzGePoint3d const& position) = 0;
 };
 
-// Asks the display behind `draw`; false when it takes no entities.
+// Asks the display that receives what `draw` draws; false when it takes no entities.
 [[nodiscard]] bool takenWhole(TzGiCommonDraw* draw,
                               TzDbEntity const& entity,
                               wchar_t const* type,

@@ -11,8 +11,8 @@
 //
 //   tzhost::reportEvent([&] { return tzhost::Event{{"event", "write"}, {"handle", "2A"}}; });
 //
-// An event is only built when somebody wants it, and no memory fault is met on the way: what
-// happened is told in any case, and the JSON library cannot pass such a fault on.
+// An event is built only when there is a sink. No allocation is made to fail meanwhile: the event
+// must be reported in any case, and the JSON library cannot hand such a failure up.
 namespace tzhost {
 
 using Event = nlohmann::ordered_json;
@@ -28,7 +28,7 @@ void reportEvent(Build const& build) {
     MemoryFaultPause const pause;
     handOver(build());
 }
-// Replaces the sink; an empty one stops events. Returns the sink before.
+// Replaces the sink; an empty one stops events. Returns the previous sink.
 EventSink setEventSink(EventSink sink);
 
 // Text as events and drawing files hold it: UTF-8.

@@ -26,8 +26,8 @@ using FaultHook = bool (*)(std::string_view operation, int& status);
 FaultHook setFaultHook(FaultHook hook) noexcept;
 
 // The status with which this call must fail, or nothing when it goes on. `usual` is the status of
-// the operation's common failure; an operation without a status ignores the number and gives its
-// null.
+// the operation's common failure; an operation without a status ignores the number and returns its
+// null value.
 [[nodiscard]] std::optional<int> faultAt(std::string_view operation, int usual = kUsualFailure);
 
 }  // namespace tzhost

@@ -13,8 +13,8 @@ public:
     ~MemoryFaultScope();
 };
 
-// What gives something back or puts it as it was runs in a pause: it happens in destructors, also
-// while an exception for want of memory passes.
+// Code that gives something back or undoes something runs in a pause: it runs in destructors, also
+// while an exception for lack of memory passes.
 class MemoryFaultPause {
 public:
     MemoryFaultPause() noexcept;

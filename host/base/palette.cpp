@@ -79,7 +79,7 @@ int searchNearest(std::uint32_t rgb) {
     return nearest;
 }
 
-// One remembered answer; index 0 is an empty place, as no search gives it.
+// One remembered answer. Index 0 marks an empty place, since no search gives 0.
 struct Remembered {
     std::uint32_t rgb = 0;
     int index = 0;

@@ -12,7 +12,7 @@ constexpr int kLastPaletteIndex = 255;
 [[nodiscard]] std::uint32_t paletteColor(int index);
 
 // The lowest of the indices 1 to 255 at the least squared distance of components. Answers are
-// remembered, so that asking for the same few colours again costs next to nothing.
+// remembered, so that a colour is searched for once as long as few colours are in use.
 [[nodiscard]] int nearestPaletteIndex(std::uint32_t rgb);
 
 }  // namespace tzhost

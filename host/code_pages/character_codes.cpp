@@ -12,7 +12,8 @@ constexpr int kDigits = 4;
 constexpr std::array<code_page_id, 5> kPages{kCodePage932, kCodePage936, kCodePage949, kCodePage950,
                                              kCodePage1361};
 
-// The value of four hex digits; -1 without them. Never looks behind a character that is none.
+// The value of four hex digits; -1 without them. Stops at the first character that is no hex digit,
+// so it never reads past the end of a text.
 int readDigits(wchar_t const* text) {
     int value = 0;
     for (int i = 0; i < kDigits; ++i) {

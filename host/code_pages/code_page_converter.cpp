@@ -22,12 +22,12 @@ public:
     Converter& operator=(Converter const&) = delete;
 
     [[nodiscard]] bool isOpen() const {
-        return handle_ != reinterpret_cast<iconv_t>(-1);  // as iconv_open fails
+        return handle_ != reinterpret_cast<iconv_t>(-1);  // what iconv_open returns when it fails
     }
 
-    // Converts `size` bytes at `from` into `room` bytes at `to`, whole characters from a fresh
-    // start: how many bytes were written, or nothing when some cannot be converted, or only to
-    // others.
+    // Converts the `size` bytes at `from`, which must be whole characters, and writes them to `to`,
+    // which has `room` bytes. Earlier calls have no effect on it. Returns how many bytes were
+    // written, or nothing when a character cannot be converted, or only to a substitute.
     std::optional<std::size_t> run(char* from, std::size_t size, char* to, std::size_t room) const {
         std::size_t const before = room;
         ::iconv(handle_, nullptr, nullptr, nullptr, nullptr);
@@ -53,7 +53,8 @@ public:
     }
     static constexpr wchar_t kNone = -1;
 
-    // Appends the text of the bytes; false, with the text as it was, when they are no characters.
+    // Appends the text of the bytes; false, with the text as it was, when the bytes are no
+    // characters of the page.
     bool decode(std::string_view bytes, std::wstring& text) const {
         std::wstring room(bytes.size() + 1, L'\0');
         std::string source(bytes);
@@ -104,9 +105,9 @@ bool isAscii(char byte) {
     return static_cast<unsigned char>(byte) < 0x80;
 }
 
-// How many bytes at the start of `bytes`, which is no single byte's character, are read at once: a
-// lead byte with its trail byte, or, in a page of characters of any length, up to the next ASCII
-// character.
+// How many bytes at the start of `bytes` are decoded together when the first one is no character by
+// itself: a lead byte with its trail byte, or, in a page whose characters may have any length, all
+// bytes before the next ASCII character.
 std::size_t lengthOfCharacters(int page, std::string_view bytes) {
     std::size_t const most = hasLeadBytes(page) ? 2 : bytes.size();
     std::size_t count = 1;

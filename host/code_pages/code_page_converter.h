@@ -10,7 +10,8 @@
 
 namespace tzhost {
 
-// The page that is read when this one is asked for.
+// The page that is used when `codePage` is asked for: that page, or the system page when the host
+// cannot use it.
 [[nodiscard]] int usablePage(int codePage);
 
 // Nothing when some bytes are no character of the page.

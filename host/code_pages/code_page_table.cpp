@@ -15,7 +15,7 @@ struct CharsetRow {
     int codePage;
 };
 
-// Both ways; set 1, the system's, is not listed.
+// Character sets and their pages, searched in both directions. Set 1, the system's, is not listed.
 constexpr CharsetRow kCharsets[] = {
     {kAnsiCharset, 1252},    {kSymbolCharset, 42},       {kMacCharset, 10000},
     {kShiftJisCharset, 932}, {kHangulCharset, 949},      {kJohabCharset, 1361},
@@ -41,7 +41,7 @@ struct NameRow {
     char const* name;
 };
 
-// Pages that iconv does not know as "CP" and their number.
+// Pages that have another name in iconv than "CP" and their number.
 constexpr NameRow kNames[] = {
     {10000, "MACINTOSH"}, {20127, "ASCII"},   {20866, "KOI8-R"},
     {21866, "KOI8-U"},    {54936, "GB18030"}, {51932, "EUC-JP"},
@@ -54,7 +54,7 @@ constexpr int kLastIsoPage = 28606;
 }  // namespace
 
 int systemCodePage() {
-    // Asked at every change of a font, so its text is not copied.
+    // This runs at every change of a font, so the text of the variable is not copied.
     auto const& name = std::get<std::wstring>(*Variables::instance().get(L"SYSCODEPAGE"));
     std::size_t const underscore = name.rfind(L'_');
     int page = 0;

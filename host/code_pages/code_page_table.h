@@ -15,15 +15,15 @@ constexpr int kUtf8CodePage = 65001;
 // none.
 [[nodiscard]] int systemCodePage();
 
-// The page of a set, 0 without one. The page 0 has no set; a page without a set of its own gives 0.
+// The page of a character set, and the set of a page. Each gives 0 when the table has no answer.
 [[nodiscard]] int codePageOf(Charset charset);
 [[nodiscard]] Charset charsetOf(int codePage);
 
 [[nodiscard]] bool isLeadByte(int codePage, unsigned char byte);
-// Whether the page has characters of two bytes that open with a lead byte.
+// Whether the page has characters of two bytes, the first of which is a lead byte.
 [[nodiscard]] bool hasLeadBytes(int codePage);
 
-// What iconv may call the page; it need not know it.
+// The name under which to ask iconv for the page; iconv may not know the page.
 [[nodiscard]] std::string iconvNameOf(int codePage);
 
 }  // namespace tzhost

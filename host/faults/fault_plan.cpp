@@ -36,7 +36,7 @@ std::optional<std::string> FaultPlan::add(std::string_view rule) {
         if (!added.status) return wrong(rule, forLocalText("the status is no integer"));
         left = left.substr(0, equals);
     }
-    // A single colon: names hold double ones.
+    // The number follows a single colon; a double colon is part of a name.
     auto const colon = left.rfind(':');
     if (colon != std::string_view::npos && (colon == 0 || left[colon - 1] != ':')) {
         std::string_view const call = left.substr(colon + 1);
@@ -83,7 +83,7 @@ std::vector<FaultPlan::IdleRule> FaultPlan::idleRules() const {
 }
 
 bool FaultPlan::decide(std::string_view operation, int& status) {
-    // What the plan itself allocates is no call of the host's.
+    // Memory that the plan itself takes is not counted and never made to fail.
     MemoryFaultPause const pause;
     return installed && installed->strike(operation, status);
 }

@@ -29,21 +29,21 @@ public:
     FaultPlan& operator=(FaultPlan const&) = delete;
     ~FaultPlan() { remove(); }
 
-    // Adds a rule; what is wrong with it, or nothing.
+    // Adds a rule. Returns what is wrong with the rule, or nothing.
     [[nodiscard]] std::optional<std::string> add(std::string_view rule);
     // Puts this plan in force, in place of the one before.
     void install();
-    // No plan is in force any more, if it was this one.
+    // Takes this plan out of force; changes nothing when another plan is in force.
     void remove();
     // Forgets rules and counts.
     void clear();
 
     // Calls met since install or clear, by operation.
     [[nodiscard]] std::map<std::string, long, std::less<>> const& calls() const { return calls_; }
-    // Whether a rule has struck since then.
+    // Whether a rule has made a call fail since install or clear.
     [[nodiscard]] bool hasStruck() const { return idleRules().size() < rules_.size(); }
-    // A rule that has made nothing fail since then, as it was added, and the calls of its
-    // operation.
+    // A rule that has made no call fail since install or clear: its text, and how often its
+    // operation was called.
     struct IdleRule {
         std::string rule;
         long calls = 0;

@@ -43,8 +43,8 @@ constexpr std::array<Level, 6> kLevels{{
 }};
 // clang-format on
 
-// Letters without case of the pages of one byte: between Hebrew and the punctuation, without the
-// marks that stand over and under others.
+// Letters of Hebrew, Arabic and Thai, which have no case. The vowel marks of Hebrew and Arabic do
+// not count.
 bool isUncasedLetter(wchar_t c) {
     struct Range {
         wchar_t first, last;

@@ -18,8 +18,8 @@ struct FamilyWord {
     FontFamily family;
 };
 
-// Words in a face's name that tell its family, the first that is found counting. The catalogue
-// itself knows nothing of serifs.
+// Words in a face's name that tell its family; the first row that is found decides. The name has to
+// be asked because the catalogue does not tell faces with serifs from those without.
 constexpr FamilyWord kFamilyWords[] = {
     {L"sans", FontFamily::kSwiss},        {L"serif", FontFamily::kRoman},
     {L"roman", FontFamily::kRoman},       {L"times", FontFamily::kRoman},
@@ -40,7 +40,8 @@ FontFamily familyOf(FontForm const& form) {
     return FontFamily::kDoNotCare;
 }
 
-// Stroke fonts are the callers' own affair, whatever file of that name the machine may have.
+// Callers handle stroke fonts themselves: such a file is unknown here, even when the machine has a
+// file of that name.
 bool isStrokeFont(CStdStrW const& file) {
     constexpr std::wstring_view kExtension = L".shx";
     std::wstring const name = tzhost::lowered(file);

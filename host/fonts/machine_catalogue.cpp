@@ -92,9 +92,9 @@ void FontCatalogue::add(FcPattern* pattern) {
     if (!isNew && form.index < at->second->index) at->second = &form;
 }
 
-// Gives each form the English family name whose nearest form it is, so that going from the file to
-// the face and back ends at the same file: a condensed cut may also stand under its family's plain
-// name.
+// Gives each form an English family name under which it is the nearest form, so that going from the
+// file to the face and back ends at the same file. A form may have several names: a condensed form
+// may also have the plain name of its family, under which another form is nearer.
 void FontCatalogue::nameForms() {
     struct Name {
         std::wstring const* english = nullptr;

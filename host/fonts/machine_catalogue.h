@@ -1,8 +1,8 @@
 #pragma once
 
 // The outline fonts of the machine by file and by exact family name, read from fontconfig once, at
-// the first question. fontconfig likes to answer with a stand-in; this catalogue only knows what is
-// there.
+// the first question. When a font is missing, fontconfig answers with a substitute; this catalogue
+// knows only the fonts that are installed.
 //
 //   FontFamilyRow const* const family = FontCatalogue::instance().family(L"DejaVu Sans");
 //   FontForm const& regular = family->nearest(false, false);
@@ -55,7 +55,7 @@ public:
 
     // By any of its names; null for an unknown one.
     [[nodiscard]] FontFamilyRow const* family(std::wstring_view name) const;
-    // By its name, a folder ahead of it not counting; null for an unknown one.
+    // By the name of the file; a folder before the name is ignored. Null for an unknown file.
     [[nodiscard]] FontForm const* file(std::wstring_view name) const;
     // Every family once, under its English name, by name.
     [[nodiscard]] std::vector<FontFamilyRow const*> families() const;
@@ -68,7 +68,7 @@ private:
     void add(FcPattern* pattern);
     void nameForms();
 
-    std::deque<FontForm> forms_;                    // keep their places
+    std::deque<FontForm> forms_;                    // a deque: addresses stay valid
     std::map<std::wstring, FontFamilyRow> byName_;  // in lower case
     std::map<std::wstring, FontForm const*> byFile_;
 };

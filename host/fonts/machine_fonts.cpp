@@ -16,8 +16,8 @@ bool flagOf(FcPattern* pattern, char const* property) {
     return FcPatternGetBool(pattern, property, 0, &value) == FcResultMatch && value == FcTrue;
 }
 
-// Bitmap fonts cannot be drawn at any size; a variable font is listed once more as each of its
-// named forms.
+// Leaves out bitmap fonts, which cannot be drawn at any size, and variable fonts as a whole, since
+// each of their named forms is listed by itself.
 bool isUsable(FcPattern* pattern) {
     return flagOf(pattern, FC_SCALABLE) && !flagOf(pattern, FC_VARIABLE);
 }

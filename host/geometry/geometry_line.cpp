@@ -11,8 +11,8 @@ TzGeVector3d unitOrZero(TzGeVector3d const& v) {
     return v.isZeroLength() ? TzGeVector3d::kIdentity : v.normal();
 }
 
-// How far apart two lines through points this large may seem to be, for no other reason than that
-// coordinates are rounded.
+// How far apart two lines that cross may seem to be, only because the coordinates of points this
+// large are rounded.
 double roundingOf(TzGePoint3d const& a, TzGePoint3d const& b) {
     double largest = 0.0;
     for (int i = 0; i < 3; ++i)

@@ -18,7 +18,7 @@ class PrintSink {
 public:
     virtual ~PrintSink() = default;
     virtual void print(std::wstring_view text) = 0;
-    // The user is to see the text screen. Nothing to do where there is only one.
+    // Shows the user the text screen; does nothing where there is only one screen.
     virtual void showTextScreen() {}
 };
 

@@ -7,7 +7,7 @@
 
 namespace {
 
-// A format without arguments: a percent sign that asks for one ends the text.
+// The text of a format that has no arguments. It ends at the first percent sign that asks for one.
 std::wstring withoutArguments(wchar_t const* format) {
     std::wstring_view rest(format ? format : L"");
     std::wstring text;

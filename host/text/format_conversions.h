@@ -8,8 +8,8 @@
 namespace tzhost {
 
 // The conversions of a format in order, without flags, width and precision, "%ls" as "%s"; nothing
-// when a percent sign opens none. Doubled percent signs are listed too. A translated format fits
-// the same arguments when it has those of the original.
+// when a percent sign begins no conversion. Doubled percent signs are listed too. A translated
+// format fits the arguments of the original when both have the same conversions.
 [[nodiscard]] std::optional<std::vector<std::wstring>> conversionsOf(std::wstring_view format);
 
 }  // namespace tzhost

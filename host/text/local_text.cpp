@@ -23,7 +23,7 @@ bool isBefore(LocalTextRow const& a, LocalTextRow const& b) {
     return a.english < b.english;
 }
 
-// What is wrong with a line; when nothing is, `row` holds it.
+// Reads a line into `row`. Returns what is wrong with the line, or nothing.
 std::optional<std::string> readRow(std::string_view line, LocalTextRow& row) {
     if (firstBadByte(line) != kAllUtf8) return "the line is not UTF-8";
     std::size_t const tab = line.find('\t');
@@ -38,7 +38,7 @@ std::optional<std::string> readRow(std::string_view line, LocalTextRow& row) {
     return std::nullopt;
 }
 
-// Sorts the rows and leaves out those whose text stands further up too.
+// Sorts the rows and leaves out a row whose English text an earlier row has too.
 void sortAndCheck(Rows& rows, std::vector<std::string>& faults) {
     std::stable_sort(rows.begin(), rows.end(), isBefore);
     auto const isSecond = [&](LocalTextRow const& first, LocalTextRow const& second) {

@@ -4,8 +4,8 @@
 // finds the one that is shown:
 //
 //   say(localText(L"An answer is needed."));
-//   constexpr wchar_t const* kWords = forLocalText(L"Single Multiple");  // shown by
-//   localText(kWords)
+//   constexpr wchar_t const* kWords = forLocalText(L"Single Multiple");
+//   say(localText(kWords));
 //
 // A language has a table of them. It is UTF-8, one text a line: the English one, a tab, the
 // translation, both with the escapes of host/text/text_escapes.h; lines that begin with # and empty

@@ -4,8 +4,8 @@ namespace tzhost {
 
 namespace {
 
-// Lives as long as the process; null, when the C library is out of memory, leaves the locale as it
-// is.
+// Lives as long as the process. Null when the C library is out of memory; the locale then stays as
+// it is.
 locale_t plainLocale() noexcept {
     static locale_t const locale = newlocale(LC_ALL_MASK, "C", locale_t{});
     return locale;

@@ -14,7 +14,7 @@ struct Escape {
     wchar_t character;
 };
 
-// The letter behind the backslash, the character that it stands for.
+// The letter after the backslash, and the character that the escape stands for.
 constexpr Escape kEscapes[] = {
     {L'n', L'\n'}, {L'r', L'\r'}, {L't', L'\t'}, {L's', L' '}, {L'\\', L'\\'},
 };

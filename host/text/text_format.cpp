@@ -16,7 +16,7 @@
 
 namespace {
 
-// Wider fields and longer fractions than this are cut: no caller means them.
+// Wider fields and longer fractions are cut to this; no caller needs more.
 constexpr int kMostWidth = 65535;
 
 enum class Length { normal, hh, h, l, ll, j, z, t, L };
@@ -29,7 +29,7 @@ struct Directive {
     Length length = Length::normal;
     wchar_t letter = 0;
 
-    // The common case, which needs none of the C library's care.
+    // The common case, a plain decimal number, which is written without the C library.
     [[nodiscard]] bool isPlainDecimal() const {
         return flags.empty() && width < 0 && precision < 0 &&
                (letter == L'd' || letter == L'i' || letter == L'u');
@@ -42,7 +42,7 @@ struct LengthRow {
     Length length;
 };
 
-// The longer of two spellings stands first.
+// The first row that fits is taken, so "hh" stands before "h" and "ll" before "l".
 constexpr LengthRow kLengths[] = {
     {L"hh", Length::hh}, {L"h", Length::h}, {L"ll", Length::ll},
     {L"l", Length::l},   {L"j", Length::j}, {L"z", Length::z},
