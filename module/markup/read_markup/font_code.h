@@ -3,7 +3,8 @@
 #include "tz/text/charset.h"
 #include "tz/text/std_str.h"
 
-// What a font code of the markup says. A code that the text cuts off says what there was of it.
+// What a font code of the markup says. A code that the end of the text cuts off gives what was read
+// until then.
 struct FontCode {
     CStdStrW name;  // of the file or face, with every backslash doubled
     bool bold = false;

@@ -18,8 +18,9 @@
 [[nodiscard]] double
 GetRealNumber(wchar_t const*& cursor, signed char* pbRelative, bool bEatSemicolon);
 
-// The text up to a ";" that is not escaped, which is consumed. The character after an escape pair
-// is copied without being looked at, and a backslash that ends the text gives a zero after it.
+// The text up to the first ";" that is not escaped; that ";" is consumed. The character after an
+// escape pair is copied without being looked at, and a backslash that ends the text gives a zero
+// after it.
 [[nodiscard]] CStdStrW GetString(wchar_t const*& cursor);
 
 // The value of the four hex digits after the character at the cursor, which then stands after

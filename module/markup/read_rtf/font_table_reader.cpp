@@ -43,8 +43,8 @@ CStdStrW readName(wchar_t const*& cursor, code_page_id_ex page) {
     }
 }
 
-// True when the group gave the name. Any other group leaves it alone. The brace that closes it is
-// left to the entry.
+// True when the group gave the name; any other group leaves the name alone. The closing brace of
+// the group is left to the reader of the entry.
 bool readSubEntry(wchar_t const*& cursor, FontEntry& entry) {
     bool isName = false;
     for (;;) {

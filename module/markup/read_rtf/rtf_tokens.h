@@ -17,9 +17,9 @@ inline constexpr int kNoValue = INT_MIN;
 // blank. Empty when no letter stands there, though a number may. The view is into the text.
 [[nodiscard]] std::wstring_view readControlWord(wchar_t const*& cursor, int& value);
 
-// One step of the walk over rich text. All readers of groups walk by these steps; where one of them
-// does otherwise than the others (leaves a closing brace to its caller, say), it does so itself,
-// from where the step began.
+// One step of the walk over rich text. All readers of groups walk by these steps; a reader that
+// treats something in its own way (one leaves a closing brace to its caller, say) goes back to
+// where the step began and does it there.
 struct RtfStep {
     enum Kind {
         end,        // of the text; the cursor does not move

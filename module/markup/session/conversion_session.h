@@ -84,8 +84,8 @@ struct WrittenMarkup {
     bool stacksSeen = false;
 };
 
-// The colour of ByLayer beside that of ByBlock, or the other way round: the two tell ByLayer and
-// ByBlock apart, so an equal one has its lowest bit flipped.
+// `rgb`, with its lowest bit flipped when it equals `other`. For the colours of ByLayer and
+// ByBlock: the converters tell ByLayer from ByBlock by colour, so the two must differ.
 [[nodiscard]] unsigned int colorBeside(unsigned int rgb, unsigned int other);
 
 // A context ready to parse.

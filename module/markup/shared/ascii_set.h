@@ -4,7 +4,8 @@
 #include <cstddef>
 #include <string_view>
 
-// A longer run of plain characters is copied in pieces, which are then still in the cache.
+// A longer run of plain characters is copied in pieces of this length: a piece that was just looked
+// through is still in the cache when it is copied.
 inline constexpr std::ptrdiff_t kLongestRun = 2048;
 
 // Some of the characters below 128, looked up at once: the loops over plain text ask about each of

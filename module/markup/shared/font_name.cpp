@@ -21,7 +21,7 @@ bool FontName::isSameAs(FontName const& other) const {
     return folded() == other.folded() || *folded() == *other.folded();
 }
 
-// Of a name that is not empty.
+// Only for a name that is not empty.
 std::shared_ptr<CStdStrW const> const& FontName::folded() const {
     if (!text_->folded) {
         CStdStrW lower = text_->text;

@@ -12,8 +12,8 @@ struct ParagraphSettings {
     std::array<int, kMostTabs> tabs{};  // ascending
     bool isSet = false;
 
-    // Puts a stop in its place. Nothing happens for one below 1, one that is there, and when there
-    // are 32.
+    // Adds a stop in ascending order. A stop below 1, one that is already there, and any after 32
+    // are ignored.
     void AddTab(int twips);
     [[nodiscard]] bool hasTabsOf(ParagraphSettings const& other) const;
 };

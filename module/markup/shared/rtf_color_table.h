@@ -25,12 +25,12 @@ public:
 
     // The first place of a colour, or -1.
     [[nodiscard]] int FindColor(unsigned int rgb) const;
-    // The place of a colour that is there, unless `bForce`, which gives it a new number all the
-    // same: a document that is read may count a colour twice.
+    // Adds a colour and returns its place. A colour that is already there is not added again unless
+    // `bForce` is set: a document that is read may list a colour twice.
     int AddColor(unsigned int rgb, bool bForce);
     // The same with an index of the host's palette, 256 for ByLayer or 0 for ByBlock.
     int AddColor(int index, bool bForce);
-    // The colour of an index, with these for ByLayer and ByBlock.
+    // The colour of an index; `byLayer` and `byBlock` are the colours of the two special ones.
     [[nodiscard]] static unsigned int GetRGB(int index, unsigned int byLayer, unsigned int byBlock);
     // The colour of a number, or the index of the palette nearest to it. False, with 0 in the
     // result, for a number that the table lacks.
@@ -44,7 +44,8 @@ public:
     void SetByBlockColor(unsigned int rgb) { m_nByBlockColor = rgb; }
     [[nodiscard]] unsigned int GetByBlockColor() const { return m_nByBlockColor; }
 
-    // The table as a group; no colour but those added, so that number 0 is the first of them.
+    // The table as a group. It holds only the colours that were added, so number 0 is the first of
+    // them.
     [[nodiscard]] CStdStrW EmitColorTable() const;
 
 private:

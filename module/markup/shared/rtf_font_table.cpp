@@ -12,7 +12,7 @@
 
 namespace {
 
-// What finds a font again, case not counting.
+// The key by which a font is found again, without regard to case.
 TableKey keyOf(wchar_t const* name, Charset charset, int pitch) {
     return descriptionKey(name ? name : L"", false, false, charset, pitch);
 }

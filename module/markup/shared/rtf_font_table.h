@@ -20,7 +20,7 @@ public:
         Charset charset = kAnsiCharset;
         int pitchAndFamily = 0;
         FontName name;
-        bool isInterned = false;  // a name is, once it is asked for
+        bool isInterned = false;  // the name is of the pool; so once asked for
     };
 
     CRichTextFontTable() = default;

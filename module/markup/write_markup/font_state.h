@@ -34,7 +34,8 @@ public:
     // Takes over the other state's present look.
     void SetValuesFrom(CFontState const* other);
 
-    // These change the present look and leave it pending, also when the value is the one there.
+    // These change the present look and leave it pending, even when the value is the same as
+    // before.
     void SetFontName(FontName const& name);
     void SetCharSet(Charset charset);
     void SetPitchAndFamily(int pitchAndFamily);
@@ -46,11 +47,11 @@ public:
     void SetFontSize(double size);
     // `bForce` non-zero: what was emitted counts as another alignment.
     void SetBaseAlignment(VerticalAlignment alignment, signed char bForce);
-    // Of the outermost level when `bBase` is non-zero, else the present one.
+    // The alignment of the outermost level when `bBase` is non-zero, else that of the present look.
     [[nodiscard]] VerticalAlignment GetBaseAlignment(signed char bBase) const;
 
-    // What the text begins with; nothing is pending for it. The first overwrites all that the
-    // others set.
+    // Set the look with which the text begins, and leave nothing pending. InitializeFontName
+    // overwrites what the other two set.
     void InitializeFontName(
         FontName const& name, bool bold, bool italic, Charset charset, int pitchAndFamily);
     void InitializeColor(int index, unsigned int rgb);
@@ -62,7 +63,7 @@ public:
     // The codes from what was emitted to the present look. A return to the outermost look is the
     // closing brace alone.
     [[nodiscard]] CStdStrW EmitStateInMText();
-    // The braces that are open, closed.
+    // Closing braces for all groups that are still open.
     [[nodiscard]] CStdStrW EmitTerminatingStateInMText();
 
 protected:

@@ -78,8 +78,8 @@ CStdStrW CFontState::fileCode(CStdStrW const& file) const {
 }
 
 // Written as a file when the font map has one for the face, else as a face. The file form keeps
-// charset 1; the face form writes the system's charset in its place. What files the machine has for
-// a face counts only for the face of the pairs.
+// charset 1; the face form writes the system's charset in its place. Only for the face of the pairs
+// may the file also be one of the machine's; for others the table decides.
 CStdStrW CFontState::newFaceCode() const {
     CStdStrW const& name = m_current.m_sFontName.text();
     bool const bold = m_current.m_bBold;

@@ -61,7 +61,7 @@ CStdStrW CRichTextToMTextContext::parseOnce(std::wstring const& text) {
     return finished(std::move(Close()));
 }
 
-// Nothing that was learned of another document serves this one.
+// What was learned of an earlier document does not hold for this one, so it is dropped.
 void CRichTextToMTextContext::run(wchar_t const* text, std::size_t length) {
     if (!isOpen()) Grow();
     forgetFaceCodes();
@@ -74,7 +74,8 @@ void CRichTextToMTextContext::run(wchar_t const* text, std::size_t length) {
 
 CStdStrW CRichTextToMTextContext::finished(CStdStrW markup) {
     if (CStdStrW const defaults = InitialDefaults(); !defaults.empty()) markup.insert(0, defaults);
-    // Looks at the letters alone, so that a backslash and a "P" of the text go too.
+    // Compares the two last characters only, so that a "P" after an escaped backslash of the text
+    // is taken for a paragraph mark too.
     while ((m_nOptions & kKeepTrailingParagraphs) == 0 && endsInParagraph(markup))
         markup.resize(markup.size() - 2);
     markup += EmitTerminatingStateInMText();

@@ -136,7 +136,7 @@ private:
     double m_dTracking = 1.0;
     double m_dCharWidth = 1.0;
     double m_dOblique = 0.0;
-    // Set by the first half of a stack's marker and by no group's end undone.
+    // Set by the first half of a stack's marker; the end of a group does not undo it.
     bool m_bInStack = false;
     bool m_bSwallowTokens = false;  // words are read but not acted on
     bool m_bStackSeen = false;

@@ -101,8 +101,8 @@ void CRichTextToMTextContext::onSymbol(wchar_t const*& cursor) {
     }
 }
 
-// A backslash of the text, which the markup has doubled; single where it begins a character's code,
-// and everywhere after a stack.
+// An escaped backslash of the document. The markup doubles it, except where it begins the code of a
+// character, and everywhere after a stack.
 void CRichTextToMTextContext::onEscapedBackslash(wchar_t const*& cursor) {
     wchar_t const* const backslash = cursor - 1;
     if (*cursor == L'S') m_bSwallowTokens = m_bStackSeen = true;

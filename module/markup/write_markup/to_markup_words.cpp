@@ -255,7 +255,7 @@ void CRichTextToMTextContext::OnRightDoubleQuote(wchar_t const*&, int) {
     appendReplacement(kRightDoubleQuote);
 }
 
-// Always takes one character after the word for its substitute, also a backslash.
+// The one character after the word is always dropped as its substitute, even a backslash.
 void CRichTextToMTextContext::OnUnicode(wchar_t const*& cursor, int value) {
     (void)GetCharacterMBCS(cursor, m_nCodePage);  // not shown
     PreEmitChar();

@@ -111,7 +111,7 @@ void CMTextToRichTextContext::run(wchar_t const* text, std::size_t length) {
     convert(text);
 }
 
-// Nothing that was learned of another text serves this one.
+// What was learned of an earlier text does not hold for this one, so it is dropped.
 void CMTextToRichTextContext::startRun(wchar_t const* text) {
     if (!isOpen()) Grow();
     chars_ = 0;

@@ -73,7 +73,7 @@ void CMTextToRichTextContext::convert(wchar_t const* cursor) {
     AppendToken(L"par");
 }
 
-// Characters that nothing comes between, at once.
+// Writes a run of plain characters in one piece.
 wchar_t const* CMTextToRichTextContext::convertRun(wchar_t const* cursor) {
     wchar_t const* end = cursor + 1;
     while (end - cursor < kLongestRun && isPlain(*end))
@@ -141,7 +141,7 @@ bool CMTextToRichTextContext::needsFontSwap(wchar_t c) {
     return swapState_ == SwapState::yes && (c & 0xFF00) == 0;
 }
 
-// Ends bold and italic, which the character after it goes without.
+// Also switches bold and italic off, so that the character after it is written without them.
 void CMTextToRichTextContext::appendFontSwap(Charset charset) {
     State const& state = top();
     AppendToken(L"f", AddFont(state.font.text().c_str(), charset, state.pitchAndFamily));

@@ -19,8 +19,8 @@ void CMTextToRichTextContext::onStack(wchar_t const*& cursor) {
     appendStack(rebuiltStack(GetString(cursor)));
 }
 
-// A size that waits is written at the outermost level; in a group it stays pending, and the stack
-// takes the factor as its own.
+// At the outermost level a pending size is written now. In a group it stays pending, and the stack
+// carries the factor of that size in per cent.
 void CMTextToRichTextContext::appendStack(std::wstring_view text) {
     int percent = 100;
     if (m_nPendingFontSize != 0) {
