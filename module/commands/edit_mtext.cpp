@@ -15,7 +15,7 @@
 
 namespace {
 
-// How the command passes its arguments on to the gate.
+// The arguments of the command, which go on to the editor.
 struct EditorSide {
     MTETabType tab;
     bool interactive;
@@ -33,8 +33,8 @@ void runReported(EditReport const& report, Edit edit) {
     if (edit() == kEditorAccepted) report.success();
 }
 
-// Edits the first text of the set. A set whose length the host does not tell is left alone, and
-// freed neither: the host does that when the command ends.
+// Edits the first text of the set. A set whose length the host does not tell is neither edited nor
+// freed here; the host frees it when the command ends.
 void editSelected(long long* set, EditReport const& report, EditorSide const& side) {
     int length = 0;
     if (tzedSSLength(set, &length) != Tzad::ePromptNormal) return;
@@ -45,8 +45,8 @@ void editSelected(long long* set, EditReport const& report, EditorSide const& si
     });
 }
 
-// Asks until something or nothing was hit; false when the user cancelled. A pick at nothing leaves
-// the name zero, which is no object's, so the editor is not reached.
+// Asks until an entity is picked or a pick hits nothing; false when the user cancelled. A pick that
+// hits nothing leaves the name zero; no object has that name, so no editor opens.
 bool pickOne(long long* name) {
     TzString const prompt = gStringTable[kText.pickText];
     for (;;) {
@@ -101,7 +101,7 @@ int EditMtextByAdsName(long long* name, MTETabType tab, bool interactive, bool v
 
 int EditMtextInSelectionSet(long long* set, MTETabType tab, bool interactive, bool view) {
     long long name[2] = {};
-    // Without a first entity the name stays that of no object.
+    // When the set has no first entity the name stays zero, which is the name of no object.
     (void)tzedSSName(set, 0, name);
     return EditMtextByAdsName(name, tab, interactive, view);
 }

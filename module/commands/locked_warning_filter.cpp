@@ -9,8 +9,8 @@ namespace {
 constexpr int kEveryHook = 15;
 constexpr int kGrowth = 8;
 
-// Whether the entity's layer alone keeps it from being written. One that another holder has open
-// cannot tell, and counts as unlocked.
+// Whether the host refuses to open the entity for write because its layer is locked. An entity that
+// another holder has open is refused for that reason instead, and counts as unlocked.
 bool isLocked(TzDbObjectId id) {
     EasyObject<TzDbEntity> entity;
     Tzad::ErrorStatus const read = tzdbOpenObject(entity.object, id, TzDb::kForRead);
@@ -37,7 +37,7 @@ void TzLockedWarningFilter::endSSGet(int /*status*/,
     for (int index = 0; index < selectionSet.length(); ++index)
         if (isLocked(selectionSet[index])) locked.append(index);
     m_counts = {selectionSet.length(), locked.length()};
-    (void)service.remove(locked);  // the indices are the array's own
+    (void)service.remove(locked);  // all indices lie in the array
 }
 
 void TzLockedWarningFilter::sendWarning(TzString warningId,

@@ -12,8 +12,8 @@ struct FilterCount {
     int locked = 0;
 };
 
-// Takes the entities on locked layers out of the selection that ends while it lives, and counts
-// them.
+// While this filter lives, it takes the entities on locked layers out of a selection that ends, and
+// counts them.
 //
 //   TzLockedWarningFilter const filter(tzDocManagerPtr()->curDocument());
 //   (void)selectMText(set, L"_I", KindCode::result);
@@ -26,7 +26,7 @@ public:
     TzLockedWarningFilter& operator=(TzLockedWarningFilter const&) = delete;
     ~TzLockedWarningFilter() override;
 
-    // Zeros before a selection that held something has ended.
+    // Zeros until a selection that held an entity has ended.
     [[nodiscard]] FilterCount counts() const { return m_counts; }
 
     void endSSGet(int status,
@@ -35,8 +35,8 @@ public:
                   TzArray<TzDbObjectId> const& selectionSet) override;
 
     // Warns once: `lockedLine` for each locked entity, the number found, and the number locked, for
-    // which there is a text of its own when it is one. The whole is a format to the host, so none
-    // of the texts may hold a stray percent sign.
+    // which there is a text of its own when it is one. The host reads the warning as a format, so
+    // none of the texts may hold a stray percent sign.
     static void sendWarning(TzString warningId,
                             TzString lockedLine,
                             TzString foundFormat,

@@ -25,8 +25,8 @@ void setHeightForSelectedMText(long long const* set) {
     report.begin();
     if (!command.DoHeightPrompt(false) || length == 0) return;
 
-    // What became of the entity that was reached last, which alone decides about the report: 0 once
-    // its id was had, also when it did not open.
+    // The status of finding the id of the last entity; it alone decides whether a success is
+    // reported. It is 0 also when that entity could not be opened.
     int last = kNothingReached;
     for (int index = 0; index < length; ++index) {
         long long name[2] = {};

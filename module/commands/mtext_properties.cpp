@@ -79,7 +79,8 @@ void changeTextStyle(long long const (&set)[2]) {
     changeTextPropery(set, [style](TzDbMText* text) { (void)text->setTextStyle(style); });
 }
 
-// An empty answer is none: the angle in the question only tells how the first text stands.
+// An empty answer changes nothing: the angle that the question shows is no default, it only tells
+// the rotation of the first text.
 void changeTextRotate(long long const (&set)[2]) {
     int const degrees =
         static_cast<int>(std::lround(firstText(set).rotation * kDegrees / std::numbers::pi));
@@ -112,7 +113,7 @@ constexpr Property kProperties[] = {
     {L'J', changeTextJustify},
 };
 
-// Alike in every language; the text of the question shows them.
+// The words are the same in every language, and the text of the question shows them.
 constexpr wchar_t kPropertyWords[] = L"Style Rotate Justify";
 
 void report(FilterCount counts) {

@@ -30,7 +30,7 @@ CTzadFontMapDatabase::CTzadFontMapDatabase(signed char flag) {
         m_sTechnologyRaster = loadResourceString(kText.rasterFace);
         m_sTechnologyVector = loadResourceString(kText.vectorFace);
     }
-    // During construction these are the operations of this class, whatever derives from it.
+    // A constructor calls the operations of its own class, never those of a derived class.
     if (!CTzadFontMapDatabase::IsDatabaseLoaded()) CTzadFontMapDatabase::LoadContents(flag);
 }
 

@@ -115,7 +115,7 @@ CStdStrW CMTextFontMapDatabase::MapFileToFont(
         charset = entry.m_eCharset;
         pitch = entry.m_nPitch;
         type = entry.m_eMapType;
-        file = entry.m_sFaceName;  // in the memory of the copy that was handed in
+        file = entry.m_sFaceName;  // reuses the memory of the argument
         return file;
     }
     if (IsBigfontFilespec(file)) {
@@ -138,7 +138,7 @@ CStdStrW CMTextFontMapDatabase::MapFontToFile(
     MapType& type, CStdStrW face, bool bold, bool italic, Charset charset, int pitch) {
     if (auto const* const entry = fontEntry(*this, face, bold, italic, charset, pitch)) {
         type = entry->m_eMapType;
-        face = entry->m_sFileName;  // in the memory of the copy that was handed in
+        face = entry->m_sFileName;  // reuses the memory of the argument
         return face;
     }
     type = MapTypeSystem;

@@ -35,7 +35,8 @@ bool CEnumerateMappedFonts::EnumeratedKey(TzString const& key) {
     bool const italic = numberField(rest) != 0;
     auto charset = static_cast<Charset>(numberField(rest));
     int const pitch = numberField(rest);
-    // The last charset is the file's own; the others only lead back to it.
+    // The file maps to the face with the last charset. The face with any of the others maps back to
+    // the file.
     while (!rest.empty()) {
         if (!m_bOneWay) leadBack(descriptionKey(face, bold, italic, charset, pitch), key, m_eType);
         charset = static_cast<Charset>(numberField(rest));

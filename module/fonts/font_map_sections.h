@@ -22,8 +22,8 @@ private:
     signed char m_bOneWay;  // the low eight bits of the key's number: 256 reads as 0
 };
 
-// Lets a described face lead to a file, in the place of the one that it led to; a folder before
-// the file does not count.
+// Maps a described face to a file, in the place of an earlier mapping; a folder before the file's
+// name is dropped.
 void leadBack(TableKey const& face, CStdStrW const& file, CMTextFontMapDatabase::MapType type);
 
 // Cuts the first field, up to a comma, off `rest`; without a comma all of it.

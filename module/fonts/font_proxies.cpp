@@ -1,4 +1,4 @@
-// Faces that are lent to files which nobody can name.
+// Faces that are lent to files for which no face is known.
 
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
@@ -72,7 +72,7 @@ void CMTextFontMapDatabase::FixupFontBox(CMTextFontList* list) {
         case MapTypeShx: list->AddShxFont(entry.m_sFaceName); break;
         case MapTypeProxy: list->AddAssignedProxy(entry.m_sFaceName, key); break;
         case MapTypeMisc: list->AddMiscFont(entry.m_sFaceName); break;
-        default: break;  // nothing reaches the list for the others
+        default: break;  // the list is not offered entries of other types
         }
     }
     for (int index = m_nProxiesAssigned;; ++index) {

@@ -5,12 +5,12 @@
 namespace {
 
 wchar_t lowerOf(wchar_t c) {
-    // Names are mostly ASCII, and the host's table is a call away.
+    // Most letters of names are ASCII; lowering them here saves a call of the host for each.
     if (c < 0x80) return c >= L'A' && c <= L'Z' ? c + (L'a' - L'A') : c;
     return tzToLower(c);
 }
 
-// Bold and italic as digits of a description, by twice the one plus the other.
+// Bold and italic as a description words them; the index is 2 * bold + italic.
 constexpr std::wstring_view kStyles[] = {L"|b0|i0|c", L"|b0|i1|c", L"|b1|i0|c", L"|b1|i1|c"};
 
 }  // namespace

@@ -22,9 +22,9 @@ public:
 private:
     static constexpr std::size_t kShort = 80;
 
-    wchar_t short_[kShort];  // the key, until it grows beyond
+    wchar_t short_[kShort];  // the key while it fits
     std::size_t size_ = 0;   // of what short_ holds
-    std::wstring long_;      // else the key; empty before
+    std::wstring long_;      // the key once it is too long for short_; else empty
 };
 
 // Lower case in place, by the same table as CStdStr::MakeLower but without a call for each letter.

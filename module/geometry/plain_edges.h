@@ -2,6 +2,6 @@
 
 #include "tz/gi/draw.h"
 
-// Lines and text of a preview stand as they are, without the edge effects of the visual style. To
-// be called before the preview draws.
+// Makes the host draw the lines and texts of a preview without the edge effects of the visual
+// style. Call it before the preview draws.
 void drawPlainEdges(TzGiWorldDraw& draw);

@@ -14,6 +14,6 @@ bool CEasyUpgrade::Upgrade(TzDbObject* toUpgrade) {
 }
 
 void CEasyUpgrade::Downgrade() {
-    if (object) (void)object->downgradeOpen();  // refused, it is open for write until it is closed
+    if (object) (void)object->downgradeOpen();  // if refused, it stays open for write
     object = nullptr;
 }

@@ -2,7 +2,7 @@
 
 class TzDbObject;
 
-// Makes an object writable for a while and gives that back.
+// Makes an object that is open for read writable, and gives the write back at the end.
 //
 //   CEasyUpgrade writable;
 //   if (!text->isWriteEnabled() && !writable.Upgrade(text)) return;

@@ -1,5 +1,5 @@
 #pragma once
 
-// The number of the system's code page: the variable SYSCODEPAGE after its last underscore, or
-// whole without one. 0 when no number stands there.
+// The number of the system's code page: the part of the variable SYSCODEPAGE after its last
+// underscore, or the whole value when it has no underscore. 0 when that is no number.
 [[nodiscard]] int SysCodePage();

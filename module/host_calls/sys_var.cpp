@@ -7,7 +7,7 @@
 
 namespace {
 
-// A variable as it was read; the string of the host's goes with it.
+// A variable as it was read. Releases the string that the host gave, if it gave one.
 class VariableValue {
 public:
     explicit VariableValue(wchar_t const* name) { (void)tzedGetVar(name, &value); }

@@ -7,8 +7,9 @@
 //   CLinearUnitConverter const length(kLinearUnitsOfDrawing, kPrecisionOfDrawing);
 //   TzString const shown = length.MapDoubleToUnit(15.5);  // "15.5000"
 //
-// Nothing is reported: what has no text gives the empty text, what cannot be read gives 0. A text
-// read back from a low precision differs from the value that it came from.
+// No failure is reported: a value that the host cannot write gives the empty text, and a text that
+// it cannot read gives 0. A text read back from a low precision differs from the value that it came
+// from.
 
 enum LinearUnits : int {
     kLinearUnitsOfDrawing = -1,  // the variable LUNITS
@@ -34,7 +35,7 @@ public:
     virtual ~CUnitConverter() = default;
     // The text, cut at 127 characters; empty when the host has none.
     [[nodiscard]] virtual TzString MapDoubleToUnit(double value) const = 0;
-    // The value, 0 when the text is none; `ok` may be null and then takes whether it is one.
+    // The value, or 0 when the text is no such number. `ok` tells which; it may be null.
     [[nodiscard]] virtual double MapUnitToDouble(TzString const& text, bool* ok) const = 0;
     // The variable's whole number, 0 for one that has none.
     [[nodiscard]] static int GetVariable(wchar_t const* name);

@@ -93,7 +93,7 @@ TzGePoint3d samplePosition(BoxCorners const& corners,
                            int attachment,
                            double textSize,
                            double textWidth) {
-    // Vertical text is set in by half its size at the left alone.
+    // Vertical text differs only at the left: it begins half its size to the right of the corner.
     switch (placeOfAttachment(attachment).column) {
     case BoxColumn::centre:
         return corners.topLeft + (corners.topRight - corners.topLeft) / 2 - frame.y * textSize -

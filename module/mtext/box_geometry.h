@@ -35,8 +35,8 @@ struct BoxEdges {
 };
 
 // Lays the box between a base point and a point, which is projected on the base point's plane. The
-// corners take their names however the drag goes; while both points are equal nothing is put in
-// order. A corner that cannot be found stays as it was.
+// corners are named by where they stand, in whatever direction the drag goes; while both points are
+// equal they keep their names. A corner that cannot be found stays as it was.
 void stretchBox(BoxCorners& corners,
                 TzGePoint3d const& base,
                 TzGePoint3d const& point,
@@ -57,7 +57,7 @@ void stretchBox(BoxCorners& corners,
 [[nodiscard]] std::array<TzGePoint3d, 8>
 arrowOutline(BoxEdge const& edge, UserAxes const& frame, LineFlow flow, double size);
 
-// Where the sample text begins that stands in the box: `textSize` its height, `textWidth` its
+// Where the sample text in the box begins. `textSize` is the height of the text, `textWidth` its
 // width.
 [[nodiscard]] TzGePoint3d samplePosition(BoxCorners const& corners,
                                          UserAxes const& frame,

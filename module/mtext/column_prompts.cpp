@@ -1,5 +1,5 @@
-// The questions for the columns of a new text. Their defaults follow the text height, so that
-// defaults alone make a layout of the text's own scale.
+// The questions for the columns of a new text. Their defaults are multiples of the text height, so
+// that Enter at every question gives columns in proportion to the text.
 
 #include <iterator>
 
@@ -15,8 +15,8 @@
 
 namespace {
 
-// Only the bits for empty, zero and negative answers and for free text mean something; the rest of
-// this word has always been handed over.
+// Only the bits for empty, zero and negative answers and for free text have a meaning; the other
+// bits of this number change nothing and are kept.
 constexpr unsigned kCountFlags = 0x138F;
 constexpr int kDefaultCount = 2;
 

@@ -32,7 +32,7 @@ constexpr int kMadeText = 0x98;
 // What a text is made for.
 enum class Purpose { drawing, attribute };
 
-// A value that the text refuses leaves the text's own, here and below: it is made all the same.
+// Here and below: when the text refuses a value it keeps its own, and it is made all the same.
 void fillEntity(TzxMtextCommand const& command,
                 TzDbMText& text,
                 TzDbObjectId style,
@@ -51,7 +51,7 @@ void fillEntity(TzxMtextCommand const& command,
     (void)text.setWidth(command.boxWidth);
 }
 
-// The columns share the box's width; gutters that would eat all of it are dropped.
+// The columns share the box's width; gutters that would take all of it are dropped.
 void setStaticColumns(TzxMtextCommand& command, TzDbMText& text) {
     TextEditorColumns& columns = command.columns;
     int const gutters = columns.columnCount - 1;
@@ -119,8 +119,8 @@ bool editText(TzxMtextCommand const& command, EasyObject<TzDbMText>& text, Purpo
     return true;
 }
 
-// The options become what the drawing's next text begins with. What the drawing refuses stays as it
-// is.
+// Stores the options as the drawing's defaults for its next text. A default for which the drawing
+// refuses the value stays as it is.
 void storeDefaults(TzxMtextCommand& command, TzDbObjectId style) {
     TzDbDatabase* const database = tzdbHostApplicationServices()->workingDatabase();
     if (StyleIsAnnotative(database->textstyle())) command.textHeight *= annotationScale();

@@ -21,7 +21,7 @@ Tzad::ErrorStatus evaluate(TzDbField& field) {
 TzString withFieldsEvaluated(TzString const& text) {
     if (!tzdbHasFields(text, 1)) return text;
     auto const field = std::make_unique<TzDbField>();
-    (void)field->setFieldCode(text, 0, nullptr);  // refused, it has no value
+    (void)field->setFieldCode(text, 0, nullptr);  // if refused, the field has no value
     TzString const result =
         evaluate(*field) == Tzad::eOk ? field->getFieldCode(kEvaluatedText) : text;
     (void)field->close();
@@ -39,5 +39,5 @@ void evaluateField(TzDbObjectId text) {
     if (tzdbOpenObject(opened.object, text, TzDb::kForRead) != Tzad::eOk) return;
     EasyObject<TzDbField> field;
     if (opened->getField(kTextFieldKey, field.object, TzDb::kForWrite) != Tzad::eOk) return;
-    (void)evaluate(*field.object);  // without a value the field shows that it has none
+    (void)evaluate(*field.object);  // a field that fails shows "####"
 }

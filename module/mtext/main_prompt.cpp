@@ -54,7 +54,7 @@ void printStatusLine(TzxMtextCommand const& command) {
 
 bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
     if (StyleIsAnnotative(GetTextStyleID(styleName)))
-        (void)tzedInvokeAnnoSelectScaleDlg();  // whatever it answers, the scale in force counts
+        (void)tzedInvokeAnnoSelectScaleDlg();  // the scale in force counts, whatever this returns
     if (!forAttribute) printStatusLine(*this);
 
     CTzsMtextFirstPointJig jig(TzGePoint3d::kOrigin);
@@ -67,7 +67,7 @@ bool TzxMtextCommand::DoMainPrompt(bool forAttribute, bool wantSecondPoint) {
         if (status == statusCancel) return false;
     }
 
-    // What the host refuses here stays as it is; the corner holds without it.
+    // A value that the host refuses here stays as it is; the corner is taken all the same.
     TzGePoint3d const corner = jig.cursor();
     setCoordinates(firstCornerUcs, corner);
     (void)tzdbWcs2Ucs(firstCornerUcs, firstCornerUcs, false);

@@ -20,7 +20,8 @@ TzDbDatabase& workingDatabase() {
     return *tzdbHostApplicationServices()->workingDatabase();
 }
 
-// Ortho mode off, and back as it was on every way out. A drawing that refuses keeps its mode.
+// Switches ortho mode off and, on every way out, back to what it was. A drawing that refuses keeps
+// its mode.
 class WithoutOrtho {
 public:
     WithoutOrtho() : before_(workingDatabase().orthomode()) {

@@ -20,7 +20,8 @@ public:
     explicit CTzsMtextJig(TzGePoint3d const& first);
 
     // Turns the box's frame and stretches the box to its bottom right corner anew. After a drag up
-    // or to the left that corner may be the first one: the box is then closed until the next move.
+    // or to the left that corner may be the first one; the box then has no size until the next
+    // move.
     void SetRotation(double radians);
     // 1 to 9; with any other neither top nor bottom is drawn, and the box counts as attached at its
     // first corner.
@@ -38,8 +39,8 @@ public:
     // The line type of the box: the drawing's first one, when it is solid, else the null id.
     [[nodiscard]] static TzDbObjectId GetSolidLine();
     static void DrawLine(TzGiWorldDraw* draw, TzGePoint3d const& a, TzGePoint3d const& b);
-    // On the inner side of an edge, unless the box is too small; flipped for the edge at the
-    // bottom.
+    // Draws the arrow on the inner side of an edge, unless the box is too small for it. `flip`
+    // turns the arrow round, for the edge at the bottom.
     void
     DrawArrow(TzGiWorldDraw* draw, TzGePoint3d const& a, TzGePoint3d const& b, bool flip) const;
     void DrawOpenTop(TzGiWorldDraw* draw) const;

@@ -15,8 +15,8 @@ inline constexpr int kSampleColor = 253;
 [[nodiscard]] double rotationOfCurrentStyle();
 // Whether the current style runs from top to bottom.
 [[nodiscard]] bool isCurrentStyleVertical();
-// The current style at a text size, upright and readable whatever it says; without a current style
-// a plain one, its size and direction left alone.
+// The current style at a text size, but never upside down or backward. When there is no current
+// style, a plain one that ignores both arguments.
 [[nodiscard]] TzGiTextStyle sampleTextStyle(double size, bool vertical);
 // The text itself, of the drafter's choice; may be empty.
 [[nodiscard]] TzString sampleText();

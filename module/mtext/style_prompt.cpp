@@ -23,7 +23,7 @@ bool TzxMtextCommandBase::DoStylePrompt() {
             EnumerateStyles();
             continue;
         }
-        // Nothing was asked for: a failed question leaves the style too.
+        // No name was given, which is also so when the question failed: the style stays.
         if (answer.isEmpty()) return true;
         if (IsStyleNameOK(answer) && answer.find(kExternalStyleMark) == -1) {
             styleName = answer;

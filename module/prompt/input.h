@@ -47,8 +47,8 @@ public:
     [[nodiscard]] virtual TzString KeywordList() const;
     // One part of a keyword's text; empty for an id that is not in the table.
     [[nodiscard]] virtual TzString GetKeywordString(unsigned int id, bool local) const;
-    // The prompt with brackets and default, without the colon. The body gives what stands in the
-    // brackets.
+    // The prompt with brackets and default, without the colon. The body in this class gives what
+    // stands in the brackets.
     [[nodiscard]] virtual TzString PromptString() const = 0;
     // The two steps of Prompt: arms the host for the next question; asks the host for the status.
     virtual void Init();

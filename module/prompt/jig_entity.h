@@ -17,7 +17,7 @@ class CTzsJigEntity : public TzDbEntity {
 public:
     // What the host draws: the preview itself.
     [[nodiscard]] virtual TzDbEntity* GetJigEntity();
-    // A sample of the cursor. The body says that nothing changed.
+    // Takes a sample of the cursor. The body in this class returns that nothing changed.
     [[nodiscard]] virtual TzEdJig::DragStatus OnSample(TzEdJig& jig) = 0;
     // Called when a sample changed something; true to be drawn.
     [[nodiscard]] virtual bool OnUpdate(TzEdJig& jig);

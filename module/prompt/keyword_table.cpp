@@ -19,7 +19,7 @@ void CKeywordTable::GetKeywords(int index, TzString& local, TzString& global) co
     TzString const& text = keywordStrings[index];
     int const separator = text.find(gsLocalizationSeparator.kwszPtr());
     local = separator == -1 ? text : text.left(separator);
-    // Without a separator, -1 plus its length leaves all but the first character.
+    // Without a separator `separator` is -1, so that only the first character is left out.
     global = text.mid(separator + gsLocalizationSeparator.length());
 }
 

@@ -21,7 +21,7 @@ void CTzsPointInput::GetPoint(double* point) const {
 
 void CTzsPointInput::GetPointInWorldCS(double* point) const {
     GetPoint(point);
-    (void)tzdbUcs2Wcs(point, point, false);  // refused, the coordinates stay as they were given
+    (void)tzdbUcs2Wcs(point, point, false);  // if refused, they stay user coordinates
 }
 
 TzString CTzsPointInput::PromptString() const {

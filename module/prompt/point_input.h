@@ -8,7 +8,7 @@ public:
     BasePoint() = default;
     // Null means none.
     explicit BasePoint(double const* point);
-    // Null without one.
+    // Null when there is no point.
     [[nodiscard]] double const* pointer() const { return isGiven_ ? point_ : nullptr; }
 
 private:

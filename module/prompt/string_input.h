@@ -8,7 +8,7 @@
 //   if (input.Prompt() == statusNormal) use(input.GetInput());
 class CTzsStringInput : public CTzsInput {
 public:
-    // Without spaces a blank ends the answer.
+    // When spaces are not allowed, a blank ends the answer.
     CTzsStringInput(unsigned int theFlags,
                     CKeywordTable& table,
                     TzString const& prompt,

@@ -29,8 +29,9 @@ bool always() {
     return true;
 }
 
-// MTEXTCOMMANDACTIVE stays 1 when an exception passes. The command runs whether or not the host
-// keeps that variable, and a text that was not accepted was not made.
+// When an exception passes, MTEXTCOMMANDACTIVE stays 1. The command runs also when the host refuses
+// to set that variable. The result of CreateObject is not needed, since it deletes a text that the
+// user did not accept.
 void runMtext(bool (*commandLineEditor)()) {
     gdJigBoundBoxHeight = 0;
     std::unique_ptr<TzxMtextCommand> const command(newTzxMtextCommand());

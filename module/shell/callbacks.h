@@ -1,7 +1,8 @@
 #pragma once
 
 // What the host calls when a command starts, one for each command. Each makes its command object,
-// runs it and lets it go; nothing survives but system variables and the exported globals.
+// runs it and deletes it. Only system variables and the exported globals carry values from one run
+// to the next.
 
 void ImprovedMtextCallback();        // MTEXT
 void CompatibleMtextCallback();      // -MTEXT

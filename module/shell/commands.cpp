@@ -20,8 +20,8 @@ struct Command {
     void (*callback)();
 };
 
-// Registered in this order. The last one is added on its own: with another flag, silently and
-// without help.
+// Registered in this order. The last one is added in another way: with one more flag, and with
+// neither a line in the debug output nor help.
 constexpr std::array<Command, 7> kCommands{{
     {&gsEditMtext_GlobalName, &gsEditMtext_LocalName, L"MTEDIT", kText.mteditCommand,
      EditMtextCallback},

@@ -6,8 +6,8 @@
 // The module's front door: the host sends every message through tzrxEntryPoint, which hands it on.
 
 // Loads, unloads, serves the functions of the interpreter; 0, or 3 for a failure. Any message that
-// is none of the five does nothing and gives 0. `appHandle` counts for loading alone.
+// is none of the five does nothing and gives 0. `appHandle` is used only when the module is loaded.
 [[nodiscard]] int tzrxEntryPoint_Mte(TzRx::AppMsgCode message, void* appHandle);
 
-// Never attached: the module has no thread but the host's.
+// Never holds a handle, since the module starts no thread.
 extern CHandleObject ghBackgroundThread;

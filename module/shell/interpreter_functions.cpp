@@ -53,7 +53,8 @@ bool invokeFunction() {
     if (first && first->restype == Tzad::eResultEntityName) {
         MTETabType const tab = code == kEdit ? kMTETabText : kMTETabProperties;
         long long name[] = {first->resval.rlname[0], first->resval.rlname[1]};
-        // The gate has told what there is to tell; the call itself has worked.
+        // Any message has been shown by then, and the call counts as successful whatever the result
+        // is.
         (void)EditMtextByAdsName(name, tab, true, true);
     } else {
         tzutPrintf(gStringTable[kText.needsEntity]);

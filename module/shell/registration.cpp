@@ -31,5 +31,5 @@ void unregisterService() {
     if (services) delete services->remove(gsServiceName);
 }
 
-// Nothing calls it; other modules of the host may hold its name.
+// The module never calls it; other modules of the host may refer to it by name.
 void UpdateCommandName(TzString&, TzString&) {}

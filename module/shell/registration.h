@@ -9,8 +9,8 @@ void registerService();
 // The names of the seven commands: fixed global ones, and local ones from the resources, empty when
 // missing.
 void InitGlobalStrings();
-// Adds the commands under those names to the module's group. But for MTEXTPROPERTIES each one is
-// told to the debug output and gets its help registered.
+// Adds the commands under those names to the module's group. Each command but MTEXTPROPERTIES is
+// also reported to the debug output and gets help.
 void registerCommands();
 
 // For one drawing: false as soon as the host refuses a function; those defined before it stay.
@@ -19,7 +19,7 @@ void undefineFunctions();
 // Runs the function that the interpreter called; false for one without a body.
 [[nodiscard]] bool invokeFunction();
 
-// They take back what was registered, and do no harm when it was not.
+// These take back what was registered, and change nothing when it was not registered.
 void unregisterClasses();
 void unregisterService();
 void unregisterCommands();

@@ -4,9 +4,9 @@
 
 // The colours, 0x00BBGGRR, that "as the layer" and "as the block" mean for a text.
 
-// Of that layer; white when it cannot be opened.
+// The colour of that layer; white when the layer cannot be opened.
 [[nodiscard]] unsigned int layerColor(TzDbObjectId layer);
-// Of the layer in force; white when it cannot be opened.
+// The colour of the layer in force; white when the layer cannot be opened.
 [[nodiscard]] unsigned int GetCurrentDrawingByLayerColor();
-// White.
+// Always white.
 [[nodiscard]] unsigned int GetCurrentDrawingByBlockColor();

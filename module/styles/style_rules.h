@@ -16,7 +16,7 @@ class TzDbTextStyleTableRecord;
 [[nodiscard]] wchar_t const* GetCurrentTextStyleName();
 // The style with that name, as the drawing's table compares names; the null id when there is none.
 [[nodiscard]] TzDbObjectId GetTextStyleID(TzString const& name);
-// The same two with a status: false leaves `name` as it is, and `style` null.
+// The same two questions with a status. On false, `name` stays as it is and `style` is null.
 [[nodiscard]] bool GetTextStyleNameFromID(TzDbObjectId const& style, TzString& name);
 [[nodiscard]] bool GetIDFromTextStyleName(TzString const& name, TzDbObjectId& style);
 
@@ -27,7 +27,8 @@ class TzDbTextStyleTableRecord;
 // The names of styles that belong to an external reference hold this; they cannot be chosen.
 inline constexpr wchar_t kExternalStyleMark = L'|';
 
-// Drawing units to one unit of an annotative text's own height, the variable CANNOSCALEVALUE.
+// How many drawing units one unit of an annotative text's own height is: the variable
+// CANNOSCALEVALUE.
 [[nodiscard]] double annotationScale();
 
 // The text height to begin with, in drawing units: the style's own, over the annotation scale for

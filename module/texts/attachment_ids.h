@@ -5,7 +5,7 @@
 #include "module/texts/text_ids.h"
 #include "tz/db/mtext.h"
 
-// Attachment points against the ids of their keywords.
+// Attachment points and the ids of their keywords, in both directions.
 
 // The keywords of the points in the order of their numbers, which is also the prompt's order.
 inline constexpr std::array<unsigned int, 9> kAttachmentKeywords{

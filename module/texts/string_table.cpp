@@ -26,7 +26,8 @@ TzString TzStringTable::operator[](unsigned int id) const {
         result += rest.left(open);
         rest = rest.mid(open + 1);
         int const close = rest.find(L'}');
-        // A brace that closes too late or never stands for itself, and ends the expansion.
+        // When the closing brace is missing or stands too late, the opening brace is plain text,
+        // and so is the rest.
         if (close == -1 || close >= kClosingBraceLimit) return result + L"{" + rest;
         result += valueOf(rest.left(close));
         rest = rest.mid(close + 1);

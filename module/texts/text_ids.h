@@ -5,7 +5,7 @@
 //
 //   tzutPrintf(gStringTable[kText.noStyleFound]);
 //
-// Nothing but ids stands in here, so that the whole is an array of them as well.
+// The struct holds nothing but ids, so that it can also be read as an array of them.
 struct TextIds {
     // Local names of the commands.
     unsigned int textalignCommand = 127;

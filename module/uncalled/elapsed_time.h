@@ -2,8 +2,9 @@
 
 #include <cstdint>
 
-// A tracing aid for developers: marks how long a block took in the debug output, nested blocks
-// indented. Nothing in the module builds one: whoever measures a block puts one there for a while.
+// A tracing aid for developers: writes to the debug output how long a block took, and indents
+// nested blocks. The module makes none: a developer who measures a block puts one into it for a
+// while.
 //
 //   CElapsedTime const timer(L"LoadContents");
 //   timer.Mark(L"files read");
