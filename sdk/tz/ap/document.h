@@ -27,8 +27,8 @@ public:
     // [any] Draws every view anew.
     virtual void redraw() = 0;
     // [any] Types a text at the document's command line as soon as it is idle: a blank or a line
-    // end ends an answer, but no blank behind a comma does. The three flags (activate, wrapped up,
-    // echo) change nothing here. 0, or a failing status without a document.
+    // end ends an answer, but a blank after a comma does not. The three flags (activate, wrapped
+    // up, echo) change nothing here. 0, or a failing status without a document.
     virtual int sendStringToExecute(
         TzApDocument* document, wchar_t const* text, bool activate, bool wrapUp, bool echo) = 0;
 };

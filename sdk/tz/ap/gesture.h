@@ -30,8 +30,8 @@ private:
 class TZ_API GestureProcessor {
 public:
     virtual ~GestureProcessor() = default;
-    // [command] Installs or removes a handler; the processor does not own it. False for a handler
-    // that is there already, or not.
+    // [command] Installs or removes a handler; the processor does not own it. Adding a handler that
+    // is already installed gives false, and so does removing one that is not.
     virtual bool addOverruleHandler(GestureOverruleHandler* handler) = 0;
     virtual bool removeOverruleHandler(GestureOverruleHandler* handler) = 0;
 };

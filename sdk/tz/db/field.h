@@ -36,8 +36,8 @@ protected:
 
 // [any] Whether a text holds field codes; the second argument is 1.
 [[nodiscard]] TZ_API bool tzdbHasFields(wchar_t const* text, int options);
-// [any] The next field at or behind `start`: its first character and the one behind it; false when
-// there is none.
+// [any] The next field at or after `start`: the index of its first character and that of the first
+// one after it; false when there is none.
 [[nodiscard]] TZ_API bool tzdbFindField(wchar_t const* text, int start, int& first, int& end);
 // [command] Tells the host that a text got a new field.
 TZ_API void tzedTextFieldModified(TzDbField* field);

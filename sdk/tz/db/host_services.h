@@ -13,7 +13,7 @@ public:
     // [any] Whether the drawing has a working set, and whether only its members may be edited now.
     [[nodiscard]] virtual bool hasWorkingSet() const = 0;
     [[nodiscard]] virtual bool isWorkingSetActive() const = 0;
-    // [any] An angle, radians, that the working set's place is turned by.
+    // [any] The angle, in radians, by which the place of the working set is turned.
     [[nodiscard]] virtual double workingAngle() const = 0;
 };
 

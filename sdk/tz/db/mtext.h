@@ -91,7 +91,7 @@ public:
     Tzad::ErrorStatus setColumnGutterWidth(double gutter);
     Tzad::ErrorStatus setColumnHeight(int column, double height);
 
-    // Behind the text.
+    // What is painted behind the text.
     [[nodiscard]] bool backgroundFillOn() const;
     Tzad::ErrorStatus setBackgroundFill(bool on);
     [[nodiscard]] TzCmColor backgroundFillColor() const;

@@ -19,7 +19,8 @@ enum OpenMode : int { kForRead = 0, kForWrite = 1, kForNotify = 2 };
 //   3. close
 // An object may be open for read many times at once, or for write once. An object that was never
 // added to a database counts as open for write and is deleted by its owner; `close` on it fails.
-// The host keeps the object between close and the next opening; its address is the host's business.
+// Between close and the next opening only the host reaches the object: callers keep its id, never
+// its address.
 //
 // Statuses: 0; 15 another holder has it open for read; 45 for write; 83 it is already open for
 // write; 87 its layer is locked (opening for write and upgrading; opening for read always works).
@@ -35,8 +36,8 @@ public:
     [[nodiscard]] bool isReadEnabled() const;
     [[nodiscard]] bool isWriteEnabled() const;
 
-    // [open] Gives the opening back; the pointer is not to be used afterwards. After a change the
-    // host's picture follows.
+    // [open] Gives the opening back; the pointer is not to be used afterwards. When the object was
+    // changed, the host brings its picture up to date.
     Tzad::ErrorStatus close();
     // [read-open] For write, by the holder that has it open for read alone. 83 when it is open for
     // write already, which changes nothing.

@@ -26,7 +26,7 @@ public:
 
 class TZ_API TzDbSymbolTableRecord : public TzDbObject {
 public:
-    // [any] Valid until the record is renamed or erased; null never.
+    // [any] Valid until the record is renamed or erased; never null.
     [[nodiscard]] wchar_t const* getName() const;
     // [write-open] Refuses a name that isValidSymbolName of tz/ed/prompts.h refuses, with
     // eInvalidSymbolName, and one that the table has.
@@ -47,8 +47,8 @@ public:
     // [read-open] The id of a record; eKeyNotFound and the null id when there is none.
     [[nodiscard]] Tzad::ErrorStatus getIdAt(wchar_t const* name, TzDbObjectId& id) const;
     [[nodiscard]] bool has(wchar_t const* name) const;
-    // [write-open] Takes a record over; a name that is there is refused and the record stays the
-    // caller's. The record then is open for write until its close.
+    // [write-open] Takes a record over; a name that the table already has is refused, and the
+    // record stays the caller's. The record then is open for write until its close.
     [[nodiscard]] Tzad::ErrorStatus addRecord(TzDbSymbolTableRecord* record, TzDbObjectId& id);
 
     static TzRxClass* desc();

@@ -9,8 +9,8 @@
 class TZ_API TzDbSymbolUtilityServices {
 public:
     virtual ~TzDbSymbolUtilityServices() = default;
-    // [any] 0 when both texts name the same symbol, which case does not decide; below or above 0 as
-    // the first stands before or after the second.
+    // [any] 0 when both texts name the same symbol, without regard to case; below 0 when the first
+    // sorts before the second, above 0 when it sorts after the second.
     [[nodiscard]] virtual int compareSymbolName(wchar_t const* first,
                                                 wchar_t const* second) const = 0;
 };

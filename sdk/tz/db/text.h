@@ -62,7 +62,7 @@ public:
     // [write-open] The same, to be changed.
     [[nodiscard]] TzDbMText* getMTextAttributeDefinition();
     // [write-open] Takes a text over as its multi-line default; null makes it single-line.
-    // eInvalidInput for a text that another definition has, which keeps it.
+    // eInvalidInput for a text that belongs to another definition; it stays there.
     Tzad::ErrorStatus setMTextAttributeDefinition(TzDbMText* text);
 
     static TzRxClass* desc();

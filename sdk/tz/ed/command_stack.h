@@ -17,8 +17,8 @@ public:
 
     // [any] Adds a command. The global name is the same in every language, the local name is the
     // translator's; either starts the command, without regard to case. `reactor` and `data` may be
-    // null, and `sequence` is -1; the embedded host looks at none of the three and adds behind all
-    // other commands. 0, or the failing status when the global name is empty or taken.
+    // null, and `sequence` is -1; the embedded host looks at none of the three and adds the command
+    // after all others. 0, or the failing status when the global name is empty or taken.
     virtual int addCommand(wchar_t const* group,
                            wchar_t const* globalName,
                            wchar_t const* localName,

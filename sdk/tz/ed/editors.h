@@ -47,8 +47,8 @@ static_assert(offsetof(IPESettings, fixedPixelSize) == 220 && sizeof(IPESettings
 // [command] The in-place editor; 0 when the user left without accepting. The settings are read
 // only.
 [[nodiscard]] TZ_API int IPEInvokeEditorOn(TzDbMText* text, IPESettings const* settings);
-// [any] Whether the editor that MTEXTED names is an in-place one; the argument asks for the name in
-// force.
+// [any] Whether the editor that MTEXTED names is an in-place one; `current` true asks about the
+// name in force.
 [[nodiscard]] TZ_API bool IPEIsEditor(bool current);
 // [command] The external program that MTEXTED names; 0 when it did not run or was left without
 // accepting.

@@ -10,7 +10,8 @@ struct resbuf;
 //   3. message 4: tzedUndef for each function
 // Statuses are 5100 and -5001.
 
-// [message 3] Defines a function of the current drawing under `name`, answered with `code`.
+// [message 3] Defines a function of the current drawing under `name`; tzedGetFunCode gives `code`
+// when it is called.
 [[nodiscard]] TZ_API int tzedDefun(wchar_t const* name, int code);
 // [message 4] Takes a definition back.
 TZ_API int tzedUndef(wchar_t const* name, int code);

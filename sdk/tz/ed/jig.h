@@ -6,8 +6,8 @@
 
 class TzDbEntity;
 
-// What one drag learned last, for whoever reports on it: whether a point was given, and which, in
-// world coordinates.
+// What one drag learned last, for reports on a command: whether a point was given, and which one,
+// in world coordinates.
 struct TzEdJigInputData {
     bool hasPoint = false;
     TzGePoint3d point;

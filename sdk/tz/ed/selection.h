@@ -13,10 +13,11 @@ struct resbuf;
 // what lies in the box between two points, and what it touches; ":$" the second argument is a pair
 // of prompts (to add and to remove); ":K" the words armed by tzedInitGet go to the keyword callback
 // and the question goes on; ":L" and ":l" leave out entities on locked layers; ":c" and ":p" change
-// nothing. Without a capital the user is asked, or a point given as the second argument taken.
+// nothing. A mode without a capital asks the user, or takes a point that is given as the second
+// argument.
 //
-// A filter is a list of conditions that an entity must meet all: codes 0 and 5020 the type's name,
-// 8 the layer, 7 the text style; names may hold the wildcards of tzutWcMatchEx.
+// A filter is a list of conditions, all of which an entity must meet: codes 0 and 5020 the type's
+// name, 8 the layer, 7 the text style; names may hold the wildcards of tzutWcMatchEx.
 
 // [command] `first` and `second` are points (double[3], user coordinates) or, with ":$", `first` is
 // a wchar_t const*[2] of prompts and `second` is not looked at; they may be null. `filter` may be
@@ -38,8 +39,8 @@ TZ_API int tzedSSFree(long long const* set);
 // part of it to grip, which this host shows nowhere, and may be null.
 TZ_API int tzedSSSetFirst(long long const* grips, long long const* selected);
 
-// [command] Picks one entity. `name` and `point` (user coordinates) are left alone but for 5100; a
-// pick at nothing gives -5001.
+// [command] Picks one entity. `name` and `point` (user coordinates) change only with 5100; a pick
+// that hits nothing gives -5001.
 [[nodiscard]] TZ_API int tzedEntSel(wchar_t const* prompt, long long* name, double* point);
 // [command] Picks one entity, also inside block references. `pickFlag` 0 asks, 1 takes `point` as
 // the pick. `matrix` (4 by 4, rows) maps the entity's coordinates to world; `references` takes a

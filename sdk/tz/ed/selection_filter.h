@@ -23,7 +23,8 @@ public:
     virtual ~TzEdInputContextReactor() = default;
 };
 
-// Shapes what a selection may hold while it runs. Nothing of it need be overridden.
+// Decides what a selection may hold while it runs. A filter overrides only the operations that it
+// needs.
 class TZ_API TzEdSSGetFilter : public TzEdInputContextReactor {
 public:
     // Entities are about to be added: the whole set so far, and the new ones, of which the service
@@ -47,7 +48,8 @@ public:
 
 // [command] Installs a filter on a document's input, or takes it back; the host does not own it.
 // The bits of `flags` ask for hooks: 1 additions, 2 removals, 4 the end; 15 asks for every one.
-// False when the document is null, or the filter is there already or not.
+// False when the document is null, when a filter to install is already there, and when one to take
+// back is not.
 TZ_API bool
 addSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter, int flags);
 TZ_API bool removeSSgetFilterInputContextReactor(TzApDocument* document, TzEdSSGetFilter* filter);

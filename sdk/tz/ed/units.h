@@ -14,7 +14,7 @@
 // [any] Radians as text: "45.0000", "45d30'0\"", "50.0000g", "0.7854r", "N 45d0'0\" E".
 [[nodiscard]] TZ_API int tzdbAngToS(double radians, int unit, int precision, TzString& text);
 // [any] The length or the angle in radians that a text stands for; every form is read under each
-// unit. -5001 leaves the result alone: an empty text, anything behind the value, or a value that is
+// unit. -5001 leaves the result alone: an empty text, anything after the value, or a value that is
 // not finite.
 [[nodiscard]] TZ_API int tzdbDisToF(wchar_t const* text, int unit, double* value);
 [[nodiscard]] TZ_API int tzdbAngToF(wchar_t const* text, int unit, double* radians);

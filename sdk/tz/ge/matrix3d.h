@@ -61,7 +61,7 @@ public:
 
     // The transformation back; the identity when there is none.
     [[nodiscard]] TZ_API TzGeMatrix3d inverse() const;
-    // The volume of a unit cube behind the transformation; negative when it mirrors.
+    // The volume of a unit cube after the transformation; negative when the transformation mirrors.
     [[nodiscard]] TZ_API double det() const;
     // Space is flattened: the axes, each taken at length 1, span no more volume than the vector
     // tolerance, or one of them is exactly zero. So a uniform scale, however small, is not

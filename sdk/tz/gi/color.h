@@ -35,7 +35,7 @@ public:
     [[nodiscard]] static TzCmEntityColor fromIndex(int index);
 
     [[nodiscard]] ColorMethod colorMethod() const { return method_; }
-    // Keeps the numbers: a true colour of components set before, an index set before.
+    // Changes only the kind. The components and the index stay, and count when the kind uses them.
     void setColorMethod(ColorMethod method) { method_ = method; }
     [[nodiscard]] bool isByLayer() const { return method_ == kByLayer; }
     [[nodiscard]] bool isByBlock() const { return method_ == kByBlock; }
@@ -48,7 +48,7 @@ public:
     void setRed(std::uint8_t red) { red_ = red; }
     void setGreen(std::uint8_t green) { green_ = green; }
     void setBlue(std::uint8_t blue) { blue_ = blue; }
-    // The components: of the palette when it is an index, 0 when it is the layer's or the block's.
+    // The components; for an index those of the palette, for the layer's or the block's colour 0.
     [[nodiscard]] std::uint8_t red() const;
     [[nodiscard]] std::uint8_t green() const;
     [[nodiscard]] std::uint8_t blue() const;
@@ -61,7 +61,7 @@ public:
     // 0 block, 256 layer, 1 to 255 palette; eOutOfRange for any other, which changes nothing.
     Tzad::ErrorStatus setColorIndex(int index);
 
-    // Equal when kind and numbers that count for the kind are.
+    // Equal when the kinds are equal, and the numbers that this kind uses.
     [[nodiscard]] bool operator==(TzCmEntityColor const& other) const;
     [[nodiscard]] bool operator!=(TzCmEntityColor const& other) const { return !(*this == other); }
 

@@ -9,8 +9,8 @@
 #include "tz/gi/drawable.h"
 #include "tz/gi/text_style.h"
 
-// One drawing in progress. Everything is valid during the call that hands it over alone.
-// Coordinates are world coordinates, or those of the innermost pushed transform.
+// One drawing in progress. Everything is valid only during the call that hands it over. Coordinates
+// are world coordinates, or those of the innermost pushed transform.
 
 // How what is drawn next looks.
 class TZ_API TzGiSubEntityTraits : public TzRxObject {
@@ -34,7 +34,7 @@ public:
     [[nodiscard]] TzRxClass* isA() const override;
 };
 
-// The traits as an object's attributes are set.
+// The traits to which a drawable gives its attributes.
 class TZ_API TzGiDrawableTraits : public TzGiSubEntityTraits {
 public:
     static TzRxClass* desc();
@@ -65,7 +65,8 @@ public:
                       TzGiTextStyle const& style) = 0;
     // Another drawable, with its own attributes.
     virtual bool draw(TzGiDrawable* drawable) = 0;
-    // What is drawn until the pop lies in coordinates that the matrix brings to those around.
+    // Until the pop, what is drawn has coordinates of its own; the matrix maps them to the ones in
+    // force before the push.
     virtual void pushModelTransform(TzGeMatrix3d const& matrix) = 0;
     virtual void popModelTransform() = 0;
 };

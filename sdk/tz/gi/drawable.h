@@ -13,7 +13,7 @@ class TzGiWorldDraw;
 //   3. viewportDraw, after false
 class TZ_API TzGiDrawable : public TzRxObject {
 public:
-    // What the class says about its drawing as bits, 0 for nothing; this host looks at none.
+    // Bits by which the class describes its drawing, 0 for none; this host looks at none of them.
     unsigned int setAttributes(TzGiDrawableTraits* traits) { return subSetAttributes(traits); }
     bool worldDraw(TzGiWorldDraw* draw) { return subWorldDraw(draw); }
     void viewportDraw(TzGiViewportDraw* draw) { subViewportDraw(draw); }

@@ -17,7 +17,7 @@ class TzDbMText;
 // Nothing here owns what it points to; the caller keeps it alive for the run. What the host calls
 // on the parameters is inline.
 
-// The values behind both parameter classes.
+// The values that both parameter classes hold.
 class TzApHostEditorParamsImp {
 public:
     [[nodiscard]] EasyObject<TzDbMText>* easyMText() const { return easyMText_; }
@@ -74,9 +74,9 @@ private:
     TzApHostEditorParamsImp* imp_;  // owned
 };
 
-// [any] Make both parameter classes known to the host, ahead of tzrxBuildClassHierarchy, and take
-// that back, which does no harm when they are not known. The module calls them at its load and
-// unload.
+// [any] Make both parameter classes known to the host, before tzrxBuildClassHierarchy is called,
+// and take that back; taking back changes nothing when they are not known. The module calls them at
+// its load and unload.
 TZ_API void MteCoreDialogParamsRXInit();
 TZ_API void MteCoreDialogParamsRXUninit();
 

@@ -2,8 +2,8 @@
 
 class TzDbField;
 
-// Holders of open database objects: what a holder is told to give back, it gives back on every way
-// out.
+// Holders of open database objects: a holder gives back what its flags name, on every way out of
+// the block.
 //
 //   EasyObject<TzDbMText> text;                       // flags 1: close at the end
 //   if (tzdbOpenObject(text.object, id, TzDb::kForRead) != Tzad::eOk) return;
@@ -24,7 +24,7 @@ public:
     EasyHolder& operator=(EasyHolder const&) = delete;
     virtual ~EasyHolder() {
         if (!object) return;
-        // A refusal to close leaves nothing that this holder could do.
+        // When the host refuses to close, the holder can do nothing about it.
         if (flags & EasyFlags::kClose) (void)object->close();
         if (flags & EasyFlags::kDelete) delete object;
         object = nullptr;

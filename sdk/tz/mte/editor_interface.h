@@ -49,7 +49,7 @@ public:
     [[nodiscard]] virtual unsigned int GetByLayerColor() const = 0;
     virtual void SetByBlockColor(unsigned int rgb) = 0;
     [[nodiscard]] virtual unsigned int GetByBlockColor() const = 0;
-    // Behind the text in the editor's window, and of the text at its start.
+    // The colour behind the text in the editor's window, and the colour of the text at its start.
     virtual void SetBkColor(unsigned int rgb) = 0;
     [[nodiscard]] virtual unsigned int GetBkColor() const = 0;
     virtual void SetInitialColor(unsigned int rgb) = 0;

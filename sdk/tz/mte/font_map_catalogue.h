@@ -27,7 +27,8 @@ public:
     CTzadFontMapDatabase& operator=(CTzadFontMapDatabase const&) = delete;
     virtual ~CTzadFontMapDatabase();
 
-    // The face of a file, empty with everything else 0 when it is not in the table.
+    // The face of a file. When the file is not in the table, the face is empty and everything else
+    // 0.
     virtual CStdStrW
     MapFileToFont(CStdStrW file, bool& bold, bool& italic, int& charset, int& family);
     // The file of a face's form, empty when it is not in the table; "@" before the face does not

@@ -52,8 +52,9 @@ public:
 
     // Reads the three mapping sections of the font map file into the tables, over what is there.
     void BuildDatabase();
-    // The face of a file or of a pair joined by a comma. With MapTypeProxy for a file without a
-    // comma and without an answer, all but the type stays as the font service left it.
+    // The face of a file or of a pair joined by a comma. A file without a comma for which nothing
+    // knows a face is lent a proxy: the type is then MapTypeProxy, and all other outputs stay as
+    // the font service left them.
     CStdStrW MapFileToFont(
         MapType& type, CStdStrW file, bool& bold, bool& italic, Charset& charset, int& pitch);
     // The file of exactly that description; else what the font service says of face, bold and

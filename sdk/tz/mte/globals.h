@@ -83,8 +83,8 @@ extern TZ_API TzString gsLocalizationSeparator;  // " _"
 extern TZ_API TzStringTable gStringTable;
 }
 
-// The stack characters, "/#^", without a terminator and directly ahead of the resource file's name:
-// a reader that takes them for a terminated string sees sixteen characters.
+// The stack characters, "/#^", without a terminator and directly before the resource file's name: a
+// reader that takes them for a terminated string sees sixteen characters.
 struct TzStackCharacters {
     wchar_t characters[3];
     wchar_t resourceFile[14];

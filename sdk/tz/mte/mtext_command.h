@@ -20,7 +20,7 @@
 // The constructor reads the drawing's defaults, so a drawing must be open.
 //
 // The questions, Do... [command], store their answers in the members below. False means that the
-// user cancelled: what was asked for last is as before, what was answered ahead of it stays. A
+// user cancelled: the value that was asked for last is as before, and earlier answers stay. A
 // question that the host could not ask is asked again, where nothing else is said.
 
 // The options and the questions that commands share.
@@ -58,10 +58,10 @@ public:
     [[nodiscard]] bool DoWidth();
     // At least or exactly; Enter keeps what it is.
     [[nodiscard]] bool DoLineSpacingStylePrompt();
-    // The distance of lines, or a factor written with an x behind it; Enter keeps the factor. One
-    // outside the limits is told and asked for again.
+    // The distance of lines, or a factor written with an x after it; Enter keeps the factor. For a
+    // factor outside the limits a message is shown and the question asked again.
     [[nodiscard]] bool DoLineSpacingFactorPrompt();
-    // Both, in this order. Cancelled at the factor, the new style stays.
+    // Both questions, in this order. When the user cancels at the factor, the new style stays.
     [[nodiscard]] bool DoLineSpacingPrompts();
     // The text, line by line up to an empty one; each line is a paragraph.
     [[nodiscard]] bool DoTextString();
@@ -102,7 +102,7 @@ public:
     // The opposite corner, from `location`, with the options as keywords; columns are none for an
     // attribute. A pick, or Enter, takes the box as it is dragged. A width, or columns, asked for
     // by keyword end the question too, and the text then begins at the first corner. A new height
-    // or style resets the line spacing. Cancelled at an option, the whole question is.
+    // or style resets the line spacing. A cancel at an option cancels the whole question.
     [[nodiscard]] bool DoSecondPointPrompt(bool forAttribute);
     // The kind of columns, then its sizes: -1 cancelled, 0 no columns, 1 columns set up. Enter
     // chooses dynamic columns of automatic height; a failed question goes on with the present kind.

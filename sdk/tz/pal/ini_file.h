@@ -7,7 +7,7 @@
 #include "tz/text/string.h"
 
 // INI files in UTF-8: sections in brackets, and key=value lines in them. Names count without case.
-// Blanks around key and value are dropped, everything else behind the first "=" is the value. A
+// Blanks around key and value are dropped, everything else after the first "=" is the value. A
 // comment opens with ";" or "#" at the start of a line only. A key written twice is met twice in an
 // enumeration, and reading it gives the last value.
 //

@@ -32,12 +32,12 @@ public:
     virtual void Close();
     [[nodiscard]] bool IsOpen() const { return isOpen_; }
 
-    // The value of that name as text, empty when it has none or is no text.
+    // The value of that name as text; empty when there is no such value or it is no text.
     [[nodiscard]] TzString GetString(wchar_t const* name) const;
     // The value of that name: false when there is none. `value` is set for type 4 alone.
     [[nodiscard]] bool
     GetDword(wchar_t const* name, std::uint32_t& value, std::uint32_t& type) const;
-    // Name and type of the value at `index`, from 0; false behind the last.
+    // Name and type of the value at `index`, from 0; false after the last.
     [[nodiscard]] bool EnumValueNames(int index, TzString& name, std::uint32_t& type) const;
 
 private:

@@ -36,9 +36,9 @@ class TZ_API Roots {
 public:
     using Reader = std::function<bool(Container const& values)>;
 
-    // Calls `reader` once with the values under that name, none of which exist when the user has
-    // set none. With `userValues` false only the product's own values count, of which this host has
-    // none. Gives what the reader gave, or false when the settings could not be read.
+    // Calls `reader` once with the values that the user has set under that name; there may be none.
+    // With `userValues` false only the product's own values count, and this host has none. Returns
+    // what `reader` returned, or false when the settings could not be read.
     bool getProductSettings(wchar_t const* name, Reader const& reader, bool userValues) const;
 };
 

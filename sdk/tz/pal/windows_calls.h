@@ -49,8 +49,8 @@ TZ_API int ClientToScreen(HWND window, POINT* point);
 // number * numerator / denominator, rounded to nearest, halves away from zero; -1 when the
 // denominator is 0 or the result does not fit.
 [[nodiscard]] TZ_API int MulDiv(int number, int numerator, int denominator);
-// Gives a handle of the host's back. This host gives out none, so it only says whether it is one
-// that could be: 1, or 0 for null and for all bits set.
+// Closes a handle of the host's. This host gives out none, so the call only tells whether `handle`
+// could be one: 1, or 0 for null and for all bits set.
 TZ_API int CloseHandle(void* handle);
 
 // A class id as text, such as "{00021401-0000-0000-C000-000000000046}", in memory that the caller

@@ -36,6 +36,6 @@ public:
 // [any] The registry; never null, lives with the process.
 [[nodiscard]] TZ_API TzRxDictionary* tzrxSysRegistry();
 // [any] Puts a service object under `name` into "ServiceDictionary" and returns it; the dictionary
-// owns it until it is removed, whoever removes it deletes it. A name that is there keeps its
-// object.
+// owns the object until it is removed, and whoever removes the object deletes it. A name that is
+// already there keeps its object.
 TZ_API TzRxObject* tzrxRegisterService(wchar_t const* name);

@@ -70,7 +70,7 @@ public:
     }
     void removeLast() { removeAt(length() - 1); }
     void removeAll() { items_.clear(); }
-    // The first index of an equal element at or behind `start`, or -1.
+    // The first index of an equal element at or after `start`, or -1.
     [[nodiscard]] int find(T const& item, int start = 0) const {
         auto const at =
             std::find(items_.begin() + std::clamp(start, 0, length()), items_.end(), item);

@@ -41,11 +41,11 @@ public:
     // The formatted text as a new value.
     [[nodiscard]] static TZ_API TzString formatted(wchar_t const* format, ...);
 
-    // The first index at or behind `start` of a character or text, or -1.
+    // The first index at or after `start` of a character or text, or -1.
     [[nodiscard]] int find(wchar_t c, int start = 0) const;
     [[nodiscard]] int find(wchar_t const* text, int start = 0) const;
     [[nodiscard]] int findLast(wchar_t c) const;
-    // The first index at or behind `start` of any character of `set`, or -1.
+    // The first index at or after `start` of any character of `set`, or -1.
     [[nodiscard]] int findOneOf(wchar_t const* set, int start = 0) const;
 
     // Parts of the text; counts reach at most to its end.
