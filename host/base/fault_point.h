@@ -1,7 +1,7 @@
 #pragma once
 
 // The one place where a host operation can be made to fail on purpose. Each operation that can fail
-// asks here first, under the name that its header declares, and fails as told:
+// asks here first, under the name that its header declares, and fails when the answer is a fault:
 //
 //   if (auto const fault = tzhost::faultAt("tzedGetVar")) return *fault;
 //

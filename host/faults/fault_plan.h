@@ -19,7 +19,7 @@
 //   plan.install();
 //
 // An installed plan also counts the calls, so that an empty one measures what a run calls. One plan
-// is installed at a time; it must outlive that. Not thread-safe.
+// is installed at a time; it must live as long as it is installed. Not thread-safe.
 namespace tzhost {
 
 class FaultPlan {
@@ -31,7 +31,7 @@ public:
 
     // Adds a rule. Returns what is wrong with the rule, or nothing.
     [[nodiscard]] std::optional<std::string> add(std::string_view rule);
-    // Puts this plan in force, in place of the one before.
+    // Puts this plan in force, in place of any other.
     void install();
     // Takes this plan out of force; changes nothing when another plan is in force.
     void remove();

@@ -6,7 +6,8 @@
 
 namespace tzhost {
 
-// Replaces the shipped font map by another file, empty for the shipped one; returns the one before.
+// Replaces the shipped font map by another file; an empty path brings the shipped one back. Returns
+// the previous path.
 std::string setFontMapFile(std::string path);
 
 }  // namespace tzhost
