@@ -13,7 +13,7 @@ int readDigits(wchar_t const*& cursor) {
     return value;
 }
 
-// One character, whatever it is; true only when that is a "1".
+// Consumes one character, whatever it is; true only for a "1".
 bool readFlag(wchar_t const*& cursor) {
     if (*cursor == 0) return false;
     return *cursor++ == L'1';

@@ -10,8 +10,7 @@
 // lines anywhere. No function steps past the terminating zero.
 //
 //   wchar_t const* cursor = L"b0\\'a1x";                  // after the \'
-//   WideCharacterString(cursor, code_page_id_ex(936))     // one character; the cursor stands on
-//   "x"
+//   WideCharacterString(cursor, code_page_id_ex(936));    // one character; the cursor is on "x"
 
 [[nodiscard]] constexpr bool isRtfWhiteSpace(wchar_t c) {
     return c == L'\t' || c == L'\n' || c == L'\r';

@@ -41,7 +41,8 @@ public:
     [[nodiscard]] CStdStrW EmitFontTable() const;
 
 protected:
-    // Null for an empty slot; valid until the slot is stored to. Its name is of the names below.
+    // Null for an empty slot; valid until the slot is stored to. The name of the record comes from
+    // names().
     [[nodiscard]] Record const* fontAt(int slot);
     // The names of this document; the owner's own names come from here too.
     FontNamePool& names() { return names_; }

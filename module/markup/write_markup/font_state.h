@@ -25,7 +25,8 @@ class CMTextFontMapDatabase;
 class CFontState {
 public:
     explicit CFontState(CMTextFontMapDatabase* fontMap) : m_pFontMap(fontMap) {}
-    // Holds the other state's present look and gives it back at its own end. Never emits.
+    // Copies the other state's present look, and makes the copy that state's present look again at
+    // its own end. Never emits.
     explicit CFontState(CFontState* other);
     virtual ~CFontState();
     CFontState(CFontState const&) = delete;
@@ -67,8 +68,8 @@ public:
     [[nodiscard]] CStdStrW EmitTerminatingStateInMText();
 
 protected:
-    // The same as EmitStateInMText, after what `codes` holds, with the codes of faces that are
-    // known. The font tables may not change between two calls unless the codes are forgotten.
+    // Appends to `codes` what EmitStateInMText gives, but keeps the code of each face for later
+    // calls. When the font tables change between two calls, forgetFaceCodes must be called.
     void appendState(CStdStrW& codes);
     void forgetFaceCodes() { faceCodes_.clear(); }
     [[nodiscard]] CFontAttributes const& base() const { return m_base; }

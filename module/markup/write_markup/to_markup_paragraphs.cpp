@@ -8,7 +8,7 @@
 
 namespace {
 
-// Opens the code at its first setting and separates the others.
+// Begins the code before its first setting, and separates each later one from the one before.
 void appendSetting(CStdStrW& code, wchar_t key) {
     code += code.empty() ? L"\\p" : L",";
     code += key;
@@ -16,7 +16,8 @@ void appendSetting(CStdStrW& code, wchar_t key) {
 
 }  // namespace
 
-// The words that follow are met again, where they are unknown and dropped.
+// The look-ahead does not consume the words of the settings: the reader of words meets them next,
+// does not know them and drops them.
 void CRichTextToMTextContext::OnDefaultParagraph(wchar_t const*& cursor, int) {
     appendParagraphSettings(paragraphs_.settingsFrom(cursor));
 }

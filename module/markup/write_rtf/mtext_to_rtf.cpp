@@ -142,7 +142,8 @@ void CMTextToRichTextContext::updateSizes(int halfPoints) {
     m_nCurrentFontSize = halfPoints;
 }
 
-// A state beyond the most there may be is dropped, and what it would have kept goes on.
+// When there are kMostStates states, a further group gets none of its own, and its closing brace
+// ends the state of a group around it.
 void CMTextToRichTextContext::PushState() {
     if (m_nState + 1 == kMostStates) return;
     State const& outer = top();

@@ -213,11 +213,12 @@ private:
     long long chars_ = 0;      // plain characters so far
     double lastFactor_ = 1.0;  // of the last relative height
     wchar_t const* text_ = nullptr;
-    // The font codes that would be looked up with the same result again. What the font tables say
-    // changes during a run only when a code lends a proxy, and one entry may then take another's
-    // place, also of another file or face. So a code that was lent a proxy is not kept and makes
-    // all others be forgotten; nor is a pair of files kept, as each of its codes may be lent again.
-    // A map file that changes on the disk during a run is not looked at.
+    // The font codes for which a second look-up would give the same result. What the font tables
+    // say changes during a run only when a code lends a proxy, and one entry may then take
+    // another's place, also of another file or face. So a code that was lent a proxy is not kept,
+    // and all kept codes are then forgotten. A pair of files is not kept either, as each of its
+    // codes may be lent a proxy again. A map file that changes on the disk during a run is not
+    // looked at.
     TextTable<ResolvedFont> fontCodes_;
     enum class SwapState { unknown, no, yes } swapState_ = SwapState::unknown;
     std::unique_ptr<StackLookAhead> stacks_;
