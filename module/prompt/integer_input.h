@@ -12,7 +12,7 @@ class CTzsIntegerInput : public CTzsInput {
 public:
     using CTzsInput::CTzsInput;
 
-    // Also lets an empty answer through (bit 0 of the flags) that the flags refused.
+    // Also clears bit 0 of the flags, so that an empty answer is no longer refused.
     virtual void SetDefault(int value);
     // The last answer, or the default after an empty one; 0 before one, and as it was after a
     // failure or a cancel.

@@ -48,7 +48,8 @@ void addCommand(TzString const& globalName,
                 TzString const& localName,
                 int flags,
                 void (*callback)()) {
-    // A name that is taken stays its owner's; the other commands are still added.
+    // A name that another module has taken stays with that module; the other commands are still
+    // added.
     if (TzEdCommandStack* const commands = commandStack())
         (void)commands->addCommand(gsCommandGroupName, globalName, localName, flags, callback,
                                    nullptr, -1, TzRxResourceInstance::empty, nullptr);
