@@ -59,9 +59,10 @@ protected:
     explicit TzDbEntity(TzDbObjectImp* imp = nullptr);
 
     [[nodiscard]] virtual Tzad::ErrorStatus subTransformBy(TzGeMatrix3d const& matrix);
-    // Passes colour, layer and so on to the traits: solid lines, outlines. 0.
+    // Passes colour and layer to the traits, and sets solid lines, no fill and no transparency.
+    // Returns 0.
     unsigned int subSetAttributes(TzGiDrawableTraits* traits) override;
-    // Draws nothing: the base's part of a derived class's drawing.
+    // The body in this class draws nothing.
     bool subWorldDraw(TzGiWorldDraw* draw) override = 0;
     void subViewportDraw(TzGiViewportDraw* draw) override;
 };

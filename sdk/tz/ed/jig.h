@@ -30,7 +30,7 @@ class TZ_API TzEdJig {
 public:
     enum [[nodiscard]] DragStatus : int{
         kCancel = -4,    // the user cancelled
-        kNoChange = -6,  // the sample is as the one before; nothing is drawn
+        kNoChange = -6,  // the sample equals the previous one; nothing is drawn
         kOther = -5,     // the host failed
         kNull = -1,      // an empty answer
         kNormal = 0,     // a point, or a sample that differs
@@ -67,7 +67,8 @@ public:
     // The entity to draw; may be null. The jig keeps it.
     [[nodiscard]] virtual TzDbEntity* entity() const = 0;
 
-    // [drag] or before it. The prompt, as it stands; keywords in the form that tzedInitGet takes.
+    // During a drag [drag] or before it. The prompt is shown as it is; keywords have the form that
+    // tzedInitGet takes.
     void setDispPrompt(wchar_t const* prompt);
     void setKeywordList(wchar_t const* keywords);
     [[nodiscard]] wchar_t const* keywordList() const;

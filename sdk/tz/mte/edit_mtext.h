@@ -36,10 +36,11 @@ public:
 };
 
 // [command] The gate: decides which editor runs on an open text, and runs it. 3 without a text, and
-// when it cannot be made writable; opened for read, it is open for read again afterwards. `tab` and
-// `flags` go to the dialog editor alone; `attribute` says that it is the text of an attribute,
-// whose in-place session follows the variable ATTIPE instead of `view`; the last two are options of
-// the in-place editor. A field that the session leaves in the holder is the caller's.
+// when the text cannot be made writable. A text that is open for read is open for read again
+// afterwards. `tab` and `flags` go to the dialog editor alone; `attribute` says that it is the text
+// of an attribute, whose in-place session follows the variable ATTIPE instead of `view`; the last
+// two are options of the in-place editor. A field that the session leaves in the holder is the
+// caller's.
 [[nodiscard]] TZ_API int InvokeEditorOn(EasyObject<TzDbMText>& text,
                                         MTETabType tab,
                                         unsigned int flags,

@@ -21,7 +21,7 @@
 //
 // The questions, Do... [command], store their answers in the members below. False means that the
 // user cancelled: the value that was asked for last is as before, and earlier answers stay. A
-// question that the host could not ask is asked again, where nothing else is said.
+// question that the host could not ask is asked again, unless its comment says otherwise.
 
 // The options and the questions that commands share.
 class TZ_API TzxMtextCommandBase {
@@ -116,12 +116,13 @@ public:
     [[nodiscard]] bool DoColumnGutterPrompt();
     [[nodiscard]] bool DoColumnHeightPrompt();
     // [command] Makes the entity from the options and asks for its text: 1 when the user accepted
-    // that, else 0. With `existing` null a new entity is posted to the drawing; one that is not
-    // accepted is deleted, one that the drawing refuses is lost, and the result is still 1. Else it
-    // fills the caller's entity, which must be open for write or in no drawing, stays open and is
-    // not posted; not accepted, it keeps the options that it got. Accepted, the options become the
-    // drawing's defaults for new texts. `forAttribute` is for the text of an attribute, which is
-    // not moved to the layer of new texts. Column sizes and the text height may change on the way.
+    // that, else 0. With `existing` null a new entity is posted to the drawing; it is deleted when
+    // the user does not accept. When the drawing refuses an accepted entity, that entity is lost
+    // although the result is 1. With `existing` the caller's entity is filled instead; it must be
+    // open for write or in no drawing, stays open and is not posted. When the user does not accept,
+    // it keeps the options that it got. When the user accepts, the options become the drawing's
+    // defaults for new texts. `forAttribute` is for the text of an attribute, which is not moved to
+    // the layer of new texts. Column sizes and the text height may change on the way.
     [[nodiscard]] int CreateObject(TzDbMText* existing, bool forAttribute);
     // [any] For outside callers, instead of the first questions.
     void setInitialProperties(TzGePoint3d const& location,

@@ -1,6 +1,6 @@
 #pragma once
 
-// The host's debug output: text for developers, seen by nobody who did not ask for it.
+// The host's debug output: text for developers, which only those see who ask for it.
 
 #include "tz/export.h"
 

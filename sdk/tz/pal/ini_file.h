@@ -28,7 +28,7 @@ public:
     [[nodiscard]] int GetInt(wchar_t const* key, int otherwise) const;
 
 protected:
-    // The section's keys, as the file writes them and in its order.
+    // The section's keys, spelt as in the file and in the order of the file.
     [[nodiscard]] std::vector<TzString> keys() const;
 
 private:

@@ -4,7 +4,7 @@
 
 #include "tz/export.h"
 
-// Styles of a message; the icon alone, as the only answer is "seen".
+// Styles of a message. They choose only the icon, since "seen" is the only answer.
 constexpr unsigned kMessageBoxError = 0x10;
 constexpr unsigned kMessageBoxWarning = 0x30;
 

@@ -26,8 +26,8 @@ public:
     CTwUiRegistryAccess() = default;
     virtual ~CTwUiRegistryAccess() = default;
 
-    // Opens a key, closing the one before; false when there is none. An empty path is the root
-    // itself.
+    // Opens a key and closes the previous one; false when there is no such key. An empty path is
+    // the root itself.
     virtual bool Open(HKEY root, wchar_t const* path);
     virtual void Close();
     [[nodiscard]] bool IsOpen() const { return isOpen_; }

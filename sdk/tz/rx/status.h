@@ -45,7 +45,7 @@ enum [[nodiscard]] ErrorStatus : int{
     eNoDocument = 1025,          // no drawing is open
     eNotImplemented = 1026,      // this host does not offer the operation
     eFieldNotEvaluated = 1027,   // a field has no value
-    eInternal = 1028,            // none of the above
+    eInternal = 1028,            // a failure with no status of its own
 };
 
 // How a question ended.
