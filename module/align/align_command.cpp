@@ -28,7 +28,7 @@ constexpr int kEmptyAnswerTaken = 4;
 class [[nodiscard]] SelectionKeywords {
 public:
     explicit SelectionKeywords(TzMTextAlignCmd* command) {
-        // Without the earlier callback none is put back.
+        // When there was no earlier callback, none is put back.
         (void)tzedSSGetKwordCallbackPtr(&before_);
         TzMTextAlignSSCallbackHandler::m_command = command;
         tzedSSSetKwordCallbackPtr(TzMTextAlignSSCallbackHandler::keywordCallback);
@@ -87,7 +87,7 @@ bool TzMTextAlignCmd::acquireTextObjsAndAlignSettings() {
     return isSelected;
 }
 
-// Where the host refuses the system, the points are taken in the one before.
+// When the host refuses the system, the points are taken in the system that was in force.
 void TzMTextAlignCmd::setUserSystem() {
     m_ucsChanged = tzedSetCurrentUCS(m_manipulator->coorSystemForWorkingPlane()) == Tzad::eOk;
 }

@@ -11,8 +11,8 @@
 //   TzMTextAlignCmd command;
 //   command.run();
 //
-// The drawing changes at the end alone. The destructor takes back the highlighting and the user
-// system whatever happened.
+// The drawing changes only at the end. The destructor takes back the highlighting and the user
+// system on every way out.
 class TzMTextAlignCmd {
 public:
     TzMTextAlignCmd();
@@ -20,8 +20,8 @@ public:
     TzMTextAlignCmd& operator=(TzMTextAlignCmd const&) = delete;
     ~TzMTextAlignCmd();
 
-    // The whole dialogue. Settings are remembered when it comes to its end; a cancel loses what was
-    // changed at its keywords.
+    // The whole dialogue. The settings are remembered when it is finished; after a cancel, changes
+    // made by its keywords are lost.
     void run();
     // The first part of it on its own: the selection, and the entities that are dragged.
     bool acquireTextObjsAndAlignSettings();

@@ -34,7 +34,7 @@ void TzMTextAlignManipulatorEntity::calculateOriginalBoundingBoxInEcs() {
     BoundBoxMakerHolder const maker = boundBoxMaker();
     if (maker) m_boundingBox = maker->makeBoundBox();
     if (!m_boundingBox.isEmpty()) return;
-    // Nobody knows where an unmeasured text stands, so it is not moved.
+    // The place of a text that was not measured is unknown, so the text is not moved.
     delete m_clone;
     m_clone = nullptr;
 }
@@ -73,7 +73,7 @@ void TzMTextAlignManipulatorEntity::replaceDbEntity() {
     if (!m_clone) return;
     EasyObject<TzDbEntity> entity;
     if (tzdbOpenObject(entity.object, m_id, TzDb::kForWrite) != Tzad::eOk) return;
-    // Where the host refuses the place the text stays as it is.
+    // When the host refuses the place, the text stays as it is.
     (void)entity->transformBy(TzGeMatrix3d::translation(m_currentOffset));
 }
 

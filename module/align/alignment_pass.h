@@ -20,8 +20,8 @@ public:
 
     // The reference text comes first, wherever it stands, and is left out as one of the others.
     void alignEntities();
-    // Puts the indices in the order in which the texts' reference points lie along the line; those
-    // behind the first point come first, equal ones keep their order.
+    // Puts the indices in the order in which the texts' reference points lie along the line; texts
+    // before the first point come first, and texts at the same place keep their order.
     void sortEntities(TzMTextAlignOption::Entities const& entities);
     [[nodiscard]] TzMTextAlignOption::Indices const& sortedIndices() const {
         return m_sortedIndices;

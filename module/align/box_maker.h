@@ -64,7 +64,7 @@ private:
     TzGeVector3d m_viewDirection;
 };
 
-// A maker holds borrowed and plain values alone, so its memory is all that is given back.
+// A maker holds only borrowed and plain values, so freeing its memory is enough.
 struct BoundBoxMakerRelease {
     void operator()(TzMTextAlignBoundBoxMaker* maker) const {
         ::operator delete(static_cast<void*>(maker));

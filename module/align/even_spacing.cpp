@@ -127,10 +127,10 @@ void TzMTextAlignOptionEvenly::loadDefaultSettings() {
 }
 
 void TzMTextAlignOptionEvenly::saveAsDefaultSettings() {
-    (void)setSysVarDouble(kSpacingVariable, spacingValue());  // the next run starts as this one did
+    (void)setSysVarDouble(kSpacingVariable, spacingValue());  // if refused, the old gap is kept
 }
 
-// With one text there is no gap, and what is divided here is used by nobody.
+// With one text there is no gap, so the result of this division is not used.
 void TzMTextAlignOptionDistribute::calculateSpace(BaseLineDirection direction, double length) {
     double occupied = 0;
     for (std::size_t i = 0; i < textCount(); ++i)

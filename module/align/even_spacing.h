@@ -70,7 +70,7 @@ protected:
     void calculateSpace(BaseLineDirection direction, double length) override;
 };
 
-// A gap that the user gives; the second point gives the direction alone.
+// A gap that the user gives; the second point gives only the direction.
 class TzMTextAlignOptionSpecificSpace : public TzMTextAlignOptionEvenly {
 public:
     [[nodiscard]] TzString const& name() const override;

@@ -19,7 +19,8 @@ namespace {
 constexpr wchar_t kModeVariable[] = L"TEXTALIGNMODE";
 constexpr wchar_t kSpacingVariable[] = L"TEXTALIGNSPACING";
 
-// Option name, number in the variable. The first row stands for what no row holds.
+// Option name, number in the variable. The first row is taken for a name or a number that no row
+// has.
 struct Spacing {
     wchar_t const* name;
     tagTextSpacing number;

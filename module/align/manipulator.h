@@ -32,8 +32,9 @@ public:
     TzMTextAlignManipulator();
     ~TzMTextAlignManipulator() override;
 
-    // Takes those texts of a selection that lie in the plane of most of them; of planes with as
-    // many texts the one that reached the number first. False when the selection holds nothing.
+    // Takes those texts of a selection that lie in the plane of most of them; when several planes
+    // have the same number of texts, the plane that reached this number first. False when the
+    // selection holds nothing.
     bool insertTexts(long long const* selection);
     [[nodiscard]] TzArray<TzDbObjectId> const& texts() const { return m_texts; }
     // Makes the entities that are dragged, one for each text taken.
@@ -52,8 +53,8 @@ public:
     // Kept and not used: the gap in force is the option's.
     void setAlignSpacingValue(double value) { m_spacingValue = value; }
 
-    // Makes the option of that name the one in force and lets it ask what it needs, whose outcome
-    // is returned. An unknown name changes nothing.
+    // Makes the option of that name the one in force and lets it ask what it needs, and returns the
+    // outcome of that question. An unknown name changes nothing.
     bool setAlignOption(TzString const& name);
     // Takes the option over.
     void registerAlignOption(TzMTextAlignOption* option);

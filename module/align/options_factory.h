@@ -8,8 +8,7 @@
 // The spacing options of a run, by name. Index 0 stands for an option that is not there.
 //
 //   factory.registerAlignOption(new TzMTextAlignOptionDistribute);
-//   TzMTextAlignOption* const option = factory.getAlignOption(L"Distribute");   // null when
-//   unknown
+//   use(factory.getAlignOption(L"Distribute"));   // null when there is no such option
 class TzMTextAlignOptionsFactory {
 public:
     TzMTextAlignOptionsFactory();

@@ -8,7 +8,7 @@ class TzMTextAlignCmd;
 // so the command that they belong to is kept beside it.
 class TzMTextAlignSSCallbackHandler {
 public:
-    // Takes the global word; another one than the two that are known does nothing. Null, so that
+    // Takes the global word; any word but the two known ones does nothing. Returns null, so that
     // the selection goes on.
     static resbuf* keywordCallback(wchar_t const* keyword);
 

@@ -6,7 +6,8 @@
 
 namespace {
 
-// The variable when it has that type; without a type otherwise. Strings are given back.
+// The variable when it has that type; otherwise a value without a type. The string of a variable of
+// another type is released.
 resbuf valueOfType(wchar_t const* name, short type) {
     resbuf value{};
     if (tzedGetVar(name, &value) != Tzad::ePromptNormal) return {};

@@ -24,5 +24,5 @@ void TzEdTextSSFilter::ssgetAddFilter(int /*flags*/,
                                       TzArray<TzDbObjectId> const& subSelectionSet) {
     for (int index = 0; index < subSelectionSet.length(); ++index)
         if (!m_manipulator.isTextSupported(subSelectionSet[index]))
-            (void)service.remove(index);  // the index is the array's own, whatever went before
+            (void)service.remove(index);  // the index stays valid after removals
 }
