@@ -13,10 +13,7 @@ TEST(CodePages, BelongToCharsetsBothWays) {
         int charset;
         int page;
     };
-    constexpr Row kRows[] = {{0, 1252},   {2, 42},     {77, 10000}, {128, 932},  {129, 949},
-                             {130, 1361}, {134, 936},  {136, 950},  {161, 1253}, {162, 1254},
-                             {163, 1258}, {177, 1255}, {178, 1256}, {186, 1257}, {204, 1251},
-                             {222, 874},  {238, 1250}, {255, 437}};
+    constexpr Row kRows[] = {{0, 1252}, {2, 42}, {128, 932}, {130, 1361}, {163, 1258}, {255, 437}};
     for (Row const& row : kRows) {
         auto const page = static_cast<code_page_id>(row.page);
         EXPECT_EQ(TzCodePage::CharSetToCodePageId(static_cast<Charset>(row.charset)), page);

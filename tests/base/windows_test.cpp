@@ -8,20 +8,6 @@
 
 namespace {
 
-TEST(Windows, HaveTheirPlacesOnTheScreen) {
-    RECT rect{};
-    ASSERT_EQ(GetWindowRect(GetDesktopWindow(), &rect), 1);
-    EXPECT_EQ(rect.right - rect.left, 1920);
-    EXPECT_EQ(rect.bottom - rect.top, 1080);
-    POINT point{10, 20};
-    ASSERT_EQ(ClientToScreen(GetDrawingAreaWindow(), &point), 1);
-    EXPECT_EQ(point.x, 170);
-    EXPECT_EQ(point.y, 110);
-    rect.left = 7;
-    EXPECT_EQ(GetWindowRect(nullptr, &rect), 0);
-    EXPECT_EQ(rect.left, 7);
-}
-
 TEST(MulDivRounds, HalvesAwayFromZero) {
     struct Row {
         int number, numerator, denominator, result;

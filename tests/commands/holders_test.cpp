@@ -19,69 +19,27 @@ struct HolderRow {
     bool isLayerLocked;  // of both texts
     TzDb::OpenMode held;
     wchar_t const* shown;  // of the transcript
-    double heights[2];     // of the held text and of the other one
-    double rotations[2];
+    double height;         // of the other text; the held one keeps 2
+    double rotation;       // of the other text; the held one keeps 0
 };
 
 // Enter at a selection prompt ends it.
 constexpr HolderRow kHolders[] = {
-    {"EditRead",
-     EditMtextCallback,
-     "<<<\nx\n>>>\n",
-     false,
-     TzDb::kForRead,
-     L"cannot be opened for writing",
-     {2, 2},
-     {0, 0}},
-    {"EditWritten",
-     EditMtextCallback,
-     "<<<\nx\n>>>\n",
-     false,
-     TzDb::kForWrite,
-     L"no multi-line text",
-     {2, 2},
-     {0, 0}},
-    {"HeightRead",
-     CompatibleEditMtextCallback,
-     "all\n\n5\n",
-     false,
-     TzDb::kForRead,
-     L"text height",
-     {2, 5},
-     {0, 0}},
-    {"HeightWritten",
-     CompatibleEditMtextCallback,
-     "all\n\n5\n",
-     false,
-     TzDb::kForWrite,
-     L"text height",
-     {2, 5},
-     {0, 0}},
-    {"PropertiesRead",
-     MtextPropertiesCallback,
-     "R\n57.29577951308232\n",
-     false,
-     TzDb::kForRead,
-     L"2 found",
-     {2, 2},
-     {0, 1}},
-    {"PropertiesWritten",
-     MtextPropertiesCallback,
-     "R\n57.29577951308232\n",
-     false,
-     TzDb::kForWrite,
-     L"2 found",
-     {2, 2},
-     {0, 1}},
+    {"EditRead", EditMtextCallback, "<<<\nx\n>>>\n", false, TzDb::kForRead,
+     L"cannot be opened for writing", 2, 0},
+    {"EditWritten", EditMtextCallback, "<<<\nx\n>>>\n", false, TzDb::kForWrite,
+     L"no multi-line text", 2, 0},
+    {"HeightRead", CompatibleEditMtextCallback, "all\n\n5\n", false, TzDb::kForRead, L"text height",
+     5, 0},
+    {"HeightWritten", CompatibleEditMtextCallback, "all\n\n5\n", false, TzDb::kForWrite,
+     L"text height", 5, 0},
+    {"PropertiesRead", MtextPropertiesCallback, "R\n57.29577951308232\n", false, TzDb::kForRead,
+     L"2 found", 2, 1},
+    {"PropertiesWritten", MtextPropertiesCallback, "R\n57.29577951308232\n", false, TzDb::kForWrite,
+     L"2 found", 2, 1},
     // Of the two on a locked layer the held one does not count, and stays in the set.
-    {"PropertiesLocked",
-     MtextPropertiesCallback,
-     "R\n57.29577951308232\n",
-     true,
-     TzDb::kForRead,
-     L"2 found. 1 of them was",
-     {2, 2},
-     {0, 0}},
+    {"PropertiesLocked", MtextPropertiesCallback, "R\n57.29577951308232\n", true, TzDb::kForRead,
+     L"2 found. 1 of them was", 2, 0},
 };
 
 TzDbObjectId postText() {
@@ -118,8 +76,8 @@ TEST_P(Holders, ArePassedOver) {
     for (int index = 0; index < 2; ++index) {
         EasyObject<TzDbMText> text;
         ASSERT_EQ(tzdbOpenObject(text.object, ids[index], TzDb::kForRead), Tzad::eOk);
-        EXPECT_EQ(text->textHeight(), row.heights[index]);
-        EXPECT_NEAR(text->rotation(), row.rotations[index], 1e-9);
+        EXPECT_EQ(text->textHeight(), index == 0 ? 2 : row.height);
+        EXPECT_NEAR(text->rotation(), index == 0 ? 0 : row.rotation, 1e-9);
     }
 }
 INSTANTIATE_TEST_SUITE_P(Commands, Holders, testing::ValuesIn(kHolders), [](auto const& row) {

@@ -40,41 +40,13 @@ constexpr SetterCase kSetters[] = {
     {"SpacingBelow", [](T& t) { return t.setLineSpacingFactor(0.2499999999); }, kOut},
     {"SpacingMost", [](T& t) { return t.setLineSpacingFactor(4); }, kOk},
     {"SpacingNan", [](T& t) { return t.setLineSpacingFactor(kNan); }, kOut},
-    {"LocationNan",
-     [](T& t) {
-         return t.setLocation({0, kNan, 0});
-     },
-     kFlat},
-    {"LocationFar",
-     [](T& t) {
-         return t.setLocation({1e300, 0, 0});
-     },
-     kOk},
-    {"NormalZero",
-     [](T& t) {
-         return t.setNormal({0, 0, 0});
-     },
-     kFlat},
-    {"NormalBelowZero",
-     [](T& t) {
-         return t.setNormal({0, 0, 1e-10});
-     },
-     kFlat},
-    {"NormalLong",
-     [](T& t) {
-         return t.setNormal({1e200, 1e200, 0});
-     },
-     kOk},
-    {"DirectionParallel",
-     [](T& t) {
-         return t.setDirection({0, 0, -2});
-     },
-     kFlat},
-    {"DirectionSlanted",
-     [](T& t) {
-         return t.setDirection({1, 0, 1});
-     },
-     kOk},
+    {"LocationNan", [](T& t) { return t.setLocation(TzGePoint3d(0, kNan, 0)); }, kFlat},
+    {"LocationFar", [](T& t) { return t.setLocation(TzGePoint3d(1e300, 0, 0)); }, kOk},
+    {"NormalZero", [](T& t) { return t.setNormal(TzGeVector3d(0, 0, 0)); }, kFlat},
+    {"NormalBelowZero", [](T& t) { return t.setNormal(TzGeVector3d(0, 0, 1e-10)); }, kFlat},
+    {"NormalLong", [](T& t) { return t.setNormal(TzGeVector3d(1e200, 1e200, 0)); }, kOk},
+    {"DirectionParallel", [](T& t) { return t.setDirection(TzGeVector3d(0, 0, -2)); }, kFlat},
+    {"DirectionSlanted", [](T& t) { return t.setDirection(TzGeVector3d(1, 0, 1)); }, kOk},
     {"AttachmentNone", [](T& t) { return t.setAttachment(T::AttachmentPoint{0}); }, kOut},
     {"AttachmentTen", [](T& t) { return t.setAttachment(T::AttachmentPoint{10}); }, kOut},
     {"RotationInfinite", [](T& t) { return t.setRotation(kInfinity); }, kFlat},
@@ -90,9 +62,7 @@ constexpr SetterCase kSetters[] = {
      },
      kFlat},
     {"MovedTooFar",
-     [](T& t) {
-         return t.transformBy(TzGeMatrix3d::translation({kInfinity, 0, 0}));
-     },
+     [](T& t) { return t.transformBy(TzGeMatrix3d::translation(TzGeVector3d(kInfinity, 0, 0))); },
      kFlat},
     {"ColumnsTooLarge",
      [](T& t) {

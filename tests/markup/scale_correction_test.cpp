@@ -83,19 +83,6 @@ TEST(Scale, CanBeTaughtAndRescaled) {
     EXPECT_TRUE(std::isnan(CScaleCorrection(0).ScaleTwipsToUnits(0)));
 }
 
-TEST(Stream, GrowsInSteps) {
-    CStringStream stream;
-    EXPECT_EQ(stream.capacity(), 1024);
-    stream.Append(L"");
-    stream.Append(std::wstring(1024, L'x').c_str());
-    EXPECT_EQ(stream.capacity(), 1024);
-    stream.Append(L'y');
-    EXPECT_EQ(stream.capacity(), 2048);
-    CStringStream once;
-    once.Append(std::wstring(1025, L'x').c_str());
-    EXPECT_EQ(once.capacity(), 2048);
-}
-
 TEST(Stream, IsReadWhenClosed) {
     CStringStream stream;
     stream.Append(L"ab");

@@ -1,8 +1,6 @@
-// Values that other modules of the host find, and the numbers that name attachments.
+// Characters of stacks, the numbers that name attachments, and the check of format versions.
 
 #include <gtest/gtest.h>
-
-#include <cwchar>
 
 #include "host/platform/output.h"
 #include "module/edit/mtext_versioner.h"
@@ -13,19 +11,9 @@
 
 namespace {
 
-TEST(ExportedVariables, BeginWithTheirFirstValues) {
-    EXPECT_EQ(gdTweakFactor, 0.72);
-    EXPECT_EQ(g_dWidthFactor, 1.0);
-    EXPECT_EQ(giPoints, 16);
-    EXPECT_EQ(g_bEnableFieldUI, 1);
-    EXPECT_EQ(TZDB_FIELDCODE_MODIFIED, 1);
-    EXPECT_EQ(gsExtensionSHX, L".shx");
-    EXPECT_EQ(gsLocalizationSeparator, L" _");
-    EXPECT_STREQ(gszEndOfStackToken, L"\\s");
-    // Searched as a terminated text, the stack characters run on into the file's name.
+// Searched as a terminated text, the stack characters run on into the file's name.
+TEST(ExportedVariables, StackCharactersRunOnIntoTheFileName) {
     EXPECT_STREQ(g_pszStackChars, L"/#^TzmtedRes.dll");
-    EXPECT_NE(std::wcschr(g_pszStackChars, L'z'), nullptr);
-    EXPECT_EQ(std::wcschr(g_pszStackChars, L'c'), nullptr);
 }
 
 TEST(AttachmentKeywords, NameEachPointAndNothingElse) {

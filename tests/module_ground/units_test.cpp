@@ -91,10 +91,6 @@ TEST_F(Units, SayWithinWhatTheSpacingMustLie) {
 }
 
 TEST_F(Units, LineSpacingAndStacksStandInTheirVariables) {
-    EXPECT_EQ(GetLineSpacingFactor(), 1);
-    EXPECT_EQ(GetLineSpacingStyle(), TzDb::kAtLeast);
-    EXPECT_EQ(GetDefaultStackScale(), 70);
-    EXPECT_EQ(GetDefaultStackAlignment(), kAlignMiddle);
     EXPECT_TRUE(SetLineSpacingFactor(2.5));
     EXPECT_FALSE(SetLineSpacingFactor(5));
     EXPECT_TRUE(SetLineSpacingStyle(TzDb::kExactly));

@@ -104,10 +104,6 @@ TEST_F(Drags, WithoutKeywordsAndOnThePaperOfTheirOwn) {
     CKeywordTable none;
     CTzsJigInput input(kControls, none, &preview, L"Drag");
     EXPECT_EQ(preview.layerId(), drawing_->clayer());
-    EXPECT_EQ(preview.GetJigEntity(), &preview);
-    EXPECT_EQ(preview.GetBasePoint(), TzGePoint3d());
-    preview.SetBasePoint(TzGePoint3d(1, 2, 3));
-    EXPECT_EQ(preview.GetBasePoint(), TzGePoint3d(1, 2, 3));
     CTzsJigHandler handler(&preview, kControls);
     EXPECT_EQ(preview.baseSample(handler), TzEdJig::kNoChange);
     EXPECT_EQ(input.Prompt(), statusNone);
