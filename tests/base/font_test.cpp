@@ -113,7 +113,7 @@ TEST(FontInfo, FollowsTheSystemPage) {
     EXPECT_EQ(charsetIn(L"ANSI_1252", L"DejaVu Sans"), 0);
 }
 
-// Gathers what an enumeration reports; ends it behind "stop" reports.
+// Gathers what an enumeration reports; ends it after "stop" reports.
 struct Gathered {
     std::vector<std::wstring> names;
     std::size_t stop = 1000;

@@ -72,7 +72,7 @@ TEST(IdlePrompt, TakesSentStringsAheadOfTheScript) {
     tzhost::documents().close();
 }
 
-// Shows prompts and answers on the same screen, and an Enter behind each.
+// Shows prompts and answers on the same screen, and an Enter after each.
 class Terminal : public tzhost::AnswerSource {
 public:
     Terminal(std::wstring& screen, std::deque<std::wstring> lines)

@@ -21,8 +21,8 @@ std::string shown(TzGePoint3d const& point) {
         .toUtf8();
 }
 
-// Notes what the host does with it: "s" for a sample with its point, "u" for an update, "d" for a
-// redraw.
+// Notes what the host does with the jig: "s" for a sample with its point, "u" for an update, "d"
+// for a redraw.
 class NotingJig : public TzEdJig {
 public:
     class Preview : public TzDbEntity {

@@ -113,8 +113,8 @@ TEST_F(DrawingTest, AttachmentMovesTheLocationAndNotTheText) {
         (void)text.setRotation(0.3);
         TzArray<TzGePoint3d> before;
         text.getBoundingPoints(before);
-        // Top left of a face with "@" is the page's upper right corner; its box was said to start
-        // there, to the right of the letters.
+        // Top left of a face with "@" is the page's upper right corner. The box used to start there
+        // and lay to the right of the letters.
         EXPECT_TRUE(before[typeface[0] == L'@' ? 1 : 0].isEqualTo(text.location()));
         for (int point = 1; point <= 9; ++point) {
             auto const attachment = TzDbMText::AttachmentPoint(point);
@@ -216,7 +216,7 @@ TEST_F(DrawingTest, DefinitionKeepsItsOwnLinesAndTakesNoOthers) {
     EXPECT_FALSE(other.isMTextAttributeDefinition());
 }
 
-// Each new record used to cost a walk over all of them.
+// Each new record used to cost a walk over all records.
 TEST_F(DrawingTest, NewRecordsLeaveTheIndexOfNamesAsItIs) {
     addLayer(L"A");
     unsigned int const before = tzhost::namesGeneration();

@@ -84,7 +84,7 @@ TEST_F(DrawingTest, FieldLivesFromAppendingToErasing) {
     EXPECT_EQ(text->close(), Tzad::eOk);
 }
 
-// Fields that show each other's texts twice took all memory.
+// Two fields, each of which shows the other's text twice, used to take all memory.
 TEST_F(DrawingTest, FieldsOfOneTextHaveALength) {
     addText(std::wstring(60'000, L'x').c_str());
     TzDbField field;

@@ -11,7 +11,8 @@ using tzhost::test::DrawingTest;
 namespace {
 
 // A walk on one text: R and W open it for read and for write, u upgrades, d downgrades, c closes,
-// l locks its layer, e erases it. Each step gives a status; behind the walk so many are open.
+// l locks its layer, e erases it. Each step gives a status; `open` counts what is open after
+// the walk.
 struct Walk {
     char const* name;
     char const* steps;
@@ -125,7 +126,7 @@ INSTANTIATE_TEST_SUITE_P(Rows, Writable, testing::ValuesIn(kWritableRows), [](au
     return row.param.name;
 });
 
-// Closing with a drawing still lends nothing to the next one.
+// What was open in a drawing that goes does not count as open in the next one.
 TEST_F(DrawingTest, DrawingThatGoesTakesItsOpeningsAlong) {
     {
         auto other = tzhost::Drawing::create();
@@ -136,7 +137,8 @@ TEST_F(DrawingTest, DrawingThatGoesTakesItsOpeningsAlong) {
     EXPECT_EQ(tzhost::audit().openObjects, 0);
 }
 
-// What an operation gives back is given back even when the fault plan makes it report a failure.
+// An operation that gives something back does so even when the fault plan makes it report a
+// failure.
 TEST_F(DrawingTest, FaultsLeaveNothingLent) {
     TzDbObjectId const id = addText(L"abc");
     TzDbMText* text = nullptr;

@@ -64,7 +64,7 @@ TEST_F(DrawingTest, BoxOfALineStandsInItsOwnFrame) {
     EXPECT_EQ(box.status, Tzad::ePromptNormal);
     EXPECT_EQ(box.low[0], 0.0);
     EXPECT_NEAR(box.high[1] - box.low[1], 2.0, 1e-9);
-    // A character by its code once counted as the letters of the code.
+    // A character written by its code used to count as the letters of the code.
     auto* const coded = new TzDbText;
     coded->setDatabaseDefaults(drawing.get());
     (void)coded->setTextString(L"a\\U+0062c");
@@ -75,7 +75,7 @@ TEST_F(DrawingTest, BoxOfALineStandsInItsOwnFrame) {
     style.setTextSize(2);
     EXPECT_NEAR(style.extents(L"a\\U+0062c", true, -1, false).x, box.high[0], 1e-9);
     EXPECT_NEAR(style.extents(L"abcdef", true, 3, true).x, box.high[0], 1e-9);
-    // The mark of a vertical face once gave the width of a stack of letters.
+    // The "@" of a vertical face used to give the width of a stack of letters.
     TzGiTextStyle plain = style;
     plain.setFont(L"DejaVu Sans", false, false, 0, 0);
     style.setFont(L"@DejaVu Sans", false, false, 0, 0);

@@ -136,7 +136,7 @@ INSTANTIATE_TEST_SUITE_P(Deeds, Undo, testing::ValuesIn(kDeeds), [](auto const& 
     return row.param.name;
 });
 
-// Commands that leave all as it was. Each was a step, so that U seemed to do nothing.
+// Commands that leave all as it was. Each used to be a step, so U seemed to do nothing.
 Deed const kIdleDeeds[] = {
     {"SameValue",
      [](DrawingFixture&, TzDbObjectId id) {
@@ -178,7 +178,7 @@ INSTANTIATE_TEST_SUITE_P(Deeds, IdleCommands, testing::ValuesIn(kIdleDeeds), [](
     return row.param.name;
 });
 
-// Smaller than the tolerance of points, and yet a change.
+// A move by less than the tolerance of points is a change all the same.
 TEST_F(DrawingTest, SmallestMoveIsAStep) {
     TzDbObjectId const id = addText(L"abc");
     drawing->undoLog().begin();
@@ -188,7 +188,7 @@ TEST_F(DrawingTest, SmallestMoveIsAStep) {
     EXPECT_EQ(at<TzDbMText>(id).location().x, 0.0);
 }
 
-// The field from before stayed erased.
+// The earlier field used to stay erased.
 TEST_F(DrawingTest, ReplacedFieldComesBack) {
     TzDbObjectId const id = addText(L"%<\\Var LUNITS>%");
     drawing->undoLog().begin();

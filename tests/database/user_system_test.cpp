@@ -44,7 +44,7 @@ TEST_F(DrawingTest, ImproperSystemsAreRefused) {
     EXPECT_EQ(tzhost::audit().ucsStack, 0);
 }
 
-// The view stands still, so its direction has other numbers in another system.
+// The view does not turn with the user system, so VIEWDIR has other numbers in another system.
 TEST_F(DrawingTest, ViewDirectionFollowsTheSystem) {
     ASSERT_EQ(tzedSetCurrentUCS(TzGeMatrix3d::rotation(kRight, {1, 0, 0})), 0);
     EXPECT_NEAR(viewDirection()[1], 1.0, 1e-15);

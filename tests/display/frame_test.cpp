@@ -148,7 +148,8 @@ TEST(Passes, EndWhereDrawablesDrawEachOther) {
     EXPECT_LE(pass.list().size(), 100U);
 }
 
-// Each drawable draws the next one twice, 2^22 in all. With a few more such a pass never ended.
+// Each drawable draws the next one twice, 2^22 in all. With a few levels more the pass would not
+// end.
 TEST(Passes, EndWhereDrawablesMultiply) {
     int level = 0;
     int drawn = 0;

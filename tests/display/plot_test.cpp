@@ -224,7 +224,7 @@ TEST(Plots, OfOneSceneAreTheSameFile) {
     unsetenv("SOURCE_DATE_EPOCH");
 }
 
-// Letters below the grid of the page left it empty.
+// Letters smaller than the grid of the page used to leave the page empty.
 TEST(Plots, ShowTooSmallLettersAsALine) {
     EXPECT_GT(plotted({text(std::wstring(200'000, L'x').c_str(), 1)}).countShades(0), 500);
 }

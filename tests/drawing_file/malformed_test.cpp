@@ -11,8 +11,8 @@ namespace {
 using tzhost::test::scratch;
 using tzhost::test::writeBytes;
 
-// The text of a file, and the line that reading it gives, behind the file's name. A text that
-// starts with a comma stands behind the members "format" and "version" of line 1.
+// The text of a file, and what the line of its fault says after the file's name. A text that starts
+// with a comma follows the members "format" and "version" of line 1.
 struct BadCase {
     char const* name;
     std::string text;

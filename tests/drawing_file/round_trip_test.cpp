@@ -24,7 +24,7 @@ std::string saved(std::string const& text) {
 
 struct KeptCase {
     char const* name;
-    char const* text;   // members of a drawing behind format and version
+    char const* text;   // members of a drawing after format and version
     char const* found;  // in the saved drawing
 };
 
@@ -36,7 +36,7 @@ constexpr KeptCase kKept[] = {
      R"("start":[0.1,1e+22,0],"end":[5e-324,1.7976931348623157e+308,3])"},
     {"SlantedDirection", R"("entities":[{"type":"MTEXT","direction":[0,5,7]}])",
      R"("direction":[0,1,0])"},
-    // Each save used to turn it by some last digits.
+    // Each save used to change the last digits of the direction.
     {"DirectionNearNormal",
      R"("entities":[{"type":"MTEXT","normal":[0.6,0,0.8],"direction":[0.60001,0.3e-5,0.8]}])",
      R"("type":"MTEXT")"},
@@ -58,7 +58,7 @@ constexpr KeptCase kKept[] = {
      R"("entities":[{"type":"MTEXT","contents":"a","columns":{"type":1,"count":1000,"width":1e306}}])",
      R"("inWorkingSet":true}])"},
     {"NameOfAMark", R"("entities read":1,"entities":[{"type":"LINE"}])", R"("type":"LINE")"},
-    // "Continuous" and "Standard" came first.
+    // "Continuous" and "Standard" used to come first.
     {"TableOrder", R"("linetypes":[{"name":"Dashed"},{"name":"continuous"}])",
      "[\n  {\"name\":\"Dashed\",\"dashes\":[]},\n  {\"name\":\"continuous\""},
     {"LackingRecordIsLast", R"("textStyles":[{"name":"Notes"}])",

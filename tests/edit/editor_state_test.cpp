@@ -137,7 +137,7 @@ TEST(EditorState, LoadsTheStylesOnce) {
     EXPECT_FALSE(state.GetStyleInfo(99, entry));
 }
 
-// A host that compares the session's style with the text's own cannot tell these from a document.
+// When the style is gone, a message stands in the place of the document and of the markup.
 TEST(EditorState, SaysInTheTextThatItsStyleIsGone) {
     OpenDrawing const drawing;
     CMTextEditorState state;

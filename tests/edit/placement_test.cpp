@@ -62,7 +62,8 @@ TEST(Placement, FollowsTheTextOnTheScreen) {
     }
 }
 
-// An empty text is as high as a line, so that the height of a box dragged before is used up unseen.
+// An empty text is as high as a line: the height of the box dragged before it does not show, and is
+// set back all the same.
 TEST(Placement, UsesTheDraggedBoxUp) {
     OpenDrawing const drawing;
     EasyObject<TzDbMText> text(new TzDbMText, EasyFlags::kDelete);

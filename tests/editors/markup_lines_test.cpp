@@ -16,7 +16,7 @@ constexpr LinesCase kBothWays[] = {
     {"Plain", L"abc", L"abc"},
     {"Paragraphs", L"A\\PB\\P", L"A\nB\n"},
     {"LineFeed", L"A\nB", L"A\\U+000AB"},
-    {"EscapedBackslash", L"A\\\\PB", L"A\\\\PB"},  // the letter P behind a literal backslash
+    {"EscapedBackslash", L"A\\\\PB", L"A\\\\PB"},  // the letter P after a literal backslash
     {"BackslashThenParagraph", L"A\\\\\\PB", L"A\\\\\nB"},
     {"OtherCodes", L"{\\H2x;\\fArial|b1;x}", L"{\\H2x;\\fArial|b1;x}"},
     {"LowerCaseP", L"\\pi1;x", L"\\pi1;x"},

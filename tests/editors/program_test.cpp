@@ -33,7 +33,7 @@ void runWithFault(tzhost::FaultPlan& plan) {
     plan.remove();
 }
 
-// A failure behind the fork used to leave two hosts, each of which went on with the script.
+// A failure after the fork used to leave two hosts, each of which went on with the script.
 TEST(Programs, LeaveOneHostWhicheverAllocationFails) {
     std::filesystem::remove(kSecond);
     pid_t const host = getpid();
@@ -77,7 +77,7 @@ public:
     [[nodiscard]] bool isPerson() const override { return true; }
 };
 
-// There used to be no editor without a word of the user's.
+// There used to be no editor unless the user had named one.
 TEST(Editors, AreLookedForAtATerminalAlone) {
     namespace fs = std::filesystem;
     std::string const before = std::getenv("PATH");

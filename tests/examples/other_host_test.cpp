@@ -10,7 +10,7 @@
 
 namespace {
 
-// What the program prints, with its exit status behind it.
+// What the program prints, then its exit status.
 std::string outputOf(std::string const& module) {
     std::string const program = (tztest::libraryFolder().parent_path() / "bin/other_host").string();
     std::string const file = tztest::scratch("other_host.txt").string();

@@ -236,7 +236,8 @@ TEST_F(FontMap, AFileThatAppearsBehindAPairWaitsForItsEnd) {
     EXPECT_EQ(byFile(fonts, L"romans.shx"), L"Roman S|0|0|0|2|1");
 }
 
-// The mark of a section counts in any case, but only as it is spelled is it no line too.
+// The mark of a section counts in upper and lower case. Spelled in another case than usual it is
+// also read as a line of the map.
 TEST_F(FontMap, AMarkInAnotherCaseIsALineAsWell) {
     write("[SHX Map]\noneWAYsubstitution=1\na.shx=A,0,0,0,0\n");
     Fonts fonts(0);
@@ -279,7 +280,7 @@ TEST_F(FontMap, OffersFacesToAList) {
     List list;
     fonts.FixupFontBox(&list);
     EXPECT_EQ(list.text, L"shx A\nshx B\nmisc M\nproxy P1 for n.shx\nfree P2\nfree P3\n");
-    // Running out counts too, so that none is offered after the end of the list.
+    // A file that found no free proxy counts too, so no proxy is offered after the end of the list.
     for (wchar_t const* file : {L"o.shx", L"p.shx", L"q.shx"})
         (void)byFile(fonts, file);
     EXPECT_TRUE(fonts.ProxiesExhausted());
@@ -308,7 +309,7 @@ TEST_F(FontMap, StatusFollowsLoadAndReset) {
     EXPECT_TRUE(fonts.IsDatabaseLoaded());
     fonts.ResetContents();
     EXPECT_FALSE(fonts.IsDatabaseLoaded());
-    // A loader in another place is waited for, which the user is told, and leaves its status alone.
+    // While another place is loading, the user is told of the wait and the status stays.
     struct Prints : tzhost::PrintSink {
         void print(std::wstring_view text) override { printed += text; }
         std::wstring printed;

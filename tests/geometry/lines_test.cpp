@@ -52,8 +52,8 @@ INSTANTIATE_TEST_SUITE_P(Rows, LineCrossings, testing::ValuesIn(kCrossings), [](
     return row.param.name;
 });
 
-// Far out two lines of one tilted plane pass each other by some rounding of their coordinates,
-// which is more than the tolerance; by that alone they would not cross.
+// Far from the origin, rounding parts two lines of one tilted plane by more than the tolerance.
+// They cross all the same.
 TEST(Lines, CrossFarFromTheOrigin) {
     TzGeMatrix3d const tilt = TzGeMatrix3d::rotation(0.7, {1, 2, 3}, {4e8, -7e8, 1e8});
     TzGePoint3d const wanted = tilt * TzGePoint3d(9e8, 1e8, 0);

@@ -11,7 +11,7 @@ struct WordCase {
     char const* name;
     std::wstring_view typed;
     std::wstring insert;
-    std::wstring choices;  // a blank behind each
+    std::wstring choices;  // a blank after each
 };
 
 std::vector<std::wstring> const kWords{L"LIST",   L"LINE",        L"LOAD",   L"MTEXT",

@@ -48,7 +48,7 @@ public:
     static fs::path desk() { return fs::path(testing::TempDir()) / "desk"; }
     static fs::path configuration() { return fs::path(testing::TempDir()) / "configuration"; }
 
-    // Once the program edits a line; before that the terminal itself would take some keys.
+    // Waits until the program edits a line; before that the terminal itself would take some keys.
     void type(std::string_view keys) {
         termios settings{};
         for (int waited = 0; waited < kPatienceMilliseconds; waited += 5) {
@@ -58,7 +58,7 @@ public:
         EXPECT_EQ(write(screen_, keys.data(), keys.size()), static_cast<ssize_t>(keys.size()));
     }
 
-    // Reads on until the text has shown; what stands behind it is left for the next call.
+    // Reads on until the text has shown; what comes after it is left for the next call.
     [[nodiscard]] bool shows(std::string_view text) {
         for (;;) {
             std::size_t const at = seen_.find(text);
@@ -176,7 +176,7 @@ constexpr char kReplace[] = "Replace it? [Yes/No] <No>: ";
 constexpr char kUnnamed[] = "not saved: a drawing without a name.";
 constexpr char kCircle[] = "Command: |CIRCLE\r|point: |1,2\r|Radius: |3\r|: ";
 
-// Nothing of this used to be asked, said or completed so. "*" draws a circle, and "$" begins the
+// The program used to ask, say and complete nothing of this. "*" draws a circle, and "$" begins the
 // program's arguments.
 constexpr CareCase kCare[] = {
     {"QuitStays", "*|QUIT\r|<No>: |\r", kIdle},

@@ -73,7 +73,7 @@ TEST(GermanSession, HasNoLineOfTheEnglishOne) {
     }
 }
 
-// Each runs in the language of whoever tries it: no local word takes the place of one in a script.
+// Each script of examples/ runs in every language: no local word takes the place of a word in it.
 TEST(Examples, DrawTheSameInEachLanguage) {
     int count = 0;
     for (auto const& entry : fs::directory_iterator(tztest::sourceFolder() / "examples")) {

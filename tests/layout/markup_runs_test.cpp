@@ -40,7 +40,7 @@ std::wstring repeated(std::wstring const& part, int count) {
     return text;
 }
 
-// Each text is what a careless reader needs quadratic time, or the whole call stack, for.
+// Texts for which a careless reader would need quadratic time or the whole call stack.
 TEST(MarkupRuns, HostileTextsAreReadInLinearTime) {
     constexpr int kCount = 200000;
     EXPECT_EQ(
@@ -48,7 +48,7 @@ TEST(MarkupRuns, HostileTextsAreReadInLinearTime) {
                   kInitial),
         "'A' P");
     EXPECT_EQ(readMarkup(repeated(L"{\\C1;a", kCount), kInitial).text.size(), 200000U);
-    // Stacks without an end: in vain, in vain but for a mark that a code hides, and out of step.
+    // Stacks without an end: without a sign, with a sign that a code hides, and "\S" alone.
     EXPECT_EQ(readMarkup(repeated(L"\\Sx", kCount), kInitial).text.size(), 600000U);
     EXPECT_EQ(readMarkup(repeated(L"\\S\\U+002F", 100000), kInitial).text.size(), 300000U);
     EXPECT_EQ(readMarkup(repeated(L"\\S", kCount), kInitial).text.size(), 400000U);

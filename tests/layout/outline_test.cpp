@@ -121,7 +121,8 @@ std::size_t shapesOf(double tracking) {
     return letters;
 }
 
-// f and i were one shape, parted as one letter, and i had no room of its own down the page.
+// f and i used to be one shape: tracking moved them as one letter, and down the page i had no place
+// of its own.
 TEST(Letters, DoNotJoinWhereEachHasItsPlace) {
     EXPECT_EQ(shapesOf(1), 1U);
     EXPECT_EQ(shapesOf(1.5), 2U);
@@ -133,7 +134,7 @@ TEST(Letters, DoNotJoinWhereEachHasItsPlace) {
     EXPECT_GT(layout.runs[1].advance, 0.0);
 }
 
-// Marks were drawn with whatever face came first that had them, here one of another script.
+// Marks used to be drawn with the first face that had them, here a face of another script.
 TEST(Letters, MarksTakeTheFaceOfTheLettersBesideThem) {
     struct {
         wchar_t const* text;

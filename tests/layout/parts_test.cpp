@@ -94,8 +94,8 @@ TEST(Parts, StackScaleSizesTheParts) {
 }
 
 // Hebrew (DejaVu Sans Mono has none, but its face decides no order) stands from right to left,
-// numbers in it from left to right; the first strong letter decides the order of the whole. Behind
-// Arabic letters a number goes with them, so the blank behind it does too.
+// numbers in it from left to right; the first strong letter decides the order of the whole. A
+// number after Arabic letters goes with them, so the blank after the number does too.
 TEST(Parts, StandInTheOrderTheyAreSeen) {
     struct {
         wchar_t const* contents;

@@ -125,7 +125,7 @@ TEST_F(FontState, GivesALookBack) {
     EXPECT_EQ(other.GetBaseAlignment(1), kAlignBottom);
 }
 
-// The second code used to be the first again.
+// The second code for the face used to be a copy of the first.
 TEST_F(FontState, WritesAFaceByTheTablesOfTheMoment) {
     FontName const lent(L"Lent One");
     state.SetPitchAndFamily(0);

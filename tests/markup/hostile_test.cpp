@@ -122,7 +122,8 @@ TEST(ManyFonts, AreFoundByNumber) {
     EXPECT_STREQ(session.toMtext(rtf).c_str(), L"{\\fF299999|b0|i0|c0|p0;a}");
 }
 
-// What is worked out at once must be what a search from each place finds.
+// Asked often, the look-ahead works out all places in one pass. A search from each place must find
+// the same.
 TEST(StackLookAhead, AnswersTheSameWhenPressed) {
     std::wstring const alphabet = L"\\;u/ab";
     unsigned int seed = 1;

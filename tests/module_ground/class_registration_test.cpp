@@ -1,4 +1,4 @@
-// Runtime classes: one descriptor for each name, whoever asks, and none left behind.
+// Runtime classes: one descriptor for each name, whoever asks, and none is left over.
 
 #include "module/host_calls/class_registration.h"
 

@@ -27,7 +27,7 @@ constexpr TextRow kTexts[] = {
     {"PointVariable", 8, L"a{LASTPOINT}b", L"ab"},
     {"NoClosingBrace", 9, L"a{LUNITS", L"a{LUNITS"},
     {"LoneClosingBrace", 10, L"a}b{LUNITS}", L"a}b2"},
-    // A name of 16 characters is looked up; one of 17 stops all expansion behind it.
+    // A name of 16 characters is looked up; one of 17 stops all expansion after it.
     {"Sixteen", 11, L"{ABCDEFGHIJKLMNOP}{LUNITS}", L"2"},
     {"Seventeen", 12, L"{LUNITS}{ABCDEFGHIJKLMNOPQ}{LUNITS}", L"2{ABCDEFGHIJKLMNOPQ}{LUNITS}"},
     {"BraceInAName", 13, L"{LU{NITS}", L""},

@@ -6,7 +6,7 @@
 
 #include "host/settings/variables.h"
 
-// Each test begins with the defaults of a fresh process, and leaves them behind.
+// Each test begins with the defaults of a fresh process and restores them at its end.
 class WithVariables : public testing::Test {
 protected:
     WithVariables() : before_(store_.snapshot()) {}

@@ -39,8 +39,8 @@ void expectStays(int from, int to, double width) {
     EXPECT_TRUE(before[3].isEqualTo(after[3], TzGeTol(1e-9)));
 }
 
-// Without a width the measured one counts. A box wider than its text is another matter: the text
-// moves in it, the box does not.
+// Without a width the measured one counts, so the text stays. In a box that is wider than its text
+// the text moves and the box stays.
 TEST(Attachment, LeavesTheTextWhereItIs) {
     OpenDrawing const drawing;
     for (int from = 1; from <= 9; ++from) {

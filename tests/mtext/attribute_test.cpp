@@ -103,8 +103,7 @@ TEST(Attributes, WithoutATextDoNothing) {
     EXPECT_EQ(TzadEditMTextEntity(nullptr, kMTETabText, nullptr, 0, 0, true, true), 3);
 }
 
-// What is read and what is written are not exact inverses: the working globals' angle is added
-// once.
+// Reading adds the angle of the working globals, and writing does not take it away.
 TEST(Options, ReadTheWorkingAngleAndNeverTakeItAway) {
     OpenDrawing const drawing;
     tzhost::DrawingSettings settings = tzhost::workingDrawing()->settings();

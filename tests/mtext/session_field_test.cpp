@@ -1,5 +1,5 @@
 // The field that an editor session leaves in the holder of its text: the drawing gets it, or it is
-// deleted, whatever comes behind the session.
+// deleted, whatever comes after the session.
 
 #include "module/edit/session_field.h"
 

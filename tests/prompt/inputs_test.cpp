@@ -110,7 +110,7 @@ constexpr Default kNo = Default::no;
 constexpr Default kYes = Default::yes;
 // The user system is moved by 10,0 and turned by nothing.
 constexpr AskRow kAsks[] = {
-    // The default of a keyword stands behind the brackets, that of a value in front of them.
+    // The default of a keyword stands after the brackets, the default of a value before them.
     {"Keyword", askKeyword, kWords, 0, kNo, "_gh\n", "5100 3 Gh",
      L"Pick [A = (b c)/Two words/Höhe]: _gh\n"},
     {"KeywordInTheUsersLanguage", askKeyword, kWords, 0, kNo, "HÖHE\n", "5100 5 Height",

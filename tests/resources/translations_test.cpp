@@ -56,7 +56,7 @@ std::vector<tzhost::LocalTextRow> hostTexts(std::string const& language) {
     return rows;
 }
 
-// What a keyword shows: its part ahead of the global word.
+// What a keyword shows: its part before the global word.
 std::wstring shownOf(tzhost::ResourceRow const& row) {
     bool const isKeyword = row.rules == tzhost::ResourceRules::keywords;
     return isKeyword ? row.text.substr(0, row.text.find(L" _")) : row.text;

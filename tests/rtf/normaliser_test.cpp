@@ -11,7 +11,7 @@ using std::string_view_literals::operator""sv;
 struct Case {
     char const* name;
     std::string_view rtf;
-    char const* written;  // from behind the first line, which has the tables, to the last paragraph
+    char const* written;  // from the second line (the first has the tables) to the last paragraph
 };
 
 std::string bodyOf(std::string_view rtf) {
@@ -134,7 +134,7 @@ constexpr Case kGroups[] = {
      "\\pard {\\dn1234 \\\\S}1/2;{\\dn6}a"},
     {"NoStack", "\\\\S\\tab\\\\Sa\\\\S\\{\\\\S{\\b b}"sv,
      "\\pard \\\\\\u83?\\tab \\\\Sa\\\\S\\{\\\\\\u83?{\\b b"},
-    // The reader looks for words of paragraphs behind the second backslash too.
+    // The reader looks for words of paragraphs after the second backslash too.
     {"NoWords", "\\\\tx5\\\\parx\\\\x"sv, "\\pard \\\\\ntx5\\\\\nparx\\\\x"},
 };
 INSTANTIATE_TEST_SUITE_P(Groups, Bodies, testing::ValuesIn(kGroups), kName);

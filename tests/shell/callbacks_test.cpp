@@ -105,7 +105,7 @@ bool failMemoryAfterDrag(std::string_view operation, int&) {
     return dragged && operation == "operator new";
 }
 
-// The mark that the command runs is set back by its last step alone, which the next run reaches.
+// The last step of a command alone clears MTEXTCOMMANDACTIVE. The next run reaches that step.
 TEST_F(Commands, LeaveTheirMarkWhenAnExceptionPasses) {
 #ifdef __SANITIZE_ADDRESS__
     GTEST_SKIP() << "the sanitizer's own operator new serves in this build";

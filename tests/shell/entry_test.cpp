@@ -63,7 +63,7 @@ protected:
             dlsym(tzhost::dynamicLinker().modules().front()->loaderHandle, name));
     }
 
-    // Registrations as "what name", with "-" ahead of those taken back; a line of the debug output
+    // Registrations as "what name", with "-" before those taken back; a line of the debug output
     // as "debug".
     std::string registered_;
     std::string debug_;  // those lines themselves

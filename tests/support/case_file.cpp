@@ -25,8 +25,8 @@ std::vector<std::string> linesOf(std::string const& file) {
     return lines;
 }
 
-// The text behind a word and the blank that follows it.
-std::string behind(std::string const& line, std::size_t word) {
+// The text after a word and the blank that follows it.
+std::string textAfter(std::string const& line, std::size_t word) {
     return line.size() > word + 1 ? line.substr(word + 1) : std::string();
 }
 
@@ -52,7 +52,7 @@ public:
 private:
     bool take(std::string const& line) {
         std::string const word = line.substr(0, line.find(' '));
-        std::string const rest = behind(line, word.size());
+        std::string const rest = textAfter(line, word.size());
         SessionCase& at = inCase_ ? current_ : common_;
         std::map<std::string, std::function<void()>> const words = {
             {"case", [&] { startCase(rest); }},

@@ -8,8 +8,8 @@
 // Files of session cases: for each a script and what is to be seen of it, line by line. A file
 // reads
 //
-//   # A comment. What stands ahead of the first case holds for all of them:
-//   from 2               events ahead of the second question are not shown
+//   # A comment. What stands before the first case holds for all of them:
+//   from 2               events before the second question are not shown
 //   show frames          what is drawn during drags is shown too
 //   hide telemetry       lines that begin so are not shown; repeatable
 //   var AUNITS=3         a variable of the run, as --var takes it; repeatable

@@ -78,7 +78,7 @@ std::map<std::string, Line> const& lineOfEvent() {
          }},
         {"print",
          [](Json const& e) {
-             // The line end behind each answer is left out.
+             // The line end after each answer is left out.
              std::string const text = textOf(e, "text");
              return text == "\\n" ? std::string() : "print " + text;
          }},

@@ -17,7 +17,7 @@ namespace tztest {
 class EventLines {
 public:
     enum class Frames { left, shown };
-    // Events ahead of the question with that number are passed over; 0 shows all.
+    // Events before the question with that number are passed over; 0 shows all.
     EventLines(int fromQuestion, Frames frames) : from_(fromQuestion), frames_(frames) {}
 
     void add(nlohmann::ordered_json const& event);

@@ -24,7 +24,7 @@ struct ProgramRun {
 
 // Arguments as on a command line, without the program's name; they must be right.
 [[nodiscard]] ProgramRun runProgram(std::vector<std::string> const& arguments);
-// The same in a process of its own, for arguments that may be wrong. `before` stands ahead of the
+// The same in a process of its own, for arguments that may be wrong. `before` stands before the
 // program for the shell, such as "ulimit -f 8; ".
 [[nodiscard]] ProgramRun startProgram(std::string const& arguments, std::string const& before = "");
 

@@ -14,7 +14,7 @@
 // failing. Whatever a try does is taken back before the next.
 namespace tztest {
 
-// What one try left behind.
+// What was left over after one try.
 struct SweepTry {
     std::string command;
     std::string what;  // "cancel from question 3", "tzedSSGet:2"

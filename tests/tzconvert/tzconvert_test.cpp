@@ -32,7 +32,7 @@ struct Outcome {
     std::string err;
 };
 
-// Behind `first`, which may limit what the program gets or where it runs.
+// Runs the program after `first`, which may limit what the program gets or where it runs.
 Outcome run(std::string const& arguments, std::string const& input, std::string const& first = "") {
     write("in", input);
     std::string const command = "{ " + first + "'" + std::getenv("TZ_TEST_BIN") + "/tzconvert' " +
@@ -46,7 +46,7 @@ struct RunCase {
     char const* arguments;
     std::string_view input;
     int status;
-    char const* out;  // all of it, or a part behind a "~"
+    char const* out;  // all of it, or a part after a "~"
     char const* err;  // a part
 };
 using std::string_view_literals::operator""sv;
@@ -223,7 +223,8 @@ TEST(Files, ThatMemoryCannotHoldAreNamed) {
     EXPECT_EQ(contentsOf("batch/one.mtext"), "1");
 }
 
-// The second file's font used to come back as the face that the first had lent to another.
+// The font of the second file used to come back as a face, which the first file had lent to another
+// font.
 TEST(Files, OfABatchGiveWhatTheyGiveAlone) {
     fs::create_directories("batch");
     write(
@@ -270,7 +271,7 @@ TEST(Files, DoNotOverwriteInputs) {
     EXPECT_EQ(contentsOf("trip.rtf"), "y");
 }
 
-// It was written over an input, or over the result that stood there already.
+// The result used to be written over an input, or over an earlier result.
 TEST(Reports, TakeThePlaceOfNothingElse) {
     struct Row {
         char const* arguments;

@@ -17,7 +17,7 @@ struct BadRow {
     char const* name;
     char const* arguments;
     int status;
-    char const* line;  // how the one line on standard error begins, behind "tzdraft: "
+    char const* line;  // how the one line on standard error begins, after "tzdraft: "
 };
 
 // Arguments that are no arguments, in a process of their own.

@@ -30,7 +30,7 @@ private:
     fs::path folder_ = scratch("configuration");
 };
 
-// How often a text stands in another.
+// How often a text occurs in another.
 int countOf(std::string const& text, std::string const& all) {
     int count = 0;
     for (std::size_t at = 0; (at = all.find(text, at)) != std::string::npos; at += text.size())
@@ -43,7 +43,7 @@ constexpr char kFolder[] = "";  // in the place of the file
 struct SettingsRow {
     char const* name;
     char const* bytes;
-    char const* problem;  // behind the file's name
+    char const* problem;  // after the file's name
 };
 constexpr SettingsRow kSettings[] = {
     {"Folder", kFolder, ": Is a directory"},

@@ -16,7 +16,7 @@ void leaveASet() {
     ASSERT_EQ(tzedSSGet(nullptr, nullptr, nullptr, nullptr, set), Tzad::ePromptNormal);
 }
 
-// They used to live on and count in every audit behind.
+// The sets used to live on and to count in every later audit.
 TEST(LeftSets, CountForTheirCommandAlone) {
     constexpr wchar_t kGroup[] = L"LEFT";
     ASSERT_EQ(tzhost::commandStack().addCommand(kGroup, L"LEAVE", L"LEAVE", 0, leaveASet, nullptr,

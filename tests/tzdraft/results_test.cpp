@@ -88,7 +88,7 @@ INSTANTIATE_TEST_SUITE_P(Rows, Result, testing::ValuesIn(kRows), [](auto const& 
     return row.param.name;
 });
 
-// The events used to be written to this file, whatever it held, until they were whole.
+// Unfinished events used to be written to a file of this name, over whatever it held.
 TEST(Results, OfEventsLeaveOtherFilesAlone) {
     auto const script = scratch("quit.scr", "QUIT\n");
     auto const other = scratch("quit.jsonl.part", kOld);
