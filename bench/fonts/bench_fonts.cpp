@@ -34,7 +34,7 @@ std::vector<Font> fontsOf(benchmark::State const& state) {
     return fonts;
 }
 
-// The tables with these fonts and no others, as long as it lives.
+// While it lives, the tables hold these fonts and no others.
 class FilledTables {
 public:
     explicit FilledTables(std::vector<Font> const& fonts) {

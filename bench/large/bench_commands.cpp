@@ -1,7 +1,8 @@
 // Commands on one entity of a drawing with 100,000, each taken back again. The floor is the same in
 // a drawing with 10: neither the audit nor undo may look at objects that a command does not touch.
-// And commands on all of 100,000 texts, whose floor is as many texts in 100 drawings of 1,000, each
-// visited once a turn as in a session: the cost of a text must not grow with the selection.
+// Further commands work on all of 100,000 texts. Their floor is as many texts in 100 drawings of
+// 1,000, each visited once a turn as in a session: the cost of a text must not grow with the
+// selection.
 #include <benchmark/benchmark.h>
 
 #include <filesystem>
@@ -122,7 +123,7 @@ std::unique_ptr<tzhost::Drawing> textsWithTwoStyles(int count) {
     if (drawing->getTextStyleTable(styles.object, TzDb::kForWrite) != Tzad::eOk) return drawing;
     auto* const style = new TzDbTextStyleTableRecord;
     TzDbObjectId id;
-    // Refused, the first use of the style finds that it is missing.
+    // When the style is refused, its first use finds that it is missing.
     if (style->setName(L"Two") == Tzad::eOk && styles->addRecord(style, id) == Tzad::eOk)
         (void)style->close();
     return drawing;

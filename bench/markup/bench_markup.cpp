@@ -2,8 +2,8 @@
 // characters to a growing wide string, text whose look changes every 40 characters twenty times.
 //
 // The sweeps show that the time for a character does not grow with the size: from 10 thousand to 50
-// million characters, those read and those written, its ratio to the floor stays within 1.3 of what
-// it is at the smallest size. Times are those of the processor, and memory stays with the process,
+// million characters (read and written) the ratio to the floor stays within 1.3 of the ratio at the
+// smallest size. Times are those of the processor, and memory stays with the process,
 // so that neither other work nor the first touch of memory is in them.
 #include <benchmark/benchmark.h>
 
@@ -55,7 +55,7 @@ void appendAll(std::wstring const& text) {
     benchmark::DoNotOptimize(copy.data());
 }
 
-// What entries of a table cost at the least: each under its own text in a table that is looked up.
+// The least that entries of a table can cost: each is entered into a hash table under its own text.
 void appendToTable(TextKind const& kind, std::wstring const& text) {
     appendAll(text);
     std::unordered_map<std::wstring, std::wstring> table;

@@ -48,8 +48,7 @@ struct Loaded {
     bool succeeded;
 };
 
-// A copy of the shipped font map that looks changed ahead of each load, so that none is spared
-// reading it.
+// A copy of the shipped font map that looks changed before each load, so that every load reads it.
 class ChangingFontMap {
 public:
     ChangingFontMap() {

@@ -1,6 +1,6 @@
 // Any bytes as rich text. Holds when the result is a document of the dialect in UTF-8 that grows by
-// no more than a paragraph's settings a character. What comes of it in turn, which drops fonts that
-// no text has, passes as it is. Characters above U+FFFF, which are bare, are left out of that: a
+// no more than a paragraph's settings a character. A second pass drops the fonts that no text uses,
+// a third must change nothing. Characters above U+FFFF are left out of that: they stand bare, and a
 // second pass takes them for bytes of a page.
 #include <cstddef>
 #include <cstdint>

@@ -36,7 +36,7 @@ extern "C" int LLVMFuzzerTestOneInput(std::uint8_t const* data, std::size_t size
     for (unsigned i = 0; i <= 2 * lines + 14; ++i)
         ask(data[0] + i);
     if (source.next({}).kind != tzhost::Answer::Kind::end) std::abort();
-    // A control character shows as eight.
+    // A control character shows as up to eight characters.
     if (shown > 8 * script.size() + 200 * (lines + 15)) std::abort();
     tzhost::commandLine().reset();
     return 0;
