@@ -1,17 +1,17 @@
 # The words that every CMakeLists.txt below uses:
 #
-#   add_layer(NAME sources...)                        one folder of the layer table (headers are found)
-#   add_test_support(NAME sources... [LIBS layers...])  shared code of the suites
-#   add_suite(NAME sources... [LIBS layers...])       a GoogleTest program, target test_NAME
-#   add_fuzz(NAME source [LIBS layers...])            a fuzzer and the replay of its seeds, target fuzz_NAME
-#   add_bench(NAME sources... [LIBS layers...])       a benchmark (release only), target bench_NAME
-#   add_bench_program(NAME sources...)                a program that scripts/compare.py measures (release only)
-#   add_example_module(NAME sources...)               a further module lib/NAME.tzx, built from sdk/ alone
-#   add_example_program(NAME sources...)              a program bin/NAME, built from sdk/ alone
-#   add_lint(NAME command...)                         a check of the source tree, test lint.NAME
+#   add_layer(NAME sources...)            a folder of the layer table; its headers are found
+#   add_test_support(NAME sources... *)   shared code of the suites
+#   add_suite(NAME sources... *)          a GoogleTest program, target test_NAME
+#   add_fuzz(NAME source *)               a fuzzer and the replay of its seeds, target fuzz_NAME
+#   add_bench(NAME sources... *)          a benchmark (release only), target bench_NAME
+#   add_bench_program(NAME sources...)    a program for scripts/compare.py (release only)
+#   add_example_module(NAME sources...)   a further module lib/NAME.tzx, built from sdk/ alone
+#   add_example_program(NAME sources...)  a program bin/NAME, built from sdk/ alone
+#   add_lint(NAME command...)             a check of the source tree, test lint.NAME
 #
-# LIBS names layers (module_prompt, app_tzdraft), support libraries or third-party targets; a layer
-# brings the layers of its row along, and libtz is always there.
+# Those with a * take LIBS and names after it: layers (module_prompt, app_tzdraft), support libraries
+# or third-party targets. A layer brings the layers of its row along, and libtz is always there.
 
 set(TZ_ROOTS ${CMAKE_BINARY_DIR}/roots)
 set(TZ_FOLDERS "")
@@ -85,7 +85,7 @@ function(tz_link_closure out)
             list(APPEND others ${name})
         endif()
     endforeach()
-    # A support library comes ahead of the layers that it calls.
+    # A support library comes before the layers that it calls.
     set(result ${others})
     set(folders ${TZ_FOLDERS})
     list(REVERSE folders)
@@ -169,7 +169,8 @@ function(tz_proof_target target)
     if(type STREQUAL "EXECUTABLE")
         set_target_properties(${target} PROPERTIES RUNTIME_OUTPUT_DIRECTORY
             ${CMAKE_BINARY_DIR}/tests)
-        # A suite starts the programs and loads the module and its resources: they are built with it.
+        # A suite starts the programs and loads the module with its resources, so they are built
+        # with it.
         add_dependencies(${target} tz_products)
     endif()
 endfunction()

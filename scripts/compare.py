@@ -5,7 +5,7 @@
 
 Each round runs every program once. What counts is the median of the processor's time, so that other
 work on the machine does not. Prints one line for each ratio with its bound, as ratios.py does, and
-the times and peaks of memory behind them; exit status 1 when one is over. A program that is not
+then the times and peaks of memory; exit status 1 when one is over. A program that is not
 installed is left out, with a line that says so."""
 import argparse
 import os
@@ -82,7 +82,7 @@ def compare_speed(report, convert, bare, file, rounds):
 
 
 def measure_depth(report, convert, file):
-    """Peaks at a million and two million open groups: the difference is that of a million levels."""
+    """Memory of a million levels: the peak at two million open groups less that at one million."""
     for way, level in (("to-mtext", r"{\b a"), ("to-rtf", "{a")):
         peaks = []
         for depth in (MILLION, 2 * MILLION):

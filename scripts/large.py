@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Proves large drawings with the whole program of the release build, which must be there.
+"""Tests large drawings with the whole program of the release build, which must be there.
 
     large.py speed  [--entities N]            making, opening and saving: times and memory
     large.py saving [--entities N] [--kills N] [--limits N]
@@ -27,7 +27,7 @@ NOBODY = 65534
 
 
 def environment(folder):
-    """Fixed fonts, and settings of nobody's."""
+    """The environment of a run: fixed fonts, and no settings of any user."""
     return os.environ | {"FONTCONFIG_FILE": str(BUILD / "tests/fonts/fonts.conf"),
                          "XDG_CONFIG_HOME": str(folder / "settings"), "LC_ALL": "C.UTF-8"}
 
@@ -182,7 +182,7 @@ class Saves:
                           f"{litter} times with a temporary file beside", wrong, times)
         before = self.number
         self.save()
-        self.report.count("saves behind them", self.held() != before + 1, 1)
+        self.report.count("saves after them", self.held() != before + 1, 1)
         for each in self.temporaries():
             each.unlink()
 

@@ -1,14 +1,15 @@
 #!/usr/bin/env python3
-"""Shows the office texts as other programs see them, to be looked at after a change of the RTF writer.
+"""Shows the office texts as other programs see them. Look at them after a change of the RTF writer.
 
   scripts/office_pages.py FOLDER [BUILD]      (build/release)
 
 Converts each text of tests/markup/office.txt to RTF, lets a word processor print it, and puts the
-pages into FOLDER: one picture a text (nnn.png) and all of them beside their markup (index.html). Each
-word of a text must be on its page and in what unrtf reads; stacks are left out, since their document
-form is for the module's own editor, and for unrtf words with characters above 0x7F, since it takes all
-that stands behind one, up to the next blank, for its substitute. Needs soffice, unrtf, pdftotext and pdftoppm
-(scripts/setup.sh pages); without one of them nothing is done and the exit status is 77.
+pages into FOLDER: one picture a text (nnn.png) and all of them beside their markup (index.html).
+Each word of a text must be on its page and in what unrtf reads. Two kinds of words are not looked
+for: stacks, whose form in the document is for the module's own editor; and, in unrtf, words with
+characters above 0x7F, since unrtf drops what follows such a character up to the next blank. Needs
+soffice, unrtf, pdftotext and pdftoppm (scripts/setup.sh pages); without one of them nothing is done
+and the exit status is 77.
 """
 import argparse
 import html
