@@ -51,22 +51,24 @@ std::string frameOf(Body const& body) {
 
 TEST(Frames, TellLinesInTheirOrderAndMergeNothing) {
     TzGePoint3d const line[] = {{0, 0, 0}, {1, -0.0, 0}};
-    EXPECT_EQ(
-        frameOf([&](TzGiWorldDraw& draw) {
-            draw.geometry().polyline(2, line);
-            draw.subEntityTraits().setColor(253);
-            draw.subEntityTraits().setLineWeight(30);
-            draw.geometry().polyline(2, line);
-            draw.subEntityTraits().setTrueColor(TzCmEntityColor(1, 0xAB, 255));
-            draw.geometry().polygon(2, line);
-            draw.geometry().polyline(0, line);
-        }),
-        R"({"op":"polyline","points":[[0.0,0.0,0.0],[1.0,0.0,0.0]],"color":3,"lineWeight":0,"linetype":""})"
-        "\n"
-        R"({"op":"polyline","points":[[0.0,0.0,0.0],[1.0,0.0,0.0]],"color":253,"lineWeight":30,"linetype":""})"
-        "\n"
-        R"({"op":"polyline","points":[[0.0,0.0,0.0],[1.0,0.0,0.0],[0.0,0.0,0.0]],"color":"#01ABFF","lineWeight":30,"linetype":""})"
-        "\n");
+    EXPECT_EQ(frameOf([&](TzGiWorldDraw& draw) {
+                  draw.geometry().polyline(2, line);
+                  draw.subEntityTraits().setColor(253);
+                  draw.subEntityTraits().setLineWeight(30);
+                  draw.geometry().polyline(2, line);
+                  draw.subEntityTraits().setTrueColor(TzCmEntityColor(1, 0xAB, 255));
+                  draw.geometry().polygon(2, line);
+                  draw.geometry().polyline(0, line);
+              }),
+              R"({"op":"polyline","points":[[0.0,0.0,0.0],[1.0,0.0,0.0]],"color":3,"lineWeight":0,)"
+              R"("linetype":""})"
+              "\n"
+              R"({"op":"polyline","points":[[0.0,0.0,0.0],[1.0,0.0,0.0]],"color":253,)"
+              R"("lineWeight":30,"linetype":""})"
+              "\n"
+              R"({"op":"polyline","points":[[0.0,0.0,0.0],[1.0,0.0,0.0],[0.0,0.0,0.0]],)"
+              R"("color":"#01ABFF","lineWeight":30,"linetype":""})"
+              "\n");
 }
 
 TEST(Frames, TellTextsAsTheyWereGiven) {
@@ -77,7 +79,8 @@ TEST(Frames, TellTextsAsTheyWereGiven) {
         frameOf([&](TzGiWorldDraw& draw) {
             draw.geometry().text({1, 2, 3}, {0, 0, 1}, {0, 2, 0}, L"\u00E4bc", 2, true, style);
         }),
-        R"({"op":"text","string":"äb","position":[1.0,2.0,3.0],"normal":[0.0,0.0,1.0],"direction":[0.0,2.0,0.0],"size":2.5,"vertical":true,"color":3})"
+        R"({"op":"text","string":"äb","position":[1.0,2.0,3.0],"normal":[0.0,0.0,1.0],)"
+        R"("direction":[0.0,2.0,0.0],"size":2.5,"vertical":true,"color":3})"
         "\n");
 }
 

@@ -78,7 +78,8 @@ BadCase const kBad[] = {
     {"Transparency", ",\"entities\":[{\"type\":\"MTEXT\",\"background\":{\"transparency\":91}}]}",
      ":1: member \"background.transparency\": is 91, expected a whole number from 0 to 90"},
     {"Color", ",\"entities\":[{\"type\":\"LINE\",\"color\":\"#12345G\"}]}",
-     ":1: member \"color\": is a text, expected a whole number from 0 to 256 or a text \"#RRGGBB\""},
+     ":1: member \"color\": is a text,"
+     " expected a whole number from 0 to 256 or a text \"#RRGGBB\""},
     {"PointOfTwo", ",\"entities\":[{\"type\":\"LINE\",\"end\":[1,2]}]}",
      ":1: member \"end\": is an array, expected an array of three numbers"},
     {"PointOfTexts", ",\"entities\":[{\"type\":\"LINE\",\"end\":[1,2,\"3\"]}]}",
@@ -90,7 +91,8 @@ BadCase const kBad[] = {
     {"ZeroCharacter", ",\"entities\":[{\"type\":\"MTEXT\",\"contents\":\"a\\u0000b\"}]}",
      ":1: member \"contents\": holds a zero character, expected a text without one"},
     {"HandleTwice",
-     ",\"entities\":[{\"handle\":\"2A\",\"type\":\"LINE\"},\n{\"handle\":\"2a\",\"type\":\"LINE\"}]}",
+     ",\"entities\":[{\"handle\":\"2A\",\"type\":\"LINE\"}"
+     ",\n{\"handle\":\"2a\",\"type\":\"LINE\"}]}",
      ":2: member \"handle\": is \"2a\" as that of an earlier entity, expected each handle once"},
     {"HandleZero", ",\"entities\":[{\"handle\":\"0\",\"type\":\"LINE\"}]}",
      ":1: member \"handle\": is no handle, expected a text of hexadecimal digits from \"1\" to "

@@ -32,7 +32,8 @@ constexpr KeptCase kKept[] = {
     {"Contents", R"("entities":[{"type":"MTEXT","contents":"a\"\\P\u00e9\ud834\udd1e\n\u0001"}])",
      "\"contents\":\"a\\\"\\\\P\u00e9\U0001D11E\\n\\u0001\""},
     {"Doubles",
-     R"("entities":[{"type":"LINE","start":[0.1,1e22,-0.0],"end":[5e-324,1.7976931348623157e308,3.0]}])",
+     R"("entities":[{"type":"LINE","start":[0.1,1e22,-0.0],)"
+     R"("end":[5e-324,1.7976931348623157e308,3.0]}])",
      R"("start":[0.1,1e+22,0],"end":[5e-324,1.7976931348623157e+308,3])"},
     {"SlantedDirection", R"("entities":[{"type":"MTEXT","direction":[0,5,7]}])",
      R"("direction":[0,1,0])"},
@@ -44,18 +45,22 @@ constexpr KeptCase kKept[] = {
      R"("center":[1,2,3],"normal":[0.26)"},
     {"Columns",
      R"("entities":[{"type":"MTEXT","columns":{"type":2,"heights":[3,4],"flowReversed":true}}])",
-     R"("columns":{"type":2,"autoHeight":false,"count":0,"width":0,"gutter":0,"heights":[3,4],"flowReversed":true})"},
+     R"("columns":{"type":2,"autoHeight":false,"count":0,"width":0,"gutter":0,"heights":[3,4],)"
+     R"("flowReversed":true})"},
     {"Background", R"("entities":[{"type":"MTEXT","background":{"fill":true,"color":"#0a0B0c"}}])",
-     R"("background":{"fill":true,"color":"#0A0B0C","scale":1.5,"useBackgroundColor":false,"transparency":0})"},
+     R"("background":{"fill":true,"color":"#0A0B0C","scale":1.5,"useBackgroundColor":false,)"
+     R"("transparency":0})"},
     {"PaperSpace", R"("entities":[{"type":"LINE","space":"paper"},{"type":"CIRCLE"}])",
      R"({"handle":"1","type":"LINE","space":"paper")"},
     {"HandlesToTheLast",
-     R"("entities":[{"handle":"3FFFFFFFFFFFFFFF","type":"LINE"},{"handle":"1","type":"LINE"},{"type":"CIRCLE"}])",
+     R"("entities":[{"handle":"3FFFFFFFFFFFFFFF","type":"LINE"},{"handle":"1","type":"LINE"},)"
+     R"({"type":"CIRCLE"}])",
      R"({"handle":"2","type":"CIRCLE")"},
     {"UnmeasuredLine", R"("entities":[{"type":"TEXT","textHeight":1e308,"text":"hello"}])",
      R"("inWorkingSet":true}])"},
     {"UnmeasuredColumns",
-     R"("entities":[{"type":"MTEXT","contents":"a","columns":{"type":1,"count":1000,"width":1e306}}])",
+     R"("entities":[{"type":"MTEXT","contents":"a","columns":{"type":1,"count":1000,)"
+     R"("width":1e306}}])",
      R"("inWorkingSet":true}])"},
     {"NameOfAMark", R"("entities read":1,"entities":[{"type":"LINE"}])", R"("type":"LINE")"},
     // "Continuous" and "Standard" used to come first.
@@ -70,17 +75,23 @@ constexpr KeptCase kKept[] = {
     {"FieldText", R"("entities":[{"type":"MTEXT","contents":"old","field":"%<\\Date>%"}])",
      R"("contents":"old")"},
     {"WorkingSet",
-     R"("workingSet":{"exists":true,"active":true},"workingAngle":0.5,"entities":[{"type":"LINE","inWorkingSet":false}])",
+     R"("workingSet":{"exists":true,"active":true},"workingAngle":0.5,)"
+     R"("entities":[{"type":"LINE","inWorkingSet":false}])",
      "\"inWorkingSet\":false}],\n \"workingSet\":{\"exists\":true,\"active\":true},\n "
      "\"workingAngle\":0.5"},
     {"Definition",
      R"("entities":[{"type":"ATTDEF","tag":"T","prompt":"P","mtext":{"contents":"c","width":3}}])",
      R"("tag":"T","prompt":"P","mtext":{"location":[0,0,0])"},
     {"Reference",
-     R"("entities":[{"type":"INSERT","block":"b","attributes":[{"type":"ATTRIB","tag":"T"}]}],"blocks":[{"name":"B","entities":[{"type":"INSERT","block":"C"}]},{"name":"C","origin":[1,2,3]}])",
-     R"("block":"B","position":[0,0,0],"normal":[0,0,1],"rotation":0,"scale":1,"attributes":[{"handle":"2","type":"ATTRIB")"},
+     R"("entities":[{"type":"INSERT","block":"b","attributes":[{"type":"ATTRIB","tag":"T"}]}],)"
+     R"("blocks":[{"name":"B","entities":[{"type":"INSERT","block":"C"}]},{"name":"C",)"
+     R"("origin":[1,2,3]}])",
+     R"("block":"B","position":[0,0,0],"normal":[0,0,1],"rotation":0,"scale":1,)"
+     R"("attributes":[{"handle":"2","type":"ATTRIB")"},
     {"TablesBehindEntities",
-     R"("entities":[{"type":"TEXT","layer":"walls","style":"Fancy"}],"textStyles":[{"name":"Fancy","height":2,"backward":true}],"layers":[{"name":"Walls","color":"#102030","locked":true}],"currentLayer":"WALLS","currentTextStyle":"fancy")",
+     R"("entities":[{"type":"TEXT","layer":"walls","style":"Fancy"}],)"
+     R"("textStyles":[{"name":"Fancy","height":2,"backward":true}],"layers":[{"name":"Walls",)"
+     R"("color":"#102030","locked":true}],"currentLayer":"WALLS","currentTextStyle":"fancy")",
      R"("layer":"Walls","color":256)"},
     {"LayersKeepTheirOrder", R"("layers":[{"name":"b"},{"name":"a"}])",
      "{\"name\":\"b\",\"color\":7,\"locked\":false},\n  {\"name\":\"a\""},

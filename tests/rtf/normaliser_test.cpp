@@ -84,7 +84,8 @@ constexpr Case kLooks[] = {
     {"UnknownWords", "{\\loch\\af3\\hich a{\\lang1033 b}}"sv, "\\pard ab"},
     // The mark of a paragraph has no look of its own unless the paragraph is empty.
     {"Marks", "{\\b a}\\par{\\b\\par}{\\fs20\\par}b"sv,
-     "\\pard {\\fs24\\b a}{\\fs24 \\par\n\\pard }{\\fs24\\b \\par\n\\pard }{\\fs20 \\par\n}\\pard {\\fs24 b"},
+     "\\pard {\\fs24\\b a}{\\fs24 \\par\n\\pard }{\\fs24\\b \\par\n\\pard }{\\fs20 \\par\n}"
+     "\\pard {\\fs24 b"},
 };
 INSTANTIATE_TEST_SUITE_P(Looks, Bodies, testing::ValuesIn(kLooks), kName);
 
@@ -105,16 +106,20 @@ constexpr Case kParagraphs[] = {
     {"StylesInACircle", "{\\stylesheet{\\s1\\sbasedon2\\b;}{\\s2\\sbasedon1\\i;}}\\s1 a"sv,
      "\\pard {\\b\\i a"},
     {"Table",
-     "\\trowd\\cellx100\\cellx200\\pard\\intbl a\\cell b\\par{\\i c}\\cell\\row\\trowd\\cellx50 \\cell\\cell d\\cell\\row\\pard e"sv,
+     "\\trowd\\cellx100\\cellx200\\pard\\intbl a\\cell b\\par{\\i c}\\cell\\row\\trowd"
+     "\\cellx50 \\cell\\cell d\\cell\\row\\pard e"sv,
      "\\pard\\tx100 a\\tab b {\\i c}\\par\n\\pard \\tab \\tab d\\par\n\\pard e"},
     {"TableInATable",
-     "\\trowd\\intbl a{\\nestcell b\\nestcell{\\*\\nesttableprops\\trowd\\nestrow}{\\nonesttables\\par}}\\cell c\\cell\\row"sv,
+     "\\trowd\\intbl a{\\nestcell b\\nestcell{\\*\\nesttableprops\\trowd\\nestrow}"
+     "{\\nonesttables\\par}}\\cell c\\cell\\row"sv,
      "\\pard a b\\tab c"},
     {"MoreTabsThanRead",
      "\\tx1\\tx2\\tx3\\tx4\\tx5\\tx6\\tx7\\tx8\\tx9\\tx10\\tx11\\tx12\\tx13\\tx14\\tx15\\tx16\\tx17"
-     "\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30\\tx31\\tx32\\tx33\\tx0 a"sv,
-     "\\pard\\tx1\\tx2\\tx3\\tx4\\tx5\\tx6\\tx7\\tx8\\tx9\\tx10\\tx11\\tx12\\tx13\\tx14\\tx15\\tx16\\tx17"
-     "\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30\\tx31\\tx32 a"},
+     "\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30\\tx31"
+     "\\tx32\\tx33\\tx0 a"sv,
+     "\\pard\\tx1\\tx2\\tx3\\tx4\\tx5\\tx6\\tx7\\tx8\\tx9\\tx10\\tx11\\tx12\\tx13\\tx14\\tx15"
+     "\\tx16\\tx17\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30\\tx31"
+     "\\tx32 a"},
 };
 INSTANTIATE_TEST_SUITE_P(Paragraphs, Bodies, testing::ValuesIn(kParagraphs), kName);
 
@@ -152,7 +157,8 @@ TEST(Tables, NameWhatIsUsed) {
 TEST(Dropped, IsCounted) {
     auto const result = tzhost::normaliseRtf(
         "{\\header h}{\\footerf f}{\\*\\shppict{\\pict 00}}{\\nonshppict{\\pict 00}}"
-        "{\\shp{\\*\\shpinst x}{\\shprslt{\\*\\do y}}}{\\footnote n{\\footnote m}}{\\*\\annotation}");
+        "{\\shp{\\*\\shpinst x}{\\shprslt{\\*\\do y}}}"
+        "{\\footnote n{\\footnote m}}{\\*\\annotation}");
     EXPECT_EQ(result.headers, 2);
     EXPECT_EQ(result.pictures, 2);
     EXPECT_EQ(result.notes, 2);

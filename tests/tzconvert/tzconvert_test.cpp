@@ -227,9 +227,8 @@ TEST(Files, ThatMemoryCannotHoldAreNamed) {
 // font.
 TEST(Files, OfABatchGiveWhatTheyGiveAlone) {
     fs::create_directories("batch");
-    write(
-        "own.ini",
-        "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\nother.shx=Else,0,0,0,0\n[Proxy Fonts]\nProxy 1=Drawn\n");
+    write("own.ini", "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\nother.shx=Else,0,0,0,0\n"
+                     "[Proxy Fonts]\nProxy 1=Drawn\n");
     write("lends.txt", "\\Fnone;a");
     write("mapped.txt", "{\\Fhouse|c0;b}");
     for (char const* files : {"mapped.txt", "lends.txt mapped.txt"}) {
