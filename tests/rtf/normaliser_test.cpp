@@ -118,8 +118,8 @@ constexpr Case kParagraphs[] = {
      "\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30\\tx31"
      "\\tx32\\tx33\\tx0 a"sv,
      "\\pard\\tx1\\tx2\\tx3\\tx4\\tx5\\tx6\\tx7\\tx8\\tx9\\tx10\\tx11\\tx12\\tx13\\tx14\\tx15"
-     "\\tx16\\tx17\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30\\tx31"
-     "\\tx32 a"},
+     "\\tx16\\tx17\\tx18\\tx19\\tx20\\tx21\\tx22\\tx23\\tx24\\tx25\\tx26\\tx27\\tx28\\tx29\\tx30"
+     "\\tx31\\tx32 a"},
 };
 INSTANTIATE_TEST_SUITE_P(Paragraphs, Bodies, testing::ValuesIn(kParagraphs), kName);
 
