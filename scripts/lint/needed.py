@@ -7,7 +7,7 @@ import subprocess
 import sys
 
 RUNTIME = r"ld-linux.*|lib(c|m|stdc\+\+|gcc_s|asan|ubsan)\.so\.\d+"
-# product, the only libraries that it may need (or None), libraries that it must need, those it never may
+# product, the only libraries that it may need (or None), those it must need, those it never may
 RULES = [
     ("lib/tzmted.tzx", rf"{RUNTIME}|libtz\.so\.1", ["libtz.so.1"], None),
     ("bin/tzdraft", None, ["libtz.so.1"], r"tzmted.*"),

@@ -1,5 +1,5 @@
 #!/usr/bin/env python3
-"""Finds source files that no CMakeLists.txt builds, and so no test and no lint of the build sees."""
+"""Finds source files that no CMakeLists.txt builds, so that no test and no lint sees them."""
 import fnmatch
 import os
 import re

@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
-"""Finds source files of the module whose objects are initialised at load time, in an optimised build.
-Exit status 77 when no module layer was built."""
+"""Finds source files of the module with objects that are initialised when the module is loaded.
+Looks at an optimised build; exit status 77 when no module layer was built."""
 import argparse
 import os
 import re

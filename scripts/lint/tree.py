@@ -19,7 +19,7 @@ def everything():
 
 
 def tracked(*suffixes):
-    """Tracked and newly added files, relative to the root, with one of the suffixes (all without)."""
+    """Tracked and new files with one of the suffixes, relative to the root; all without suffixes."""
     return sorted(name for name in set(everything()) if name
                   and os.path.isfile(os.path.join(ROOT, name))
                   and (not suffixes or name.endswith(suffixes)))
@@ -45,7 +45,7 @@ def rows():
 
 
 def module_archives(folder):
-    """The archives of the module's layers, by their rows: those of a layer that is gone are left out."""
+    """The archives of the layers that have a row. Archives of former layers do not count."""
     paths = [os.path.join(folder, f"lib{row.replace('/', '_')}.a")
              for row in rows() if row.startswith("module/")]
     return [path for path in paths if os.path.exists(path)]
