@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <cstdint>
 #include <limits>
 #include <memory>
 #include <numbers>
@@ -14,6 +15,7 @@
 #include "module/align/current_spacing.h"
 #include "module/align/even_spacing.h"
 #include "module/align/options_factory.h"
+#include "module/align/text_planes.h"
 #include "tests/align/given_text.h"
 #include "tests/mtext/held_text.h"
 
@@ -210,8 +212,8 @@ struct ThresholdRow {
     double degrees;
     bool error;
 };
-constexpr ThresholdRow kThresholds[] = {{0, true},       {0.99, true},   {1.01, false},
-                                        {178.99, false}, {179.01, true}, {180, true}};
+constexpr ThresholdRow kThresholds[] = {{0, true},          {0.99999, true},   {1.00001, false},
+                                        {178.99999, false}, {179.00001, true}, {180, true}};
 TEST(Spacing, NeedsOneDegree) {
     TzMTextAlignOptionCurrentSpaceHorizontal option;
     for (ThresholdRow const& row : kThresholds) {
@@ -270,6 +272,22 @@ TEST(Spacing, SetAsksForItsGap) {
         EXPECT_EQ(tzhost::Variables::instance().number(L"TEXTALIGNSPACINGVALUE"), row.after)
             << row.script;
     }
+}
+
+// Planes by their height, in units of the tolerance. The third text lies as close to the first
+// plane as to the second, and counts for both; the fourth brings the second ahead.
+TEST(Planes, CountATextForEachThatIsTheSame) {
+    TextPlanes planes;
+    EXPECT_TRUE(planes.majority().empty());
+    std::uintptr_t number = 0;
+    for (double const height : {0.0, 1.6, 0.8, 2.4, 9.0}) {
+        TzDbObjectId const id(reinterpret_cast<TzDbObjectRecord*>(++number));
+        planes.insert({{0, 0, height * TzGeContext::gTol.equalPoint()}, TzGeVector3d::kZAxis}, id);
+    }
+    std::string ids;
+    for (TzDbObjectId const& id : planes.majority())
+        ids += std::to_string(reinterpret_cast<std::uintptr_t>(id.record()));
+    EXPECT_EQ(ids, "234");
 }
 
 TEST(Factory, FindsTheNewestByItsExactName) {
