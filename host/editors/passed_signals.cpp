@@ -29,6 +29,12 @@ void pass(int signal) {
 PassedSignals::PassedSignals() {
     programGroup = 0;
     postponed = 0;
+    // One that comes before the program's group is known would be passed to nobody.
+    sigset_t signals;
+    sigemptyset(&signals);
+    for (int const each : kSignals)
+        sigaddset(&signals, each);
+    sigprocmask(SIG_BLOCK, &signals, &blockedBefore_);
     struct sigaction action {};
     action.sa_handler = pass;
     for (std::size_t i = 0; i < kSignals.size(); ++i) {
@@ -37,11 +43,23 @@ PassedSignals::PassedSignals() {
     }
 }
 
+void PassedSignals::release() const noexcept {
+    sigprocmask(SIG_SETMASK, &blockedBefore_, nullptr);
+}
+
+void PassedSignals::forget() const noexcept {
+    for (std::size_t i = 0; i < kSignals.size(); ++i)
+        if (before[i].sa_handler != SIG_IGN) std::signal(kSignals[i], SIG_DFL);
+    release();
+}
+
 void PassedSignals::passTo(pid_t group) {
     programGroup = group;
+    release();
 }
 
 PassedSignals::~PassedSignals() {
+    release();
     for (std::size_t i = 0; i < kSignals.size(); ++i)
         sigaction(kSignals[i], &before[i], nullptr);
     if (postponed != 0) (void)std::raise(postponed);

@@ -16,10 +16,18 @@ public:
     PassedSignals& operator=(PassedSignals const&) = delete;
     ~PassedSignals();
 
-    // The group of processes that the program leads, which gets the signals from now on.
+    // In the program's process, before it becomes the program: the signals end it.
+    void forget() const noexcept;
+    // The group of processes that the program leads, which gets the signals from now on. A signal
+    // that came before waited until now.
     void passTo(pid_t group);
 
     static constexpr std::array kSignals{SIGTERM, SIGHUP, SIGINT};
+
+private:
+    void release() const noexcept;
+
+    sigset_t blockedBefore_{};
 };
 
 }  // namespace tzhost

@@ -26,13 +26,16 @@ std::vector<char*> argumentsOf(std::vector<std::string>& words) {
 
 // In the child: becomes the program, or tells through the pipe why it cannot. Nothing here may
 // throw, else the child would go on as a second host.
-[[noreturn]] void
-become(std::vector<char*> const& arguments, LentTerminal const& terminal, int report) noexcept {
+[[noreturn]] void become(std::vector<char*> const& arguments,
+                         LentTerminal const& terminal,
+                         PassedSignals const& passed,
+                         int report) noexcept {
     setpgid(0, 0);
     terminal.giveTo(getpid());
     terminal.becomeInput();
     for (int const each : {SIGINT, SIGQUIT, SIGTSTP, SIGTTIN, SIGTTOU, SIGPIPE, SIGXFSZ})
         std::signal(each, SIG_DFL);
+    passed.forget();
     execvp(arguments[0], arguments.data());
     int const reason = errno;
     (void)!write(report, &reason, sizeof reason);
@@ -108,7 +111,7 @@ ProgramResult runProgram(std::string_view command, std::filesystem::path const& 
     PassedSignals passed;  // goes last: what it postponed may end the process
     LentTerminal const terminal;
     pid_t const child = fork();
-    if (child == 0) become(arguments, terminal, report[1]);
+    if (child == 0) become(arguments, terminal, passed, report[1]);
     int reason = child < 0 ? errno : 0;
     close(report[1]);
     if (child > 0) {
