@@ -33,6 +33,7 @@ bool isDigit(wchar_t c) {
 // A control word with its number and the blank that ends it.
 struct Word {
     std::wstring_view name;
+    std::wstring_view digits;
     std::optional<int> value;
     std::size_t length = 0;  // from the backslash on
 };
@@ -54,7 +55,8 @@ Word wordAt(std::wstring_view text) {
     if (at + 1 < text.size() && text[at] == L'-' && isDigit(text[at + 1])) ++at;
     while (at < text.size() && isDigit(text[at]))
         ++at;
-    if (at > number) word.value = numberOf(text.substr(number, at - number));
+    word.digits = text.substr(number, at - number);
+    if (at > number) word.value = numberOf(word.digits);
     if (at < text.size() && text[at] == L' ') ++at;
     word.length = at;
     return word;
@@ -75,6 +77,7 @@ private:
     void takeCharacter(wchar_t c);
     bool takeStack();
     void takeColorTable();
+    void putStyle();
 
     void put(std::wstring_view ascii) { sent_.append(ascii.begin(), ascii.end()); }
     void putNumber(int number);
@@ -85,7 +88,8 @@ private:
 
     std::wstring_view rest_;
     std::string sent_;
-    std::vector<int> sizes_{0};    // half-points, of the groups that are open; 0 before the first
+    std::vector<int> sizes_{0};  // half-points, of the groups that are open; 0 before the first
+    bool hasStyle_ = false;
     std::size_t backslashes_ = 0;  // of the text, directly ahead
 };
 
@@ -131,8 +135,27 @@ void Sending::takeWord(Word const& word) {
         return takeCharacter(static_cast<wchar_t>(*word.value));
     }
     if (word.name == L"fs" && word.value) sizes_.back() = *word.value;
+    if (word.name == L"pard" && !hasStyle_) putStyle();
     if (word.name == L"par" || word.name == L"line" || word.name == L"tab") backslashes_ = 0;
-    put(whole);
+    if (word.value == 1 && (word.name == L"b" || word.name == L"i")) {
+        put(whole.substr(0, word.name.size() + 1));  // some programs take `\b1` for an end
+        sent_ += ' ';
+    } else {
+        put(whole);
+    }
+}
+
+// The text starts with the words of its look, of which the size comes last.
+void Sending::putStyle() {
+    hasStyle_ = true;
+    std::size_t const at = rest_.find(L"\\fs");
+    if (at == rest_.npos) return;
+    std::wstring_view const size = wordAt(rest_.substr(at)).digits;
+    sent_ += "{\\stylesheet{\\s0\\f0\\fs";
+    put(size);
+    sent_ += "\\afs";
+    put(size);
+    sent_ += " Normal;}}\n";
 }
 
 void Sending::takeCharacter(wchar_t c) {
@@ -204,7 +227,8 @@ void Sending::putNumber(int number) {
     sent_.append(digits, std::to_chars(digits, digits + sizeof digits, number).ptr);
 }
 
-// Numbers have 16 bits and a sign.
+// Numbers have 16 bits and a sign. A bare "?" would be no end of the number to every program: one
+// takes the next character away with it.
 void Sending::putUnicode(wchar_t c) {
     if (c > kLastOfOneWord) {
         putUnicode(static_cast<wchar_t>(0xD800 + ((c - kHalf) >> 10)));
@@ -212,7 +236,7 @@ void Sending::putUnicode(wchar_t c) {
     }
     sent_ += "\\u";
     putNumber(c >= kFirstNegative ? c - kHalf : c);
-    sent_ += '?';
+    sent_ += "\\'3f";
 }
 
 void Sending::takeColorTable() {

@@ -6,7 +6,9 @@
 //   - a stack stands as the code that it has in markup, `\S1/2;`, in its own size, and backslashes
 //     of the text that would make one of an "S" stand doubled;
 //   - characters above U+FFFF are pairs of `\u` words;
-//   - white, the colour of the page, is the nearest that can be seen.
+//   - white, the colour of the page, is the nearest that can be seen;
+//   - the document's style is the look that the text starts in, which is then that of new text and
+//     of scripts for which programs keep looks of their own.
 //
 //   std::string const file = sentRtf(document);
 //   std::vector<DialectFont> const fonts = fontsOf(file);

@@ -98,6 +98,7 @@ private:
     [[nodiscard]] int knownPage(int page) const;
     [[nodiscard]] RtfStyleValues const& styleOf(RtfStyleKind kind);
     [[nodiscard]] int valueOf(RtfField field);
+    [[nodiscard]] int valueOf(RtfField field, RtfField wide);
     [[nodiscard]] int addFont(DialectFont const& font);
     [[nodiscard]] KeptFont keptFont(int number);
     [[nodiscard]] DialectLook lookInForce();
@@ -115,6 +116,7 @@ private:
     void setToggle(RtfToken const& token, int field);
     void setNumber(RtfToken const& token, int field);
     void setOff(RtfToken const& token, int field);
+    void setWide(RtfToken const& token, int field);
     void setDestination(RtfToken const& token, int destination);
     void beginTable(RtfToken const& token, int table);
     void beginListText(RtfToken const& token, int argument);

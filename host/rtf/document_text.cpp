@@ -69,15 +69,21 @@ RtfDocument::KeptFont RtfDocument::keptFont(int number) {
     return kept;
 }
 
+// What is set for text of East Asia, where the text is such, else what holds for any.
+int RtfDocument::valueOf(RtfField field, RtfField wide) {
+    int const value = isOn(state_.get(RtfField::isWide)) ? state_.get(wide) : kRtfUnset;
+    return value == kRtfUnset ? valueOf(field) : value;
+}
+
 DialectLook RtfDocument::lookInForce() {
     DialectLook look;
     look.font = font_.written;
-    look.size = std::clamp(orZero(valueOf(RtfField::size)), 0, kMostSize);
+    look.size = std::clamp(orZero(valueOf(RtfField::size, RtfField::wideSize)), 0, kMostSize);
     if (look.size == 0) look.size = usualSize_;
     if (auto const color = colors_.find(valueOf(RtfField::color)))
         look.color = writer_.colorNumber(replacements_.color(*color));
-    look.isBold = isOn(valueOf(RtfField::bold));
-    look.isItalic = isOn(valueOf(RtfField::italic));
+    look.isBold = isOn(valueOf(RtfField::bold, RtfField::wideBold));
+    look.isItalic = isOn(valueOf(RtfField::italic, RtfField::wideItalic));
     look.isUnderlined = isOn(valueOf(RtfField::underline));
     look.isStruck = isOn(valueOf(RtfField::strike));
     look.isStackMark = isOn(state_.get(RtfField::stackMark));

@@ -27,6 +27,12 @@ void RtfDocument::setOff(RtfToken const&, int field) {
     state_.set(static_cast<RtfField>(field), 0);
 }
 
+// The same words tell of other scripts, too, which have the look of any text here.
+void RtfDocument::setWide(RtfToken const& token, int field) {
+    if (state_.get(RtfField::isWide) == 1)
+        state_.set(static_cast<RtfField>(field), token.valueOr(1));
+}
+
 void RtfDocument::setDestination(RtfToken const&, int destination) {
     state_.set(RtfField::destination, destination);
 }
@@ -143,6 +149,8 @@ void RtfDocument::resetLook(RtfToken const&, int) {
     for (std::size_t i = 0; i < kRtfLookFields; ++i)
         state_.set(static_cast<RtfField>(i), kRtfUnset);
     state_.set(RtfField::characterStyle, kRtfUnset);
+    for (RtfField const wide : {RtfField::wideSize, RtfField::wideBold, RtfField::wideItalic})
+        state_.set(wide, kRtfUnset);
 }
 
 // Text above and below the line stands on it. The mark of a stack stays one.

@@ -40,11 +40,16 @@ enum class RtfField : std::uint8_t {
     stackMark,    // the characters are a mark of a stack
     substitutes,  // characters that stand behind a `\u` for who does not know it
     destination,
+    // What characters of East Asia have instead, where a writer keeps that apart.
+    isWide,  // what follows is such text
+    wideSize,
+    wideBold,
+    wideItalic,
 };
 
 inline constexpr std::size_t kRtfLookFields = 9;
 inline constexpr std::size_t kRtfStyleFields = 12;  // a style has those up to here
-inline constexpr std::size_t kRtfFields = 19;
+inline constexpr std::size_t kRtfFields = 23;
 
 // Of a field that nothing has set.
 inline constexpr int kRtfUnset = -2147483647 - 1;
