@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "host/settings/settings.h"
+#include "module/markup/session/conversion_session.h"
 #include "tests/mtext/held_text.h"
 #include "tz/mte/editor_state.h"
 #include "tz/mte/globals.h"
@@ -175,6 +176,39 @@ TEST(EditorState, ConvertsOnEachReading) {
     EXPECT_NE(text.find(L"\\T1.5;"), CStdStrW::npos) << TzString(text).toUtf8();
     EXPECT_NE(text.find(L"\\H1.75x;"), CStdStrW::npos) << TzString(text).toUtf8();
     EXPECT_EQ(state.GetConversionResults(), 0x1U);
+}
+
+// A trip through a state is that of a converter with the same face, colours, size and twips.
+TEST(EditorState, ConvertsAsAConverterDoes) {
+    OpenDrawing const drawing;
+    Surroundings const surroundings("");
+    g_dTextSize = 0.5;
+    CMTextEditorState state;
+    state.SetInitialSize(0.5);
+    state.SetStyle(L"Standard");
+    state.SetByLayerColor(0xFF0000);
+    state.LoadStyles();
+    CStyleInfoEntry style;
+    ASSERT_TRUE(state.GetStyleInfo(0, style));
+    TextStart start;
+    start.font = {style.typeface, style.bold,           style.italic,
+                  style.charset,  style.pitchAndFamily, style.fileName};
+    start.size = 0.5;
+    start.twips = 320;
+    start.byLayer = 0xFF0000;
+    for (wchar_t const* markup : {L"{\\H0.35;\\LA\\l}\\P\\C5;B \\T1.5;\\A1;\\S1/2;",
+                                  L"{\\fArial|b1|i0|c204|p34;x}\\pi1,t2,3;\t\\U+0416"}) {
+        ConversionSession session(start);
+        WrittenRtf const written = session.toRtf(markup);
+        CStdStrW rtf;
+        CStdStrW text;
+        state.SetMTextString(markup);
+        state.GetRTFString(rtf);
+        EXPECT_EQ(rtf, written.rtf);
+        state.SetRTFString(rtf);
+        state.GetMTextString(text);
+        EXPECT_EQ(text, session.toMarkup(rtf, written.found.wholeText).markup);
+    }
 }
 
 TEST(EditorState, MeasuresMarginsByTheTextSize) {

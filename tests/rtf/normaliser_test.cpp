@@ -78,6 +78,8 @@ constexpr Case kLooks[] = {
      "\\pard a{\\cf0 b}{\\cf1 c}de"},
     {"Fonts", "\\deff5{\\fonttbl\\f5 A;{\\f7 B{\\*\\falt C};}}a\\f7 b\\f9 c\\plain d"sv,
      "\\pard {\\f0 a}{\\f1 b}c{\\f0 d"},
+    {"WideText", "\\rtlch\\afs20\\ltrch\\fs30{\\dbch\\afs40\\ab a{\\loch b}}{\\dbch c"sv,
+     "\\pard {\\fs40\\b a}{\\fs30 bc"},
     {"HiddenAndDeleted", "a{\\v b\\tab\\line}{\\deleted c}d"sv, "\\pard ad"},
     {"Capitals", "{\\caps a\\'e9}b"sv, "\\pard A\\u201?b"},
     {"Baseline", "m{\\super 2}{\\up6 3}{\\dn4 4}"sv, "\\pard m234"},
