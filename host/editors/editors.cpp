@@ -68,6 +68,7 @@ bool editRichText(CMTextEditorInterface& state) {
     if (isAsked && !askDialogValues(state, changes)) return false;
     rtf.setChanges(std::move(changes));
     std::string const& command = editorConfiguration().richTextEditor;
+    if (isAsked && command.empty()) return rtf.take({}).taken != Taken::refused;
     wchar_t const* const lack =
         localText(L"There is no editor for rich text: --rtf-editor or the settings name one.");
     return runEditorSession(rtf, {command, lack}) == SessionEnd::accepted;
