@@ -141,8 +141,10 @@ bool ProgramSession::undo() {
     return true;
 }
 
-bool ProgramSession::save(std::filesystem::path const& file, std::string& error) {
-    error = tzhost::writeDrawing(*drawing_, file);
+bool ProgramSession::save(std::filesystem::path const& file,
+                          std::string& error,
+                          tzhost::IfReadOnly ifReadOnly) {
+    error = tzhost::writeDrawing(*drawing_, file, ifReadOnly);
     if (!error.empty()) return false;
     drawing_->setFile(file);
     drawing_->undoLog().noteSaved();

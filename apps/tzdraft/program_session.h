@@ -10,6 +10,7 @@
 
 #include "host/database/drawing.h"
 #include "host/display/plot.h"
+#include "host/files/safe_file.h"
 #include "host/settings/variables.h"
 
 // One run of the program: the drawing that is open, and what the commands of the program do with
@@ -33,7 +34,9 @@ public:
     // Another drawing in place of it; on failure the drawing stays.
     [[nodiscard]] bool open(std::filesystem::path const& file, std::string& error);
     // The open drawing to a file, whole or not at all.
-    [[nodiscard]] bool save(std::filesystem::path const& file, std::string& error);
+    [[nodiscard]] bool save(std::filesystem::path const& file,
+                            std::string& error,
+                            tzhost::IfReadOnly ifReadOnly = tzhost::IfReadOnly::refuse);
     // The active space as a picture; the file's ending (.svg, .png, .pdf) says which.
     [[nodiscard]] bool plot(std::filesystem::path const& file, std::string& error) const;
     // The same with the kind of picture given.

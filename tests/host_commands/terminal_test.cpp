@@ -23,7 +23,9 @@ public:
     explicit Terminal(std::string const& editor, std::string const& arguments = "") {
         fs::remove_all(desk());
         fs::create_directories(desk());
-        std::ofstream(desk() / "there.json") << "{}";
+        for (char const* const name : {"there.json", "locked.json"})
+            std::ofstream(desk() / name) << "{}";
+        fs::permissions(desk() / "locked.json", fs::perms::owner_read);
         winsize const size{40, 200, 0, 0};
         child_ = forkpty(&screen_, nullptr, nullptr, &size);
         if (child_ != 0) return;
@@ -44,7 +46,7 @@ public:
         close(screen_);
     }
 
-    // The program's working folder, with a file "there.json" in it.
+    // The program's working folder, with "there.json" and a read-only "locked.json" in it.
     static fs::path desk() { return fs::path(testing::TempDir()) / "desk"; }
     static fs::path configuration() { return fs::path(testing::TempDir()) / "configuration"; }
 
@@ -191,6 +193,9 @@ constexpr CareCase kCare[] = {
      "*|NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r", "<No>"},
     {"SaveAsksFirst", ": |SAVE\r|: |there.json\r|<No>: |\r", kIdle},
     {"SaveAsksOnce", ": |SAVE\r|: |there.json\r|<No>: |y\r|Saved: /|SAVE\r|n>: |\r", "Saved: /"},
+    {"SaveAsksReadOnly",
+     ": |SAVE\r|: |locked.json\r|read-only: |y\r|Saved: /|SAVE\r|n>: |\r|read-only: |y\r",
+     "Saved: /"},
     {"OpenSaysWhat", ": |SAVE\r|: |c.json\r|Saved: |OPEN\r|open: |c.json\r", "Opened: /"},
     {"PlotSaysWhat", ": |PLOT\r|: |a.svg\r", "/desk/a.svg."},
     {"TabInAText", ": |TEXT\r|: |0,0\r|: |1\r|: |\r|: |a\tb\r|: |LIST\r|: |l\r|: |\r", "  a\tb"},

@@ -50,8 +50,11 @@ void saveCommand() {
         TzString::fromUtf8(ProgramSession::current().drawing().file().string());
     auto const file = askFile(localText(L"Save drawing as"), present);
     if (!file || !mayOverwrite(*file)) return;
-    doWith(*file, forLocalText(L"Saved: %ls."), [](auto const& to, std::string& error) {
-        return ProgramSession::current().save(to, error);
+    // A person has just been asked; nobody asks a script.
+    auto const ifReadOnly =
+        tzhost::commandLine().isPerson() ? tzhost::IfReadOnly::replace : tzhost::IfReadOnly::refuse;
+    doWith(*file, forLocalText(L"Saved: %ls."), [ifReadOnly](auto const& to, std::string& error) {
+        return ProgramSession::current().save(to, error, ifReadOnly);
     });
 }
 

@@ -4,6 +4,7 @@
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
+#include "host/files/file_kind.h"
 #include "host/text/utf8.h"
 
 namespace tzdraft {
@@ -42,12 +43,11 @@ bool mayReplace() {
 }
 
 bool mayOverwrite(std::filesystem::path const& file) {
-    std::error_code unknown;
-    if (!tzhost::commandLine().isPerson() || ProgramSession::current().isOwn(file) ||
-        !std::filesystem::is_regular_file(file, unknown)) {
-        return true;
-    }
-    return isMeant(forLocalText(L"There is a file of that name: %ls."),
+    if (!tzhost::commandLine().isPerson() || !tzhost::isFile(file.string())) return true;
+    bool const isReadOnly = tzhost::isReadOnly(file.string());
+    if (!isReadOnly && ProgramSession::current().isOwn(file)) return true;
+    return isMeant(isReadOnly ? forLocalText(L"The file is read-only: %ls.")
+                              : forLocalText(L"There is a file of that name: %ls."),
                    tzhost::fromUtf8(file.string()), forLocalText(L"Replace it?"));
 }
 
