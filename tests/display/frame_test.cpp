@@ -172,6 +172,20 @@ TEST(Passes, EndWhereDrawablesMultiply) {
     EXPECT_FALSE(pass.isWhole());
 }
 
+// Letters that no memory holds used to be laid out all the same.
+TEST(Passes, EndWhereLettersAreTooMany) {
+    std::wstring const letters(DrawPass::kMostLetters, L'a');
+    Preview text([&](TzGiWorldDraw& draw) {
+        for (wchar_t const* const each : {L"b", letters.c_str()})
+            draw.geometry().text({}, TzGeVector3d::kZAxis, TzGeVector3d::kXAxis, each, -1, true,
+                                 {});
+    });
+    DrawPass pass(nullptr, DrawPass::Entities::strokes);
+    pass.draw(&text);
+    EXPECT_FALSE(pass.isWhole());
+    EXPECT_EQ(pass.takeList().size(), 1U);
+}
+
 TEST(Passes, CarryTextsThroughTransforms) {
     TzGiTextStyle style;
     style.setTextSize(2);

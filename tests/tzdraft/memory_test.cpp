@@ -67,4 +67,45 @@ TEST(Faults, ThatStruckNothingAreNamed) {
               "operation: 0\n");
 }
 
+struct ShortRow {
+    char const* name;
+    int letters;
+    char const* kilobytes;  // of memory
+    char const* result;
+    int status;
+    char const* says;
+};
+
+// Memory that ran short used to end the program by a signal, and a plot took 5 KB a letter.
+constexpr ShortRow kShortRows[] = {
+    {"Opening", 30'000'000, "150000", "--pdf", 2, "short.json: cannot be read: memory ran short\n"},
+    {"Result", 1'000'000, "100000", "--save", 2, "result: cannot be written: memory ran short\n"},
+    {"OneKilobyteALetter", 200'000, "280000", "--pdf", 0, ""},
+};
+
+class ShortMemory : public testing::TestWithParam<ShortRow> {};
+
+TEST_P(ShortMemory, IsSaid) {
+#ifdef __SANITIZE_ADDRESS__
+    GTEST_SKIP() << "the sanitizer needs the memory that is left out here";
+#endif
+    std::string drawing = R"({"format": "tz-drawing", "version": 1, "entities": [)"
+                          R"({"handle": "2A", "type": "MTEXT", "contents": ")";
+    for (int letters = 0; letters < GetParam().letters; letters += 4)
+        drawing += "abc ";
+    std::filesystem::path const file = scratch("short.json", drawing + "\"}]}");
+    tztest::ProgramRun const run =
+        tztest::startProgram(file.string() + " --script /dev/null " + GetParam().result + " " +
+                                 scratch("result").string(),
+                             std::string("ulimit -v ") + GetParam().kilobytes + "; ");
+    std::filesystem::remove(file);
+    EXPECT_EQ(run.status, GetParam().status);
+    EXPECT_TRUE(run.errors.ends_with(GetParam().says)) << run.errors;
+    EXPECT_LE(std::count(run.errors.begin(), run.errors.end(), '\n'), 1) << run.errors;
+}
+
+INSTANTIATE_TEST_SUITE_P(Rows, ShortMemory, testing::ValuesIn(kShortRows), [](auto const& row) {
+    return row.param.name;
+});
+
 }  // namespace
