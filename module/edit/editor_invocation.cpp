@@ -52,16 +52,21 @@ int runRawEditor(EasyObject<TzDbMText>& text) {
 }
 
 // Tells the world which text is being edited, for the length of the session. An editor may open
-// another one: the outer text is then the edited one again.
+// another one: the outer text is then the edited one again, and its size the one that its
+// conversions use.
 class [[nodiscard]] EditedText {
 public:
     explicit EditedText(EasyObject<TzDbMText>& text) : outer_(std::exchange(gpText, &text)) {}
     EditedText(EditedText const&) = delete;
     EditedText& operator=(EditedText const&) = delete;
-    ~EditedText() { gpText = outer_; }
+    ~EditedText() {
+        gpText = outer_;
+        if (outer_) g_dTextSize = outerSize_;
+    }
 
 private:
     EasyObject<TzDbMText>* outer_;
+    double outerSize_ = g_dTextSize;
 };
 
 }  // namespace

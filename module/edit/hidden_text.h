@@ -1,7 +1,6 @@
 #pragma once
 
 #include "tz/db/mtext.h"
-#include "tz/mte/easy_object.h"
 
 // Draws the views and the screen anew, after a text was hidden or shown.
 void redrawAll();
@@ -9,25 +8,26 @@ void redrawAll();
 // Hides a text while a dialog stands over it, and meanwhile leaves it open for read only, so that
 // the views can be drawn. What it was is given back once, at the latest by the destructor.
 //
-//   HiddenText hidden;
-//   hidden.hide(text);
+//   HiddenText session(*text.object);
+//   session.hide();
 //   ... the dialog ...
-//   if (!hidden.show()) return;  // the text could not be opened for write again
+//   if (!session.show()) return;  // the text could not be opened for write again
 class [[nodiscard]] HiddenText {
 public:
-    HiddenText() = default;
+    // Takes a text that is open for write and stays open longer than this object lives.
+    explicit HiddenText(TzDbMText& text) : text_(text) {}
     HiddenText(HiddenText const&) = delete;
     HiddenText& operator=(HiddenText const&) = delete;
     // Tries once more when the text is still hidden.
     ~HiddenText();
 
-    // Takes a text that is open for write; its holder outlives this object.
-    void hide(EasyObject<TzDbMText>& text);
-    // Makes the text writable and as visible as it was; false when it cannot be made writable.
-    // True when nothing is hidden.
+    void hide();
+    // Makes the text writable, which a dialog may have ended for one that was never hidden too, and
+    // a hidden one as visible as it was; false when it cannot be made writable.
     [[nodiscard]] bool show();
 
 private:
-    TzDbMText* text_ = nullptr;
+    TzDbMText& text_;
     TzDb::Visibility before_ = TzDb::kVisible;
+    bool hidden_ = false;
 };

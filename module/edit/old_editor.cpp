@@ -34,7 +34,7 @@ private:
 
 // With a window at a fixed place the text stays as it is; else the window stands over it, and the
 // text is hidden.
-void makeRoom(EasyObject<TzDbMText>& text, HiddenText& hidden) {
+void makeRoom(EasyObject<TzDbMText>& text, HiddenText& session) {
     if (gMTextFixed) {
         g_dMTextObjectHeight = 0.0;
         gwysiwyg = 0;
@@ -43,7 +43,7 @@ void makeRoom(EasyObject<TzDbMText>& text, HiddenText& hidden) {
     CalcEditorSizeAndPosition(text);
     TzGeMatrix3d userSystem;
     (void)tzedGetCurrentUCS(userSystem);  // read, and put to no use
-    hidden.hide(text);
+    session.hide();
 }
 
 // What the dialog ended with; a text of a newer format is not shown to it.
@@ -61,13 +61,13 @@ int runDialog(CMTextEditorInterface& editor,
 }  // namespace
 
 int InvokeOldEditorOn(EasyObject<TzDbMText>& text, MTETabType tab, unsigned int flags, bool) {
-    HiddenText hidden;
-    makeRoom(text, hidden);
+    HiddenText session(*text.object);
+    makeRoom(text, session);
     SessionEditor const editor;
     feedEditor(*editor, text);
     unsigned int const fedColor = editor->GetInitialColor();
     int const answer = runDialog(*editor, text, tab, flags);
-    if (!hidden.show()) {
+    if (!session.show()) {
         MessageBox(nullptr, gStringTable[kText.notWritable].kwszPtr(), nullptr, kMessageBoxError);
         return kNoEditor;
     }

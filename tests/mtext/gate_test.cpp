@@ -2,8 +2,11 @@
 
 #include <gtest/gtest.h>
 
+#include <new>
 #include <utility>
 
+#include "host/base/fault_point.h"
+#include "host/base/memory_faults.h"
 #include "module/host_calls/space_posting.h"
 #include "tests/mtext/held_text.h"
 #include "tz/db/field.h"
@@ -11,6 +14,7 @@
 #include "tz/db/shapes.h"
 #include "tz/ed/variables.h"
 #include "tz/mte/dialog_params.h"
+#include "tz/mte/dialog_session.h"
 #include "tz/mte/edit_mtext.h"
 #include "tz/mte/globals.h"
 
@@ -215,6 +219,72 @@ TEST(Gate, LeavesATextWhoseFieldIsOpenElsewhere) {
     EXPECT_EQ(fieldCodeOf(id), L"%<\\Var LUNITS>%");
     EXPECT_NE(drawing.transcript().find(L"has a field that cannot be opened"), std::wstring::npos);
 }
+
+// What happens once, at a call of the host's.
+struct Event {
+    char const* name;
+    std::string_view call;
+    void (*action)();  // null: memory ends
+    short fixedWindow;
+    wchar_t const* contents;  // empty: an exception leaves the session
+};
+
+constexpr Event kEvents[] = {
+    // The text was left open for read, and what was edited was lost without a word.
+    {"ShownInAFixedWindow", "TzApHostDialogImp::run", SetVisibility, 1, L"{\\H2.5x;af\\H0.3x;ter}"},
+    {"ShownByTheDialog", "TzApHostDialogImp::run", SetVisibility, 0, L"{\\H2.105x;af\\H0.3x;ter}"},
+    {"MemoryEndsInTheDialog", "TzApHostDialogImp::run", nullptr, 0, L""},
+    // The program ended: the text that had not been hidden was to be shown again.
+    {"MemoryEndsBeforeHiding", "TzDbEntity::setVisibility", nullptr, 0, L""},
+};
+
+class DuringASession : public testing::TestWithParam<Event> {
+protected:
+    static bool atCall(std::string_view operation, int&) {
+        if (!due_) return !GetParam().action && operation == "operator new";
+        if (operation != GetParam().call) return false;
+        due_ = false;
+        if (GetParam().action) GetParam().action();
+        return false;
+    }
+    static bool due_;
+};
+bool DuringASession::due_;
+
+TEST_P(DuringASession, TextEndsVisibleAndClosed) {
+#ifdef __SANITIZE_ADDRESS__
+    if (!GetParam().action) GTEST_SKIP() << "the sanitizer's own operator new serves in this build";
+#endif
+    std::string const block = "<<<\n{\\rtf1{\\fs80 af}ter}\n>>>\n";
+    OpenDrawing const drawing(block + block);
+    ASSERT_TRUE(tzhost::Variables::instance().overrideFromText(L"MTEXTED", L"OLDEDITOR").isDone());
+    resbuf value{nullptr, Tzad::eResultShort, {}};
+    value.resval.rint = GetParam().fixedWindow;
+    ASSERT_EQ(tzedSetVar(L"MTEXTFIXED", &value), Tzad::ePromptNormal);
+    TzDbObjectId const id = postText();
+    tzhost::workingDrawing()->undoLog().begin();
+    MteCoreDialogParamsRXInit();
+    due_ = true;
+    tzhost::FaultHook const before = tzhost::setFaultHook(atCall);
+    bool hadMemory = true;
+    try {
+        tzhost::MemoryFaultScope const memory;
+        EXPECT_EQ(editById(id), 1);
+    } catch (std::bad_alloc const&) {
+        hadMemory = false;
+    }
+    tzhost::setFaultHook(before);
+    MteCoreDialogParamsRXUninit();
+    tzhost::workingDrawing()->undoLog().end();
+    EXPECT_EQ(hadMemory, GetParam().action != nullptr);
+    EXPECT_EQ(contentsOf(id).str(), hadMemory ? GetParam().contents : L"before");
+    EasyObject<TzDbMText> text;
+    ASSERT_EQ(tzdbOpenObject(text.object, id, TzDb::kForWrite), Tzad::eOk);
+    EXPECT_EQ(text->visibility(), TzDb::kVisible);
+}
+INSTANTIATE_TEST_SUITE_P(Events, DuringASession, testing::ValuesIn(kEvents), [](auto const& row) {
+    return row.param.name;
+});
 
 struct RecordRow {
     char const* name;
