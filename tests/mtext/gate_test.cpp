@@ -229,10 +229,17 @@ struct Event {
     wchar_t const* contents;  // empty: an exception leaves the session
 };
 
+TzDbObjectId nextText;
+void editNext() {
+    EXPECT_EQ(editById(nextText), 1);
+}
+
 constexpr Event kEvents[] = {
     // The text was left open for read, and what was edited was lost without a word.
     {"ShownInAFixedWindow", "TzApHostDialogImp::run", SetVisibility, 1, L"{\\H2.5x;af\\H0.3x;ter}"},
     {"ShownByTheDialog", "TzApHostDialogImp::run", SetVisibility, 0, L"{\\H2.105x;af\\H0.3x;ter}"},
+    // The height of the inner text counted: 0.06015.
+    {"DialogInADialog", "TzApHostDialogImp::run", editNext, 0, L"{\\H2.105x;af\\H0.3x;ter}"},
     {"MemoryEndsInTheDialog", "TzApHostDialogImp::run", nullptr, 0, L""},
     // The program ended: the text that had not been hidden was to be shown again.
     {"MemoryEndsBeforeHiding", "TzDbEntity::setVisibility", nullptr, 0, L""},
@@ -262,6 +269,12 @@ TEST_P(DuringASession, TextEndsVisibleAndClosed) {
     value.resval.rint = GetParam().fixedWindow;
     ASSERT_EQ(tzedSetVar(L"MTEXTFIXED", &value), Tzad::ePromptNormal);
     TzDbObjectId const id = postText();
+    nextText = postText();
+    {
+        EasyObject<TzDbMText> next;
+        ASSERT_EQ(tzdbOpenObject(next.object, nextText, TzDb::kForWrite), Tzad::eOk);
+        ASSERT_EQ(next->setTextHeight(7), Tzad::eOk);
+    }
     tzhost::workingDrawing()->undoLog().begin();
     MteCoreDialogParamsRXInit();
     due_ = true;
