@@ -40,12 +40,21 @@ struct Prompts {
     }
 };
 
+// What tzedInitGet armed; without words there the list that the selection was given.
+Armed armedFor(SelectionMode const& mode, void const* list) {
+    Armed armed = commandLine().takeArmed();
+    if (!mode.hasPrompts || list == nullptr || !armed.words.isEmpty()) return armed;
+    armed.list = static_cast<wchar_t const*>(list);
+    armed.words = KeywordList::parse(armed.list).value_or(KeywordList());
+    return armed;
+}
+
 // The question that goes on, line by line, until Enter.
 class SelectionQuestion {
 public:
-    SelectionQuestion(SelectionMode const& mode, Prompts prompts, Selecting& selecting)
+    SelectionQuestion(SelectionMode const& mode, Prompts prompts, Armed armed, Selecting& selecting)
         : prompts_(prompts), selecting_(selecting),
-          question_(QuestionKind::selection, prompts.add) {
+          question_(QuestionKind::selection, prompts.add, std::move(armed)) {
         question_.clearFlags();
         question_.setEndings(Tzad::ePromptNormal, Tzad::ePromptCancel);
         question_.setPrompt(Prompts::shown(prompts_.add, kAddPrompt));
@@ -122,7 +131,10 @@ EntityIds entitiesFor(SelectionWay way, void const* first, void const* second) {
 
 int select(SelectionMode const& mode, void const* first, void const* second, Selecting& selecting) {
     bool const asks = mode.way == SelectionWay::ask && (mode.hasPrompts || first == nullptr);
-    if (asks) return SelectionQuestion(mode, Prompts::of(mode, first), selecting).ask();
+    if (asks) {
+        Prompts const prompts = Prompts::of(mode, first);
+        return SelectionQuestion(mode, prompts, armedFor(mode, second), selecting).ask();
+    }
     selecting.add(entitiesFor(mode.way, first, second));
     return Tzad::ePromptNormal;
 }

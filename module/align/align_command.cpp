@@ -96,10 +96,11 @@ bool TzMTextAlignCmd::selectTextEntity() {
     TzString const prompt = gStringTable[kText.alignSelection];
     wchar_t const* const prompts[] = {prompt.kwszPtr(), L""};
     TzEdTextSSFilter const filter(tzDocManagerPtr()->curDocument(), *m_manipulator);
-    tzedInitGet(kNoEmptyAnswer, gStringTable[kText.alignSelectionKeywords]);
+    TzString const words = gStringTable[kText.alignSelectionKeywords];
+    tzedInitGet(kNoEmptyAnswer, words);
     SelectionKeywords const keywords(this);
     long long selection[2] = {};
-    int const status = tzedSSGet(L"_:L:K:$", prompts, nullptr, nullptr, selection);
+    int const status = tzedSSGet(L"_:L:K:$", prompts, words.kwszPtr(), nullptr, selection);
     if (status == Tzad::ePromptNormal) takeSelection(selection);
     return status == Tzad::ePromptNormal;
 }

@@ -11,8 +11,8 @@ struct resbuf;
 // Modes of tzedSSGet, in one text, null as "": "_" nothing further; "I" the implied set; "X" all
 // entities of both spaces; "L" the newest entity; "P" the set that was selected last; "W" and "C"
 // what lies in the box between two points, and what it touches; ":$" the second argument is a pair
-// of prompts (to add and to remove); ":K" the words armed by tzedInitGet go to the keyword callback
-// and the question goes on; ":L" and ":l" leave out entities on locked layers; ":c" and ":p" change
+// of prompts (to add and to remove); ":K" the question's words go to the keyword callback and the
+// question goes on; ":L" and ":l" leave out entities on locked layers; ":c" and ":p" change
 // nothing. A mode without a capital asks the user, or takes a point that is given as the second
 // argument.
 //
@@ -20,10 +20,11 @@ struct resbuf;
 // name, 8 the layer, 7 the text style; names may hold the wildcards of tzutWcMatchEx.
 
 // [command] `first` and `second` are points (double[3], user coordinates) or, with ":$", `first` is
-// a wchar_t const*[2] of prompts and `second` is not looked at; they may be null. `filter` may be
-// null. 5100 with at least one entity, and `set` takes the name of a new set; -5001 with none, for
-// an unknown mode or filter code, -5002 on cancel, -5005 for a keyword that goes to no callback:
-// then `set` takes a name of no set. The flags of tzedInitGet do not apply, its words do.
+// a wchar_t const*[2] of prompts and `second` a wchar_t const* with a list of words, in the form of
+// tzedInitGet; they may be null. `filter` may be null. 5100 with at least one entity, and `set`
+// takes the name of a new set; -5001 with none, for an unknown mode or filter code, -5002 on
+// cancel, -5005 for a keyword that goes to no callback: then `set` takes a name of no set. The
+// flags of tzedInitGet do not apply; its words do, and those of `second` when it armed none.
 [[nodiscard]] TZ_API int tzedSSGet(wchar_t const* mode,
                                    void const* first,
                                    void const* second,
