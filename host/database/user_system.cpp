@@ -16,11 +16,14 @@
 namespace tzhost {
 namespace {
 
-// A system that waits to be restored, and the space that it belongs to.
+// A system that waits to be restored, the space that it belongs to, and VIEWDIR in that system and
+// in the one that followed.
 struct Remembered {
     long long drawing;
     TzDbObjectId space;
     UserSystem system;
+    VariablePoint view;
+    VariablePoint turnedView;
 };
 
 std::vector<Remembered>& stack() {
@@ -33,24 +36,32 @@ UserSystem systemOf(Drawing const& drawing, TzDbObjectId space) {
     return space == drawing.paperSpace() ? settings.paperSystem : settings.modelSystem;
 }
 
+VariablePoint viewDirection() {
+    VariableValue const* const value = Variables::instance().get(L"VIEWDIR");
+    VariablePoint const* const numbers = value ? std::get_if<VariablePoint>(value) : nullptr;
+    return numbers ? *numbers : VariablePoint{0, 0, 1};
+}
+
+// Restoring a system must not fail for want of memory, which telling observers may take.
+void setViewDirection(VariablePoint const& numbers) {
+    Variables& variables = Variables::instance();
+    try {
+        (void)variables.set(L"VIEWDIR", numbers, Writer::host);
+    } catch (std::bad_alloc const&) {
+        (void)variables.setKept(L"VIEWDIR", numbers);
+    }
+}
+
 // Turns VIEWDIR from one user system to another, so that the view stands still.
 void turnViewDirection(UserSystem const& from, UserSystem const& to) {
-    Variables& variables = Variables::instance();
-    VariableValue const* const value = variables.get(L"VIEWDIR");
-    VariablePoint const* const numbers = value ? std::get_if<VariablePoint>(value) : nullptr;
-    if (!numbers || from.isSameAs(to)) return;
-    TzGeVector3d direction((*numbers)[0], (*numbers)[1], (*numbers)[2]);
+    if (from.isSameAs(to)) return;
+    VariablePoint const numbers = viewDirection();
+    TzGeVector3d direction(numbers[0], numbers[1], numbers[2]);
     TzGeMatrix3d fromAxes = from.matrix();
     TzGeMatrix3d toAxes = to.matrix();
     direction.transformBy(fromAxes).transformBy(toAxes.inverse());
-    VariablePoint const turned{direction.x, direction.y, direction.z};
     // Numbers of a rotated direction are finite and not all zero, so the variable takes them.
-    // Restoring a system must not fail for want of memory, which telling observers may take.
-    try {
-        (void)variables.set(L"VIEWDIR", turned, Writer::host);
-    } catch (std::bad_alloc const&) {
-        (void)variables.setKept(L"VIEWDIR", turned);
-    }
+    setViewDirection({direction.x, direction.y, direction.z});
 }
 
 void place(Drawing& drawing, TzDbObjectId space, UserSystem const& system) {
@@ -167,9 +178,11 @@ int tzedSetCurrentUCS(TzGeMatrix3d const& system) {
         return Tzad::eInvalidInput;
     }
     TzDbObjectId const space = drawing->activeSpace();
-    tzhost::Remembered const before{drawing->serial(), space, tzhost::systemOf(*drawing, space)};
+    tzhost::Remembered before{
+        drawing->serial(), space, tzhost::systemOf(*drawing, space), tzhost::viewDirection(), {}};
     tzhost::stack().reserve(tzhost::stack().size() + 1);
     (void)tzhost::setUserSystem(next);  // checked above
+    before.turnedView = tzhost::viewDirection();
     tzhost::stack().push_back(before);
     ++tzhost::audit().ucsStack;
     tzhost::reportSystem("set", next);
@@ -186,7 +199,11 @@ int tzedRestorePreviousUCS() {
     --tzhost::audit().ucsStack;
     tzhost::Drawing* const drawing = tzhost::drawingWithSerial(last.drawing);
     if (!drawing) return Tzad::eNoDocument;
+    bool const isViewKept =
+        last.space == drawing->activeSpace() && tzhost::viewDirection() == last.turnedView;
     tzhost::place(*drawing, last.space, last.system);
+    // Turning the view back rounds its numbers; a view that nobody changed gets its own again.
+    if (isViewKept && tzhost::viewDirection() != last.view) tzhost::setViewDirection(last.view);
     tzhost::noteUserSystem();
     tzhost::reportSystem("restore", last.system);
     return fault;

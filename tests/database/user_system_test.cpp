@@ -59,6 +59,14 @@ TEST_F(DrawingTest, ViewDirectionFollowsTheSystem) {
     EXPECT_NEAR(viewDirection()[2], 1.0, 1e-15);
 }
 
+// It was 0,-1.4e-17,1 after this.
+TEST_F(DrawingTest, ViewDirectionComesBackToTheLastDigit) {
+    tzhost::VariablePoint const before = viewDirection();
+    ASSERT_EQ(tzedSetCurrentUCS(TzGeMatrix3d::rotation(0.7, {0.3, 0.5, 0.7})), 0);
+    EXPECT_EQ(tzedRestorePreviousUCS(), 0);
+    EXPECT_EQ(viewDirection(), before);
+}
+
 TEST_F(DrawingTest, RotationCountsFromTheSystemsAxis) {
     TzDbMText text;
     (void)text.setDirection({0, 1, 0});
