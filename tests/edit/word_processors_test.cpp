@@ -26,12 +26,12 @@ constexpr ProcessorRow kProcessors[] = {
     {"soffice", "{\\H1.5x;\\LSCOPE} \\\\Sx \\S1#2;\\P"
                 "{\\fLiberation Sans|b1|i0|c0|p34;NOTE:} {\\fLiberation Sans|b0|i1|c0|p34;one} "
                 "{\\Oold\\P\\Fromans.shx|c204;\\oSimplex} {\\C1;red \\H0.7x;\\S+0.1^-0.2;} "
-                "\\U+00FCber \\U+56F3\\P\\pi-1,l2,t4;1.\ttab"                       },
+                "\\U+00FCber \\U+56F3\\P\\pi-1,l2,t4;1.\ttab"},
     {"abiword", "{\\H1.5x;\\LSCOPE} \\\\Sx \\S1#2;\\P"
                 "{\\fLiberation Sans|b1|i0|c0|p34;NOTE:} {\\fLiberation Sans|b0|i1|c0|p34;one} "
                 "{\\Oold\\P\\Fromans.shx|c204;\\oSimplex} {\\C1;red \\H0.7x;\\S+0.1^-0.2;} "
-                "\\U+00FCber \\U+56F3\\P\\pi-0.999269,l1.99927,t3.99927;1.\ttab"    },
-    {"pandoc",  "{\\fHelvetica|b0|i0|c0|p32;\\LSCOPE\\l \\\\Sx \\S1#2;\\P"
+                "\\U+00FCber \\U+56F3\\P\\pi-0.999269,l1.99927,t3.99927;1.\ttab"},
+    {"pandoc", "{\\fHelvetica|b0|i0|c0|p32;\\LSCOPE\\l \\\\Sx \\S1#2;\\P"
                "\\fHelvetica|b1|i0|c0|p32;NOTE:\\fHelvetica|b0|i0|c0|p32; "
                "\\fHelvetica|b0|i1|c0|p32;one\\fHelvetica|b0|i0|c0|p32; "
                "\\Oold\\P\\oSimplex red \\S+0.1^-0.2; \\U+00FCber \\U+56F3\\P1. tab}"},
@@ -44,11 +44,10 @@ TEST_P(WordProcessors, KeepTheText) {
     if (std::system(("command -v " + program + " >/dev/null").c_str()) != 0)
         GTEST_SKIP() << program << " is not installed";
     nlohmann::json const drawing = {
-        {"format",   "tz-drawing"                                                               },
-        {"version",  1                                                                          },
+        {"format", "tz-drawing"},
+        {"version", 1},
         {"entities",
-         {{{"handle", "2A"}, {"type", "MTEXT"}, {"location", {0, 0, 0}}, {"contents", kMarkup}}}}
-    };
+         {{{"handle", "2A"}, {"type", "MTEXT"}, {"location", {0, 0, 0}}, {"contents", kMarkup}}}}};
     fs::path const before = tztest::scratch("before.json", drawing.dump());
     fs::path const after = tztest::scratch("after.json");
     std::string const editor =
