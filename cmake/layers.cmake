@@ -29,11 +29,13 @@ tz_row(module/markup/write_rtf    USES sdk module/globals module/host_calls modu
 tz_row(module/markup/read_rtf     USES sdk module/markup/shared)
 tz_row(module/markup/write_markup USES sdk module/globals module/texts module/fonts module/markup/shared module/markup/read_rtf)
 tz_row(module/markup/session      USES sdk module/globals module/host_calls module/texts module/styles module/fonts module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup)
-tz_row(module/edit         USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session)
+# module/editor_state has no header of its own: it defines what sdk/tz/mte declares for dialogs.
+tz_row(module/editor_state USES sdk module/globals module/host_calls module/texts module/styles module/fonts module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session)
+tz_row(module/edit         USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/markup/shared module/editor_state)
 tz_row(module/mtext        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/prompt module/edit)
 tz_row(module/commands     USES sdk module/globals module/holders module/host_calls module/texts module/styles module/prompt module/edit)
 tz_row(module/align        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/prompt)
-tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/prompt module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session module/edit module/mtext module/commands module/align)
+tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/prompt module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session module/editor_state module/edit module/mtext module/commands module/align)
 
 tz_row(host/base           USES sdk LIBRARIES json)
 tz_row(host/geometry       USES sdk)
