@@ -4,6 +4,9 @@
 #include <cmath>
 #include <cstdio>
 #include <limits>
+#include <sstream>
+
+#include "apps/tzconvert/streams.h"
 
 namespace tzconvert {
 namespace {
@@ -203,6 +206,13 @@ std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
     return rest.empty() ? text : text + ", not \"" + rest.front() + "\"";
 }
 
+// What was asked of the program itself, and the exit status after it.
+int printAnswer(std::string const& text) {
+    Failure const failure = writeBytes("", text);
+    if (failure) std::fprintf(stderr, "tzconvert: %s\n", failure->c_str());
+    return failure ? kUnusable : kDone;
+}
+
 }  // namespace
 
 char const* endingOf(Direction direction) {
@@ -223,11 +233,11 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
         if (parsed.options.files.empty()) parsed.options.files.push_back("-");
         checkTogether(parsed.options);
     } catch (CLI::CallForVersion const& version) {
-        std::printf("%s\n", version.what());
-        parsed.exit = kDone;
+        parsed.exit = printAnswer(std::string(version.what()) + '\n');
     } catch (CLI::Success const&) {  // --help; CLI11 finds the command asked about
-        app.exit(CLI::CallForHelp());
-        parsed.exit = kDone;
+        std::ostringstream text;
+        app.exit(CLI::CallForHelp(), text);
+        parsed.exit = printAnswer(text.str());
     } catch (CLI::ParseError const& wrong) {
         std::fprintf(stderr, "tzconvert: %s; try --help\n", explain(app, wrong).c_str());
         parsed.exit = kUnusable;

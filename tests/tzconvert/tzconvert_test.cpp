@@ -155,6 +155,15 @@ INSTANTIATE_TEST_SUITE_P(Commands, Runs, testing::ValuesIn(kRuns), [](auto const
     return row.param.name;
 });
 
+// Both used to end with 0 and not a word.
+TEST(Usage, ThatCannotBeWrittenIsSaid) {
+    for (char const* const asked : {"--help", "--version"}) {
+        Outcome const result = run(std::string(asked) + " >/dev/full", "");
+        EXPECT_EQ(result.status, 2) << asked;
+        EXPECT_TRUE(result.err.starts_with("tzconvert: standard output: ")) << result.err;
+    }
+}
+
 TEST(Normaliser, TakesBytesAndCountsWhatIsLeftOutInOneLine) {
     std::string_view const rtf =
         "{\\new \xC0\0}\\u-10179?\\u-8704?{\\pict}{\\footnote}{\\footnote}{\\header}"sv;
