@@ -25,16 +25,19 @@ struct ProcessorRow {
 constexpr ProcessorRow kProcessors[] = {
     {"soffice", "{\\H1.5x;\\LSCOPE} \\\\Sx \\S1#2;\\P"
                 "{\\fLiberation Sans|b1|i0|c0|p34;NOTE:} {\\fLiberation Sans|b0|i1|c0|p34;one} "
-                "{\\Oold\\P\\Fromans.shx|c204;\\oSimplex} {\\C1;red \\H0.7x;\\S+0.1^-0.2;} "
+                "{\\Oold}\\P{\\Fromans.shx|c204;Simplex} {\\C1;red \\H0.7x;\\S+0.1^-0.2;} "
                 "\\U+00FCber \\U+56F3\\P\\pi-1,l2,t4;1.\ttab"},
-    {"abiword", "{\\H1.5x;\\LSCOPE} \\\\Sx \\S1#2;\\P"
-                "{\\fLiberation Sans|b1|i0|c0|p34;NOTE:} {\\fLiberation Sans|b0|i1|c0|p34;one} "
-                "{\\Oold\\P\\Fromans.shx|c204;\\oSimplex} {\\C1;red \\H0.7x;\\S+0.1^-0.2;} "
-                "\\U+00FCber \\U+56F3\\P\\pi-0.999269,l1.99927,t3.99927;1.\ttab"},
+    // It gives the mark of a paragraph the look of its last text, or of the next one's first.
+    {"abiword", "{\\H1.5x;\\LSCOPE} \\\\Sx \\S1#2;{\\H1.5x;\\L\\P"
+                "\\fLiberation Sans|b1|i0|c0|p34;\\H0.6667x;\\lNOTE:} "
+                "{\\fLiberation Sans|b0|i1|c0|p34;one} {\\Oold"
+                "\\fLiberation Sans|b1|i0|c0|p34;\\o\\P\\Fromans.shx|c204;Simplex} "
+                "{\\C1;red \\H0.7x;\\S+0.1^-0.2;} \\U+00FCber \\U+56F3{\\Fromans.shx|c204;\\P"
+                "\\pi-0.999269,l1.99927,t3.99927;}1.\ttab"},
     {"pandoc", "{\\fHelvetica|b0|i0|c0|p32;\\LSCOPE\\l \\\\Sx \\S1#2;\\P"
                "\\fHelvetica|b1|i0|c0|p32;NOTE:\\fHelvetica|b0|i0|c0|p32; "
                "\\fHelvetica|b0|i1|c0|p32;one\\fHelvetica|b0|i0|c0|p32; "
-               "\\Oold\\P\\oSimplex red \\S+0.1^-0.2; \\U+00FCber \\U+56F3\\P1. tab}"},
+               "\\Oold\\o\\PSimplex red \\S+0.1^-0.2; \\U+00FCber \\U+56F3\\P1. tab}"},
 };
 
 class WordProcessors : public testing::TestWithParam<ProcessorRow> {};
@@ -43,6 +46,8 @@ TEST_P(WordProcessors, KeepTheText) {
     std::string const program = GetParam().program;
     if (std::system(("command -v " + program + " >/dev/null").c_str()) != 0)
         GTEST_SKIP() << program << " is not installed";
+    // What happens to be installed decides about no change.
+    if (std::getenv("CI") != nullptr) GTEST_SKIP() << "word processors are not asked in CI";
     nlohmann::json const drawing = {
         {"format", "tz-drawing"},
         {"version", 1},
