@@ -196,10 +196,11 @@ DialogChange readBackground(State const&, std::wstring_view text) {
     Json const object = Json::parse(toUtf8(text), nullptr, false);
     if (!object.is_object()) return {};
     std::vector<DialogChange> changes;
-    for (auto const& [name, value] : object.items()) {
-        auto const* const row =
-            std::ranges::find_if(kBackground, [&](auto const& each) { return name == each.name; });
-        DialogChange change = row == std::end(kBackground) ? DialogChange() : row->read(value);
+    for (auto const& member : object.items()) {
+        auto const* const row = std::ranges::find_if(
+            kBackground, [&](auto const& each) { return member.key() == each.name; });
+        DialogChange change =
+            row == std::end(kBackground) ? DialogChange() : row->read(member.value());
         if (!change) return {};
         changes.push_back(std::move(change));
     }
