@@ -34,8 +34,9 @@ tz_row(module/editor_state USES sdk module/globals module/host_calls module/text
 tz_row(module/edit         USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/markup/shared module/editor_state)
 tz_row(module/mtext        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/prompt module/edit)
 tz_row(module/commands     USES sdk module/globals module/holders module/host_calls module/texts module/styles module/prompt module/edit)
-tz_row(module/align        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/prompt)
-tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/prompt module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session module/editor_state module/edit module/mtext module/commands module/align)
+tz_row(module/align/spacing USES sdk module/globals module/holders module/host_calls module/texts module/geometry)
+tz_row(module/align        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/prompt module/align/spacing)
+tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/prompt module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session module/editor_state module/edit module/mtext module/commands module/align/spacing module/align)
 
 tz_row(host/base           USES sdk LIBRARIES json)
 tz_row(host/geometry       USES sdk)

@@ -1,10 +1,10 @@
 #include "module/align/align_command.h"
 
 #include "module/align/align_jig.h"
-#include "module/align/current_spacing.h"
-#include "module/align/even_spacing.h"
 #include "module/align/selection_keywords.h"
 #include "module/align/setting_texts.h"
+#include "module/align/spacing/current_spacing.h"
+#include "module/align/spacing/even_spacing.h"
 #include "module/align/text_filter.h"
 #include "module/geometry/points.h"
 #include "module/holders/scope_guard.h"

@@ -2,10 +2,10 @@
 
 #include <optional>
 
-#include "module/align/alignment_pass.h"
-#include "module/align/setting_variables.h"
-#include "module/align/text_axes.h"
-#include "module/align/text_planes.h"
+#include "module/align/spacing/alignment_pass.h"
+#include "module/align/spacing/setting_variables.h"
+#include "module/align/spacing/text_axes.h"
+#include "module/align/spacing/text_planes.h"
 #include "module/host_calls/selection_sets.h"
 #include "tz/db/mtext.h"
 #include "tz/db/text.h"

@@ -2,9 +2,9 @@
 
 #include <vector>
 
-#include "module/align/aligned_entity.h"
-#include "module/align/options_factory.h"
-#include "module/align/text_spacing.h"
+#include "module/align/spacing/aligned_entity.h"
+#include "module/align/spacing/options_factory.h"
+#include "module/align/spacing/text_spacing.h"
 #include "tz/ge/line_seg3d.h"
 #include "tz/ge/plane.h"
 #include "tz/text/array.h"

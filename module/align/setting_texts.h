@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/align/text_direction.h"
+#include "module/align/spacing/text_direction.h"
 #include "tz/text/string.h"
 
 // Keywords and descriptions of the justifications and the spacing options. The descriptions are

@@ -3,7 +3,7 @@
 #include "tz/ge/bound_block3d.h"
 
 // A direction of an alignment that does not align: it knows no point of a text and no distance.
-// Nothing calls it; what a justification means stands in module/align/text_direction.h.
+// Nothing calls it; what a justification means stands in module/align/spacing/text_direction.h.
 class TzMTextAlignDirection {
 public:
     // The world's origin, whatever the box.

@@ -6,9 +6,9 @@
 #include <cstdio>
 #include <string>
 
-#include "module/align/aligned_entity.h"
-#include "module/align/text_axes.h"
-#include "module/align/text_box_makers.h"
+#include "module/align/spacing/aligned_entity.h"
+#include "module/align/spacing/text_axes.h"
+#include "module/align/spacing/text_box_makers.h"
 #include "tests/align/given_text.h"
 #include "tests/database/drawing_fixture.h"
 #include "tz/db/text.h"

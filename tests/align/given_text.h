@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/align/aligned_entity.h"
+#include "module/align/spacing/aligned_entity.h"
 #include "tz/ge/point2d.h"
 
 // Texts for an alignment that need no drawing: their boxes are given.

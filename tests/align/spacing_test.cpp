@@ -11,11 +11,11 @@
 #include <random>
 #include <string>
 
-#include "module/align/alignment_pass.h"
-#include "module/align/current_spacing.h"
-#include "module/align/even_spacing.h"
-#include "module/align/options_factory.h"
-#include "module/align/text_planes.h"
+#include "module/align/spacing/alignment_pass.h"
+#include "module/align/spacing/current_spacing.h"
+#include "module/align/spacing/even_spacing.h"
+#include "module/align/spacing/options_factory.h"
+#include "module/align/spacing/text_planes.h"
 #include "tests/align/given_text.h"
 #include "tests/mtext/held_text.h"
 

@@ -1,4 +1,4 @@
-#include "module/align/current_spacing.h"
+#include "module/align/spacing/current_spacing.h"
 
 #include <algorithm>
 #include <numbers>

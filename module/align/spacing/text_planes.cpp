@@ -1,4 +1,4 @@
-#include "module/align/text_planes.h"
+#include "module/align/spacing/text_planes.h"
 
 #include <algorithm>
 

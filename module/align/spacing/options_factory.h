@@ -3,7 +3,7 @@
 #include <cstddef>
 #include <vector>
 
-#include "module/align/spacing_option.h"
+#include "module/align/spacing/spacing_option.h"
 
 // The spacing options of a run, by name. Index 0 stands for an option that is not there.
 //

@@ -1,4 +1,4 @@
-#include "module/align/box_maker.h"
+#include "module/align/spacing/box_maker.h"
 
 #include <algorithm>
 

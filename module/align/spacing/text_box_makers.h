@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/align/box_maker.h"
+#include "module/align/spacing/box_maker.h"
 
 // The makers of the boxes of both kinds of texts. A text that cannot be opened or measured gives an
 // empty box.

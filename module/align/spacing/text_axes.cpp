@@ -1,4 +1,4 @@
-#include "module/align/text_axes.h"
+#include "module/align/spacing/text_axes.h"
 
 #include "tz/ge/arbitrary_axis.h"
 

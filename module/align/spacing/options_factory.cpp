@@ -1,4 +1,4 @@
-#include "module/align/options_factory.h"
+#include "module/align/spacing/options_factory.h"
 
 #include <memory>
 

@@ -3,7 +3,7 @@
 #include <cstddef>
 #include <vector>
 
-#include "module/align/aligned_entity.h"
+#include "module/align/spacing/aligned_entity.h"
 #include "tz/ge/line_seg3d.h"
 #include "tz/text/string.h"
 

@@ -1,4 +1,4 @@
-#include "module/align/alignment_pass.h"
+#include "module/align/spacing/alignment_pass.h"
 
 #include <algorithm>
 #include <cmath>

@@ -1,4 +1,4 @@
-#include "module/align/setting_variables.h"
+#include "module/align/spacing/setting_variables.h"
 
 #include "module/host_calls/sys_var.h"
 #include "tz/ed/variables.h"

@@ -1,4 +1,4 @@
-#include "module/align/spacing_option.h"
+#include "module/align/spacing/spacing_option.h"
 
 void TzMTextAlignOption::calculateOffsets(Offsets& offsets,
                                           TzGeMatrix3d const& coordSystem,

@@ -1,10 +1,10 @@
-#include "module/align/even_spacing.h"
+#include "module/align/spacing/even_spacing.h"
 
 #include <algorithm>
 #include <cmath>
 #include <limits>
 
-#include "module/align/setting_variables.h"
+#include "module/align/spacing/setting_variables.h"
 #include "module/texts/string_table.h"
 #include "module/texts/text_ids.h"
 #include "tz/ed/prompts.h"

@@ -1,10 +1,10 @@
-#include "module/align/text_box_makers.h"
+#include "module/align/spacing/text_box_makers.h"
 
 #include <memory>
 #include <new>
 #include <optional>
 
-#include "module/align/text_axes.h"
+#include "module/align/spacing/text_axes.h"
 #include "module/geometry/attachments.h"
 #include "tz/db/mtext.h"
 #include "tz/db/text.h"

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/align/spacing_option.h"
+#include "module/align/spacing/spacing_option.h"
 
 // One pass of an alignment: puts the texts in order along the line, asks the spacing option for
 // their moves, and moves their copies. Built for each place of the cursor; no object of the drawing

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/align/spacing_option.h"
+#include "module/align/spacing/spacing_option.h"
 
 // Each text slides along one axis of the working plane until its reference point is on the line, so
 // that the distances along the other axis stay as they are. A line within one degree of the axis

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "module/align/spacing_option.h"
+#include "module/align/spacing/spacing_option.h"
 
 // Texts one after another along the line, with the same gap between the boxes of neighbours. The
 // first one's reference point goes to the first point.

@@ -1,9 +1,9 @@
-#include "module/align/aligned_entity.h"
+#include "module/align/spacing/aligned_entity.h"
 
 #include <array>
 #include <numeric>
 
-#include "module/align/text_box_makers.h"
+#include "module/align/spacing/text_box_makers.h"
 #include "tz/db/mtext.h"
 #include "tz/gi/draw.h"
 #include "tz/mte/easy_object.h"

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "module/align/box_maker.h"
-#include "module/align/text_direction.h"
+#include "module/align/spacing/box_maker.h"
+#include "module/align/spacing/text_direction.h"
 #include "tz/db/entity.h"
 
 class TzGiCommonDraw;
