@@ -7,6 +7,7 @@
 #include "host/runtime/documents.h"
 #include "host/settings/variables.h"
 #include "tests/command_line/scripted_session.h"
+#include "tz/mte/font_map_database.h"
 
 // An open drawing with a script's answers, for tests that hold a text of their own and call the
 // module's code directly.
@@ -28,6 +29,8 @@ public:
     ~OpenDrawing() {
         tzhost::documents().close();
         tzhost::setWorkingDrawing(nullptr);
+        // An editing session may have loaded it.
+        CMTextFontMapDatabase(0).ResetContents();
     }
 
     [[nodiscard]] std::string const& events() const { return session_.events(); }
