@@ -14,6 +14,11 @@ endforeach()
 target_link_libraries(tz PRIVATE Threads::Threads ${CMAKE_DL_LIBS})
 target_link_options(tz PRIVATE ${TZ_LINK_DEFS})
 set_target_properties(tz PROPERTIES VERSION 1 SOVERSION 1)
+# What a module of a stranger sees of it, here and installed.
+target_include_directories(tz INTERFACE
+    $<BUILD_INTERFACE:${TZ_ROOT_sdk}> $<INSTALL_INTERFACE:${CMAKE_INSTALL_INCLUDEDIR}>)
+target_compile_features(tz INTERFACE cxx_std_20)
+add_library(tz::tz ALIAS tz)
 add_dependencies(tz_products tz)
 
 # The module: every module layer whole, hidden but for the names of its list.
@@ -35,6 +40,11 @@ target_link_options(tzmted PRIVATE -Wl,--version-script=${version_script})
 set_target_properties(tzmted PROPERTIES LINK_DEPENDS ${version_script})
 add_dependencies(tzmted tzmted_version_script)
 add_dependencies(tz_products tzmted)
+# What a module links that calls this one.
+add_library(tzmted_linked INTERFACE)
+target_link_libraries(tzmted_linked INTERFACE $<TARGET_FILE:tzmted> tz)
+add_dependencies(tzmted_linked tzmted)
+add_library(tz::tzmted ALIAS tzmted_linked)
 
 # The programs: each is its layer, which suites link too, and a main.cpp.
 function(tz_program name)

@@ -6,12 +6,14 @@
 #   add_fuzz(NAME source *)               a fuzzer and the replay of its seeds, target fuzz_NAME
 #   add_bench(NAME sources... *)          a benchmark (release only), target bench_NAME
 #   add_bench_program(NAME sources...)    a program for scripts/compare.py (release only)
-#   add_example_module(NAME sources...)   a further module lib/NAME.tzx, built from sdk/ alone
+#   add_example_module(NAME)              a folder with a further module, built as a stranger would
 #   add_example_program(NAME sources...)  a program bin/NAME, built from sdk/ alone
 #   add_lint(NAME command...)             a check of the source tree, test lint.NAME
 #
 # Those with a * take LIBS and names after it: layers (module_prompt, app_tzdraft), support libraries
 # or third-party targets. A layer brings the layers of its row along, and libtz is always there.
+
+include(${CMAKE_CURRENT_LIST_DIR}/tz_module.cmake)
 
 set(TZ_ROOTS ${CMAKE_BINARY_DIR}/roots)
 set(TZ_FOLDERS "")
@@ -262,14 +264,6 @@ function(add_bench_program name)
     set_target_properties(${name} PROPERTIES RUNTIME_OUTPUT_DIRECTORY ${CMAKE_BINARY_DIR}/tests)
 endfunction()
 
-# What a loadable module needs to be: a plain file NAME.tzx that nothing pins to the process.
-function(tz_module_properties target output)
-    set_target_properties(${target} PROPERTIES PREFIX "" SUFFIX .tzx OUTPUT_NAME ${output}
-        CXX_VISIBILITY_PRESET hidden VISIBILITY_INLINES_HIDDEN ON)
-    target_compile_options(${target} PRIVATE $<$<CXX_COMPILER_ID:GNU>:-fno-gnu-unique>)
-    target_link_options(${target} PRIVATE -Wl,-soname,${output}.tzx ${TZ_LINK_DEFS})
-endfunction()
-
 function(add_example_program name)
     add_executable(example_${name} ${ARGN})
     tz_flags(example_${name})
@@ -279,13 +273,12 @@ function(add_example_program name)
     add_dependencies(tz_products example_${name})
 endfunction()
 
+# The folder stands for itself: outside of this tree its CMakeLists.txt builds by find_package(tz).
 function(add_example_module name)
-    add_library(example_${name} MODULE ${ARGN})
-    tz_flags(example_${name})
-    tz_module_properties(example_${name} ${name})
-    target_include_directories(example_${name} PRIVATE ${TZ_ROOT_sdk} ${TZ_ROOT_examples})
-    add_dependencies(example_${name} tzmted)
-    target_link_libraries(example_${name} PRIVATE $<TARGET_FILE:tzmted>)
-    target_link_libraries(example_${name} PRIVATE tz)
-    add_dependencies(tz_products example_${name})
+    add_subdirectory(${name})
+    get_property(modules DIRECTORY ${name} PROPERTY BUILDSYSTEM_TARGETS)
+    foreach(module IN LISTS modules)
+        tz_flags(${module})
+        add_dependencies(tz_products ${module})
+    endforeach()
 endfunction()

@@ -4,8 +4,8 @@
 
 #include <array>
 
-#include "examples/second_module/bodies.h"
-#include "examples/second_module/mark_preview.h"
+#include "bodies.h"
+#include "mark_preview.h"
 #include "tz/ed/command_stack.h"
 #include "tz/ed/functions.h"
 #include "tz/ed/print.h"

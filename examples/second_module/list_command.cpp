@@ -1,8 +1,8 @@
 // MARKLIST: lists the texts that the user selects. While the selection is pending, its word Layers
 // lists the layers of the drawing.
 
-#include "examples/second_module/bodies.h"
-#include "examples/second_module/posting.h"
+#include "bodies.h"
+#include "posting.h"
 #include "tz/ap/document.h"
 #include "tz/ap/gesture.h"
 #include "tz/db/database.h"

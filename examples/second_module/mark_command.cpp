@@ -1,8 +1,8 @@
 // MARK: asks for the number, its angle and what it points at, and drags the circle to its place.
 
-#include "examples/second_module/bodies.h"
-#include "examples/second_module/mark_preview.h"
-#include "examples/second_module/posting.h"
+#include "bodies.h"
+#include "mark_preview.h"
+#include "posting.h"
 #include "tz/db/mtext.h"
 #include "tz/db/shapes.h"
 #include "tz/ed/jig.h"

@@ -1,4 +1,4 @@
-#include "examples/second_module/mark_preview.h"
+#include "mark_preview.h"
 
 #include "tz/gi/draw.h"
 #include "tz/gi/text_style.h"

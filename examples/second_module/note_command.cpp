@@ -4,8 +4,8 @@
 #include <array>
 #include <memory>
 
-#include "examples/second_module/bodies.h"
-#include "examples/second_module/posting.h"
+#include "bodies.h"
+#include "posting.h"
 #include "tz/db/mtext.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"

@@ -1,4 +1,4 @@
-#include "examples/second_module/posting.h"
+#include "posting.h"
 
 #include "tz/db/block_table.h"
 #include "tz/db/database.h"

@@ -1,7 +1,7 @@
 // MARKSETUP: what the settings, the registry, the font map file and the text module say about texts
 // and fonts.
 
-#include "examples/second_module/bodies.h"
+#include "bodies.h"
 #include "tz/ed/editors.h"
 #include "tz/ed/print.h"
 #include "tz/ed/prompts.h"

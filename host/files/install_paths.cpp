@@ -25,6 +25,20 @@ fs::path ownFile() {
     return file.empty() ? fs::canonical("/proc/self/exe", none) : file;
 }
 
+// Of an installation: seen from the library, then from a program; of a build: from a program.
+constexpr char const* kWays[] = {"tz", TZ_FROM_PROGRAM_TO_BESIDE, "../lib"};
+
+std::string findLibraryFolder() {
+    fs::path const folder = ownFile().parent_path();
+    if (folder.empty()) return "/";
+    for (char const* way : kWays) {
+        fs::path const beside = (folder / way).lexically_normal();
+        std::error_code none;
+        if (fs::is_directory(beside, none)) return beside.string();
+    }
+    return folder.string();
+}
+
 std::string variable(char const* name) {
     char const* const value = std::getenv(name);
     return value ? value : "";
@@ -33,12 +47,9 @@ std::string variable(char const* name) {
 }  // namespace
 
 std::string libraryFolder() {
-    fs::path const folder = ownFile().parent_path();
-    if (folder.empty()) return "/";
-    fs::path const beside = folder.parent_path() / "lib";
-    std::error_code none;
-    bool const isProgram = folder.filename() != "lib" && fs::is_directory(beside, none);
-    return (isProgram ? beside : folder).string();
+    // Where it was at the first question: a session outlives the removal of what it runs from.
+    static std::string const folder = findLibraryFolder();
+    return folder;
 }
 
 std::string configurationFolder() {

@@ -7,9 +7,11 @@
 
 namespace tzhost {
 
-// The folder of the libraries and of the data files beside them, an absolute path without a slash
-// at its end: that of this library, or lib/ beside the folder of the program that holds this code.
-// The root when the system does not tell.
+// The folder of the module and of the data files beside it, an absolute path without a slash at its
+// end. In an installation it is tz/ in the folder of the libraries; in a build it is the folder of
+// the libraries itself, which is lib/ beside the folder of a program that holds this code. The root
+// when the system does not tell. It is looked for once, so that it stays when the files are
+// removed.
 [[nodiscard]] std::string libraryFolder();
 
 // The user's folder for the configuration of these programs, which need not exist: in
