@@ -8,8 +8,8 @@
 # column under sdk/, module/ and examples/ use the standard library alone
 # (and the smallest host the loader).
 #
-# Names of libraries: json (nlohmann-json), ini (SimpleIni), fontconfig, pango (with GLib), cairo,
-# cli (CLI11), editline (libedit).
+# Names of libraries: json (nlohmann-json), fastjson (RapidJSON), ini (SimpleIni), fontconfig,
+# pango (with GLib), cairo, cli (CLI11), editline (libedit).
 
 tz_row(sdk)
 
@@ -41,7 +41,7 @@ tz_row(module/shell        USES sdk module/globals module/holders module/host_ca
 tz_row(host/base           USES sdk LIBRARIES json)
 tz_row(host/geometry       USES sdk)
 tz_row(host/text           USES sdk)
-tz_row(host/files          USES sdk host/base host/text LIBRARIES json ini)
+tz_row(host/files          USES sdk host/base host/text LIBRARIES json fastjson ini)
 tz_row(host/settings       USES sdk host/base host/text host/files LIBRARIES json)
 tz_row(host/code_pages     USES sdk host/settings)
 tz_row(host/fonts          USES sdk host/base host/text host/files host/code_pages LIBRARIES fontconfig)

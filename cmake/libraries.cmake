@@ -7,7 +7,7 @@ pkg_check_modules(PANGO REQUIRED IMPORTED_TARGET pango pangocairo pangoft2)
 pkg_check_modules(CAIRO REQUIRED IMPORTED_TARGET cairo cairo-svg cairo-png cairo-pdf)
 pkg_check_modules(EDITLINE REQUIRED IMPORTED_TARGET libedit)
 
-foreach(library json ini fontconfig pango cairo cli editline)
+foreach(library json fastjson ini fontconfig pango cairo cli editline)
     add_library(tz_library_${library} INTERFACE)
 endforeach()
 target_link_libraries(tz_library_ini INTERFACE simpleini)

@@ -40,7 +40,7 @@ void DrawingReader::readVersion(JsonValue const& value) {
     if (value.kind == JsonKind::number && value.number == kVersion) return;
     isNewer_ = value.kind == JsonKind::number && value.number > kVersion;
     context_.complain(value.line, "version",
-                      isNewer_ ? localText("is ") + value.text +
+                      isNewer_ ? localText("is ") + std::string(value.text) +
                                      localText(" and newer than this program, expected 1")
                                : localText("is no version, expected 1"));
 }
@@ -79,9 +79,9 @@ void DrawingReader::readName(char const* name, JsonValue const& value, std::stri
     (&into == &layer_ ? layerLine_ : styleLine_) = value.line;
 }
 
-bool DrawingReader::member(std::string const& name, JsonValue value) {
+bool DrawingReader::member(std::string_view name, JsonValue const& value) {
     if (pass_ == Pass::entitiesOnly) return true;
-    seen_.insert(name);
+    seen_.emplace(name);
     for (MemberRow const& row : kRows) {
         if (name != row.name) continue;
         (this->*row.read)(value);
@@ -89,17 +89,17 @@ bool DrawingReader::member(std::string const& name, JsonValue value) {
     }
     std::string json;
     writeValue(json, value);
-    context_.drawing.unknown.push_back({"", name, std::move(json)});
+    context_.drawing.unknown.push_back({"", std::string(name), std::move(json)});
     return true;
 }
 
 // Blocks need their layers and styles, entities of the drawing need the blocks too.
-void DrawingReader::beginArray(std::string const& name) {
+void DrawingReader::beginArray(std::string_view name) {
     bool const hasTables = seen_.contains("layers") && seen_.contains("textStyles");
     if (pass_ == Pass::first) {
         readsEntities_ = hasTables;
         skippedEntities_ = skippedEntities_ || !readsEntities_;
-        if (readsEntities_) readArrays_.insert(name);
+        if (readsEntities_) readArrays_.emplace(name);
     } else {
         readsEntities_ = !readArrays_.contains(name);
     }
@@ -107,9 +107,9 @@ void DrawingReader::beginArray(std::string const& name) {
 }
 
 bool DrawingReader::beginBlock(int line) {
-    blockValue_ = JsonValue();
-    blockValue_.kind = JsonKind::object;
-    blockValue_.line = line;
+    blockMembers_.clear();
+    blockStore_.clear();
+    blockLine_ = line;
     if (pass_ == Pass::entitiesOnly) {
         if (blockIndex_ < blocks_.size())
             block_ = blocks_[blockIndex_++].record;
@@ -123,8 +123,8 @@ bool DrawingReader::beginBlock(int line) {
     return true;
 }
 
-bool DrawingReader::blockMember(std::string const& name, JsonValue value) {
-    blockValue_.members.push_back({name, std::move(value)});
+bool DrawingReader::blockMember(std::string_view name, JsonValue const& value) {
+    blockMembers_.push_back({blockStore_.keep(name), blockStore_.keep(value)});
     return true;
 }
 
@@ -132,8 +132,12 @@ bool DrawingReader::endBlock() {
     TzDbObjectRecord* const record = std::exchange(block_, nullptr);
     if (pass_ == Pass::entitiesOnly) return true;
     BlockImp& values = valuesOf<BlockImp>(*record->object);
+    JsonValue value;
+    value.kind = JsonKind::object;
+    value.line = blockLine_;
+    value.members = {blockMembers_.data(), blockMembers_.size()};
     UnknownMembers unknown;
-    MemberReader members(context_, blockValue_, unknown);
+    MemberReader members(context_, value, unknown);
     std::wstring name;
     members.text("name", name);
     describe(members, values);
@@ -142,14 +146,14 @@ bool DrawingReader::endBlock() {
         members.complain("name", localText("is missing or empty, expected a name"));
     }
     values.name = std::move(name);
-    if (JsonValue const* const named = blockValue_.find("name")) {
+    if (JsonValue const* const named = value.find("name")) {
         blocks_.back().nameLine = named->line;
     }
     if (!unknown.empty()) values.unknown = std::make_unique<UnknownMembers>(std::move(unknown));
     return !context_.failed;
 }
 
-bool DrawingReader::entity(JsonValue value) {
+bool DrawingReader::entity(JsonValue const& value) {
     if (!readsEntities_) return true;
     entities_.read(value, block_);
     return !context_.failed;

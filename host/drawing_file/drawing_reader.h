@@ -32,12 +32,12 @@ public:
     // Everything was read.
     void finish();
 
-    bool member(std::string const& name, JsonValue value) override;
+    bool member(std::string_view name, JsonValue const& value) override;
     bool beginBlock(int line) override;
-    bool blockMember(std::string const& name, JsonValue value) override;
+    bool blockMember(std::string_view name, JsonValue const& value) override;
     bool endBlock() override;
-    bool entity(JsonValue value) override;
-    void beginArray(std::string const& name) override;
+    bool entity(JsonValue const& value) override;
+    void beginArray(std::string_view name) override;
 
 private:
     void readFormat(JsonValue const& value);
@@ -77,8 +77,8 @@ private:
     std::string style_;
     int layerLine_ = 1;
     int styleLine_ = 1;
-    std::set<std::string> seen_;        // members of the drawing
-    std::set<std::string> readArrays_;  // those whose entities the first pass took
+    std::set<std::string, std::less<>> seen_;        // members of the drawing
+    std::set<std::string, std::less<>> readArrays_;  // those whose entities the first pass took
     Pass pass_ = Pass::first;
     bool readsEntities_ = false;  // of the array that is open
     bool skippedEntities_ = false;
@@ -86,7 +86,9 @@ private:
     bool hasVersion_ = false;
     bool isNewer_ = false;
     // The block that is open.
-    JsonValue blockValue_;
+    JsonStore blockStore_;  // of its members
+    std::vector<JsonMember> blockMembers_;
+    int blockLine_ = 1;
     TzDbObjectRecord* block_ = nullptr;  // null outside blocks
     std::size_t blockIndex_ = 0;
     struct ReadBlock {

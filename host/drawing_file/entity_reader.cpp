@@ -63,7 +63,7 @@ std::uint64_t EntityReader::handleOf(JsonValue const& value) {
     if (!context_.drawing.objectAt(*handle).isNull()) {
         context_.complain(
             member->line, "handle",
-            localText("is \"") + member->text +
+            localText("is \"") + std::string(member->text) +
                 localText("\" as that of an earlier entity, expected each handle once"));
         return 0;
     }
@@ -173,7 +173,7 @@ void EntityReader::read(JsonValue const& value, TzDbObjectRecord* owner) {
         return (this->*row.read)(value, owner ? *owner : spaceOf(value));
     }
     std::string const found =
-        type->kind == JsonKind::text ? '"' + type->text + '"' : nameOf(type->kind);
+        type->kind == JsonKind::text ? '"' + std::string(type->text) + '"' : nameOf(type->kind);
     context_.complain(type->line, "type",
                       localText("is ") + found + localText(", expected ") + localText(kTypes));
 }

@@ -1,7 +1,6 @@
 #include "host/drawing_file/json_stream.h"
 
 #include <set>
-#include <utility>
 
 #include "host/files/json_events.h"
 #include "host/text/local_text.h"
@@ -15,20 +14,22 @@ enum class Place { start, drawing, entities, blocks, block, blockEntities, end }
 // Walks through the drawing itself, its streamed arrays and its blocks.
 class StreamParser final : public JsonEvents {
 public:
-    StreamParser(JsonSource& source, DrawingSink& sink) : JsonEvents(source), sink_(sink) {}
+    StreamParser(JsonSource& source, JsonStore& store, DrawingSink& sink)
+        : JsonEvents(source, store), store_(store), sink_(sink) {}
 
     [[nodiscard]] bool stopped() const { return stopped_; }
 
 protected:
-    bool take(JsonValue value) override;
+    bool take(JsonValue const& value) override;
     bool allow(JsonValue const& scalar) override;
     bool enter(JsonKind kind, bool& walked) override;
     bool leave() override;
     bool enterMember() override {
-        return seen_[place_ == Place::block ? 1 : 0].insert(name()).second || failTwice();
+        return seen_[place_ == Place::block ? 1 : 0].emplace(name()).second || failTwice();
     }
 
 private:
+    bool handOn(JsonValue const& value);
     bool hand(bool accepted) {
         stopped_ = !accepted;
         return accepted;
@@ -38,18 +39,25 @@ private:
                (place_ == Place::block && name() == "entities");
     }
 
+    JsonStore& store_;
     DrawingSink& sink_;
     bool stopped_ = false;
     Place place_ = Place::start;
     std::set<std::string> seen_[2];  // members of the drawing and of the block so far
 };
 
-bool StreamParser::take(JsonValue value) {
+bool StreamParser::take(JsonValue const& value) {
+    bool const goesOn = handOn(value);
+    store_.clear();
+    return goesOn;
+}
+
+bool StreamParser::handOn(JsonValue const& value) {
     switch (place_) {
-    case Place::drawing: return hand(sink_.member(name(), std::move(value)));
-    case Place::block: return hand(sink_.blockMember(name(), std::move(value)));
+    case Place::drawing: return hand(sink_.member(name(), value));
+    case Place::block: return hand(sink_.blockMember(name(), value));
     case Place::entities:
-    case Place::blockEntities: return hand(sink_.entity(std::move(value)));
+    case Place::blockEntities: return hand(sink_.entity(value));
     case Place::blocks:
         return fail(localText("holds ") + nameOf(value.kind) + localText(", expected an object"));
     case Place::start:
@@ -100,7 +108,8 @@ bool StreamParser::leave() {
 
 StreamResult readStream(std::FILE* file, DrawingSink& sink) {
     JsonSource source(file);
-    StreamParser parser(source, sink);
+    JsonStore store;
+    StreamParser parser(source, store, sink);
     (void)parser.readAll();  // the result says what became of it
     return {parser.stopped(), parser.failed(), parser.problem()};
 }

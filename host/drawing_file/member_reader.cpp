@@ -12,7 +12,7 @@ namespace {
 
 // A value as a message shows it.
 std::string shown(JsonValue const& value) {
-    if (value.kind == JsonKind::number) return value.text;
+    if (value.kind == JsonKind::number) return std::string(value.text);
     if (value.kind == JsonKind::flag) return value.flag ? "true" : "false";
     return nameOf(value.kind);
 }
@@ -41,12 +41,15 @@ std::string MemberReader::pathOf(std::string_view name) const {
 }
 
 JsonValue const* MemberReader::take(char const* name) {
-    JsonValue const* const found = object_.find(name);
-    if (!found) return nullptr;
-    for (std::size_t i = 0; i < object_.members.size(); ++i) {
-        if (&object_.members[i].second == found) known_[i] = true;
+    std::size_t const count = object_.members.size();
+    for (std::size_t tried = 0; tried < count; ++tried) {
+        std::size_t const at = next_;
+        next_ = at + 1 == count ? 0 : at + 1;
+        if (object_.members[at].first != name) continue;
+        known_[at] = true;
+        return &object_.members[at].second;
     }
-    return found;
+    return nullptr;
 }
 
 JsonValue const* MemberReader::takeOf(char const* name, JsonKind kind) {
@@ -94,7 +97,7 @@ void MemberReader::wholeNumber(char const* name, int& value, WholeRange numbers)
 void MemberReader::text(char const* name, std::wstring& value) {
     JsonValue const* const member = takeOf(name, JsonKind::text);
     if (!member) return;
-    if (member->text.find('\0') != std::string::npos) {
+    if (member->text.find('\0') != std::string_view::npos) {
         return complain(name, localText("holds a zero character, expected a text without one"));
     }
     value = fromUtf8(member->text);
@@ -159,8 +162,9 @@ void MemberReader::record(char const* name,
         value = found;
         return;
     }
-    complain(name, localText("names \"") + member->text + localText("\", expected the name of ") +
-                       localText(kind) + localText(" of this drawing"));
+    complain(name, localText("names \"") + std::string(member->text) +
+                       localText("\", expected the name of ") + localText(kind) +
+                       localText(" of this drawing"));
 }
 
 void MemberReader::layer(char const* name, TzDbObjectId& value) {
@@ -191,7 +195,7 @@ void MemberReader::keepRest() {
         auto const& [name, value] = object_.members[i];
         std::string json;
         writeValue(json, value);
-        unknown_.push_back({path_, name, std::move(json)});
+        unknown_.push_back({path_, std::string(name), std::move(json)});
     }
 }
 

@@ -78,6 +78,8 @@ private:
     UnknownMembers& unknown_;
     std::string path_;
     std::vector<bool> known_;  // by the index of the member
+    // Where the next search begins: members mostly come in the order in which they are asked for.
+    std::size_t next_ = 0;
 };
 
 }  // namespace tzhost::drawingfile

@@ -101,10 +101,10 @@ std::optional<VariableValue> valueFrom(JsonValue const& value, VariableType type
 
 void readVariable(ReadContext& context,
                   VariableDefinition const& row,
-                  std::string const& name,
+                  std::string_view name,
                   JsonValue const& member,
                   Variables::Values& values) {
-    std::string const path = "variables." + name;
+    std::string const path = "variables." + std::string(name);
     auto const value = valueFrom(member, row.type);
     if (!value) {
         return context.complain(member.line, path,
@@ -141,10 +141,10 @@ void readVariables(ReadContext& context, JsonValue const& object, Variables::Val
         if (!row) {
             std::string json;
             writeValue(json, member);
-            context.drawing.unknown.push_back({"variables", name, std::move(json)});
+            context.drawing.unknown.push_back({"variables", std::string(name), std::move(json)});
         } else if (row->kept != KeptIn::drawing) {
             context.warnings.push_back(std::to_string(member.line) + ": " + localText("member \"") +
-                                       "variables." + name +
+                                       "variables." + std::string(name) +
                                        localText("\": a drawing does not decide it, left out"));
         } else {
             readVariable(context, *row, name, member, values);

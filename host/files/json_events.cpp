@@ -1,10 +1,11 @@
 #include "host/files/json_events.h"
 
 #include <algorithm>
+#include <bitset>
 #include <iterator>
-#include <string_view>
 
 #include "host/files/file_bytes.h"
+#include "host/files/json_parsers.h"
 #include "host/text/local_text.h"
 
 namespace tzhost {
@@ -12,52 +13,45 @@ namespace {
 
 constexpr std::size_t kDeepest = 200;
 
+// Whether names that may be the same make it necessary to compare them: names with different sums
+// are different.
+bool mayHoldTwins(JsonList<JsonMember> const& members) {
+    constexpr std::size_t kSums = 4096;
+    std::bitset<kSums> sums;
+    for (auto const& [name, value] : members) {
+        std::size_t sum = name.size();
+        for (char const c : name)
+            sum = sum * 33 + static_cast<unsigned char>(c);
+        if (sums.test(sum % kSums)) return true;
+        sums.set(sum % kSums);
+    }
+    return false;
+}
+
 // The second value of a name that an object has twice, and that name; null when there is none.
-JsonValue const* secondOfName(JsonValue const& object, std::string& name) {
+JsonMember const* secondOfName(JsonList<JsonMember> const& members) {
+    if (!mayHoldTwins(members)) return nullptr;
     using Member = JsonMember const*;
     std::vector<Member> sorted;
-    sorted.reserve(object.members.size());
-    for (auto const& member : object.members)
+    sorted.reserve(members.size());
+    for (auto const& member : members)
         sorted.push_back(&member);
     std::stable_sort(sorted.begin(), sorted.end(),
                      [](Member a, Member b) { return a->first < b->first; });
     auto const at = std::adjacent_find(sorted.begin(), sorted.end(),
                                        [](Member a, Member b) { return a->first == b->first; });
-    if (at == sorted.end()) return nullptr;
-    name = (*at)->first;
-    return &(*std::next(at))->second;
-}
-
-// The sentence that a parser's message holds, without places and the text that was read.
-std::string sentenceOf(std::string_view message) {
-    std::size_t const dash = message.find(" - ");
-    if (dash != message.npos) message.remove_prefix(dash + 3);
-    std::size_t const read = message.find("; last read:");
-    if (read == message.npos) return std::string(message);
-    std::size_t const expected = message.find("; expected", read);
-    std::string text(message.substr(0, read));
-    return expected == message.npos ? text : text + std::string(message.substr(expected));
-}
-
-std::string explain(nlohmann::json::exception const& error) {
-    std::string_view const message = error.what();
-    if (message.find("UTF-8") != message.npos)
-        return localText("is not UTF-8, expected UTF-8 text");
-    if (message.find("out_of_range") != message.npos) {
-        return localText("is too large a number, expected one below 1.8e308");
-    }
-    return localText("is no JSON here: ") + sentenceOf(message);
+    return at == sorted.end() ? nullptr : *std::next(at);
 }
 
 // Keeps the one value of a document.
 class DocumentReader final : public JsonEvents {
 public:
     using JsonEvents::JsonEvents;
-    [[nodiscard]] JsonValue takeRoot() { return std::move(root_); }
+    [[nodiscard]] JsonValue const& root() const { return root_; }
 
 protected:
-    bool take(JsonValue value) override {
-        root_ = std::move(value);
+    bool take(JsonValue const& value) override {
+        root_ = value;
         return true;
     }
 
@@ -68,7 +62,7 @@ private:
 }  // namespace
 
 bool JsonEvents::readAll() {
-    bool const isRead = nlohmann::json::sax_parse(source_.begin(), source_.end(), this);
+    bool const isRead = parseJson(source_, *this);
     if (source_.failed()) {
         failed_ = true;
         problem_ = {source_.line(), "", localText("cannot be read") + ": " + systemReason()};
@@ -76,42 +70,41 @@ bool JsonEvents::readAll() {
     return isRead && !failed_;
 }
 
-bool JsonEvents::boolean(bool flag) {
-    JsonValue value;
-    value.kind = JsonKind::flag;
-    value.flag = flag;
-    return scalar(std::move(value));
+bool JsonEvents::flag(bool value) {
+    JsonValue made;
+    made.kind = JsonKind::flag;
+    made.flag = value;
+    return scalar(made);
 }
 
-bool JsonEvents::string(string_t& text) {
+bool JsonEvents::text(std::string_view utf8) {
     JsonValue value;
     value.kind = JsonKind::text;
-    value.text = std::move(text);
-    return scalar(std::move(value));
+    value.text = store_.keep(utf8);
+    return scalar(value);
 }
 
-bool JsonEvents::numberValue(double number, std::string digits) {
-    JsonValue value;
-    value.kind = JsonKind::number;
-    value.number = number;
-    value.text = std::move(digits);
-    return scalar(std::move(value));
+bool JsonEvents::number(double value, std::string_view digits) {
+    JsonValue made;
+    made.kind = JsonKind::number;
+    made.number = value;
+    made.text = store_.keep(digits);
+    return scalar(made);
 }
 
-bool JsonEvents::key(string_t& name) {
-    key_ = std::move(name);
-    return !open_.empty() || enterMember();
-}
-
-bool JsonEvents::parse_error(std::size_t,
-                             std::string const&,
-                             nlohmann::json::exception const& error) {
-    return fail(explain(error));
+bool JsonEvents::key(std::string_view name) {
+    if (!open_.empty()) {
+        key_ = store_.keep(name);
+        return true;
+    }
+    walkedKey_ = name;
+    key_ = walkedKey_;
+    return enterMember();
 }
 
 bool JsonEvents::fail(std::string what) {
     failed_ = true;
-    problem_ = {source_.line(), key_, std::move(what)};
+    problem_ = {source_.line(), std::string(key_), std::move(what)};
     return false;
 }
 
@@ -121,21 +114,16 @@ bool JsonEvents::failTwiceAt(int line) {
     return false;
 }
 
-bool JsonEvents::deliver(JsonValue value) {
-    if (open_.empty()) return take(std::move(value));
-    JsonValue& outer = open_.back().second;
-    if (outer.kind == JsonKind::array) {
-        outer.items.push_back(std::move(value));
-    } else {
-        outer.members.push_back({key_, std::move(value)});
-    }
+bool JsonEvents::deliver(JsonValue const& value) {
+    if (open_.empty()) return take(value);
+    pending_.push_back({key_, value});
     return true;
 }
 
 bool JsonEvents::scalar(JsonValue value) {
     value.line = source_.line();
     if (open_.empty() && !allow(value)) return false;
-    return deliver(std::move(value));
+    return deliver(value);
 }
 
 bool JsonEvents::open(JsonKind kind) {
@@ -143,29 +131,43 @@ bool JsonEvents::open(JsonKind kind) {
         return fail(localText("is nested too deeply, expected at most 200 levels"));
     bool walked = false;
     if (open_.empty() && !enter(kind, walked)) return false;
-    if (walked) return true;
-    open_.emplace_back(key_, JsonValue());
-    open_.back().second.kind = kind;
-    open_.back().second.line = source_.line();
+    if (!walked) open_.push_back({key_, kind, source_.line(), pending_.size()});
     return true;
 }
 
 bool JsonEvents::close() {
     if (open_.empty()) return leave();
-    auto [name, value] = std::move(open_.back());
+    Open const closed = open_.back();
     open_.pop_back();
-    key_ = std::move(name);
-    if (JsonValue const* const twice = secondOfName(value, key_)) return failTwiceAt(twice->line);
-    return deliver(std::move(value));
+    JsonValue value;
+    value.kind = closed.kind;
+    value.line = closed.line;
+    JsonMember const* const parts = pending_.data() + closed.first;
+    std::size_t const count = pending_.size() - closed.first;
+    if (closed.kind == JsonKind::object) {
+        value.members = store_.keep(parts, count);
+    } else {
+        items_.clear();
+        std::transform(parts, parts + count, std::back_inserter(items_),
+                       [](JsonMember const& part) { return part.second; });
+        value.items = store_.keep(items_.data(), count);
+    }
+    pending_.resize(closed.first);
+    if (JsonMember const* const twice = secondOfName(value.members)) {
+        key_ = twice->first;
+        return failTwiceAt(twice->second.line);
+    }
+    key_ = closed.key;
+    return deliver(value);
 }
 
 JsonDocument readJson(std::string_view bytes) {
     JsonSource source(bytes);
-    DocumentReader reader(source);
     JsonDocument document;
+    DocumentReader reader(source, *document.store);
     document.failed = !reader.readAll();
     document.problem = reader.problem();
-    if (!document.failed) document.root = reader.takeRoot();
+    if (!document.failed) document.root = reader.root();
     return document;
 }
 

@@ -2,12 +2,11 @@
 
 #include <cstddef>
 #include <string>
-#include <utility>
+#include <string_view>
 #include <vector>
 
-#include <nlohmann/json.hpp>
-
 #include "host/files/json_source.h"
+#include "host/files/json_store.h"
 #include "host/files/json_value.h"
 
 // What is shared by all readers of JSON: values that know their line, each member once, nesting up
@@ -21,17 +20,12 @@ struct JsonProblem {
     std::string what;
 };
 
-// Takes the events of the parser and builds values of them. A derived class gets each value that
+// Takes the events of a parser and builds values of them. A derived class gets each value that
 // stands in no other one, and may walk through arrays and objects instead of having them built.
 class JsonEvents {
 public:
-    using number_integer_t = nlohmann::json::number_integer_t;
-    using number_unsigned_t = nlohmann::json::number_unsigned_t;
-    using number_float_t = nlohmann::json::number_float_t;
-    using string_t = nlohmann::json::string_t;
-    using binary_t = nlohmann::json::binary_t;
-
-    explicit JsonEvents(JsonSource& source) : source_(source) {}
+    // Values lie in the store, which whoever takes them clears.
+    JsonEvents(JsonSource& source, JsonStore& store) : source_(source), store_(store) {}
     JsonEvents(JsonEvents const&) = delete;
     JsonEvents& operator=(JsonEvents const&) = delete;
     virtual ~JsonEvents() = default;
@@ -41,31 +35,21 @@ public:
     [[nodiscard]] bool failed() const { return failed_; }
     [[nodiscard]] JsonProblem const& problem() const { return problem_; }
 
-    // The parser's events.
+    // The parser's events; each gives false to stop the reading.
     bool null() { return scalar({}); }
-    bool boolean(bool flag);
-    bool number_integer(number_integer_t number) {
-        return numberValue(static_cast<double>(number), std::to_string(number));
-    }
-    bool number_unsigned(number_unsigned_t number) {
-        return numberValue(static_cast<double>(number), std::to_string(number));
-    }
-    bool number_float(number_float_t number, string_t const& digits) {
-        return numberValue(number, digits);
-    }
-    bool string(string_t& text);
-    bool binary(binary_t&) { return false; }
-    bool key(string_t& name);
-    bool start_object(std::size_t) { return open(JsonKind::object); }
-    bool end_object() { return close(); }
-    bool start_array(std::size_t) { return open(JsonKind::array); }
-    bool end_array() { return close(); }
-    bool parse_error(std::size_t, std::string const&, nlohmann::json::exception const& error);
+    bool flag(bool value);
+    bool number(double value, std::string_view digits);
+    bool text(std::string_view utf8);
+    bool key(std::string_view name);
+    bool open(JsonKind kind);
+    bool close();
+    // Keeps what is wrong here and stops.
+    bool fail(std::string what);
 
 protected:
     // Each gives false to stop the reading.
     // A whole value that stands in no built one, under `name()` when in an object.
-    virtual bool take(JsonValue value) = 0;
+    virtual bool take(JsonValue const& value) = 0;
     // A scalar is about to be taken.
     virtual bool allow(JsonValue const& /*scalar*/) { return true; }
     // An array or object begins: `walked` says that its parts come one by one.
@@ -75,30 +59,38 @@ protected:
     // A member of an object that is walked through begins.
     virtual bool enterMember() { return true; }
 
-    [[nodiscard]] std::string const& name() const { return key_; }
+    [[nodiscard]] std::string_view name() const { return key_; }
     [[nodiscard]] int line() const { return source_.line(); }
-    // Keeps what is wrong here and stops.
-    bool fail(std::string what);
     bool failTwice() { return failTwiceAt(source_.line()); }
 
 private:
-    bool numberValue(double number, std::string digits);
+    // An array or object that is being built, with the key that it stands under.
+    struct Open {
+        std::string_view key;
+        JsonKind kind;
+        int line;
+        std::size_t first;  // of its parts among those pending
+    };
+
     bool scalar(JsonValue value);
-    bool open(JsonKind kind);
-    bool close();
-    // Hands a finished value over, or into the value around it.
-    bool deliver(JsonValue value);
+    // Hands a finished value over, or to the value around it.
+    bool deliver(JsonValue const& value);
     bool failTwiceAt(int line);
 
     JsonSource& source_;
+    JsonStore& store_;
     bool failed_ = false;
     JsonProblem problem_;
-    std::vector<std::pair<std::string, JsonValue>> open_;  // with the key that each stands under
-    std::string key_;
+    std::vector<Open> open_;
+    std::vector<JsonMember> pending_;  // parts of values that are open; items have no names
+    std::vector<JsonValue> items_;     // of the array that ends, kept for its memory
+    std::string walkedKey_;            // the last key of an object that is walked through
+    std::string_view key_;             // that one, or one in the store
 };
 
-// A whole document.
+// A whole document, with what its values name.
 struct JsonDocument {
+    std::unique_ptr<JsonStore> store = std::make_unique<JsonStore>();
     JsonValue root;
     bool failed = false;
     JsonProblem problem;  // when it failed

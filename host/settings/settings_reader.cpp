@@ -109,7 +109,8 @@ VariableValue variableValue(JsonValue const& value, VariableType type) {
 
 void Reader::read(JsonValue const& root) {
     if (!isA(root, Kind::object, "")) return;
-    for (auto const& [name, value] : root.members) {
+    for (auto const& [key, value] : root.members) {
+        std::string const name(key);
         MemberRow const* found = nullptr;
         for (MemberRow const& row : kMembers) {
             if (row.name == name) found = &row;
@@ -123,7 +124,7 @@ void Reader::read(JsonValue const& root) {
 void Reader::variables(JsonValue const& value, std::string const& path) {
     if (!isA(value, Kind::object, path)) return;
     for (auto const& [name, held] : value.members) {
-        std::string const here = path + '.' + name;
+        std::string const here = path + '.' + std::string(name);
         VariableDefinition const* const row = findVariable(fromUtf8(name));
         if (row == nullptr) return fail(held, here, localText("there is no such system variable"));
         if (row->kept != KeptIn::user)
@@ -139,10 +140,11 @@ void Reader::variables(JsonValue const& value, std::string const& path) {
 void Reader::product(JsonValue const& value, std::string const& path) {
     if (!isA(value, Kind::object, path)) return;
     for (auto const& [name, values] : value.members) {
-        if (!isA(values, Kind::object, path + '.' + name)) return;
+        std::string const here = path + '.' + std::string(name);
+        if (!isA(values, Kind::object, here)) return;
         auto& into = result_.settings.product[lowered(fromUtf8(name))];
         for (auto const& [key, number] : values.members) {
-            auto const read = wholeNumber(number, path + '.' + name + '.' + key);
+            auto const read = wholeNumber(number, here + '.' + std::string(key));
             if (!read) return;
             into[lowered(fromUtf8(key))] = *read;
         }
@@ -152,7 +154,7 @@ void Reader::product(JsonValue const& value, std::string const& path) {
 void Reader::registry(JsonValue const& value, std::string const& path) {
     if (!isA(value, Kind::object, path)) return;
     for (auto const& [name, values] : value.members) {
-        std::string const here = path + '.' + name;
+        std::string const here = path + '.' + std::string(name);
         std::wstring key = lowered(fromUtf8(name));
         if (!beginsWithRoot(key)) {
             return fail(values, here,
@@ -163,7 +165,7 @@ void Reader::registry(JsonValue const& value, std::string const& path) {
         if (!isA(values, Kind::object, here)) return;
         result_.settings.registry[key];
         for (JsonMember const& member : values.members) {
-            registryValue(key, member, here + '.' + member.first);
+            registryValue(key, member, here + '.' + std::string(member.first));
         }
     }
 }

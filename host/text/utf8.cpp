@@ -1,5 +1,8 @@
 #include "host/text/utf8.h"
 
+#include <cstdint>
+#include <cstring>
+
 #include "tz/text/string.h"
 
 namespace tzhost {
@@ -35,6 +38,19 @@ Decoded decode(std::string_view bytes) {
     return {c, size};
 }
 
+// How many of the first bytes are ASCII, by eights but for the last ones.
+std::size_t asciiAtStart(std::string_view bytes) {
+    constexpr std::uint64_t kHighBits = 0x8080808080808080;
+    std::size_t at = 0;
+    for (std::uint64_t eight; at + sizeof eight <= bytes.size(); at += sizeof eight) {
+        std::memcpy(&eight, bytes.data() + at, sizeof eight);
+        if ((eight & kHighBits) != 0) break;
+    }
+    while (at < bytes.size() && static_cast<unsigned char>(bytes[at]) < 0x80)
+        ++at;
+    return at;
+}
+
 void encode(wchar_t c, std::string& bytes) {
     auto const tail = [&bytes](int value) { bytes += static_cast<char>(0x80 | (value & 0x3F)); };
     if (c < 0x80) {
@@ -57,18 +73,21 @@ void encode(wchar_t c, std::string& bytes) {
 }  // namespace
 
 std::size_t firstBadByte(std::string_view bytes) {
-    for (std::size_t at = 0; at < bytes.size();) {
+    for (std::size_t at = asciiAtStart(bytes); at < bytes.size();) {
         std::size_t const size = decode(bytes.substr(at)).size;
         if (size == 0) return at;
         at += size;
+        at += asciiAtStart(bytes.substr(at));
     }
     return kAllUtf8;
 }
 
 std::wstring fromUtf8(std::string_view bytes) {
-    std::wstring text;
+    std::size_t const plain = asciiAtStart(bytes);
+    std::wstring text(bytes.begin(), bytes.begin() + plain);
+    if (plain == bytes.size()) return text;
     text.reserve(bytes.size());
-    for (std::size_t at = 0; at < bytes.size();) {
+    for (std::size_t at = plain; at < bytes.size();) {
         Decoded const next = decode(bytes.substr(at));
         text += next.size == 0 ? kReplacement : next.c;
         at += next.size == 0 ? 1 : next.size;

@@ -47,6 +47,14 @@ BadCase const kBad[] = {
      ":3: member \"width\": is too large a number, expected one below 1.8e308"},
     {"TooLargeUnknown", ",\"unheardOf\":-1e400}",
      ":1: member \"unheardOf\": is too large a number, expected one below 1.8e308"},
+    // The fast parser lets half a pair through, and refuses this zero.
+    {"HalfPair", ",\"entities\":[{\"type\":\"MTEXT\",\n\"contents\":\"\\udc00\"}]}",
+     ":2: member \"contents\": is no JSON here: invalid string: surrogate U+DC00..U+DFFF must "
+     "follow U+D800..U+DBFF"},
+    {"HugeZero", ",\n\"unheardOf\":0e400,\n\"layers\":3}",
+     ":3: member \"layers\": is a number, expected an array"},
+    {"LineEndBeforeTheEnd", ",\n\"unheardOf\":1\n",
+     ":2: member \"unheardOf\": is no JSON here: unexpected end of input; expected '}'"},
     {"Twice", ",\n\"currentLayer\":\"0\",\n\"currentLayer\":\"0\"}",
      ":3: member \"currentLayer\": stands twice, expected each member once"},
     {"TwiceInside", ",\"entities\":[{\"type\":\"LINE\",\"start\":[0,0,0],\n\"start\":[0,0,0]}]}",
