@@ -17,8 +17,8 @@ constexpr char kScripts[] =
     "A script is UTF-8 text with one answer a line: an empty line is Enter, ^C cancels, ;; begins a\n"
     "comment, ~x,y moves the cursor in a drag, <<< and >>> enclose what an editor leaves.\n"
     "Exit status: 0 done; 1 input ended inside a command, an editor block was not taken, a SAVE, PLOT,\n"
-    "OPEN or LOAD of a script failed, or the session had to end early; 2 wrong usage, an unusable file,\n"
-    "or a result that cannot be written; 3 a command left something open.";
+    "OPEN or LOAD of a script failed, --strict ended the script, or the session had to end early; 2 wrong\n"
+    "usage, an unusable file, or a result that cannot be written; 3 a command left something open.";
 
 // Some files are left out by an empty name; nobody means that by writing the option.
 std::string problemWithName(std::string const& name) {
@@ -45,6 +45,9 @@ void declare(CLI::App& app, Options& options) {
                    "answers from FILE ('-' is standard input); without it, an interactive session")
         ->type_name("FILE")
         ->check(problemWithName, "");
+    app.add_flag("--strict", options.isStrict,
+                 "end a script at the first thing that goes wrong, with status 1");
+    app.add_flag("--quiet", options.isQuiet, "keep the transcript of a script to errors");
     declareFile(app, "--save", options.save, "write the drawing at the end");
     declareFile(app, "--svg", options.svg,
                 "plot the active space at the end, fitted to its extents");

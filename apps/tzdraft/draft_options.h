@@ -30,6 +30,8 @@ struct Options {
     std::string richTextEditor;
     std::string textEditor;
     std::filesystem::path events;
+    bool isStrict = false;            // a script ends at the first thing that goes wrong
+    bool isQuiet = false;             // a script's transcript is kept to errors
     std::vector<std::string> faults;  // NAME[:K][=STATUS]
 };
 

@@ -162,6 +162,8 @@ bool Run::begin() {
     if (!configureHost(options_, settings_, error)) return complain(error);
     if (!openSource() || !planFaults()) return false;
     line.setSource(source_.get());
+    if (options_.isStrict) line.endScriptAtProblems();
+    if (options_.isQuiet && !line.isPerson()) line.keepToProblems();
     if (!options_.events.empty() && !events_.begin(options_.events, error)) return complain(error);
     registerHostCommands();
     tzhost::addCommandHooks({[this](tzhost::Command const& command) { beginCommand(command); },
@@ -205,7 +207,7 @@ void Run::runTyped(std::wstring const& line) {
     if (isCall(line)) return runCall(line);
     tzhost::Command const* const command = tzhost::commandStack().find(TzString(line));
     if (!command) {
-        return tzhost::commandLine().say(
+        return tzhost::commandLine().sayProblem(
             TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str()).str());
     }
     auto const answers =
@@ -213,15 +215,23 @@ void Run::runTyped(std::wstring const& line) {
     tzhost::runCommand(*command, answers);
 }
 
+// A script that ends at problems ends here, too.
+void tellLeftOver(std::wstring const& line) {
+    if (tzhost::commandLine().isPerson()) return;
+    tzhost::commandLine().sayProblem(
+        TzString::formatted(localText(L"%ls left something open."), line.c_str()).str());
+}
+
 void Run::runGuarded(std::wstring const& line) {
     try {
         runTyped(line);
         session_.doPostponed();
     } catch (std::exception const& problem) {
-        tzhost::commandLine().say(line + localText(L" ended early: ") +
-                                  tzhost::fromUtf8(problem.what()));
+        tzhost::commandLine().sayProblem(line + localText(L" ended early: ") +
+                                         tzhost::fromUtf8(problem.what()));
     }
     tzhost::freeAllSets();  // the audit has counted them
+    if (options_.isStrict && !tzhost::worstAudit().clean()) tellLeftOver(line);
 }
 
 // Whether the end of the input is that of the session. A person who ended it by Ctrl-D may stay.

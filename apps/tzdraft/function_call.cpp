@@ -52,7 +52,7 @@ Arguments readArgument(std::wstring_view text) {
 }
 
 void complain(std::wstring_view call, wchar_t const* what) {
-    tzhost::commandLine().say(std::wstring(call) + L": " + what);
+    tzhost::commandLine().sayProblem(std::wstring(call) + L": " + what);
 }
 
 }  // namespace

@@ -191,7 +191,7 @@ void ProgramSession::unloadLater() {
         auto const& modules = tzhost::dynamicLinker().modules();
         std::string error = localText("No module is loaded.");
         if (modules.empty() || !tzhost::dynamicLinker().unload(modules.back()->file, error))
-            tzhost::commandLine().say(tzhost::fromUtf8(error));
+            tzhost::commandLine().sayProblem(tzhost::fromUtf8(error));
     });
 }
 

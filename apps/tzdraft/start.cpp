@@ -106,7 +106,11 @@ bool findTexts(Options const& options, std::string& error) {
     search.file = options.resources.string();
     tzhost::setResourceSearch(search);
     if (options.resources.empty() || hasModuleResources()) return true;
-    error = search.file + ": " + localText("the resource library is missing or damaged");
+    bool const isRead = tzhost::readFile(search.file).has_value();
+    error =
+        search.file + ": " +
+        (isRead ? localText("the resource library is damaged")
+                : localText("the resource library cannot be read") + ": " + tzhost::systemReason());
     return false;
 }
 

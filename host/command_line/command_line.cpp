@@ -53,6 +53,8 @@ void CommandLine::reset() {
     failures_ = 0;
     hasFailed_ = false;
     hasEndedInCommand_ = false;
+    endsAtProblems_ = false;
+    isStopped_ = false;
     resetDragCursor();
 }
 
@@ -67,17 +69,28 @@ void CommandLine::print(std::wstring_view text) {
 // It has lines of its own; a line end that its text begins with adds no empty one.
 void CommandLine::notify(Notification const& notification) {
     std::wstring_view const text = notification.text;
-    say(text.substr(text.starts_with(L'\n') ? 1 : 0));
+    transcript_.problem(text.substr(text.starts_with(L'\n') ? 1 : 0));
 }
 
 void CommandLine::complain(std::wstring const& text) {
     hasFailed_ = true;
+    isStopped_ = endsAtProblems_ && !isPerson();
     transcript_.error(text);
 }
 
+// One thing went wrong; what follows from it is no news.
+void CommandLine::sayProblem(std::wstring_view what) {
+    transcript_.problem(what);
+    if (endsAtProblems_ && !isPerson() && !isStopped_) complain(place() + std::wstring(what));
+}
+
+std::wstring CommandLine::place() const {
+    return source_ ? source_->place() : L"";
+}
+
 void CommandLine::sayFailure(std::wstring const& what) {
-    say(visible(what, LineFeeds::shown));
-    if (!isPerson()) complain((source_ ? source_->place() : L"") + what);
+    transcript_.problem(visible(what, LineFeeds::shown));
+    if (!isPerson()) complain(place() + what);
 }
 
 // Said once, however many questions still wait.
@@ -87,17 +100,17 @@ void CommandLine::endedInCommand(std::wstring const& where) {
 }
 
 bool CommandLine::hasEnded() const {
-    return source_ == nullptr || source_->hasEnded() || (mustEnd_ && mustEnd_());
+    return isStopped_ || source_ == nullptr || source_->hasEnded() || (mustEnd_ && mustEnd_());
 }
 
 bool CommandLine::mustEnd() {
     bool const isOver = mustEnd_ && mustEnd_();
     hasFailed_ = hasFailed_ || isOver;
-    return isOver;
+    return isOver || isStopped_;
 }
 
 Answer CommandLine::readFromSource(AnswerRequest const& request) {
-    while (source_ != nullptr) {
+    while (source_ != nullptr && !isStopped_) {
         Answer answer = source_->next(request);
         if (answer.kind != Answer::Kind::fault) return answer;
         complain(answer.text);
@@ -154,11 +167,12 @@ std::optional<std::wstring> CommandLine::readCommand(std::vector<std::wstring> w
         Answer answer = ask(request);
         if (answer.kind == Answer::Kind::line) return std::move(answer.text);
         if (answer.kind == Answer::Kind::end) return std::nullopt;
-        if (answer.kind == Answer::Kind::tooLong) say(localText(L"That line is too long."));
+        if (answer.kind == Answer::Kind::tooLong) sayProblem(localText(L"That line is too long."));
     }
 }
 
 std::optional<EditorBlock> CommandLine::takeEditorBlock() {
+    if (isStopped_) return EditorBlock{L"", false};
     return source_ == nullptr ? std::nullopt : source_->takeBlock();
 }
 

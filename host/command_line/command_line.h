@@ -49,6 +49,10 @@ public:
     // Asked before and after each answer: true ends the input at once, which counts as a failure.
     // The source is not asked any more.
     void setEndCheck(std::function<bool()> mustEnd) { mustEnd_ = std::move(mustEnd); }
+    // A script ends at the first thing that goes wrong, which counts as a failure.
+    void endScriptAtProblems() { endsAtProblems_ = true; }
+    // The screen shows nothing else than problems and errors.
+    void keepToProblems() { transcript_.keepToProblems(); }
     // Takes what the host and its modules print, until the object ends or another takes over.
     void attach();
     ~CommandLine() override;
@@ -72,6 +76,9 @@ public:
     void say(std::wstring_view line) { transcript_.line(line); }
     // Ends the line that the cursor stands in.
     void freshLine() { transcript_.freshLine(); }
+    // A line about an answer, a command or a call that went wrong. A script that ends at problems
+    // ends here, and the line is an error with its place, too.
+    void sayProblem(std::wstring_view what);
     // A command could not do what it was told: a line of the host's own. In a script also an error
     // with its place, and a failure of the session.
     void sayFailure(std::wstring const& what);
@@ -110,6 +117,7 @@ private:
     void showAnswer(Answer const& answer);
     [[nodiscard]] bool mustEnd();
     void complain(std::wstring const& text);
+    [[nodiscard]] std::wstring place() const;
     void endedInCommand(std::wstring const& where);
 
     AnswerSource* source_ = nullptr;
@@ -123,6 +131,8 @@ private:
     int failures_ = 0;  // questions in a row that took no line
     bool hasFailed_ = false;
     bool hasEndedInCommand_ = false;
+    bool endsAtProblems_ = false;
+    bool isStopped_ = false;  // the script ended at a problem
     bool isAttached_ = false;
 };
 

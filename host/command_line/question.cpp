@@ -71,7 +71,7 @@ int Question::ask(Reader const& read) {
         case Answer::Kind::line:
             if (auto const status = take(answer.text, read)) return *status;
             break;
-        case Answer::Kind::tooLong: line_.say(localText(L"That line is too long.")); break;
+        case Answer::Kind::tooLong: line_.sayProblem(localText(L"That line is too long.")); break;
         case Answer::Kind::cancel: return line_.answered(L"^C", cancelStatus_);
         default: return line_.answered(L"", cancelStatus_);
         }
@@ -83,7 +83,7 @@ std::optional<int> Question::take(std::wstring const& line, Reader const& read) 
         replyTo(kind_ == QuestionKind::string ? line : withoutBlanksAround(line), read);
     line_.answered(line, reply.status);
     if (reply.kind == Reply::Kind::done) return reply.status;
-    if (reply.kind == Reply::Kind::refused) line_.say(reply.complaint);
+    if (reply.kind == Reply::Kind::refused) line_.sayProblem(reply.complaint);
     return std::nullopt;
 }
 

@@ -1,7 +1,8 @@
 #include "host/command_line/script_source.h"
 
 #include <algorithm>
-#include <filesystem>
+#include <cerrno>
+#include <cstring>
 #include <fstream>
 #include <iostream>
 #include <sstream>
@@ -59,12 +60,13 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
         return std::make_unique<ScriptSource>(localText("standard input"),
                                               std::make_unique<std::istream>(std::cin.rdbuf()));
     }
+    errno = 0;
     std::ifstream input(file, std::ios::binary);
     std::ostringstream whole;
-    std::error_code unreadable;  // then it cannot be opened either
-    if (!input || std::filesystem::is_directory(file, unreadable) ||
-        (input.peek() != Traits::eof() && !(whole << input.rdbuf()))) {
-        error = file + ": " + localText("the script cannot be read");
+    // A folder opens, and its first read fails.
+    if (!input || (input.peek() != Traits::eof() && !(whole << input.rdbuf())) || errno == EISDIR) {
+        error = file + ": " + localText("the script cannot be read") + ": " +
+                localText(std::strerror(errno));
         return nullptr;
     }
     std::string const text = whole.str();

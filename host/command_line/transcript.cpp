@@ -20,7 +20,7 @@ void Transcript::setScreen(Screen screen) {
 }
 
 void Transcript::show(Shown kind, std::wstring_view text) {
-    if (text.empty()) return;
+    if (text.empty() || (isQuiet_ && kind != Shown::problem)) return;
     cursor_ = text.ends_with(L'\n') ? Cursor::lineStart : Cursor::inLine;
     if (screen_) screen_(kind, visible(text));
 }
@@ -36,6 +36,7 @@ void Transcript::prompt(std::wstring_view text) {
 }
 
 void Transcript::answer(std::wstring_view text) {
+    if (isQuiet_) return;
     bool const isLineEmpty = cursor_ == Cursor::lineStart && text.empty();
     show(Shown::answer, text);
     cursor_ = isLineEmpty ? Cursor::belowAnswer : Cursor::afterAnswer;
@@ -54,10 +55,18 @@ void Transcript::message(std::wstring_view text) {
          cursor_ == Cursor::lineStart && !isBlankLine ? withoutLineFeed(text) : text);
 }
 
+void Transcript::wholeLine(Shown kind, std::wstring_view text) {
+    freshLine(kind);
+    show(kind, text);
+    freshLine(kind);
+}
+
 void Transcript::line(std::wstring_view text) {
-    freshLine(Shown::line);
-    show(Shown::line, text);
-    freshLine(Shown::line);
+    wholeLine(Shown::line, text);
+}
+
+void Transcript::problem(std::wstring_view text) {
+    wholeLine(Shown::problem, text);
 }
 
 void Transcript::error(std::wstring_view text) {

@@ -24,6 +24,7 @@ enum class Shown {
     answer,
     message,  // of a command, perhaps a part of a line
     line,     // a whole line of the host's own
+    problem,  // the same about what went wrong
     error,    // a whole line about what went wrong, for standard error
 };
 
@@ -32,6 +33,8 @@ public:
     using Screen = std::function<void(Shown kind, std::wstring_view text)>;
     // Takes what is shown from now on; an empty one drops it.
     void setScreen(Screen screen);
+    // From now on problems and errors alone are shown.
+    void keepToProblems() { isQuiet_ = true; }
 
     void prompt(std::wstring_view text);
     void answer(std::wstring_view text);
@@ -39,6 +42,8 @@ public:
     void message(std::wstring_view text);
     // A whole line of the host's own.
     void line(std::wstring_view text);
+    // A whole line of the host's own about what went wrong.
+    void problem(std::wstring_view text);
     // An error as one line, whatever it holds. It moves no cursor, since it goes elsewhere.
     void error(std::wstring_view text);
     // To the start of a line.
@@ -55,9 +60,11 @@ private:
     };
 
     void show(Shown kind, std::wstring_view text);
+    void wholeLine(Shown kind, std::wstring_view text);
     void freshLine(Shown next);
 
     Screen screen_;
+    bool isQuiet_ = false;
     Cursor cursor_ = Cursor::lineStart;
 };
 

@@ -64,12 +64,12 @@ void ProgramSession::refuse(std::string const& problem) {
     if (keepsWork())
         message += TzString::formatted(localText(L" What was edited is kept in %ls"),
                                        TzString::fromUtf8(file_.path().string()).kwszPtr());
-    commandLine().say(message.str());
+    commandLine().sayProblem(message.str());
 }
 
 SessionEnd ProgramSession::run() {
     if (!file_.made()) {
-        commandLine().say(
+        commandLine().sayProblem(
             localText(L"No file can be made for the editor; the text stays as it was."));
         return SessionEnd::left;
     }
@@ -90,9 +90,10 @@ SessionEnd takeBlock(EditedText& text, EditorBlock const& block) {
     if (!block.accepted) return SessionEnd::left;
     TakenText const result = text.take(toUtf8(block.text) + "\n");
     if (result.taken != Taken::refused) return endOf(text, result.taken);
-    commandLine().say(TzString::formatted(localText(L"The script %ls; the text stays as it was."),
-                                          TzString::fromUtf8(result.problem).kwszPtr())
-                          .str());
+    commandLine().sayProblem(
+        TzString::formatted(localText(L"The script %ls; the text stays as it was."),
+                            TzString::fromUtf8(result.problem).kwszPtr())
+            .str());
     return SessionEnd::left;
 }
 
@@ -102,7 +103,7 @@ SessionEnd runEditorSession(EditedText& text, EditorProgram const& program) {
     if (std::optional<EditorBlock> const block = commandLine().takeEditorBlock())
         return takeBlock(text, *block);
     if (!program.command.empty()) return ProgramSession(text, program.command).run();
-    commandLine().say(program.lack);
+    commandLine().sayProblem(program.lack);
     return SessionEnd::left;
 }
 

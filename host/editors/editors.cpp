@@ -38,7 +38,7 @@ int editMarkup(TzDbMText& text,
                       L"one; -MTEXT takes the text at the command line.");
         accepted = runEditorSession(markup, {program, lack}) == SessionEnd::accepted;
     } else {
-        commandLine().say(
+        commandLine().sayProblem(
             localText(L"The text has a field that cannot be opened; it stays as it was."));
     }
     reportEditor(kind, accepted, settings);
@@ -59,7 +59,7 @@ void runRawEditor(TzApHostDialogParams& params) {
 bool editRichText(CMTextEditorInterface& state) {
     EditedRtf rtf(state);
     if (!rtf.failure().empty()) {
-        commandLine().say(rtf.failure());
+        commandLine().sayProblem(rtf.failure());
         return false;
     }
     DialogChanges changes;

@@ -111,7 +111,7 @@ TEST(Scripts, AreCheckedWholeWhenOpened) {
     EXPECT_EQ(ScriptSource::open("bad.txt", error), nullptr);
     EXPECT_EQ(error, "bad.txt:3: this line is not UTF-8");
     EXPECT_EQ(ScriptSource::open("missing.txt", error), nullptr);
-    EXPECT_EQ(error, "missing.txt: the script cannot be read");
+    EXPECT_EQ(error, "missing.txt: the script cannot be read: No such file or directory");
     auto const source = ScriptSource::open("good.txt", error);
     ASSERT_NE(source, nullptr);
     EXPECT_EQ(notation(source->next({kPoint, L"", {}})), "[é]");

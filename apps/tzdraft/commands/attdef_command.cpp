@@ -1,4 +1,5 @@
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/commands/text_command.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/database/geometry.h"
@@ -33,7 +34,7 @@ void attdefCommand() {
     Answer<TzString> const tag = askText(localText(L"Attribute tag"));
     if (tag.asked != Asked::given) return;
     if (!isTag(tag.value)) {
-        tzutPrintf(localText(L"\nA tag has no blanks.\n"));
+        tellProblem(localText(L"A tag has no blanks."));
         return;
     }
     Answer<TzString> const prompt = askText(localText(L"Prompt for its value"), tag.value);

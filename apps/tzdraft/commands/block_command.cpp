@@ -2,6 +2,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/placing.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/program_session.h"
@@ -114,8 +115,7 @@ void blockCommand() {
     if (entities.empty()) return;
     TzDbObjectId const block = newBlock(name.value);
     if (block.isNull()) {
-        tzutPrintf(localText(L"\n\"%ls\" cannot be the name of a new block.\n"),
-                   name.value.kwszPtr());
+        tellProblem(localText(L"\"%ls\" cannot be the name of a new block."), name.value.kwszPtr());
         return;
     }
     moveInto(block, entities, base.point);

@@ -4,6 +4,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/help_topics.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/runtime/command_stack.h"
@@ -52,7 +53,7 @@ void helpCommand() {
     TzString const registered = registeredName(name.value);
     std::wstring const text = registered.isEmpty() ? std::wstring() : helpFor(registered);
     if (text.empty()) {
-        tzutPrintf(localText(L"\nThere is no help on \"%ls\".\n"), name.value.kwszPtr());
+        tellProblem(localText(L"There is no help on \"%ls\"."), name.value.kwszPtr());
     } else {
         tzutPrintf(L"\n%ls\n", text.c_str());
     }

@@ -4,6 +4,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/placing.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
@@ -115,7 +116,7 @@ void insertCommand() {
     if (name.asked != Asked::given) return;
     TzDbObjectId const block = blockNamed(name.value);
     if (block.isNull()) {
-        tzutPrintf(localText(L"\nThere is no block \"%ls\".\n"), name.value.kwszPtr());
+        tellProblem(localText(L"There is no block \"%ls\"."), name.value.kwszPtr());
         return;
     }
     std::unique_ptr<TzDbBlockReference> reference = askReference(block);

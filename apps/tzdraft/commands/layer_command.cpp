@@ -2,6 +2,7 @@
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
 #include "apps/tzdraft/commands/color_text.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
@@ -17,7 +18,7 @@ TzDbObjectId layerNamed(TzString const& name) {
         return id;
     Opened<TzDbLayerTable> const opened(table);
     if (table->getIdAt(name, id) != Tzad::eOk) {
-        tzutPrintf(localText(L"\nThere is no layer \"%ls\".\n"), name.kwszPtr());
+        tellProblem(localText(L"There is no layer \"%ls\"."), name.kwszPtr());
     }
     return id;
 }
@@ -43,7 +44,7 @@ bool make() {
     Opened<TzDbLayerTable> const opened(table);
     TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name.value);
     if (id.isNull())
-        tzutPrintf(localText(L"\n\"%ls\" cannot be the name of a layer.\n"), name.value.kwszPtr());
+        tellProblem(localText(L"\"%ls\" cannot be the name of a layer."), name.value.kwszPtr());
     makeCurrent(id);
     return true;
 }
@@ -71,7 +72,7 @@ bool color() {
     if (text.asked != Asked::given) return !text.isCancelled();
     std::optional<TzCmColor> const chosen = readColor(text.value.str());
     if (!chosen) {
-        tzutPrintf(localText(L"\n\"%ls\" is no colour.\n"), text.value.kwszPtr());
+        tellProblem(localText(L"\"%ls\" is no colour."), text.value.kwszPtr());
         return true;
     }
     return changeNamed(localText(L"Layer to colour"),

@@ -1,6 +1,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/settings/variable_table.h"
@@ -41,8 +42,8 @@ void setvarCommand() {
     tzhost::Variables& variables = tzhost::Variables::instance();
     tzhost::VariableValue const* const present = variables.get(name.value.str());
     if (!present) {
-        tzutPrintf(localText(L"\nThere is no system variable \"%ls\"; ? lists them.\n"),
-                   name.value.kwszPtr());
+        tellProblem(localText(L"There is no system variable \"%ls\"; ? lists them."),
+                    name.value.kwszPtr());
         return;
     }
     TzString const shown(tzhost::writeValue(*present));
@@ -52,7 +53,7 @@ void setvarCommand() {
     // "." stands for the empty text, which Enter cannot give.
     std::wstring const text = value.value == L"." ? std::wstring() : value.value.str();
     tzhost::WriteResult const written = write(name.value, text);
-    if (!written.isDone()) tzutPrintf(L"\n%ls\n", written.reason.c_str());
+    if (!written.isDone()) tellProblem(L"%ls", written.reason.c_str());
 }
 
 }  // namespace tzdraft

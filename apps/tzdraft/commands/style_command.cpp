@@ -1,6 +1,7 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
@@ -146,11 +147,11 @@ void styleCommand() {
     TzDbObjectId const id = styleNamed(name);
     Opened<TzDbTextStyleTableRecord> const style(id, TzDb::kForWrite);
     if (!style) {
-        tzutPrintf(localText(L"\n\"%ls\" cannot be the name of a text style.\n"), name.kwszPtr());
+        tellProblem(localText(L"\"%ls\" cannot be the name of a text style."), name.kwszPtr());
         return;
     }
     if (write(*style.get(), values) != Tzad::eOk) {
-        tzutPrintf(localText(L"\nOne of these values cannot be kept; the others are.\n"));
+        tellProblem(localText(L"One of these values cannot be kept; the others are."));
     }
     if (ProgramSession::current().drawing().setTextstyle(id) == Tzad::eOk) {
         tzutPrintf(localText(L"\n\"%ls\" is now the current text style.\n"), name.kwszPtr());

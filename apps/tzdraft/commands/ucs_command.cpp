@@ -1,5 +1,6 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/database/user_system.h"
@@ -20,7 +21,7 @@ void makeCurrent(TzGeMatrix3d const& system) {
     tzhost::UserSystem user;
     TzGeVector3d zAxis;
     system.getCoordSystem(user.origin, user.xAxis, user.yAxis, zAxis);
-    if (!tzhost::setUserSystem(user)) tzutPrintf(localText(L"\nThat is no coordinate system.\n"));
+    if (!tzhost::setUserSystem(user)) tellProblem(localText(L"That is no coordinate system."));
 }
 
 // Makes a system that is given in the present one current, for good.
@@ -59,7 +60,7 @@ void threePoints() {
     TzGeVector3d x = onX.point - origin.point;
     TzGeVector3d z = x.crossProduct(towardsY.point - origin.point);
     if (x.isZeroLength() || z.isZeroLength()) {
-        tzutPrintf(localText(L"\nThe three points lie on one line.\n"));
+        tellProblem(localText(L"The three points lie on one line."));
         return;
     }
     x.normalize();

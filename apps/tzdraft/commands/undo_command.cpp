@@ -1,4 +1,5 @@
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "tz/ed/print.h"
@@ -7,7 +8,7 @@ namespace tzdraft {
 
 void undoCommand() {
     if (!ProgramSession::current().undo())
-        tzutPrintf(localText(L"\nThere is nothing to take back.\n"));
+        tellProblem(localText(L"There is nothing to take back."));
 }
 
 }  // namespace tzdraft
