@@ -8,6 +8,22 @@ file(RELATIVE_PATH way ${CMAKE_INSTALL_FULL_BINDIR} ${CMAKE_INSTALL_FULL_LIBDIR}
 set_target_properties(tzdraft PROPERTIES INSTALL_RPATH $ORIGIN/${way})
 set_target_properties(tzmted PROPERTIES INSTALL_RPATH $ORIGIN/..)
 
+# A Debian package holds manual pages and the like compressed: `out` is the file to install.
+function(tz_compressed file out)
+    get_filename_component(file ${file} ABSOLUTE)
+    if(TZ_DEBIAN)
+        get_filename_component(name ${file} NAME)
+        set(packed ${CMAKE_BINARY_DIR}/debian/${name}.gz)
+        add_custom_command(OUTPUT ${packed} DEPENDS ${file}
+            COMMAND ${CMAKE_COMMAND} -E make_directory ${CMAKE_BINARY_DIR}/debian
+            COMMAND gzip -9nc ${file} > ${packed} VERBATIM)
+        add_custom_target(packed_${name} ALL DEPENDS ${packed})
+        add_dependencies(tz_products packed_${name})
+        set(file ${packed})
+    endif()
+    set(${out} ${file} PARENT_SCOPE)
+endfunction()
+
 install(TARGETS tzdraft tzconvert COMPONENT programs)
 install(TARGETS tzmted LIBRARY DESTINATION ${TZ_INSTALL_BESIDE} COMPONENT programs)
 install(FILES README.md DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT programs)
@@ -16,7 +32,15 @@ install(DIRECTORY docs DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT programs
 install(DIRECTORY examples DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT programs
     FILES_MATCHING PATTERN *.scr PATTERN *.json
     PATTERN second_module EXCLUDE PATTERN other_host EXCLUDE)
-install(FILES docs/man/tzdraft.1 docs/man/tzconvert.1
+install(FILES packaging/tzdraft.desktop
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/applications COMPONENT programs)
+install(FILES packaging/tz-drawing.xml
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/mime/packages COMPONENT programs)
+install(FILES packaging/tzdraft.svg
+    DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps COMPONENT programs)
+tz_compressed(docs/man/tzdraft.1 draft_manual)
+tz_compressed(docs/man/tzconvert.1 convert_manual)
+install(FILES ${draft_manual} ${convert_manual}
     DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 COMPONENT programs)
 
 install(TARGETS tz EXPORT tzTargets

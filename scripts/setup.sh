@@ -1,7 +1,7 @@
 #!/bin/sh
 # Installs the Debian packages that are missing:
 #
-#   scripts/setup.sh [build|checks|pages]    the group "build", or that and another one
+#   scripts/setup.sh [build|checks|package|pages]    the group "build", or that and another one
 #
 # Does nothing, and asks for no rights, when all are there.
 set -eu
