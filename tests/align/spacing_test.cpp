@@ -16,11 +16,13 @@
 #include "module/align/spacing/even_spacing.h"
 #include "module/align/spacing/options_factory.h"
 #include "module/align/spacing/text_planes.h"
+#include "tests/align/flat_box.h"
 #include "tests/align/given_text.h"
 #include "tests/mtext/held_text.h"
 
 namespace {
 
+using tztest::FlatBox;
 using tztest::GivenText;
 using tztest::placed;
 
@@ -33,32 +35,10 @@ TzMTextAlignOption::Entities entitiesOf(Texts const& texts) {
     return entities;
 }
 
-struct Box {
-    TzGePoint3d low;
-    TzGePoint3d high;
-
-    static Box of(TzMTextAlignManipulatorEntity const& text) {
-        Box box;
-        text.boundingBox().getMinMaxPoints(box.low, box.high);
-        return box;
-    }
-    [[nodiscard]] Box by(TzGeVector3d const& offset) const { return {low + offset, high + offset}; }
-    [[nodiscard]] bool overlaps(Box const& other) const {
-        return low.x < other.high.x && other.low.x < high.x && low.y < other.high.y &&
-               other.low.y < high.y;
-    }
-};
-
-// How far `next` goes along the line until it leaves `here`, when both reference points lie at the
-// origin: found by halving, not by the angles of the line.
-double touchingDistance(Box const& here, Box const& next, TzGeVector3d const& along) {
-    double near = 0;
-    double far = 1e6;
-    for (int i = 0; i < 80; ++i) {
-        double const middle = (near + far) / 2;
-        (here.overlaps(next.by(along * middle)) ? near : far) = middle;
-    }
-    return far;
+FlatBox boxOf(TzMTextAlignManipulatorEntity const& text) {
+    FlatBox box;
+    text.boundingBox().getMinMaxPoints(box.low, box.high);
+    return box;
 }
 
 // Texts of unequal sizes, the last one behind the first point of every line.
@@ -120,15 +100,15 @@ public:
     // Between the boxes at i and i + 1, along the line.
     [[nodiscard]] double gap(std::size_t i) const {
         double const distance = along_.dotProduct(moved(i + 1) - moved(i));
-        return distance - touchingDistance(atOrigin(i), atOrigin(i + 1), along_);
+        return distance - tztest::touchingDistance(atOrigin(i), atOrigin(i + 1), along_);
     }
 
     static constexpr TzGePoint3d kFirst{2, 3, 0};
 
 private:
     [[nodiscard]] GivenText const& text(std::size_t i) const { return *texts_[order_[i]]; }
-    [[nodiscard]] Box atOrigin(std::size_t i) const {
-        return Box::of(text(i)).by(-text(i).referencePoint().asVector());
+    [[nodiscard]] FlatBox atOrigin(std::size_t i) const {
+        return boxOf(text(i)).by(-text(i).referencePoint().asVector());
     }
 
     Texts texts_;
