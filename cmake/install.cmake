@@ -8,7 +8,8 @@ file(RELATIVE_PATH way ${CMAKE_INSTALL_FULL_BINDIR} ${CMAKE_INSTALL_FULL_LIBDIR}
 set_target_properties(tzdraft PROPERTIES INSTALL_RPATH $ORIGIN/${way})
 set_target_properties(tzmted PROPERTIES INSTALL_RPATH $ORIGIN/..)
 
-# A Debian package holds manual pages and the like compressed: `out` is the file to install.
+# A Debian package holds manual pages and the like compressed: `out` is the file to install, made
+# with `tz_products`.
 function(tz_compressed file out)
     get_filename_component(file ${file} ABSOLUTE)
     if(TZ_DEBIAN)
@@ -38,10 +39,7 @@ install(FILES packaging/tz-drawing.xml
     DESTINATION ${CMAKE_INSTALL_DATADIR}/mime/packages COMPONENT programs)
 install(FILES packaging/tzdraft.svg
     DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps COMPONENT programs)
-tz_compressed(docs/man/tzdraft.1 draft_manual)
-tz_compressed(docs/man/tzconvert.1 convert_manual)
-install(FILES ${draft_manual} ${convert_manual}
-    DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 COMPONENT programs)
+include(${CMAKE_CURRENT_LIST_DIR}/option_pages.cmake)
 
 install(TARGETS tz EXPORT tzTargets
     LIBRARY COMPONENT library NAMELINK_COMPONENT development)

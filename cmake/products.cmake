@@ -53,7 +53,7 @@ function(tz_program name)
     target_link_libraries(${name} PRIVATE app_${name} ${ARGN})
     add_dependencies(tz_products ${name})
 endfunction()
-tz_program(tzdraft tz Threads::Threads ${CMAKE_DL_LIBS})
+tz_program(tzdraft app_options tz Threads::Threads ${CMAKE_DL_LIBS})
 # Archives only, so that no drawing database and no display library comes along.
 tz_link_closure(layers app_tzconvert)
 list(REMOVE_ITEM layers app_tzconvert)

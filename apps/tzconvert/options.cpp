@@ -6,6 +6,7 @@
 #include <limits>
 #include <sstream>
 
+#include "apps/options/option_list.h"
 #include "apps/tzconvert/streams.h"
 
 namespace tzconvert {
@@ -227,6 +228,10 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     app.set_version_flag("--version", "tzconvert 1.0");
     ParsedOptions parsed;
     declare(app, parsed.options);
+    if (auto const list = tzapps::optionList(app, count, arguments)) {
+        parsed.exit = printAnswer(*list);
+        return parsed;
+    }
     try {
         app.parse(count, arguments);
         if (parsed.options.output == "-") parsed.options.output.clear();

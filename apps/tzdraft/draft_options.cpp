@@ -6,6 +6,7 @@
 #include <cstring>
 #include <sstream>
 
+#include "apps/options/option_list.h"
 #include "host/text/visible_text.h"
 
 namespace tzdraft {
@@ -94,6 +95,10 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     app.set_version_flag("--version", "tzdraft 1.0");
     ParsedOptions parsed;
     declare(app, parsed.options);
+    if (auto const list = tzapps::optionList(app, count, arguments)) {
+        parsed.exit = printAnswer(*list);
+        return parsed;
+    }
     try {
         app.parse(count, arguments);
     } catch (CLI::Success const& asked) {  // --help, --version

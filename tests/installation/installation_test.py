@@ -5,6 +5,7 @@ the installation is removed under it. Nothing of the build tree is used after th
 import argparse
 import json
 import os
+import re
 import shutil
 import subprocess
 import sys
@@ -20,6 +21,11 @@ LIBRARIES = None  # of the installation
 
 def scratch(name):
     return os.path.join(SCRATCH, name)
+
+
+def read(path):
+    with open(path, encoding="utf-8") as file:
+        return file.read()
 
 
 def run(*command, text="", status=0, **options):
@@ -56,8 +62,7 @@ class Programs(unittest.TestCase):
         script = os.path.join(EXAMPLES, "title-block.scr")
         said = run(program("tzdraft"), "--script", script, "--save", drawing, "--locale", "de")
         self.assertIn("Erste Ecke angeben", said)
-        with open(drawing, encoding="utf-8") as file:
-            kinds = [entity["type"] for entity in json.load(file)["entities"]]
+        kinds = [entity["type"] for entity in json.loads(read(drawing))["entities"]]
         self.assertGreater(kinds.count("MTEXT"), 5)
 
     def test_tzconvert_finds_the_font_map(self):
@@ -69,6 +74,52 @@ class Programs(unittest.TestCase):
         self.assertNotEqual(with_map, without)
 
 
+class Options(unittest.TestCase):
+    PAGES = (("share/man/man1/{}.1", r"\-\-"), ("share/bash-completion/completions/{}", "--"),
+             ("share/zsh/site-functions/_{}", "--"),
+             ("share/fish/vendor_completions.d/{}.fish", "-l "))
+
+    def test_stand_in_every_page_as_in_the_help(self):
+        for name, command in (("tzdraft", []), ("tzconvert", ["to-mtext"])):
+            told = run(program(name), *command, "--help")
+            options = set(re.findall(r"^ +(?:-\w,)?--([\w-]+)", told, re.MULTILINE))
+            self.assertGreater(len(options), 12)
+            for page, sign in self.PAGES:
+                text = read(os.path.join(PREFIX, page.format(name)))
+                missing = [each for each in options
+                           if sign + (each.replace("-", r"\-") if "man" in page else each)
+                           not in text]
+                self.assertEqual(missing, [], page)
+
+    # What is typed, and what bash and fish offer.
+    ROWS = (("tzdraft --scr", ["--script"]), ("tzconvert to-r", ["to-rtf"]),
+            ("tzdraft --save dr", ["drawn here"]), ("tzconvert to-rtf --output-dir fo", ["folder"]),
+            ("tzconvert to-mtext --norm", ["--normalise"]), ("tzdraft --save locked/", []),
+            ("tzdraft --save gone/", []))
+
+    def test_are_completed(self):
+        place = scratch("typed")
+        shutil.rmtree(place, ignore_errors=True)
+        for folder in ("folder", "locked"):
+            os.makedirs(os.path.join(place, folder))
+        open(os.path.join(place, "drawn here"), "w", encoding="utf-8").close()
+        os.chmod(os.path.join(place, "locked"), 0)
+        share = os.path.join(PREFIX, "share")
+        for line, offered in self.ROWS:
+            name = line.split()[0]
+            asked = (f'source "{share}/bash-completion/completions/{name}"; compopt() {{ :; }}; '
+                     f'COMP_WORDS=({line}); [[ "{line}" != *" " ]] || COMP_WORDS+=(""); '
+                     f'COMP_CWORD=$((${{#COMP_WORDS[@]}} - 1)); _{name}; '
+                     'printf "%s\\n" "${COMPREPLY[@]}"')
+            self.assertEqual(run("bash", "-c", asked, cwd=place).split("\n")[:-1],
+                             offered or [""], f"bash: {line}")
+            said = run("fish", "-c", f'source "{share}/fish/vendor_completions.d/{name}.fish"; '
+                       f'complete -C "{line}"; true', cwd=place, env=os.environ | {"HOME": place})
+            words = [each.split("\t")[0].rstrip("/") for each in said.splitlines()]
+            self.assertEqual([word.replace("\\", "") for word in words], offered, f"fish: {line}")
+            run("zsh", "-n", f"{share}/zsh/site-functions/_{name}")
+
+
 class Modules(unittest.TestCase):
     def test_find_package_builds_the_second_module(self):
         source, build = scratch("stranger"), scratch("stranger/build")
@@ -77,8 +128,7 @@ class Modules(unittest.TestCase):
         run("cmake", "-G", "Ninja", "-S", source, "-B", build, f"-DCMAKE_PREFIX_PATH={PREFIX}",
             f"-DCMAKE_CXX_COMPILER={COMPILER}", f"-DCMAKE_CXX_FLAGS={SANITIZE}")
         run("cmake", "--build", build)
-        with open(os.path.join(build, "build.ninja"), encoding="utf-8") as file:
-            self.assertNotIn(BUILD + "/lib", file.read())
+        self.assertNotIn(BUILD + "/lib", read(os.path.join(build, "build.ninja")))
         said = run(program("tzdraft"), "--script", "-", text=f"LOAD\n{build}/sheetmarks.tzx\n"
                    "MARKSETUP\nMARKNOTE\nNew\nA note\n\nLIST\nlast\n\n")
         self.assertIn("Words of the text module: Justify", said)
@@ -111,8 +161,7 @@ class Removal(unittest.TestCase):
                                           "UNLOAD\nLOAD\n\nQUIT\n", timeout=120)
         self.assertEqual(session.returncode, 1, said)
         self.assertIn(os.path.join(other, "lib") + "/", said)
-        with open(drawing, encoding="utf-8") as file:
-            texts = [entity["contents"] for entity in json.load(file)["entities"]]
+        texts = [entity["contents"] for entity in json.loads(read(drawing))["entities"]]
         self.assertEqual(texts, ["before", "changed"], said)
 
 

@@ -1,0 +1,24 @@
+#pragma once
+
+#include <CLI/CLI.hpp>
+#include <optional>
+#include <string>
+
+// The options of a program as data, from the same declarations that --help prints. The build makes
+// manual pages and the completions of shells from them (scripts/option_pages.py).
+namespace tzapps {
+
+// Given alone, --option-list asks for a JSON object; help does not show it:
+//
+//   {"program": "tzdraft", "options": [OPTION...], "commands": [{"name", "help", "options"}...]}
+//
+// with an OPTION for each option and each argument without one, in the order of --help:
+//
+//   {"names": ["-h", "--help"], "value": "FILE", "help": "write there"}
+//
+// An argument has "argument": its name in place of "names"; an option without a value no "value".
+// Nothing when the arguments ask for something else.
+[[nodiscard]] std::optional<std::string>
+optionList(CLI::App const& app, int count, char const* const* arguments);
+
+}  // namespace tzapps
