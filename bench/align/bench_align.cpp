@@ -1,6 +1,6 @@
 // An alignment of many texts. One place of the cursor stands beside a sort of as many numbers; a
-// whole run stands beside runs with fewer texts, and one with as many planes as texts beside one
-// with a single plane.
+// whole run stands beside runs with fewer texts, and one with as many planes or directions as texts
+// beside one with a single plane and direction.
 #include <benchmark/benchmark.h>
 
 #include <algorithm>
@@ -23,10 +23,11 @@ namespace {
 constexpr int kMany = 100000;
 constexpr int kTenth = kMany / 10;
 
-// A drawing with texts at scattered places, in turns on parallel planes.
+// A drawing with texts at scattered places, in turns on parallel planes and in directions that fill
+// a quarter of a turn.
 class Texts {
 public:
-    Texts(int count, int planes) : drawing_(tzhost::Drawing::create()) {
+    Texts(int count, int planes, int directions) : drawing_(tzhost::Drawing::create()) {
         tzhost::setWorkingDrawing(drawing_.get());
         TzDbBlockTableRecord* space = nullptr;
         if (tzdbOpenObject(space, drawing_->modelSpace(), TzDb::kForWrite) != Tzad::eOk) return;
@@ -36,6 +37,8 @@ public:
             auto* const text = new TzDbMText;
             text->setDatabaseDefaults();
             (void)text->setLocation({place(random), place(random), double(i % planes)});
+            double const angle = 1.5 * (i % directions) / directions;
+            (void)text->setDirection({std::cos(angle), std::sin(angle), 0});
             (void)text->setContents(L"A note");
             TzDbObjectId id;
             (void)space->appendTzDbEntity(id, text);
@@ -83,7 +86,7 @@ private:
 };
 
 void onePlaceOfTheCursor(benchmark::State& state) {
-    Texts const texts(kMany, 1);
+    Texts const texts(kMany, 1, 1);
     auto const manipulator = texts.taken();
     std::vector<double> numbers(kMany);
     std::mt19937 random(2);
@@ -101,8 +104,8 @@ void onePlaceOfTheCursor(benchmark::State& state) {
 BENCHMARK(onePlaceOfTheCursor)->UseManualTime()->Unit(benchmark::kMillisecond);
 
 void manyTextsOnTenPlanes(benchmark::State& state) {
-    Texts const many(kMany, 10);
-    Texts const few(kTenth, 10);
+    Texts const many(kMany, 10, 10);
+    Texts const few(kTenth, 10, 10);
     tzbench::AgainstFloor against(state, 1.5);
     while (state.KeepRunning())
         against.turn([&] { return many.aligned(); },
@@ -115,12 +118,21 @@ void manyTextsOnTenPlanes(benchmark::State& state) {
 BENCHMARK(manyTextsOnTenPlanes)->UseManualTime()->Unit(benchmark::kMillisecond);
 
 void asManyPlanesAsTexts(benchmark::State& state) {
-    Texts const apart(kTenth, kTenth);
-    Texts const together(kTenth, 1);
+    Texts const apart(kTenth, kTenth, 1);
+    Texts const together(kTenth, 1, 1);
     tzbench::AgainstFloor against(state, 200);
     while (state.KeepRunning())
         against.turn([&] { return apart.aligned(); }, [&] { return together.aligned(); });
 }
 BENCHMARK(asManyPlanesAsTexts)->UseManualTime()->Unit(benchmark::kMillisecond);
+
+void asManyDirectionsAsTexts(benchmark::State& state) {
+    Texts const apart(kTenth, 1, kTenth);
+    Texts const together(kTenth, 1, 1);
+    tzbench::AgainstFloor against(state, 200);
+    while (state.KeepRunning())
+        against.turn([&] { return apart.aligned(); }, [&] { return together.aligned(); });
+}
+BENCHMARK(asManyDirectionsAsTexts)->UseManualTime()->Unit(benchmark::kMillisecond);
 
 }  // namespace

@@ -7,6 +7,25 @@
 #include "tz/ge/vector2d.h"
 #include "tz/ge/vector3d.h"
 
+namespace {
+
+// Products of such lengths, and of their squares, are exact to the last digits.
+bool isOrdinary(double squaredLength) {
+    return squaredLength > 1e-100 && squaredLength < 1e100;
+}
+
+// Whether the products of two vectors tell, without a root, that they run in directions which no
+// small tolerance takes for parallel: within 1e-5 the squared cosine is above 1 - 1e-10.
+bool areFarFromParallel(TzGeVector3d const& a, TzGeVector3d const& b, TzGeTol const& tol) {
+    double const along = a.dotProduct(b);
+    double const aa = a.dotProduct(a);
+    double const bb = b.dotProduct(b);
+    return tol.equalVector() <= 1e-5 && isOrdinary(aa) && isOrdinary(bb) &&
+           along * along < aa * bb * (1 - 1e-9);
+}
+
+}  // namespace
+
 double TzGeVector2d::length() const {
     return std::hypot(x, y);
 }
@@ -54,6 +73,7 @@ double TzGeVector3d::angleTo(TzGeVector3d const& v) const {
 }
 
 bool TzGeVector3d::isParallelTo(TzGeVector3d const& v, TzGeTol const& tol) const {
+    if (areFarFromParallel(*this, v, tol)) return false;
     return isCodirectionalTo(v, tol) || isCodirectionalTo(-v, tol);
 }
 

@@ -31,6 +31,7 @@ struct RelationCase {
 constexpr RelationCase kRelations[] = {
     {"Same", {1, 2, 3}, {1, 2, 3}, "pce"},
     {"Longer", {1, 2, 3}, {1e9, 2e9, 3e9}, "pc"},
+    {"Huge", {1e200, 2e200, 0}, {1e300, 2e300, 0}, "pc"},
     {"Opposite", {0, 5, 0}, {0, -1e-3, 0}, "p"},
     {"RightAngle", {0, 5, 0}, {7, 0, 1e6}, "r"},
     {"TiltWithin", {1, 0, 0}, {1e6, 0.9e-4, 0}, "pc"},
