@@ -1,6 +1,7 @@
 #include "tz/db/field.h"
 
 #include <algorithm>
+#include <cwchar>
 #include <new>
 
 #include "host/database/drawing.h"
@@ -131,16 +132,16 @@ unsigned int TzDbField::subSetAttributes(TzGiDrawableTraits* /*traits*/) {
 }
 
 bool tzdbHasFields(wchar_t const* text, int /*options*/) {
-    return text && tzhost::findField(text, 0).has_value();
+    return text && tzhost::findField(text).has_value();
 }
 
 bool tzdbFindField(wchar_t const* text, int start, int& first, int& end) {
-    std::wstring_view const all(text ? text : L"");
     auto const from = static_cast<std::size_t>(std::max(start, 0));
-    auto const span = from <= all.size() ? tzhost::findField(all, from) : std::nullopt;
+    if (!text || ::wcsnlen(text, from) < from) return false;
+    auto const span = tzhost::findField(text + from);
     if (!span) return false;
-    first = static_cast<int>(span->first);
-    end = static_cast<int>(span->end);
+    first = static_cast<int>(from + span->first);
+    end = static_cast<int>(from + span->end);
     return true;
 }
 

@@ -2,6 +2,7 @@
 
 #include <cstdlib>
 #include <ctime>
+#include <cwchar>
 
 #include "host/base/result_time.h"
 #include "host/database/drawing.h"
@@ -82,6 +83,14 @@ std::optional<FieldSpan> findField(std::wstring_view text, std::size_t start) {
     std::size_t const end = text.find(kEnd, first + kBegin.size());
     if (end == text.npos) return std::nullopt;
     return FieldSpan{first, end + kEnd.size()};
+}
+
+std::optional<FieldSpan> findField(wchar_t const* text) {
+    wchar_t const* const first = std::wcsstr(text, kBegin.data());
+    wchar_t const* const end = first ? std::wcsstr(first + kBegin.size(), kEnd.data()) : nullptr;
+    if (!end) return std::nullopt;
+    return FieldSpan{static_cast<std::size_t>(first - text),
+                     static_cast<std::size_t>(end - text) + kEnd.size()};
 }
 
 ExpandedText expandFields(std::wstring_view text, Drawing const* drawing) {

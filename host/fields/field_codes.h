@@ -19,6 +19,8 @@ struct FieldSpan {
 
 // The first code that begins at `start` or after it.
 [[nodiscard]] std::optional<FieldSpan> findField(std::wstring_view text, std::size_t start);
+// The first code of a text of which only as much is read as finding it takes.
+[[nodiscard]] std::optional<FieldSpan> findField(wchar_t const* text);
 
 // A text with its codes computed; those that cannot be show "####". Nothing is looked at twice: a
 // value that looks like a code stays as it is. The values of one text have no more than

@@ -12,13 +12,14 @@ void convertBackslashesInFields(CStdStrW& text, signed char flag) {
     int first = 0;
     int end = 0;
     // The text is put together from its pieces: exchanging each span in place would move all that
-    // follows once for each field.
-    while (tzdbFindField(text.c_str(), copied, first, end)) {
-        CStdStrW field = text.Mid(first, end - first);
+    // follows once for each field. The host is given the rest alone, since it may look at all that
+    // stands ahead of a start.
+    while (tzdbFindField(text.c_str() + copied, 0, first, end)) {
+        CStdStrW field = text.Mid(copied + first, end - first);
         field.Replace(flag ? one : two, flag ? two : one);
-        converted += text.Mid(copied, first - copied);
+        converted += text.Mid(copied, first);
         converted += field;
-        copied = end;
+        copied += end;
     }
     if (copied == 0) return;
     converted += text.Mid(copied);
