@@ -13,6 +13,7 @@
 //   std::string document = writer.finish({});
 
 #include <cstddef>
+#include <deque>
 #include <map>
 #include <string>
 #include <string_view>
@@ -93,7 +94,7 @@ private:
         DialectFont face;
         bool isUsed = false;  // the table has it
     };
-    std::vector<Font> fonts_;
+    std::deque<Font> fonts_;  // no copy while it grows: a document may have a million
     std::vector<unsigned int> colors_;
     std::map<unsigned int, int> colorNumbers_;
     std::string body_;
