@@ -1,7 +1,7 @@
 #include "tz/db/object.h"
 
 #include <algorithm>
-#include <new>
+#include <exception>
 
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
@@ -88,7 +88,7 @@ namespace {
 // A field that cannot be evaluated is attached all the same; what fails in it shows "####".
 void evaluateAttached(TzDbField& field, tzhost::Drawing& drawing) try {
     (void)field.evaluate(0x20, &drawing);
-} catch (std::bad_alloc const&) {
+} catch (std::exception const&) {
     // Its owner shows the text from before.
 }
 
@@ -107,13 +107,14 @@ Tzad::ErrorStatus TzDbObject::setField(wchar_t const* key, TzDbField* field, TzD
     auto& links = *imp_->fields;
     links.reserve(links.size() + 1);
     std::wstring name(key ? key : L"");
+    auto const old = std::find_if(links.begin(), links.end(),
+                                  [&](auto const& link) { return link.first == name; });
+    if (old != links.end()) tzhost::beginHostChange(*old->second.record()->object);
+    // Once the drawing has the field nothing may throw: the caller would delete it as its own.
     TzDbObjectRecord& added =
         record->drawing->addObject(field, record, tzhost::Drawing::Numbered::service);
     id = TzDbObjectId(&added);
-    auto const old = std::find_if(links.begin(), links.end(),
-                                  [&](auto const& link) { return link.first == name; });
     if (old != links.end()) {
-        tzhost::beginHostChange(*old->second.record()->object);
         old->second.record()->erased = true;
         old->second = id;
     } else {

@@ -5,6 +5,7 @@
 #include "host/base/memory_faults.h"
 #include "host/faults/fault_plan.h"
 #include "tests/database/drawing_fixture.h"
+#include "tz/db/field.h"
 #include "tz/ed/ucs.h"
 
 using tzhost::test::DrawingTest;
@@ -27,13 +28,19 @@ struct TextHolder {
     }
 };
 
-// A command that adds a text with a field, changes one, and works in a system of its own.
+// A command that adds a text with a field, replaces the field of one, and works in a system of its
+// own.
 void work(tzhost::Drawing& drawing, TzDbObjectId id) {
     SystemHolder system;
     system.held = tzedSetCurrentUCS(TzGeMatrix3d::rotation(1, TzGeVector3d::kXAxis)) == 0;
     TextHolder holder;
     if (tzdbOpenObject(holder.text, id, TzDb::kForWrite) != Tzad::eOk) return;
     (void)holder.text->highlight();
+    auto field = std::make_unique<TzDbField>();
+    TzDbObjectId added;
+    if (field->setFieldCode(L"%<\\Var LUPREC>%", 0, nullptr) == Tzad::eOk &&
+        holder.text->setField(L"TEXT", field.get(), added) == Tzad::eOk)
+        (void)field.release()->close();
     (void)holder.text->setContents(L"%<\\Var LUNITS>% and a text that needs memory");
     std::unique_ptr<TzDbObject> const copy(holder.text->clone());
     auto fresh = std::make_unique<TzDbMText>();
@@ -45,7 +52,6 @@ void work(tzhost::Drawing& drawing, TzDbObjectId id) {
         TzDbObject* object;
         ~Closer() { (void)object->close(); }
     } const closer{space};
-    TzDbObjectId added;
     if (space->appendTzDbEntity(added, fresh.get()) == Tzad::eOk) (void)fresh.release()->close();
 }
 
@@ -54,7 +60,7 @@ TEST_F(DrawingTest, EveryFailingAllocationIsSurvived) {
 #ifdef __SANITIZE_ADDRESS__
     GTEST_SKIP() << "the sanitizer's own operator new serves in this build";
 #endif
-    TzDbObjectId const id = addText(L"abc");
+    TzDbObjectId const id = addText(L"%<\\Var LUNITS>%");
     auto const before = tzhost::setEventSink([](tzhost::Event const&) {});
     bool struck = true;
     int call = 0;
@@ -76,7 +82,7 @@ TEST_F(DrawingTest, EveryFailingAllocationIsSurvived) {
         while (drawing->undoLog().takeBack()) {
         }
         ASSERT_EQ(list(), "1 MTEXT 0") << call;
-        ASSERT_EQ(at<TzDbMText>(id).contents(), L"abc") << call;
+        ASSERT_EQ(at<TzDbMText>(id).contents(), L"2") << call;
         ASSERT_EQ(drawing->ucsydir(), TzGeVector3d::kYAxis) << call;
     }
     EXPECT_FALSE(struck) << "the sweep came to its end";
