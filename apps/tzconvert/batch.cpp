@@ -1,7 +1,6 @@
 #include "apps/tzconvert/batch.h"
 
 #include <algorithm>
-#include <cstdio>
 #include <new>
 #include <stdexcept>
 #include <utility>
@@ -19,7 +18,7 @@ namespace {
 // kDone, or kUnusable when there is a failure, which goes to standard error.
 int told(Failure const& failure) {
     if (!failure) return kDone;
-    std::fprintf(stderr, "tzconvert: %s\n", failure->c_str());
+    tell(*failure);
     return kUnusable;
 }
 

@@ -1,6 +1,5 @@
 #include "apps/tzconvert/normalising.h"
 
-#include <cstdio>
 #include <utility>
 
 #include "apps/tzconvert/text_codec.h"
@@ -19,7 +18,7 @@ void tellWhatIsLeftOut(std::string const& file, tzhost::NormalisedRtf const& rtf
     appendCount(counts, rtf.pictures, "picture", "pictures");
     appendCount(counts, rtf.notes, "note", "notes");
     appendCount(counts, rtf.headers, "header or footer", "headers and footers");
-    std::fprintf(stderr, "tzconvert: %s: left out: %s\n", shownName(file).c_str(), counts.c_str());
+    tell(shownName(file) + ": left out: " + counts);
 }
 
 Failure normalise(std::string const& file, std::string& document) {

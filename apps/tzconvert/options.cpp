@@ -2,7 +2,6 @@
 
 #include <CLI/CLI.hpp>
 #include <cmath>
-#include <cstdio>
 #include <limits>
 #include <sstream>
 
@@ -210,7 +209,7 @@ std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
 // What was asked of the program itself, and the exit status after it.
 int printAnswer(std::string const& text) {
     Failure const failure = writeBytes("", text);
-    if (failure) std::fprintf(stderr, "tzconvert: %s\n", failure->c_str());
+    if (failure) tell(*failure);
     return failure ? kUnusable : kDone;
 }
 
@@ -244,7 +243,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
         app.exit(CLI::CallForHelp(), text);
         parsed.exit = printAnswer(text.str());
     } catch (CLI::ParseError const& wrong) {
-        std::fprintf(stderr, "tzconvert: %s; try --help\n", explain(app, wrong).c_str());
+        tell(explain(app, wrong) + "; try --help");
         parsed.exit = kUnusable;
     }
     return parsed;

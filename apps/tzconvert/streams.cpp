@@ -6,6 +6,7 @@
 #include "apps/tzconvert/text_codec.h"
 #include "host/files/file_bytes.h"
 #include "host/files/file_reader.h"
+#include "host/text/visible_text.h"
 
 namespace tzconvert {
 namespace {
@@ -66,6 +67,11 @@ Failure writeStandardOutput(std::string_view bytes) {
 }
 
 }  // namespace
+
+void tell(std::string const& line) {
+    std::fprintf(stderr, "tzconvert: %s\n",
+                 tzhost::visible(line, tzhost::LineFeeds::shown).c_str());
+}
 
 std::string shownName(std::string const& file) {
     return file == "-" ? "standard input" : file;

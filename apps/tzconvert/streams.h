@@ -11,6 +11,10 @@ namespace tzconvert {
 // What is read or written failed: one line saying what and why.
 using Failure = std::optional<std::string>;
 
+// Tells a line on standard error, under the program's name. Control characters, which a file's name
+// may hold, are shown and not obeyed.
+void tell(std::string const& line);
+
 // An input's name in messages: "-" is standard input.
 [[nodiscard]] std::string shownName(std::string const& file);
 

@@ -97,6 +97,8 @@ constexpr RunCase kRuns[] = {
     {"NotUtf8", "to-rtf", "ab\xE9x"sv, 2, "", "standard input: byte 2: not UTF-8"},
     {"CutOffUtf8", "round-trip", "ab\xE4\xB8"sv, 2, "", "byte 2: not UTF-8"},
     {"ZeroCharacter", "to-mtext", "a\0b"sv, 2, "", "byte 1: a zero character"},
+    {"ControlsInAName", "to-rtf \"$(printf 'a\\033]b')\"", ""sv, 2, "",
+     "a\\U+001B]b: cannot be read"},
     {"NoFile", "to-rtf none.txt", ""sv, 2, "", "none.txt: cannot be read"},
     {"FolderAsFile", "to-rtf .", ""sv, 2, "", ".: cannot be read"},
     {"FolderAsMap", "to-rtf --font-map .", "a"sv, 2, "", ".: cannot be read"},
