@@ -49,10 +49,8 @@ constexpr std::array kCommands{
                 forLocalText(L"Tells what objects are, where they lie and how large they are.")},
     HostCommand{forLocalText(L"LOAD"), loadCommand, kAlone,
                 forLocalText(L"Loads a module, once this command has ended.")},
-    HostCommand{
-        forLocalText(L"NEW"), newCommand, kAlone,
-        forLocalText(
-            L"Begins a new drawing; it asks nothing, and U brings the drawing before it back.")},
+    HostCommand{forLocalText(L"NEW"), newCommand, kAlone,
+                forLocalText(L"Begins a new drawing; U brings the drawing before it back.")},
     HostCommand{forLocalText(L"OPEN"), openCommand, kAlone,
                 forLocalText(L"Opens a drawing in place of this one.")},
     HostCommand{
