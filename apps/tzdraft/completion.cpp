@@ -64,12 +64,14 @@ Completion completeName(std::wstring_view typed, std::vector<std::wstring> const
     return complete(typed, std::move(offered), Case::ignored);
 }
 
-Completion completeFile(std::wstring_view typed) {
+Completion completeFile(std::wstring_view typed, std::wstring_view home) {
     std::size_t const slash = typed.rfind(L'/');
     std::wstring_view const start =
         slash == std::wstring_view::npos ? typed : typed.substr(slash + 1);
     std::filesystem::path const folder =
-        slash == std::wstring_view::npos ? "." : tzhost::toUtf8(typed.substr(0, slash + 1));
+        tzhost::toUtf8(slash != std::wstring_view::npos ? typed.substr(0, slash + 1)
+                       : home.empty()                   ? L"."
+                                                        : home);
     std::vector<std::wstring> names;
     std::error_code unreadable;  // such a folder holds nothing to offer
     for (std::filesystem::directory_iterator each(folder, unreadable), end; each != end;

@@ -22,7 +22,8 @@ struct Completion {
                                       std::vector<std::wstring> const& names);
 
 // Of the whole text as the name of a file, relative to the working folder; a folder gets a slash.
-// Names that begin with a dot are offered when the dot is typed.
-[[nodiscard]] Completion completeFile(std::wstring_view typed);
+// Names that begin with a dot are offered when the dot is typed. A name without a slash is one of
+// `home` instead, unless that is empty.
+[[nodiscard]] Completion completeFile(std::wstring_view typed, std::wstring_view home = {});
 
 }  // namespace tzdraft

@@ -68,6 +68,7 @@ public:
     // The file name of the module that LOAD proposes.
     void setModule(std::filesystem::path module) { module_ = std::move(module); }
     [[nodiscard]] TzString moduleName() const;
+    [[nodiscard]] std::filesystem::path moduleFolder() const { return module_.parent_path(); }
     // Modules come and go between commands, since the one that asks for it may be a module's. A
     // name without a slash is looked for beside the proposed module alone: the working folder may
     // hold a stranger's files.

@@ -146,7 +146,7 @@ unsigned char TerminalSource::Editor::deleteOrLeave(EditLine* line, wint_t /*key
 Completion TerminalSource::Editor::completionOf(std::wstring_view typed) const {
     tzhost::Offer const& offer = request_->offer;
     switch (offer.kind) {
-    case tzhost::Offer::Kind::files: return completeFile(typed);
+    case tzhost::Offer::Kind::files: return completeFile(typed, offer.home);
     case tzhost::Offer::Kind::names: return completeName(typed, offer.choices);
     case tzhost::Offer::Kind::words: return completeWord(typed, offer.choices);
     case tzhost::Offer::Kind::nothing: break;

@@ -39,10 +39,11 @@ struct Offer {
         nothing,  // a text, in which a tab is a tab
         words,    // the word before the cursor, by `choices`; global words begin with "_"
         names,    // the whole answer, by `choices`
-        files,    // the whole answer, as the name of a file
+        files,    // the whole answer, as the name of a file; one without a slash lies in `home`
     };
     Kind kind = Kind::nothing;
     std::vector<std::wstring> choices = {};
+    std::wstring home = {};  // a folder; empty: the working folder
 };
 
 // What is asked, for sources that let a person see and edit.

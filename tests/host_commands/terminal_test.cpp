@@ -200,6 +200,14 @@ constexpr CareCase kCare[] = {
     {"PlotSaysWhat", ": |PLOT\r|: |a.svg\r", "/desk/a.svg."},
     {"TabInAText", ": |TEXT\r|: |0,0\r|: |1\r|: |\r|: |a\tb\r|: |LIST\r|: |l\r|: |\r", "  a\tb"},
     {"FilesComplete", ": |SAVE\r|: |th\t\r", kReplace},
+    {"ModulesComplete", ": |LOAD\r|: |sheetm\t", "arks.tzx"},
+    // Enter keeps a value; what is no value is asked for again.
+    {"PropertiesAreAskedFor",
+     "$--var MTEXTED=OLDEDITOR|: |-MTEXT\r|: |0,0\r|: |9,-9\r|: |one\r|: |\r|: |MTPROP\r|: |#1\r|"
+     "textHeight <0.2>: |0\r|no value for textHeight|3\r|attachment <1>: |5\r|width <9>: |\r|"
+     "rotation <0>: |\r|style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
+     "textHeight <3>: |\r",
+     "attachment <5>: "},
     {"StylesComplete", ": |STYLE\r|: |sta\t", "ndard"},
     {"VariablesComplete", ": |SETVAR\r|: |textsi\t\r", "for textsize"},
     {"CommandsComplete", ": |HELP\r|list: |qui\t\r", "Ends the session."},

@@ -5,6 +5,7 @@
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
+#include "host/text/utf8.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/units.h"
 #include "tz/rx/status.h"
@@ -97,8 +98,10 @@ askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultNam
     return answer;
 }
 
-std::optional<std::filesystem::path> askFile(wchar_t const* question, TzString const& defaultFile) {
-    Answer<TzString> const file = askName(question, {tzhost::Offer::Kind::files}, defaultFile);
+std::optional<std::filesystem::path>
+askFile(wchar_t const* question, TzString const& defaultFile, std::filesystem::path const& home) {
+    tzhost::Offer const offer{tzhost::Offer::Kind::files, {}, tzhost::fromUtf8(home.string())};
+    Answer<TzString> const file = askName(question, offer, defaultFile);
     if (file.asked != Asked::given) return std::nullopt;
     return std::filesystem::path(file.value.toUtf8());
 }

@@ -26,9 +26,10 @@ struct Answer {
 // The same for a name, which completion may be offered for (choices.h).
 [[nodiscard]] Answer<TzString>
 askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultName = TzString());
-// The name of a file; nothing for none.
-[[nodiscard]] std::optional<std::filesystem::path>
-askFile(wchar_t const* question, TzString const& defaultFile = TzString());
+// The name of a file; nothing for none. Completion looks for one without a slash in `home`.
+[[nodiscard]] std::optional<std::filesystem::path> askFile(wchar_t const* question,
+                                                           TzString const& defaultFile = TzString(),
+                                                           std::filesystem::path const& home = {});
 // The global word of the keyword; the default is one of the words. `keywords` are the global words,
 // blanks between them; their local text has the local ones in the same order, and those are shown.
 [[nodiscard]] Answer<TzString>

@@ -6,8 +6,10 @@
 namespace tzdraft {
 
 void loadCommand() {
-    auto const file = askFile(localText(L"Module to load"), ProgramSession::current().moduleName());
-    if (file) ProgramSession::current().loadLater(*file);
+    ProgramSession& session = ProgramSession::current();
+    auto const file =
+        askFile(localText(L"Module to load"), session.moduleName(), session.moduleFolder());
+    if (file) session.loadLater(*file);
 }
 
 void unloadCommand() {
