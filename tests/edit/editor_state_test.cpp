@@ -3,9 +3,13 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+
 #include "host/settings/settings.h"
+#include "host/text/utf8.h"
 #include "module/markup/session/conversion_session.h"
 #include "tests/mtext/held_text.h"
+#include "tests/support/program_run.h"
 #include "tz/mte/editor_state.h"
 #include "tz/mte/globals.h"
 
@@ -178,6 +182,18 @@ TEST(EditorState, ConvertsOnEachReading) {
     EXPECT_EQ(state.GetConversionResults(), 0x1U);
 }
 
+// What the program makes of a markup with the font, size and colour of the test below.
+std::string tripByTheProgram(std::wstring_view markup) {
+    std::string const input = tztest::scratch("trip.txt", tzhost::toUtf8(markup)).string();
+    std::string const output = tztest::scratch("trip.out").string();
+    std::string const command = std::string(std::getenv("TZ_TEST_BIN")) +
+                                "/tzconvert round-trip --font-file txt.shx --size 0.5 --twips 320 "
+                                "--by-layer 0000FF --output " +
+                                output + " " + input;
+    EXPECT_EQ(std::system(command.c_str()), 0);
+    return tztest::bytesOf(output);
+}
+
 // A trip through a state is that of a converter with the same face, colours, size and twips.
 TEST(EditorState, ConvertsAsAConverterDoes) {
     OpenDrawing const drawing;
@@ -208,6 +224,7 @@ TEST(EditorState, ConvertsAsAConverterDoes) {
         state.SetRTFString(rtf);
         state.GetMTextString(text);
         EXPECT_EQ(text, session.toMarkup(rtf, written.found.wholeText).markup);
+        EXPECT_EQ(tzhost::toUtf8(text), tripByTheProgram(markup));
     }
 }
 
