@@ -1,16 +1,19 @@
 #include "apps/tzconvert/batch.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <new>
 #include <stdexcept>
 #include <utility>
 
 #include "apps/tzconvert/conversion.h"
+#include "apps/tzconvert/inputs.h"
 #include "apps/tzconvert/machine.h"
 #include "apps/tzconvert/normalising.h"
 #include "apps/tzconvert/places.h"
 #include "apps/tzconvert/report.h"
 #include "apps/tzconvert/streams.h"
+#include "apps/tzconvert/warnings.h"
 
 namespace tzconvert {
 namespace {
@@ -24,63 +27,128 @@ int told(Failure const& failure) {
 
 class Batch {
 public:
-    explicit Batch(Options const& options) : options_(options), places_(options) {}
+    Batch(Options const& options, std::vector<Input> const& inputs)
+        : options_(options), inputs_(inputs), places_(options, inputs) {}
 
     [[nodiscard]] Failure checkReport() const { return places_.checkReport(); }
-
-    [[nodiscard]] Failure convertFile(std::string const& file) {
-        try {
-            return convertUnguarded(file);
-        } catch (std::bad_alloc const&) {
-        } catch (std::length_error const&) {
-        }
-        return shownName(file) + ": memory cannot hold its conversion";
-    }
-
-    [[nodiscard]] Failure writeReport() const {
-        if (options_.report.empty() || (reports_.empty() && options_.outputDir.empty())) return {};
-        return writeBytes(options_.report == "-" ? "" : options_.report,
-                          reportText(options_, reports_));
-    }
+    // Converts all files, one after the other; the status.
+    [[nodiscard]] int convertAll();
+    [[nodiscard]] Failure writeReport() const;
+    // How many files did what, where there are several.
+    void summarise() const;
 
 private:
-    [[nodiscard]] Failure convertUnguarded(std::string const& file) {
-        std::string const target = targetOf(options_, file);
-        if (Failure failure = places_.checkTarget(file, target)) return failure;
-        Converted converted;
-        Failure const failure = options_.direction == Direction::normalise
-                                    ? normaliseFile(file, target)
-                                    : convertText(file, target, converted);
-        if (failure) return failure;
-        places_.keepTarget(target);
-        reports_.push_back({file, converted.found});
-        return {};
-    }
-
-    [[nodiscard]] Failure
-    convertText(std::string const& file, std::string const& target, Converted& converted) const {
-        std::wstring text;
-        if (Failure failure =
-                options_.normalises ? readNormalised(file, text) : readText(file, text))
-            return failure;
-        converted = convert(options_, std::move(text));
-        return writeText(target, converted.text);
-    }
+    [[nodiscard]] Failure convertFile(Input const& input, Warnings& warnings);
+    [[nodiscard]] Failure convertUnguarded(Input const& input, Warnings& warnings);
+    [[nodiscard]] Failure convertText(std::string const& file,
+                                      std::string const& target,
+                                      Converted& converted,
+                                      Warnings& warnings) const;
+    [[nodiscard]] Failure makeFolderOf(std::string const& target) const;
+    void tellWarnings(std::string const& file, Warnings const& warnings);
 
     Options const& options_;
+    std::vector<Input> const& inputs_;
     Places places_;
     std::vector<FileReport> reports_;
+    int warned_ = 0;  // files
 };
+
+int Batch::convertAll() {
+    int status = kDone;
+    for (Input const& input : inputs_) {
+        Warnings warnings;
+        status = std::max(status, told(convertFile(input, warnings)));
+        tellWarnings(input.file, warnings);
+    }
+    bool const isError = warned_ > 0 && options_.warningsAreErrors;
+    return std::max(status, isError ? kWarned : kDone);
+}
+
+void Batch::tellWarnings(std::string const& file, Warnings const& warnings) {
+    if (!warnings.empty()) ++warned_;
+    if (options_.isQuiet) return;
+    for (std::string const& warning : warnings)
+        tell(shownName(file) + ": warning: " + warning);
+}
+
+void Batch::summarise() const {
+    if (inputs_.size() < 2 || options_.isQuiet) return;
+    std::size_t const failed = inputs_.size() - reports_.size();
+    std::string text = std::to_string(reports_.size()) + " of " + std::to_string(inputs_.size()) +
+                       " files converted";
+    if (failed > 0) text += ", " + std::to_string(failed) + " failed";
+    if (warned_ > 0) text += ", " + std::to_string(warned_) + " with warnings";
+    tell(text);
+}
+
+Failure Batch::convertFile(Input const& input, Warnings& warnings) {
+    try {
+        return convertUnguarded(input, warnings);
+    } catch (std::bad_alloc const&) {
+    } catch (std::length_error const&) {
+    }
+    return shownName(input.file) + ": memory cannot hold its conversion";
+}
+
+Failure Batch::convertUnguarded(Input const& input, Warnings& warnings) {
+    std::string const target = targetOf(options_, input);
+    if (Failure failure = places_.checkTarget(input.file, target)) return failure;
+    if (Failure failure = makeFolderOf(target)) return failure;
+    Converted converted;
+    Failure const failure = options_.direction == Direction::normalise
+                                ? normaliseFile(input.file, target, warnings)
+                                : convertText(input.file, target, converted, warnings);
+    if (failure) return failure;
+    places_.keepTarget(target);
+    reports_.push_back({input.file, converted.found});
+    return {};
+}
+
+// What came from below a folder goes below the folder of the results.
+Failure Batch::makeFolderOf(std::string const& target) const {
+    if (!options_.isRecursive) return {};
+    std::error_code problem;
+    std::filesystem::create_directories(std::filesystem::path(target).parent_path(), problem);
+    if (!problem) return {};
+    return target + ": cannot be written: " + problem.message();
+}
+
+Failure Batch::convertText(std::string const& file,
+                           std::string const& target,
+                           Converted& converted,
+                           Warnings& warnings) const {
+    std::wstring text;
+    if (Failure failure =
+            options_.normalises ? readNormalised(file, text, warnings) : readText(file, text))
+        return failure;
+    if (!options_.normalises) addLook(warnings, options_.direction, text);
+    converted = convert(options_, std::move(text));
+    addIncidents(warnings, converted.found);
+    // What the normaliser writes is the converter's own, and so is what a round trip reads.
+    if (options_.direction == Direction::toMtext && !options_.normalises)
+        addLosses(warnings, converted.losses);
+    return writeText(target, converted.text);
+}
+
+Failure Batch::writeReport() const {
+    if (options_.report.empty() || (reports_.empty() && options_.outputDir.empty())) return {};
+    return writeBytes(options_.report == "-" ? "" : options_.report,
+                      reportText(options_, reports_));
+}
 
 }  // namespace
 
 int run(Options const& options) {
     if (int const status = told(prepareMachine(options)); status != kDone) return status;
-    Batch batch(options);
+    Inputs const inputs = inputsOf(options);
+    Batch batch(options, inputs.files);
     if (int const status = told(batch.checkReport()); status != kDone) return status;
     int status = kDone;
-    for (std::string const& file : options.files)
-        status = std::max(status, told(batch.convertFile(file)));
+    for (std::string const& failure : inputs.failures)
+        status = told(failure);
+    status = std::max(status, batch.convertAll());
+    batch.summarise();
     return std::max(status, told(batch.writeReport()));
 }
 

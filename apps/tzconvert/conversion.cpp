@@ -43,6 +43,7 @@ Converted convert(Options const& options, std::wstring text) {
     CMTextFontMapDatabase(0).ResetContents();
     ConversionSession session(startOf(options));
     MarkupFindings found = startFindings(options);
+    RtfLosses losses;
     if (options.direction != Direction::toMtext) {
         WrittenRtf document = session.toRtf(text);
         text = std::move(document.rtf);
@@ -54,8 +55,9 @@ Converted convert(Options const& options, std::wstring text) {
             session.toMarkup(text, found.wholeText, options.keepsTrailingParagraphs ? keeps : 0U);
         text = std::move(markup.markup);
         found.stacksSeen = found.stacksSeen || markup.stacksSeen;
+        losses = std::move(markup.losses);
     }
-    return {std::move(text), found};
+    return {std::move(text), found, std::move(losses)};
 }
 
 }  // namespace tzconvert

@@ -13,6 +13,8 @@ struct Converted {
     std::wstring text;
     // Of markup that is written: what the options said, and whether stacks were seen.
     MarkupFindings found;
+    // Of RTF that was read.
+    RtfLosses losses;
 };
 
 // Gives `text` up as soon as it is read. The result is that of a new session: the font tables are

@@ -13,39 +13,40 @@ void appendCount(std::string& text, int count, char const* one, char const* seve
     text += (text.empty() ? "" : ", ") + std::to_string(count) + " " + (count == 1 ? one : several);
 }
 
-void tellWhatIsLeftOut(std::string const& file, tzhost::NormalisedRtf const& rtf) {
+void addWhatIsLeftOut(Warnings& warnings, tzhost::NormalisedRtf const& rtf) {
     std::string counts;
     appendCount(counts, rtf.pictures, "picture", "pictures");
     appendCount(counts, rtf.notes, "note", "notes");
     appendCount(counts, rtf.headers, "header or footer", "headers and footers");
-    tell(shownName(file) + ": left out: " + counts);
+    if (!counts.empty()) warnings.push_back("left out: " + counts);
 }
 
-Failure normalise(std::string const& file, std::string& document) {
+Failure normalise(std::string const& file, std::string& document, Warnings& warnings) {
     tzhost::NormalisedRtf rtf;
     {
         std::string bytes;
         if (Failure failure = readBytes(file, bytes)) return failure;
+        addLook(warnings, Direction::normalise, bytes);
         rtf = tzhost::normaliseRtf(bytes);
     }
-    if (!rtf.isComplete()) tellWhatIsLeftOut(file, rtf);
+    addWhatIsLeftOut(warnings, rtf);
     document = std::move(rtf.document);
     return {};
 }
 
 }  // namespace
 
-Failure readNormalised(std::string const& file, std::wstring& text) {
+Failure readNormalised(std::string const& file, std::wstring& text, Warnings& warnings) {
     std::string document;
-    if (Failure failure = normalise(file, document)) return failure;
+    if (Failure failure = normalise(file, document, warnings)) return failure;
     text.reserve(document.size());
     (void)decodeText(document, text);  // it is UTF-8 without zeros
     return {};
 }
 
-Failure normaliseFile(std::string const& file, std::string const& target) {
+Failure normaliseFile(std::string const& file, std::string const& target, Warnings& warnings) {
     std::string document;
-    if (Failure failure = normalise(file, document)) return failure;
+    if (Failure failure = normalise(file, document, warnings)) return failure;
     return writeBytes(target, document);
 }
 

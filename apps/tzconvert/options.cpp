@@ -1,22 +1,26 @@
 #include "apps/tzconvert/options.h"
 
 #include <CLI/CLI.hpp>
+#include <algorithm>
 #include <cmath>
 #include <limits>
 #include <sstream>
 
 #include "apps/options/option_list.h"
 #include "apps/tzconvert/streams.h"
+#include "host/text/near_words.h"
+#include "host/text/utf8.h"
 
 namespace tzconvert {
 namespace {
 
 constexpr char kPurpose[] = "Converts MTEXT markup to RTF and RTF to MTEXT markup.";
 constexpr char kFooter[] =
+    "Help on a command: tzconvert help COMMAND.\n"
     "Without FILE, or with \"-\", standard input is read; input is UTF-8 and taken byte for\n"
     "byte, and any bytes where RTF is normalised.\n"
-    "Exit status: 0 done; 2 wrong usage, an unusable file, or input that is not UTF-8 or holds a\n"
-    "zero character, of which nothing is written.";
+    "Exit status: 0 done; 1 a warning under --werror; 2 wrong usage, an unusable file, or input\n"
+    "that is not UTF-8 or holds a zero character, of which nothing is written.";
 
 struct DirectionRow {
     char const* name;
@@ -154,7 +158,10 @@ void declareFiles(CLI::App& app, Options& options) {
     app.add_option("--font-map", options.fontMap, "a font map file in place of the shipped one")
         ->type_name("FILE")
         ->check(aName());
-    auto* const output = app.add_option("--output", options.output, "write there")
+    app.add_flag(
+        "-r,--recursive", options.isRecursive,
+        "a folder stands for the files in it and below it, which keep their places in DIR");
+    auto* const output = app.add_option("-o,--output", options.output, "write there")
                              ->type_name("FILE")
                              ->check(aName());
     app.add_option("--output-dir", options.outputDir, "write each FILE's result into that folder")
@@ -165,6 +172,8 @@ void declareFiles(CLI::App& app, Options& options) {
     app.add_option("--report", options.report, "write what the conversion found as JSON")
         ->type_name("FILE")
         ->check(aName());
+    app.add_flag("-q,--quiet", options.isQuiet, "no warnings and no summary");
+    app.add_flag("--werror", options.warningsAreErrors, "warnings end with status 1");
 }
 
 void declare(CLI::App& app, Options& options) {
@@ -188,22 +197,57 @@ void declare(CLI::App& app, Options& options) {
 void checkTogether(Options const& options) {
     if (options.files.size() > 1 && options.outputDir.empty())
         throw CLI::ValidationError("FILE", "several of them need --output-dir");
+    if (options.isRecursive && options.outputDir.empty())
+        throw CLI::ValidationError("--recursive", "it needs --output-dir");
     bool const isTextOnOutput = options.outputDir.empty() && options.output.empty();
     if (isTextOnOutput && options.report == "-")
         throw CLI::ValidationError("--report", "the result goes there");
 }
 
-// What is wrong, in a line.
-std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
-    std::vector<std::string> const rest = app.remaining();
-    if (!app.get_subcommands().empty()) {
-        return rest.empty() ? wrong.what()
-                            : "options stand after the command, not \"" + rest.front() + "\"";
+constexpr char kHelp[] = "help";
+
+std::vector<std::wstring> commandNames() {
+    std::vector<std::wstring> names = {tzhost::fromUtf8(kHelp), L"--help", L"--version"};
+    for (DirectionRow const& row : kDirections)
+        names.push_back(tzhost::fromUtf8(row.name));
+    return names;
+}
+
+// The options of a command, with their dashes.
+std::vector<std::wstring> optionNames(CLI::App const& command) {
+    std::vector<std::wstring> names;
+    for (CLI::Option const* const option : command.get_options()) {
+        for (std::string const& name : option->get_lnames())
+            names.push_back(tzhost::fromUtf8("--" + name));
     }
+    return names;
+}
+
+// "; did you mean ...?", or nothing when no word is near.
+std::string nearMiss(std::string const& typed, std::vector<std::wstring> const& words) {
+    std::wstring const near = tzhost::nearestWord(tzhost::fromUtf8(typed), words);
+    return near.empty() ? "" : "; did you mean " + tzhost::toUtf8(near) + "?";
+}
+
+// What is wrong with the first word, which should be a command.
+std::string explainCommand(std::vector<std::string> const& rest) {
     std::string text = "expected";
     for (DirectionRow const& row : kDirections)
         text += std::string(&row == kDirections ? " " : ", ") + row.name;
-    return rest.empty() ? text : text + ", not \"" + rest.front() + "\"";
+    if (rest.empty()) return text;
+    return text + ", not \"" + rest.front() + "\"" + nearMiss(rest.front(), commandNames());
+}
+
+// What is wrong, in a line.
+std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
+    std::vector<std::string> const rest = app.remaining();
+    if (app.get_subcommands().empty()) return explainCommand(rest);
+    if (!rest.empty()) return "options stand after the command, not \"" + rest.front() + "\"";
+    CLI::App const& command = *app.get_subcommands().front();
+    std::vector<std::string> const unknown = command.remaining();
+    if (unknown.empty()) return wrong.what();
+    std::string const option = unknown.front().substr(0, unknown.front().find('='));
+    return wrong.what() + nearMiss(option, optionNames(command));
 }
 
 // What was asked of the program itself, and the exit status after it.
@@ -213,7 +257,30 @@ int printAnswer(std::string const& text) {
     return failure ? kUnusable : kDone;
 }
 
+bool isCommand(std::string_view name) {
+    return std::any_of(std::begin(kDirections), std::end(kDirections),
+                       [&](DirectionRow const& row) { return name == row.name; });
+}
+
+// The words of the command line: "help COMMAND" stands for "COMMAND --help". Nothing when help is
+// wanted on what is no command, which is said.
+std::optional<std::vector<char const*>> wordsOf(int count, char const* const* arguments) {
+    std::vector<char const*> words(arguments, arguments + count);
+    if (words.size() < 2 || std::string_view(words[1]) != kHelp) return words;
+    words.erase(words.begin() + 1);
+    if (words.size() > 1 && !isCommand(words[1])) {
+        tell(explainCommand({words[1]}) + "; try --help");
+        return std::nullopt;
+    }
+    words.push_back("--help");
+    return words;
+}
+
 }  // namespace
+
+bool readsRtf(Direction direction) {
+    return direction == Direction::toMtext || direction == Direction::normalise;
+}
 
 char const* endingOf(Direction direction) {
     for (DirectionRow const& row : kDirections)
@@ -224,15 +291,20 @@ char const* endingOf(Direction direction) {
 ParsedOptions parseOptions(int count, char const* const* arguments) {
     CLI::App app(kPurpose, "tzconvert");
     app.footer(kFooter);
-    app.set_version_flag("--version", "tzconvert 1.0");
+    app.set_version_flag("-v,--version", "tzconvert 1.0");
     ParsedOptions parsed;
     declare(app, parsed.options);
     if (auto const list = tzapps::optionList(app, count, arguments)) {
         parsed.exit = printAnswer(*list);
         return parsed;
     }
+    auto const words = wordsOf(count, arguments);
+    if (!words) {
+        parsed.exit = kUnusable;
+        return parsed;
+    }
     try {
-        app.parse(count, arguments);
+        app.parse(static_cast<int>(words->size()), words->data());
         if (parsed.options.output == "-") parsed.options.output.clear();
         if (parsed.options.files.empty()) parsed.options.files.push_back("-");
         checkTogether(parsed.options);

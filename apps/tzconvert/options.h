@@ -9,16 +9,22 @@ namespace tzconvert {
 
 // Exit statuses.
 inline constexpr int kDone = 0;
+inline constexpr int kWarned = 1;    // a warning under --werror
 inline constexpr int kUnusable = 2;  // wrong usage, an unusable file, or input that was refused
 
 enum class Direction { toRtf, toMtext, roundTrip, normalise };
 
 // The ending of the name of a result, with its dot.
 [[nodiscard]] char const* endingOf(Direction direction);
+// Whether a conversion reads RTF; the others read markup.
+[[nodiscard]] bool readsRtf(Direction direction);
 
 struct Options {
     Direction direction = Direction::toRtf;
     std::vector<std::string> files;  // at least one; "-" is standard input
+    bool isRecursive = false;        // a folder stands for the files in it and below it
+    bool isQuiet = false;            // errors alone are told
+    bool warningsAreErrors = false;
 
     // The text style's font: a face, or a file when there is none.
     std::string face;

@@ -8,16 +8,15 @@ namespace tzconvert {
 
 namespace fs = std::filesystem;
 
-std::string targetOf(Options const& options, std::string const& file) {
+std::string targetOf(Options const& options, Input const& input) {
     if (options.outputDir.empty()) return options.output;
-    fs::path name = file == "-" ? fs::path("stdin") : fs::path(file).filename();
-    name.replace_extension(endingOf(options.direction));
-    return (fs::path(options.outputDir) / name).string();
+    return (fs::path(options.outputDir) / input.result).string();
 }
 
-Places::Places(Options const& options) : options_(options) {
-    for (std::string const& file : options.files)
-        inputs_.insert(placeOf(file == "-" ? "/dev/stdin" : file));
+Places::Places(Options const& options, std::vector<Input> const& inputs)
+    : options_(options), files_(inputs) {
+    for (Input const& each : inputs)
+        inputs_.insert(placeOf(each.file == "-" ? "/dev/stdin" : each.file));
     if (!options.fontMap.empty()) inputs_.insert(placeOf(options.fontMap));
 }
 
@@ -33,10 +32,9 @@ Failure Places::checkReport() const {
     if (options_.report.empty() || options_.report == "-") return {};
     Place const place = placeOf(options_.report);
     if (inputs_.count(place) != 0) return "--report " + options_.report + ": it is an input";
-    bool const isTarget =
-        std::any_of(options_.files.begin(), options_.files.end(), [&](std::string const& file) {
-            return placeOf(targetOf(options_, file)) == place;
-        });
+    bool const isTarget = std::any_of(files_.begin(), files_.end(), [&](Input const& input) {
+        return placeOf(targetOf(options_, input)) == place;
+    });
     if (isTarget) return "--report " + options_.report + ": a result goes there";
     return {};
 }

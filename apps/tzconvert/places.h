@@ -6,6 +6,7 @@
 #include <set>
 #include <string>
 
+#include "apps/tzconvert/inputs.h"
 #include "apps/tzconvert/options.h"
 #include "apps/tzconvert/streams.h"
 
@@ -13,14 +14,14 @@ namespace tzconvert {
 
 // Where a file's result goes: in a folder, under its own name with the ending of the result. Empty
 // for standard output.
-[[nodiscard]] std::string targetOf(Options const& options, std::string const& file);
+[[nodiscard]] std::string targetOf(Options const& options, Input const& input);
 
 // What a run reads and has written. Nothing takes the place of an input, whatever its name there:
 // of a file that is converted, of what standard input comes from, or of the font map. No result
 // takes the place of another, and the report of none.
 class Places {
 public:
-    explicit Places(Options const& options);
+    Places(Options const& options, std::vector<Input> const& inputs);
 
     [[nodiscard]] Failure checkReport() const;
     [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) const;
@@ -32,6 +33,7 @@ private:
     [[nodiscard]] static Place placeOf(std::string const& file);
 
     Options const& options_;
+    std::vector<Input> const& files_;
     std::set<Place> inputs_;
     std::set<Place> targets_;  // the results that were written
 };

@@ -26,6 +26,7 @@ MarkupFindings findingsOf(CMTextToRichTextContext const& context) {
     found.wholeText = {context.GetTracking(), context.GetCharWidth(), context.GetOblique(),
                        context.GetBaseAlignment()};
     found.incidents = context.GetIncidents();
+    found.incidentCounts = context.incidentCounts();
     found.stacksSeen = context.StacksSeen();
     found.minFontSize = context.GetMinFontSize();
     found.maxFontSize = context.GetMaxFontSize();
@@ -81,7 +82,7 @@ WrittenMarkup toMarkup(ConversionTables const& tables,
     setUp(context, start, values);
     context.SetOptions(options);
     CStdStrW markup = context.parseOnce(rtf);
-    return {std::move(markup), context.StackSeen()};
+    return {std::move(markup), context.StackSeen(), context.losses()};
 }
 
 ConversionSession::ConversionSession(TextStart start) : start_(std::move(start)) {

@@ -67,6 +67,7 @@ struct WholeText {
 struct MarkupFindings {
     WholeText wholeText;
     unsigned int incidents = 0;  // bits of ConversionIncident
+    IncidentCounts incidentCounts;
     bool stacksSeen = false;
     int minFontSize = 0;
     int maxFontSize = 0;
@@ -82,6 +83,7 @@ struct WrittenRtf {
 struct WrittenMarkup {
     CStdStrW markup;
     bool stacksSeen = false;
+    RtfLosses losses;
 };
 
 // `rgb`, with its lowest bit flipped when it equals `other`. For the colours of ByLayer and

@@ -7,6 +7,7 @@
 #include "module/markup/shared/rtf_font_table.h"
 #include "module/markup/shared/string_stream.h"
 #include "module/markup/write_markup/font_state.h"
+#include "module/markup/write_markup/rtf_losses.h"
 #include "tz/text/code_page.h"
 
 class CMTextFontMapDatabase;
@@ -64,6 +65,8 @@ public:
 
     // Whether the text held a `\S`, which stacks begin with.
     [[nodiscard]] bool StackSeen() const { return m_bStackSeen; }
+    // What was passed over so far.
+    [[nodiscard]] RtfLosses const& losses() const { return losses_; }
 
     // The control word after a backslash and its number, kNoValue without one; a view of the text.
     [[nodiscard]] static std::wstring_view GetToken(wchar_t const*& cursor, int& value);
@@ -148,6 +151,7 @@ private:
     bool m_bCharEmitted = false;    // in the present group
     ParagraphSettings m_paragraph;  // as last written; not undone by a group's end
 
+    RtfLosses losses_;
     std::deque<Level> levels_;  // the groups around the present one
     ParagraphLookAhead paragraphs_;
     CStdStrW codes_;  // used again for each change

@@ -28,7 +28,10 @@ void CRichTextToMTextContext::Convert(wchar_t const* cursor) {
         switch (step.kind) {
         case RtfStep::end: isOpen = false; break;
         case RtfStep::open: onGroup(skipsDestination, isBehindFirst); break;
-        case RtfStep::close: isOpen = onGroupEnd(skipsDestination, isBehindFirst); break;
+        case RtfStep::close:
+            isOpen = onGroupEnd(skipsDestination, isBehindFirst);
+            if (!isOpen) losses_.hasTextBehindEnd = isMoreThanBlank(cursor);
+            break;
         case RtfStep::word:
             onWord(cursor, step, skipsDestination, isBehindFirst);
             isBehindFirst = true;
@@ -79,7 +82,11 @@ void CRichTextToMTextContext::onWord(wchar_t const*& cursor,
                                      bool isBehindFirst) {
     if (HandleToken(cursor, step.name, step.value)) return;
     bool const isOpening = !isBehindFirst && !m_bCharEmitted;
+    wchar_t const* const rest = cursor;
     if (skipsDestination || isOpening) IgnoreToMatchingBrace(cursor);
+    if (skipsDestination) return;  // the document says that this may be dropped
+    losses_.unknownWords.note(step.name);
+    if (isOpening && isTextLost(step.name, rest, cursor)) losses_.texts.note(step.name);
 }
 
 // The character after a backslash: all but a few stand for themselves.

@@ -32,6 +32,12 @@ CMTextToRichTextContext::CMTextToRichTextContext(CMTextFontMapDatabase* fontMap,
 
 CMTextToRichTextContext::~CMTextToRichTextContext() = default;
 
+void CMTextToRichTextContext::ReportIncident(unsigned int incident) {
+    if (incident == 0) return;
+    m_nIncidents |= incident;
+    incidentCounts_.note(incident);
+}
+
 void CMTextToRichTextContext::SetInitialFontName(
     wchar_t const* name, bool bold, bool italic, Charset charset, int pitchAndFamily) {
     auto const* const entry =

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <bit>
 #include <memory>
 #include <string>
 #include <string_view>
@@ -29,6 +30,19 @@ enum ConversionIncident : unsigned int {
     kFaceWithoutFile = 0x200,        // a face that no file is known of
     kUnknownCode = 0x40000000,       // kept as text
     kStackWithoutSign = 0x80000000,  // `\S` without a sign of a stack, kept as text
+};
+
+// How often each incident was met.
+class IncidentCounts {
+public:
+    void note(unsigned int incident) { ++counts_[placeOf(incident)]; }
+    [[nodiscard]] int of(ConversionIncident incident) const { return counts_[placeOf(incident)]; }
+
+private:
+    static std::size_t placeOf(unsigned int incident) {
+        return static_cast<std::size_t>(std::countr_zero(incident));
+    }
+    std::array<int, 32> counts_{};
 };
 
 // Reads MTEXT markup in one pass and writes it as an RTF document: text, fonts, sizes, colours,
@@ -74,7 +88,10 @@ public:
     [[nodiscard]] unsigned int GetIncidents() const { return m_nIncidents; }
     // Whether all bits of the mask are set.
     [[nodiscard]] bool IsIncident(unsigned int mask) const { return (m_nIncidents & mask) == mask; }
-    void ReportIncident(unsigned int incident) { m_nIncidents |= incident; }
+    // One incident, or 0 for none.
+    void ReportIncident(unsigned int incident);
+    // How often each was reported.
+    [[nodiscard]] IncidentCounts const& incidentCounts() const { return incidentCounts_; }
     [[nodiscard]] bool StacksSeen() const { return m_bStacksSeen; }
 
     // Whole-text values.
@@ -197,6 +214,7 @@ private:
     bool m_bBold = false;
     bool m_bItalic = false;
     unsigned int m_nIncidents = 0;
+    IncidentCounts incidentCounts_;
     double m_dTracking = 1.0;
     double m_dCharWidth = 1.0;
     double m_dOblique = 0.0;

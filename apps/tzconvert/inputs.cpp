@@ -1,0 +1,82 @@
+#include "apps/tzconvert/inputs.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace tzconvert {
+namespace {
+
+namespace fs = std::filesystem;
+
+// Whether a name has an ending of what is read.
+bool isOne(Direction direction, fs::path const& file) {
+    std::string ending = file.extension().string();
+    for (char& c : ending) {
+        if (c >= 'A' && c <= 'Z') c = static_cast<char>(c - 'A' + 'a');
+    }
+    return readsRtf(direction) ? ending == ".rtf" : ending == ".mtext" || ending == ".txt";
+}
+
+class Walk {
+public:
+    Walk(Direction direction, Inputs& inputs) : direction_(direction), inputs_(inputs) {}
+
+    void through(fs::path const& root) {
+        folders_.push_back(root);
+        while (!folders_.empty()) {
+            fs::path const folder = std::move(folders_.back());
+            folders_.pop_back();
+            look(root, folder);
+        }
+    }
+
+private:
+    // Files before the folders below, each by name.
+    void look(fs::path const& root, fs::path const& folder) {
+        std::vector<fs::path> files;
+        std::vector<fs::path> below;
+        std::error_code problem;
+        for (fs::directory_iterator at(folder, problem), end; !problem && at != end;
+             at.increment(problem)) {
+            if (at->path().filename().string().starts_with('.')) continue;
+            std::error_code unseen;  // such an entry is neither
+            if (at->is_directory(unseen)) {
+                if (!at->is_symlink(unseen)) below.push_back(at->path());
+            } else if (isOne(direction_, at->path())) {
+                files.push_back(at->path());
+            }
+        }
+        if (problem) {
+            inputs_.failures.push_back(folder.string() + ": cannot be read: " + problem.message());
+        }
+        std::sort(files.begin(), files.end());
+        for (fs::path const& file : files)
+            inputs_.files.push_back({file.string(), file.lexically_relative(root)});
+        std::sort(below.begin(), below.end(), std::greater<>());
+        folders_.insert(folders_.end(), below.begin(), below.end());
+    }
+
+    Direction direction_;
+    Inputs& inputs_;
+    std::vector<fs::path> folders_;  // still to be looked at, the next one last
+};
+
+}  // namespace
+
+Inputs inputsOf(Options const& options) {
+    Inputs inputs;
+    Walk walk(options.direction, inputs);
+    for (std::string const& file : options.files) {
+        std::error_code unseen;  // will be named when it is read
+        if (options.isRecursive && fs::is_directory(file, unseen)) {
+            walk.through(file);
+        } else {
+            inputs.files.push_back({file, file == "-" ? "stdin" : fs::path(file).filename()});
+        }
+    }
+    for (Input& each : inputs.files)
+        each.result.replace_extension(endingOf(options.direction));
+    return inputs;
+}
+
+}  // namespace tzconvert
