@@ -13,10 +13,11 @@ namespace {
 namespace fs = std::filesystem;
 
 constexpr std::string_view kMark = ".tz-part-";
-constexpr std::string_view kPattern = "XXXXXX";
-constexpr std::size_t kLongestName = 255;  // of a file in its folder
+constexpr std::string_view kPlaces = "0123";
+constexpr std::string_view kPattern = "XXXXXX";  // when all places are taken
+constexpr std::size_t kLongestName = 255;        // of a file in its folder
 
-// The name up to the random part. A name that would get too long is cut.
+// The name up to the place. A name that would get too long is cut.
 std::string prefixOf(fs::path const& target) {
     std::size_t const room = kLongestName - 1 - kMark.size() - kPattern.size();
     return '.' + target.filename().string().substr(0, room) + std::string(kMark);
@@ -33,37 +34,52 @@ bool isStillThere(int file) {
 }
 
 // Where locks do not work nothing is removed.
-void removeIfLeft(fs::path const& file) {
+void removeIfLeft(std::string const& file) {
     int const handle = open(file.c_str(), O_RDWR | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
     if (handle < 0) return;
     if (flock(handle, LOCK_EX | LOCK_NB) == 0) (void)unlink(file.c_str());  // a try is enough
     (void)close(handle);
 }
 
-}  // namespace
+// Whether the new file is this save's; else another one removes it.
+bool isOwn(int file) {
+    return !isLocked(file) && isStillThere(file);
+}
 
-int makePartFile(fs::path const& target, std::string& name) {
-    std::string const pattern =
-        (target.parent_path() / (prefixOf(target) + std::string(kPattern))).string();
+// With a name that nobody has. The descriptor, or -1 and errno.
+int makeBesideAll(std::string const& prefix, std::string& name) {
     for (;;) {
-        name = pattern;
+        name = prefix + std::string(kPattern);
         int const file = mkostemp(name.data(), O_CLOEXEC);
-        if (file < 0) name.clear();
-        if (file < 0 || (!isLocked(file) && isStillThere(file))) return file;
-        (void)close(file);  // the other save removes it
+        if (file < 0 || isOwn(file)) return file;
+        (void)close(file);
     }
 }
 
-void removeLeftPartFiles(fs::path const& target) {
-    std::string const prefix = prefixOf(target);
-    std::size_t const length = prefix.size() + kPattern.size();
-    fs::path const folder = target.has_parent_path() ? target.parent_path() : ".";
-    std::error_code problem;  // a folder that cannot be read keeps what is left in it
-    for (fs::directory_iterator each(folder, problem), end; !problem && each != end;
-         each.increment(problem)) {
-        std::string const name = each->path().filename().string();
-        if (name.size() == length && name.starts_with(prefix)) removeIfLeft(each->path());
+// At the first free place. The descriptor, or -1 and errno: EEXIST when all are taken.
+int makeAtAPlace(std::string const& prefix, std::string& name) {
+    for (char const place : kPlaces) {
+        name = prefix + place;
+        int const file =
+            open(name.c_str(), O_RDWR | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, 0600);
+        if (file < 0 && errno != EEXIST) return file;
+        if (file >= 0 && isOwn(file)) return file;
+        if (file >= 0) (void)close(file);
     }
+    errno = EEXIST;
+    return -1;
+}
+
+}  // namespace
+
+int makePartFile(fs::path const& target, std::string& name) {
+    std::string const prefix = (target.parent_path() / prefixOf(target)).string();
+    for (char const place : kPlaces)
+        removeIfLeft(prefix + place);
+    int file = makeAtAPlace(prefix, name);
+    if (file < 0 && errno == EEXIST) file = makeBesideAll(prefix, name);
+    if (file < 0) name.clear();
+    return file;
 }
 
 }  // namespace tzhost

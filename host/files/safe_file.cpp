@@ -102,7 +102,6 @@ SafeFile::SafeFile(std::filesystem::path const& target, IfReadOnly ifReadOnly)
 }
 
 void SafeFile::makePart(struct stat const* old) {
-    removeLeftPartFiles(target_);
     file_ = makePartFile(target_, part_);
     if (file_ < 0) {
         (void)fail();

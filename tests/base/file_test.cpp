@@ -112,7 +112,7 @@ TEST_F(FileBytes, StayOldWhenTheyCannotBeWritten) {
 TEST_F(FileBytes, LeaveNoUnfinishedFileButThatOfAnotherSave) {
     std::string const longest(255, 'n');
     for (std::string const& name : {std::string("plan.json"), longest}) {
-        std::string const left = path(('.' + name.substr(0, 239) + ".tz-part-aaaaaa").c_str());
+        std::string const left = path(('.' + name.substr(0, 239) + ".tz-part-2").c_str());
         ASSERT_TRUE(tzhost::writeFileSafely(left, "unfinished"));
         tzhost::SafeFile other(path(name.c_str()));
         EXPECT_FALSE(fs::exists(left));
