@@ -7,6 +7,7 @@
 #include <sstream>
 
 #include "apps/options/option_list.h"
+#include "apps/tzdraft/page_options.h"
 #include "host/text/visible_text.h"
 
 namespace tzdraft {
@@ -51,9 +52,10 @@ void declare(CLI::App& app, Options& options) {
     app.add_flag("--quiet", options.isQuiet, "keep the transcript of a script to errors");
     declareFile(app, "--save", options.save, "write the drawing at the end");
     declareFile(app, "--svg", options.svg,
-                "plot the active space at the end, fitted to its extents");
+                "plot the active space at the end, fitted to its extents or on its page");
     declareFile(app, "--png", options.png, "the same as a PNG picture");
     declareFile(app, "--pdf", options.pdf, "the same as a PDF page");
+    declarePage(app, options);
     app.add_option("--var", options.variables,
                    "set a system variable for this run (repeatable; points as x,y,z)")
         ->type_name("NAME=VALUE")
@@ -101,6 +103,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     }
     try {
         app.parse(count, arguments);
+        checkPage(parsed.options);
     } catch (CLI::Success const& asked) {  // --help, --version
         std::ostringstream text;
         app.exit(asked, text);

@@ -5,6 +5,9 @@
 #include <string>
 #include <vector>
 
+#include "host/display/plot.h"
+#include "host/page/page.h"
+
 // What the program was told on its command line.
 namespace tzdraft {
 
@@ -21,6 +24,8 @@ struct Options {
     std::filesystem::path svg;
     std::filesystem::path png;
     std::filesystem::path pdf;
+    tzhost::PageChoice page;  // of the plots
+    tzhost::PlotSpace space = tzhost::PlotSpace::active;
     std::vector<std::string> variables;  // NAME=VALUE
     std::filesystem::path fontMap;
     std::string locale;

@@ -169,6 +169,7 @@ bool Run::begin() {
     tzhost::addCommandHooks({[this](tzhost::Command const& command) { beginCommand(command); },
                              [this](tzhost::Command const& command) { endCommand(command); }});
     session_.setModule(modulePath(options_));
+    session_.setPlotting(options_.page, options_.space);
     if (!options_.save.empty()) session_.saveAtEnd();
     if (!openDrawing()) return false;
     if (!options_.faults.empty()) faults_.install();
@@ -309,9 +310,12 @@ void Run::writeResults() {
     for (Plot const& plot :
          {Plot{options_.svg, tzhost::PlotFormat::svg}, Plot{options_.png, tzhost::PlotFormat::png},
           Plot{options_.pdf, tzhost::PlotFormat::pdf}}) {
+        std::vector<std::string> remarks;
         writeResult(plot.file, [&](std::string& error) {
-            return session_.plotAs(plot.format, plot.file, error);
+            return session_.plotAs(plot.format, plot.file, error, remarks);
         });
+        for (std::string const& each : remarks)
+            complain(each);
     }
 }
 

@@ -19,13 +19,13 @@ namespace {
 ProgramSession* running = nullptr;
 
 struct PlotEnding {
-    char const* ending;
+    wchar_t const* ending;
     tzhost::PlotFormat format;
 };
 constexpr std::array kPlotEndings{
-    PlotEnding{".svg", tzhost::PlotFormat::svg},
-    PlotEnding{".png", tzhost::PlotFormat::png},
-    PlotEnding{".pdf", tzhost::PlotFormat::pdf},
+    PlotEnding{L".svg", tzhost::PlotFormat::svg},
+    PlotEnding{L".png", tzhost::PlotFormat::png},
+    PlotEnding{L".pdf", tzhost::PlotFormat::pdf},
 };
 
 // Drawings that undo can bring back.
@@ -152,23 +152,34 @@ bool ProgramSession::save(std::filesystem::path const& file,
     return true;
 }
 
-bool ProgramSession::plot(std::filesystem::path const& file, std::string& error) const {
-    auto const at =
-        std::find_if(kPlotEndings.begin(), kPlotEndings.end(),
-                     [&](PlotEnding const& each) { return file.extension() == each.ending; });
+void ProgramSession::setPlotting(tzhost::PageChoice const& page, tzhost::PlotSpace space) {
+    page_ = page;
+    space_ = space;
+}
+
+bool ProgramSession::plot(std::filesystem::path const& file,
+                          std::string& error,
+                          std::vector<std::string>& remarks) const {
+    TzString ending = TzString::fromUtf8(file.extension().string());
+    ending.makeLower();
+    auto const at = std::find_if(kPlotEndings.begin(), kPlotEndings.end(),
+                                 [&](PlotEnding const& each) { return ending == each.ending; });
     if (at == kPlotEndings.end()) {
         error = file.string() + ": " + localText("a plot's name ends in .svg, .png or .pdf");
         return false;
     }
-    return plotAs(at->format, file, error);
+    return plotAs(at->format, file, error, remarks);
 }
 
 bool ProgramSession::plotAs(tzhost::PlotFormat format,
                             std::filesystem::path const& file,
-                            std::string& error) const {
-    auto const problem = tzhost::plotDrawing(*drawing_, format, file.string());
-    if (problem) error = *problem;
-    return !problem;
+                            std::string& error,
+                            std::vector<std::string>& remarks) const {
+    tzhost::PlotReport const report =
+        tzhost::plotDrawing(*drawing_, {format, file.string(), page_, space_});
+    remarks = report.remarks;
+    if (report.problem) error = *report.problem;
+    return !report.problem;
 }
 
 TzString ProgramSession::moduleName() const {

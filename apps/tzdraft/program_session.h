@@ -37,11 +37,18 @@ public:
     [[nodiscard]] bool save(std::filesystem::path const& file,
                             std::string& error,
                             tzhost::IfReadOnly ifReadOnly = tzhost::IfReadOnly::refuse);
-    // The active space as a picture; the file's ending (.svg, .png, .pdf) says which.
-    [[nodiscard]] bool plot(std::filesystem::path const& file, std::string& error) const;
+    // What stands above the drawing's page in each plot, and the space that is plotted.
+    void setPlotting(tzhost::PageChoice const& page, tzhost::PlotSpace space);
+    // The drawing as a picture; the file's ending (.svg, .png, .pdf, in any case) says which.
+    // `remarks` are lines about what the picture lacks.
+    [[nodiscard]] bool plot(std::filesystem::path const& file,
+                            std::string& error,
+                            std::vector<std::string>& remarks) const;
     // The same with the kind of picture given.
-    [[nodiscard]] bool
-    plotAs(tzhost::PlotFormat format, std::filesystem::path const& file, std::string& error) const;
+    [[nodiscard]] bool plotAs(tzhost::PlotFormat format,
+                              std::filesystem::path const& file,
+                              std::string& error,
+                              std::vector<std::string>& remarks) const;
     // The open drawing; there is always one once makeNew or open was called.
     [[nodiscard]] tzhost::Drawing& drawing() const { return *drawing_; }
 
@@ -101,6 +108,8 @@ private:
     std::vector<std::function<void()>> postponed_;
     std::set<std::filesystem::path> ownFiles_;
     std::filesystem::path module_;
+    tzhost::PageChoice page_;
+    tzhost::PlotSpace space_ = tzhost::PlotSpace::active;
     bool isInCommand_ = false;
     bool wantsToEnd_ = false;
     bool savesAtEnd_ = false;

@@ -4,11 +4,13 @@
 #include <deque>
 #include <filesystem>
 #include <memory>
+#include <optional>
 #include <string>
 #include <unordered_map>
 
 #include "host/database/object_record.h"
 #include "host/database/undo_log.h"
+#include "host/page/page.h"
 #include "tz/db/database.h"
 #include "tz/db/host_services.h"
 
@@ -42,6 +44,7 @@ struct DrawingSettings {
     bool workingSetExists = false;
     bool workingSetActive = false;
     double workingAngle = 0.0;
+    std::optional<Page> page;  // nothing: plots are not on paper
 
     [[nodiscard]] bool isSameAs(DrawingSettings const& other) const;
 };

@@ -30,7 +30,8 @@ bool DrawingSettings::isSameAs(DrawingSettings const& other) const {
     return textStyle == other.textStyle && layer == other.layer &&
            modelSystem.isSameAs(other.modelSystem) && paperSystem.isSameAs(other.paperSystem) &&
            workingSetExists == other.workingSetExists &&
-           workingSetActive == other.workingSetActive && workingAngle == other.workingAngle;
+           workingSetActive == other.workingSetActive && workingAngle == other.workingAngle &&
+           page == other.page;
 }
 
 void Drawing::setSettings(DrawingSettings const& settings) {

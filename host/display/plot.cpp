@@ -1,48 +1,185 @@
 #include "host/display/plot.h"
 
+#include <algorithm>
+#include <array>
 #include <new>
+#include <set>
 
 #include "host/base/fault_point.h"
 #include "host/database/drawing.h"
 #include "host/display/draw_pass.h"
+#include "host/display/plot_paint.h"
 #include "host/display/record_access.h"
 #include "host/files/safe_file.h"
+#include "host/page/page_plan.h"
+#include "host/page/page_text.h"
 #include "host/text/local_text.h"
 
 namespace tzhost {
 namespace {
 
-void drawActiveSpace(DrawPass& pass, TzDbDatabase& database) {
-    auto const* const space = objectOf<TzDbBlockTableRecord>(drawingOf(&database)->activeSpace());
-    TzArray<TzDbObjectId> ids;
-    if (space) space->entities(ids);
-    for (TzDbObjectId const& id : ids)
+constexpr double kDotsPerInch = 300.0;
+constexpr double kMostDots = 30'000.0;  // on a side of a picture
+
+struct SpaceToPlot {
+    Space space = Space::model;
+    TzArray<TzDbObjectId> entities;
+};
+
+SpaceToPlot contentsOf(Drawing const& drawing, Space space) {
+    SpaceToPlot result;
+    result.space = space;
+    TzDbObjectId const id = space == Space::paper ? drawing.paperSpace() : drawing.modelSpace();
+    if (auto const* const record = objectOf<TzDbBlockTableRecord>(id))
+        record->entities(result.entities);
+    return result;
+}
+
+// A drawing without anything still gives a page.
+std::vector<SpaceToPlot> spacesOf(Drawing const& drawing, PlotSpace wanted) {
+    switch (wanted) {
+    case PlotSpace::active: return {contentsOf(drawing, activeSpace())};
+    case PlotSpace::model: return {contentsOf(drawing, Space::model)};
+    case PlotSpace::paper: return {contentsOf(drawing, Space::paper)};
+    case PlotSpace::all: break;
+    }
+    std::vector<SpaceToPlot> spaces{contentsOf(drawing, Space::model),
+                                    contentsOf(drawing, Space::paper)};
+    std::erase_if(spaces, [](SpaceToPlot const& each) { return each.entities.isEmpty(); });
+    if (spaces.empty()) spaces.push_back(contentsOf(drawing, Space::model));
+    return spaces;
+}
+
+// The window lies on the world's XY plane; the box around it is what the view shows of it.
+std::optional<PageBox> windowIn(ViewAxes const& axes, std::optional<PageBox> const& window) {
+    if (!window) return std::nullopt;
+    std::array const corners{axes.project(TzGePoint3d(window->left, window->bottom, 0.0)),
+                             axes.project(TzGePoint3d(window->right, window->bottom, 0.0)),
+                             axes.project(TzGePoint3d(window->left, window->top, 0.0)),
+                             axes.project(TzGePoint3d(window->right, window->top, 0.0))};
+    auto const [left, right] = std::minmax_element(
+        corners.begin(), corners.end(), [](auto const& a, auto const& b) { return a.x < b.x; });
+    auto const [bottom, top] = std::minmax_element(
+        corners.begin(), corners.end(), [](auto const& a, auto const& b) { return a.y < b.y; });
+    return PageBox{left->x, bottom->y, right->x, top->y};
+}
+
+class Plot {
+public:
+    Plot(Drawing& drawing, PlotOrder const& order)
+        : drawing_(drawing), order_(order), page_(pageOf(drawing.settings().page, order.page)) {}
+
+    // Whether the pages are there; if not, the report says why.
+    [[nodiscard]] bool make();
+    [[nodiscard]] bool write();
+    [[nodiscard]] PlotReport takeReport() { return std::move(report_); }
+
+private:
+    bool fail(std::string const& why) {
+        report_.problem = order_.file + ": " + why;
+        return false;
+    }
+    [[nodiscard]] bool checkPage();
+    [[nodiscard]] bool addSheet(SpaceToPlot const& space);
+    [[nodiscard]] bool addPaper(PlotScene scene, ViewAxes const& axes);
+    void noteLeftOut(bool hasWindow);
+    void noteLocked(std::set<std::string> const& faces);
+
+    Drawing& drawing_;
+    PlotOrder const& order_;
+    std::optional<Page> page_;
+    std::vector<PlotSheet> sheets_;
+    PlotReport report_;
+};
+
+bool Plot::checkPage() {
+    if (order_.space == PlotSpace::all && order_.format != PlotFormat::pdf)
+        return fail(localText("only a PDF has a page for each space"));
+    if (!page_) return true;
+    if (auto const problem = problemOf(*page_)) return fail(*problem);
+    SheetSize const sheet = sheetOf(*page_);
+    double const dots = std::max(sheet.width, sheet.height) / millimetresOf(PageUnit::inch) *
+                        order_.page.dotsPerInch.value_or(kDotsPerInch);
+    bool const isPicture = order_.format == PlotFormat::png;
+    if (isPicture && dots > kMostDots)
+        return fail(localText("the picture would have more than 30,000 pixels on a side"));
+    return true;
+}
+
+void Plot::noteLeftOut(bool hasWindow) {
+    char const* const what = hasWindow ? forLocalText("what lies outside the window is left out")
+                                       : forLocalText("what lies outside the page is left out");
+    std::string const remark = order_.file + ": " + localText(what);
+    auto& remarks = report_.remarks;
+    if (std::find(remarks.begin(), remarks.end(), remark) == remarks.end())
+        remarks.push_back(remark);
+}
+
+bool Plot::addPaper(PlotScene scene, ViewAxes const& axes) {
+    std::optional<PageBox> const window = windowIn(axes, page_->window);
+    if (window && !makeWindow(window->left, window->bottom, window->right, window->top))
+        return fail(localText("the window is seen from its edge and has no size"));
+    sheets_.push_back(paperSheet(std::move(scene), order_.format, *page_, window,
+                                 order_.page.dotsPerInch.value_or(kDotsPerInch)));
+    if (sheets_.back().shown) noteLeftOut(window.has_value());
+    return true;
+}
+
+bool Plot::addSheet(SpaceToPlot const& space) {
+    DrawPass pass(&drawing_, DrawPass::Entities::strokes);
+    for (TzDbObjectId const& id : space.entities)
         pass.draw(objectOf<TzDbEntity>(id));
+    if (pass.hasTooManyLetters()) return fail(localText("it has more letters than a plot takes"));
+    if (!pass.isWhole()) return fail(localText("its blocks stand for too much to plot"));
+    ViewAxes const axes = viewAxes(space.space);
+    PlotScene scene = makeScene(pass.takeList(), axes);
+    if (page_) return addPaper(std::move(scene), axes);
+    sheets_.push_back(fittedSheet(std::move(scene), order_.format));
+    return true;
+}
+
+bool Plot::make() {
+    if (faultAt("plotDrawing")) return fail(localText("cannot be plotted"));
+    if (!checkPage()) return false;
+    std::vector<SpaceToPlot> const spaces = spacesOf(drawing_, order_.space);
+    return std::all_of(spaces.begin(), spaces.end(),
+                       [&](SpaceToPlot const& each) { return addSheet(each); });
+}
+
+// Each face that had to be left out of the document, with what became of its letters.
+void Plot::noteLocked(std::set<std::string> const& faces) {
+    for (std::string const& face : faces) {
+        report_.remarks.push_back(order_.file + ": " + face + ": " +
+                                  localText("may not be embedded, its letters are outlines"));
+    }
+}
+
+bool Plot::write() {
+    SafeFile target(order_.file);
+    bool written = target.isOpen();
+    ByteTaker const take = [&](std::string_view bytes) {
+        written = written && target.write(bytes);
+        return written;
+    };
+    std::set<std::string> lockedFaces;
+    bool const painted = written && paintPlot(sheets_, order_.format, take, lockedFaces);
+    noteLocked(lockedFaces);
+    if (written && !painted) return fail(localText("the picture could not be made"));
+    if (written && target.commit()) return true;
+    return fail(localText("cannot be written") + ": " + target.reason());
 }
 
 }  // namespace
 
-std::optional<std::string>
-plotDrawing(TzDbDatabase& database, PlotFormat format, std::string const& file) try {
-    if (faultAt("plotDrawing")) return file + ": " + localText("cannot be plotted");
-    DrawPass pass(&database, DrawPass::Entities::strokes);
-    drawActiveSpace(pass, database);
-    if (pass.hasTooManyLetters())
-        return file + ": " + localText("it has more letters than a plot takes");
-    if (!pass.isWhole()) return file + ": " + localText("its blocks stand for too much to plot");
-    PlotScene const scene = makeScene(pass.takeList(), viewAxes(activeSpace()));
-    SafeFile target(file);
-    bool written = target.isOpen();
-    bool const painted = written && paintPlot(scene, format, [&](std::string_view bytes) {
-                             written = written && target.write(bytes);
-                             return written;
-                         });
-    if (written && !painted) return file + ": " + localText("the picture could not be made");
-    if (!written || !target.commit())
-        return file + ": " + localText("cannot be written") + ": " + target.reason();
-    return std::nullopt;
+PlotReport plotDrawing(TzDbDatabase& database, PlotOrder const& order) try {
+    Plot plot(*drawingOf(&database), order);
+    // What is lacking in a plot that is not there is no news.
+    if (!plot.make() || !plot.write()) return {plot.takeReport().problem, {}};
+    return plot.takeReport();
 } catch (std::bad_alloc const&) {
-    return file + ": " + localText("cannot be written") + ": " + localText("memory ran short");
+    return {order.file + ": " + localText("cannot be written") + ": " +
+                localText("memory ran short"),
+            {}};
 }
 
 }  // namespace tzhost

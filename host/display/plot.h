@@ -2,21 +2,37 @@
 
 #include <optional>
 #include <string>
+#include <vector>
 
-#include "host/display/plot_paint.h"
+#include "host/display/plot_sheet.h"
+#include "host/page/page.h"
 
 class TzDbDatabase;
 
 // Plots of the drawing.
 //
-//   if (auto const fault = tzhost::plotDrawing(*database, PlotFormat::svg, "plan.svg"))
-//   say(*fault);
+//   PlotReport const report = tzhost::plotDrawing(*database, {PlotFormat::svg, "plan.svg"});
+//   if (report.problem) say(*report.problem);
 namespace tzhost {
 
-// Plots the active space as it is looked at, fitted to its extents, and writes it whole: a file
-// that is there stays as it was until the new one is complete. Nothing on success, else one line
-// that says what went wrong with which file, without an end.
-[[nodiscard]] std::optional<std::string>
-plotDrawing(TzDbDatabase& database, PlotFormat format, std::string const& file);
+// The active space, one of the two, or each that holds something: a page of a PDF for each.
+enum class PlotSpace { active, model, paper, all };
+
+struct PlotOrder {
+    PlotFormat format = PlotFormat::svg;
+    std::string file;
+    PageChoice page;  // stands above the drawing's own page
+    PlotSpace space = PlotSpace::active;
+};
+
+// Lines without an end, each with the file in it.
+struct PlotReport {
+    std::optional<std::string> problem;  // what went wrong; nothing was written then
+    std::vector<std::string> remarks;    // what the plot lacks
+};
+
+// Plots a space as it is looked at and writes it whole: a file that is there stays as it was until
+// the new one is complete. Without a page the plot is fitted to a page of its own.
+[[nodiscard]] PlotReport plotDrawing(TzDbDatabase& database, PlotOrder const& order);
 
 }  // namespace tzhost

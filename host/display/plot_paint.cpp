@@ -12,9 +12,12 @@
 #include <memory>
 #include <new>
 #include <numeric>
+#include <optional>
 #include <string_view>
 
 #include "host/base/result_time.h"
+#include "host/display/plot_clip.h"
+#include "host/display/plot_text.h"
 
 namespace tzhost {
 namespace {
@@ -27,20 +30,6 @@ struct CairoFree {
     void operator()(cairo_t* cairo) const { cairo_destroy(cairo); }
 };
 using Cairo = std::unique_ptr<cairo_t, CairoFree>;
-
-struct Page {
-    double width;
-    double height;
-    double perMillimetre;  // page units
-    double thinnestLine;   // page units
-};
-// In the order of PlotFormat: pixels of 1/96 inch, and points of 1/72 inch.
-constexpr Page kPages[] = {
-    {1600.0, 900.0, 96.0 / 25.4, 1.0},
-    {1600.0, 900.0, 96.0 / 25.4, 1.0},
-    {841.89, 595.28, 72.0 / 25.4, 0.5},
-};
-constexpr double kMargin = 0.05;  // of the page's smaller side
 
 // What Cairo writes to. Nothing may be thrown through Cairo, so that a failure is kept instead.
 class Output {
@@ -83,7 +72,7 @@ void unnumber(std::string& svg) {
     svg.erase(digits, svg.find('"', digits) - digits);
 }
 
-Surface makeSurface(PlotFormat format, Page const& page, Output& output) {
+Surface makeSurface(PlotFormat format, PlotSheet const& page, Output& output) {
     switch (format) {
     case PlotFormat::svg: {
         Surface surface(
@@ -103,138 +92,138 @@ Surface makeSurface(PlotFormat format, Page const& page, Output& output) {
     }
     case PlotFormat::png: break;
     }
-    return Surface(cairo_image_surface_create(CAIRO_FORMAT_RGB24, static_cast<int>(page.width),
-                                              static_cast<int>(page.height)));
-}
-
-// From the view to the page, whose y runs downwards.
-class PageMapping {
-public:
-    PageMapping(Page const& page, LayoutBox const& extents);
-
-    [[nodiscard]] LayoutPoint place(LayoutPoint const& point) const {
-        return {pageMiddle_.x + (point.x - middle_.x) * scale_,
-                pageMiddle_.y - (point.y - middle_.y) * scale_};
-    }
-    [[nodiscard]] double scale() const { return scale_; }
-
-private:
-    LayoutPoint middle_;
-    LayoutPoint pageMiddle_;
-    double scale_ = 1.0;
-};
-
-PageMapping::PageMapping(Page const& page, LayoutBox const& extents)
-    : middle_{(extents.left + extents.right) / 2.0, (extents.bottom + extents.top) / 2.0},
-      pageMiddle_{page.width / 2.0, page.height / 2.0} {
-    double const margin = 2.0 * kMargin * std::min(page.width, page.height);
-    double const across = (page.width - margin) / extents.width();
-    double const upwards = (page.height - margin) / extents.height();
-    double const fitting = std::min(across, upwards);
-    // A scene that is a single point has no size to fit.
-    if (std::isfinite(fitting)) scale_ = fitting;
+    return Surface(cairo_image_surface_create(CAIRO_FORMAT_RGB24,
+                                              static_cast<int>(std::lround(page.width)),
+                                              static_cast<int>(std::lround(page.height))));
 }
 
 class Painter {
 public:
-    Painter(cairo_t* cairo, Page const& page, PageMapping const& mapping)
-        : cairo_(cairo), page_(page), mapping_(mapping) {}
+    Painter(cairo_t* cairo, PlotSheet const& sheet, TextPainter* text)
+        : cairo_(cairo), sheet_(sheet), text_(text), near_(surroundingsOf(sheet)) {}
 
+    void clip();
     void paint(PlotShape const& shape);
 
 private:
-    [[nodiscard]] bool addPath(std::vector<OutlineStep> const& path);
+    // Nothing for a path that has a coordinate that is not finite.
+    [[nodiscard]] std::optional<std::vector<OutlineStep>>
+    placed(std::vector<OutlineStep> const& path) const;
     [[nodiscard]] bool isTooSmall(PlotShape const& letters) const;
     void paintBaseline(PlotShape const& letters);
-    void addStep(OutlineKind kind, std::array<LayoutPoint, 3> const& at);
-    void setStroke(PlotShape const& shape);
+    void setStroke(PlotShape const& shape, double before);
+    void stroke(PlotShape const& shape, std::vector<OutlineStep> const& path);
 
     cairo_t* cairo_;
-    Page const& page_;
-    PageMapping const& mapping_;
+    PlotSheet const& sheet_;
+    TextPainter* text_;  // null: letters are outlines
+    LayoutBox near_;
 };
 
-void Painter::addStep(OutlineKind kind, std::array<LayoutPoint, 3> const& at) {
-    switch (kind) {
-    case OutlineKind::move: cairo_move_to(cairo_, at[0].x, at[0].y); break;
-    case OutlineKind::line: cairo_line_to(cairo_, at[0].x, at[0].y); break;
-    case OutlineKind::curve:
-        cairo_curve_to(cairo_, at[0].x, at[0].y, at[1].x, at[1].y, at[2].x, at[2].y);
-        break;
-    case OutlineKind::close: cairo_close_path(cairo_); break;
-    }
+// Lines on the edge show in their whole width, when it is the thinnest.
+void Painter::clip() {
+    if (!sheet_.shown) return;
+    LayoutPoint const from = sheet_.place({sheet_.shown->left, sheet_.shown->top});
+    LayoutPoint const to = sheet_.place({sheet_.shown->right, sheet_.shown->bottom});
+    double const edge = sheet_.thinnestLine / 2.0;
+    cairo_rectangle(cairo_, from.x - edge, from.y - edge, to.x - from.x + 2.0 * edge,
+                    to.y - from.y + 2.0 * edge);
+    cairo_clip(cairo_);
 }
 
-bool Painter::addPath(std::vector<OutlineStep> const& path) {
-    cairo_new_path(cairo_);
-    for (OutlineStep const& step : path) {
-        std::array<LayoutPoint, 3> at;
-        std::transform(step.points.begin(), step.points.end(), at.begin(),
-                       [&](auto const& each) { return mapping_.place(each); });
-        bool const isFinite = std::all_of(at.begin(), at.end(), [](LayoutPoint const& each) {
-            return std::isfinite(each.x) && std::isfinite(each.y);
-        });
-        if (!isFinite) return false;
-        addStep(step.kind, at);
+std::optional<std::vector<OutlineStep>>
+Painter::placed(std::vector<OutlineStep> const& path) const {
+    std::vector<OutlineStep> result = path;
+    for (OutlineStep& step : result) {
+        for (LayoutPoint& each : step.points) {
+            each = sheet_.place(each);
+            if (!std::isfinite(each.x) || !std::isfinite(each.y)) return std::nullopt;
+        }
     }
-    return true;
+    return result;
 }
 
-void Painter::setStroke(PlotShape const& shape) {
-    double const width = shape.lineWeight * page_.perMillimetre;
-    cairo_set_line_width(cairo_, std::max(width, page_.thinnestLine));
+void Painter::setStroke(PlotShape const& shape, double before) {
+    double const width = shape.lineWeight * sheet_.perMillimetre;
+    cairo_set_line_width(cairo_, std::max(width, sheet_.thinnestLine));
     cairo_set_line_cap(cairo_, CAIRO_LINE_CAP_ROUND);
     cairo_set_line_join(cairo_, CAIRO_LINE_JOIN_ROUND);
     std::vector<double> dashes = shape.dashes;
     for (double& each : dashes)
-        each *= mapping_.scale();
+        each *= sheet_.scale;
     double const period = std::accumulate(dashes.begin(), dashes.end(), 0.0);
     // Dashes that run into each other, or longer than anything, show as a solid line.
-    bool const isVisible = period > 2.0 * page_.thinnestLine && std::isfinite(period);
-    cairo_set_dash(cairo_, dashes.data(), isVisible ? static_cast<int>(dashes.size()) : 0, 0.0);
+    bool const isVisible = period > 2.0 * sheet_.thinnestLine && std::isfinite(period);
+    // An odd number of dashes goes round twice.
+    cairo_set_dash(cairo_, dashes.data(), isVisible ? static_cast<int>(dashes.size()) : 0,
+                   isVisible ? std::fmod(before, 2.0 * period) : 0.0);
+}
+
+void Painter::stroke(PlotShape const& shape, std::vector<OutlineStep> const& path) {
+    if (!reachesBeyond(path, near_)) {
+        addPath(cairo_, path);
+        setStroke(shape, 0.0);
+        return cairo_stroke(cairo_);
+    }
+    for (LinePiece const& piece : clippedLines(path, near_)) {
+        addPath(cairo_, {{OutlineKind::move, {piece.from}}, {OutlineKind::line, {piece.to}}});
+        setStroke(shape, piece.before);
+        cairo_stroke(cairo_);
+    }
 }
 
 // Cairo draws on a grid of 1/256 page unit, where such letters vanish.
 bool Painter::isTooSmall(PlotShape const& letters) const {
     constexpr double kLeastLetter = 1.0 / 64.0;  // page units
-    return letters.letterHeight > 0.0 && letters.letterHeight * mapping_.scale() < kLeastLetter;
+    return letters.letterHeight > 0.0 && letters.letterHeight * sheet_.scale < kLeastLetter;
 }
 
 void Painter::paintBaseline(PlotShape const& letters) {
-    std::vector<OutlineStep> const line{
+    auto const line = placed({
         {OutlineKind::move, {letters.from}},
         {OutlineKind::line, {letters.to}},
-    };
-    if (!addPath(line)) return;
-    setStroke(letters);
-    cairo_stroke(cairo_);
+    });
+    if (line) stroke(letters, *line);
 }
 
 void Painter::paint(PlotShape const& shape) {
     PlotColor const& color = shape.color;
     cairo_set_source_rgba(cairo_, color.red, color.green, color.blue, color.alpha);
     if (isTooSmall(shape)) return paintBaseline(shape);
-    if (!addPath(shape.path)) return;
-    if (shape.kind == PlotKind::fill) {
-        cairo_fill(cairo_);
-        return;
-    }
-    setStroke(shape);
-    cairo_stroke(cairo_);
+    if (text_ && !shape.glyphs.empty()) return text_->show(shape);
+    auto const path = placed(shape.path);
+    if (!path) return;
+    if (shape.kind == PlotKind::stroke) return stroke(shape, *path);
+    addPath(cairo_, reachesBeyond(*path, near_) ? clippedArea(*path, near_) : *path);
+    cairo_fill(cairo_);
 }
 
-bool paintPage(PlotScene const& scene, PlotFormat format, ByteTaker const& take) {
-    Page const& page = kPages[static_cast<std::size_t>(format)];
-    PageMapping const mapping(page, extentsOf(scene).value_or(LayoutBox{}));
-    Output output(take);
-    Surface const surface = makeSurface(format, page, output);
-    Cairo cairo(cairo_create(surface.get()));
+bool paintSheet(PlotSheet const& sheet,
+                PlotFormat format,
+                cairo_surface_t* surface,
+                std::set<std::string>& lockedFaces) {
+    bool const hasPages = format == PlotFormat::pdf;
+    if (hasPages) cairo_pdf_surface_set_size(surface, sheet.width, sheet.height);
+    Cairo const cairo(cairo_create(surface));
     cairo_set_source_rgb(cairo.get(), 1.0, 1.0, 1.0);
     cairo_paint(cairo.get());
-    Painter painter(cairo.get(), page, mapping);
-    scene([&](PlotShape const& shape) { painter.paint(shape); });
-    bool const good = cairo_status(cairo.get()) == CAIRO_STATUS_SUCCESS;
-    cairo.reset();
+    TextPainter text(cairo.get(), sheet, lockedFaces);
+    Painter painter(cairo.get(), sheet, hasPages ? &text : nullptr);
+    painter.clip();
+    sheet.scene([&](PlotShape const& shape) { painter.paint(shape); });
+    if (hasPages) cairo_show_page(cairo.get());
+    return cairo_status(cairo.get()) == CAIRO_STATUS_SUCCESS;
+}
+
+bool paintPages(std::vector<PlotSheet> const& sheets,
+                PlotFormat format,
+                ByteTaker const& take,
+                std::set<std::string>& lockedFaces) {
+    Output output(take);
+    Surface const surface = makeSurface(format, sheets.front(), output);
+    bool const good = std::all_of(sheets.begin(), sheets.end(), [&](PlotSheet const& sheet) {
+        return paintSheet(sheet, format, surface.get(), lockedFaces);
+    });
     if (format == PlotFormat::png) {
         (void)cairo_surface_write_to_png_stream(surface.get(), takeBytes, &output);
     }
@@ -244,13 +233,17 @@ bool paintPage(PlotScene const& scene, PlotFormat format, ByteTaker const& take)
 
 }  // namespace
 
-bool paintPlot(PlotScene const& scene, PlotFormat format, ByteTaker const& take) {
-    if (format != PlotFormat::svg) return paintPage(scene, format, take);
+bool paintPlot(std::vector<PlotSheet> const& sheets,
+               PlotFormat format,
+               ByteTaker const& take,
+               std::set<std::string>& lockedFaces) {
+    if (format != PlotFormat::svg) return paintPages(sheets, format, take, lockedFaces);
     std::string svg;
-    bool const good = paintPage(scene, format, [&](std::string_view bytes) {
+    ByteTaker const collect = [&](std::string_view bytes) {
         svg += bytes;
         return true;
-    });
+    };
+    bool const good = paintPages(sheets, format, collect, lockedFaces);
     unnumber(svg);
     return good && take(svg);
 }

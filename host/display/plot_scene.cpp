@@ -73,6 +73,9 @@ public:
     [[nodiscard]] LayoutPoint place(LayoutPoint const& point) const {
         return flat(origin_ + along_ * point.x + up_ * point.y);
     }
+    [[nodiscard]] LayoutPoint turn(LayoutPoint const& step) const {
+        return flat(TzGePoint2d() + along_ * step.x + up_ * step.y);
+    }
 
 private:
     TzGePoint2d origin_;
@@ -105,6 +108,8 @@ private:
 };
 
 void LetterShapes::add(OutlinedLetter const& letter) {
+    // Glyphs that stand for the same characters stay together.
+    if (letters_ >= kLettersOfAShape && !letter.text.empty()) flush();
     if (letters_ == 0) shape_.from = frame_.place(letter.start);
     shape_.to = frame_.place(letter.end);
     for (OutlineStep step : letter.steps) {
@@ -112,12 +117,16 @@ void LetterShapes::add(OutlinedLetter const& letter) {
             step.points[i] = frame_.place(step.points[i]);
         shape_.path.push_back(step);
     }
-    if (++letters_ == kLettersOfAShape) flush();
+    shape_.glyphs.push_back({letter.font, letter.glyph, frame_.place(letter.origin),
+                             frame_.turn(letter.along), frame_.turn(letter.down), letter.text,
+                             letter.rightToLeft});
+    ++letters_;
 }
 
 void LetterShapes::flush() {
     if (!shape_.path.empty()) take_(shape_);
     shape_.path.clear();
+    shape_.glyphs.clear();
     letters_ = 0;
 }
 

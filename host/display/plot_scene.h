@@ -2,6 +2,7 @@
 
 #include <functional>
 #include <optional>
+#include <string>
 #include <vector>
 
 #include "host/display/draw_list.h"
@@ -24,6 +25,17 @@ struct PlotColor {
 
 enum class PlotKind { stroke, fill };
 
+// A glyph of letters: what an OutlinedLetter says, in the view.
+struct PlotGlyph {
+    GlyphFont font;
+    unsigned int glyph = 0;
+    LayoutPoint origin;
+    LayoutPoint along;
+    LayoutPoint down;
+    std::string text;
+    bool rightToLeft = false;
+};
+
 struct PlotShape {
     PlotKind kind = PlotKind::stroke;
     std::vector<OutlineStep> path;
@@ -33,6 +45,7 @@ struct PlotShape {
     double letterHeight = 0.0;   // of letters; 0 for other shapes
     LayoutPoint from;            // the baseline of letters
     LayoutPoint to;
+    std::vector<PlotGlyph> glyphs;  // the letters that the path shows, from left to right
 };
 
 // Hands over the shapes from the lowest to the topmost, the same ones at each call.

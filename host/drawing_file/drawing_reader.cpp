@@ -19,6 +19,7 @@ DrawingReader::MemberRow const DrawingReader::kRows[] = {
     {"variables", &DrawingReader::variables},
     {"ucs", &DrawingReader::ucs},
     {"paperUcs", &DrawingReader::paperUcs},
+    {"page", &DrawingReader::page},
     {"layers", &DrawingReader::layers},
     {"currentLayer", &DrawingReader::currentLayer},
     {"linetypes", &DrawingReader::linetypes},

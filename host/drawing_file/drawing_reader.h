@@ -6,6 +6,7 @@
 
 #include "host/drawing_file/entity_reader.h"
 #include "host/drawing_file/json_stream.h"
+#include "host/drawing_file/page_member.h"
 #include "host/drawing_file/table_reader.h"
 
 namespace tzhost::drawingfile {
@@ -64,6 +65,7 @@ private:
     void variables(JsonValue const& value);
     void ucs(JsonValue const& value) { userSystem("ucs", value, settings_.modelSystem); }
     void paperUcs(JsonValue const& value) { userSystem("paperUcs", value, settings_.paperSystem); }
+    void page(JsonValue const& value) { readPage(context_, value, settings_.page); }
     void userSystem(char const* name, JsonValue const& value, UserSystem& system);
     void workingSet(JsonValue const& value);
     void workingAngle(JsonValue const& value);

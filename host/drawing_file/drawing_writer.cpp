@@ -2,6 +2,7 @@
 
 #include "host/drawing_file/entity_writer.h"
 #include "host/drawing_file/members.h"
+#include "host/drawing_file/page_member.h"
 
 namespace tzhost::drawingfile {
 namespace {
@@ -40,6 +41,7 @@ void DrawingWriter::header() {
     DrawingSettings const& settings = drawing_.settings();
     userSystem("ucs", settings.modelSystem);
     userSystem("paperUcs", settings.paperSystem);
+    if (settings.page) writePage(members_, *settings.page);
     table<LayerImp>("layers", drawing_.layerTableId());
     writeText(members_.begin("currentLayer"), recordName(settings.layer));
     table<LinetypeImp>("linetypes", drawing_.linetypeTableId());

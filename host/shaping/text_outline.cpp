@@ -23,17 +23,41 @@ struct GlyphsFree {
 };
 using Glyphs = std::unique_ptr<PangoGlyphString, GlyphsFree>;
 
+// The characters of the cluster that begins, from left to right, at a glyph; none when it began
+// before.
+std::string clusterAt(std::string const& text, PangoGlyphString const& glyphs, int index) {
+    int const* const starts = glyphs.log_clusters;
+    int const start = starts[index];
+    if (index > 0 && starts[index - 1] == start) return {};
+    // Clusters are read to the right or to the left.
+    int end = static_cast<int>(text.size());
+    if (index > 0 && starts[index - 1] > start) {
+        end = starts[index - 1];
+    } else {
+        int next = index;
+        while (next < glyphs.num_glyphs && starts[next] == start)
+            ++next;
+        if (next < glyphs.num_glyphs && starts[next] > start) end = starts[next];
+    }
+    return text.substr(static_cast<std::size_t>(start), static_cast<std::size_t>(end - start));
+}
+
 class Outliner {
 public:
     Outliner(GlyphRun const& run, LetterTaker const& take)
         : run_(run), take_(take), face_(ShapeEngine::instance().face(run.face)),
-          scale_(run.height / face_.capHeight), slant_(std::tan(run.oblique)) {}
+          scale_(run.height / face_.capHeight), slant_(std::tan(run.oblique)) {
+        double const mirrorX = run.mirroredX ? -scale_ : scale_;
+        double const mirrorY = run.mirroredY ? -scale_ : scale_;
+        letter_.along = {mirrorX * run.widthFactor, 0.0};
+        letter_.down = {-mirrorX * slant_, -mirrorY};
+    }
 
     void outline();
 
 private:
     void addItem(PangoItem const& item, Utf8Text const& utf8, PangoGlyphString& glyphs);
-    void addGlyph(PangoFont* font, PangoGlyphInfo const& glyph);
+    void addGlyph(PangoGlyphInfo const& glyph);
     // Places a point given in Pango units from the pen, y down.
     [[nodiscard]] LayoutPoint place(LayoutPoint const& point) const;
 
@@ -64,18 +88,29 @@ void Outliner::outline() {
 void Outliner::addItem(PangoItem const& item, Utf8Text const& utf8, PangoGlyphString& glyphs) {
     pango_shape_full(utf8.bytes.c_str() + item.offset, item.length, utf8.bytes.c_str(),
                      static_cast<int>(utf8.bytes.size()), &item.analysis, &glyphs);
+    letter_.font = {};
+    if (item.analysis.font) {
+        letter_.font = GlyphFont(static_cast<PangoFont*>(g_object_ref(item.analysis.font)),
+                                 [](PangoFont* font) { g_object_unref(font); });
+    }
+    letter_.rightToLeft = item.analysis.level % 2 != 0;
     for (int i = 0; i < glyphs.num_glyphs; ++i) {
-        addGlyph(item.analysis.font, glyphs.glyphs[i]);
+        letter_.text = clusterAt(utf8.bytes.substr(static_cast<std::size_t>(item.offset),
+                                                   static_cast<std::size_t>(item.length)),
+                                 glyphs, i);
+        addGlyph(glyphs.glyphs[i]);
     }
 }
 
-void Outliner::addGlyph(PangoFont* font, PangoGlyphInfo const& glyph) {
+void Outliner::addGlyph(PangoGlyphInfo const& glyph) {
     letter_.steps.clear();
     letter_.start = place({0.0, 0.0});
-    if (font != nullptr) {
-        LayoutPoint const offset{static_cast<double>(glyph.geometry.x_offset),
-                                 static_cast<double>(glyph.geometry.y_offset)};
-        for (OutlineStep step : glyphShape(font, glyph)) {
+    letter_.glyph = glyph.glyph;
+    LayoutPoint const offset{static_cast<double>(glyph.geometry.x_offset),
+                             static_cast<double>(glyph.geometry.y_offset)};
+    letter_.origin = place(offset);
+    if (letter_.font) {
+        for (OutlineStep step : glyphShape(letter_.font.get(), glyph)) {
             for (LayoutPoint& point : step.points)
                 point = place({point.x + offset.x, point.y + offset.y});
             letter_.steps.push_back(step);
@@ -93,6 +128,12 @@ LayoutPoint Outliner::place(LayoutPoint const& point) const {
 }
 
 }  // namespace
+
+std::vector<OutlineStep> const& outlineOf(GlyphFont const& font, unsigned int glyph) {
+    PangoGlyphInfo info{};
+    info.glyph = glyph;
+    return glyphShape(font.get(), info);
+}
 
 void outlineLetters(GlyphRun const& run, LetterTaker const& take) {
     Outliner(run, take).outline();

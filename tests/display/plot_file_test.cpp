@@ -8,6 +8,7 @@
 
 #include "host/database/drawing.h"
 #include "host/files/file_bytes.h"
+#include "host/page/page_text.h"
 #include "host/settings/variables.h"
 #include "tests/display/picture.h"
 #include "tz/db/mtext.h"
@@ -88,7 +89,7 @@ protected:
 
     [[nodiscard]] Picture plotted() const {
         std::string const file = "plot.png";
-        EXPECT_EQ(plotDrawing(*drawing_, PlotFormat::png, file), std::nullopt);
+        EXPECT_EQ(plotDrawing(*drawing_, {PlotFormat::png, file, {}}).problem, std::nullopt);
         return Picture(readFile(file).value_or(""));
     }
 
@@ -141,14 +142,49 @@ TEST_F(PlotFiles, RefuseBlocksThatStandForTooMuch) {
         block = next;
     }
     std::string const file = "doubled.svg";
-    EXPECT_EQ(plotDrawing(*drawing_, PlotFormat::svg, file),
+    EXPECT_EQ(plotDrawing(*drawing_, {PlotFormat::svg, file, {}}).problem,
               "doubled.svg: its blocks stand for too much to plot");
     EXPECT_FALSE(std::filesystem::exists(file));
 }
 
+// Ten pixels to a millimetre, a millimetre for each 0.1 unit: the line runs from corner to corner
+// of the middle 100 millimetres.
+TEST_F(PlotFiles, LieOnTheirPaper) {
+    PlotOrder order{PlotFormat::png, "paper.png", {}};
+    order.page = {readPaper("120x120"), {}, {}, {}, PageUnit::centimetre, {}, 254.0};
+    order.page.scale = makeScale(1, 1);
+    PlotReport const whole = plotDrawing(*drawing_, order);
+    EXPECT_EQ(whole.problem, std::nullopt);
+    EXPECT_EQ(whole.remarks, std::vector<std::string>());
+    Picture const picture(readFile("paper.png").value_or(""));
+    EXPECT_EQ(picture.width(), 1200);
+    EXPECT_EQ(picture.at(101, 1098), 0xFF0000U);
+    EXPECT_EQ(picture.at(1098, 101), 0xFF0000U);
+    EXPECT_EQ(picture.at(97, 1102), 0xFFFFFFU);
+    // A hundred pages wide, the page shows its middle and no more than the margins let through.
+    order.page.scale = makeScale(100, 1);
+    PlotReport const cut = plotDrawing(*drawing_, order);
+    EXPECT_EQ(cut.remarks,
+              std::vector<std::string>{"paper.png: what lies outside the page is left out"});
+    Picture const part(readFile("paper.png").value_or(""));
+    EXPECT_EQ(part.at(600, 599), 0xFF0000U);
+    EXPECT_EQ(part.at(110, 1089), 0xFF0000U);
+    EXPECT_EQ(part.at(90, 1109), 0xFFFFFFU);
+}
+
+TEST_F(PlotFiles, OfAllSpacesHaveAPageForEach) {
+    PlotOrder order{PlotFormat::pdf, "all.pdf", {}};
+    order.space = PlotSpace::all;
+    EXPECT_EQ(plotDrawing(*drawing_, order).problem, std::nullopt);
+    EXPECT_NE(readFile("all.pdf").value_or("").find("/Count 2"), std::string::npos);
+    order.format = PlotFormat::png;
+    EXPECT_EQ(plotDrawing(*drawing_, order).problem,
+              "all.pdf: only a PDF has a page for each space");
+}
+
 TEST_F(PlotFiles, SayWhatWentWrong) {
     std::string const file = "missing/plan.svg";
-    auto const fault = plotDrawing(*drawing_, PlotFormat::svg, file);
+    auto const fault = plotDrawing(*drawing_, {PlotFormat::svg, file, {}}).problem;
     EXPECT_EQ(fault, "missing/plan.svg: cannot be written: No such file or directory");
     EXPECT_FALSE(std::filesystem::exists("missing"));
 }

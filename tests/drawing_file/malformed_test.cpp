@@ -142,6 +142,17 @@ BadCase const kBad[] = {
      ":1: member \"ucs.y\": stands at no right angle to x, expected one that does"},
     {"WorkingAngle", ",\"workingAngle\":\"0\"}",
      ":1: member \"workingAngle\": is a text, expected a number"},
+    {"PageText", ",\n\"page\":\"A3\"}", ":2: member \"page\": is a text, expected an object"},
+    {"PagePaper", ",\"page\":{\n\"paper\":\"B5\"}}",
+     ":2: member \"page.paper\": is not what it takes, expected A0 to A4, letter, legal, tabloid, or "
+     "WxH with sides of 1 to 5000 millimetres"},
+    {"PageScale", ",\"page\":{\"scale\":[1,0]}}",
+     ":1: member \"page.scale\": is not what it takes, expected null or two numbers above 0"},
+    {"PageWindow", ",\"page\":{\"window\":[[0,0],[0,5]]}}",
+     ":1: member \"page.window\": is not what it takes, expected null or two opposite corners, "
+     "[[x,y],[x,y]]"},
+    {"PageMargin", ",\"page\":{\"margin\":105}}",
+     ":1: member \"page.margin\": the margins leave nothing of the paper"},
 };
 
 class Malformed : public testing::TestWithParam<BadCase> {};

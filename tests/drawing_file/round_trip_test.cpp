@@ -50,6 +50,9 @@ constexpr KeptCase kKept[] = {
     {"Background", R"("entities":[{"type":"MTEXT","background":{"fill":true,"color":"#0a0B0c"}}])",
      R"("background":{"fill":true,"color":"#0A0B0C","scale":1.5,"useBackgroundColor":false,)"
      R"("transparency":0})"},
+    {"Page", R"("page":{"paper":"legal","scale":[0.5,1e3],"tray":2})",
+     R"("page":{"paper":"legal","landscape":true,"margin":10,"scale":[0.5,1000],"unit":"mm",)"
+     R"("window":null,"tray":2})"},
     {"PaperSpace", R"("entities":[{"type":"LINE","space":"paper"},{"type":"CIRCLE"}])",
      R"({"handle":"1","type":"LINE","space":"paper")"},
     {"HandlesToTheLast",

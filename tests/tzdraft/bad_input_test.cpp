@@ -29,6 +29,18 @@ constexpr BadRow kUsage[] = {
     {"ResultNameless", "--png ''", 2, "--png: the file name is empty"},
     {"ScriptNameless", "--script ''", 2, "--script: the file name is empty"},
     {"DrawingNameless", "''", 2, "DRAWING: the file name is empty"},
+    {"PaperUnknown", "--paper B5", 2, "--paper: \"B5\" is none, expected A0 to A4"},
+    {"PaperOfNoSize", "--paper 0x10", 2, "--paper: \"0x10\" is none"},
+    {"PaperWithoutRoom", "--paper a4 --margin 105", 2, "--paper: the margins leave nothing"},
+    {"ScaleOfNothing", "--scale 1:0", 2, "--scale: \"1:0\" is none, expected fit, or N:M"},
+    {"ScaleHuge", "--scale 1e300:1e-300", 2, "--scale: \"1e300:1e-300\" is none"},
+    {"WindowOfNoSize", "--window -1,0,-1,5", 2, "--window: \"-1,0,-1,5\" is none"},
+    {"WindowHuge", "--window -1e308,0,1e308,5", 2, "--window: \"-1e308,0,1e308,5\" is none"},
+    {"UnitUnknown", "--unit yd", 2, "--unit: \"yd\" is none, expected mm, cm, m, in or ft"},
+    {"MarginBelowZero", "--margin -1", 2, "--margin: \"-1\" is none"},
+    {"DotsBelowOne", "--dpi 0", 2, "--dpi: \"0\" is none"},
+    {"OrientationTwice", "--portrait --landscape", 2, "--portrait excludes --landscape"},
+    {"PictureOfAllSpaces", "--space all --png a.png", 2, "--space: only a PDF has a page"},
 };
 
 class WrongUsage : public testing::TestWithParam<BadRow> {};

@@ -8,6 +8,7 @@ void newCommand();
 void openCommand();
 void saveCommand();
 void plotCommand();
+void pageCommand();
 void quitCommand();
 void listCommand();
 void setvarCommand();

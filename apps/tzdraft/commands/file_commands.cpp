@@ -61,9 +61,12 @@ void saveCommand() {
 void plotCommand() {
     auto const file = askFile(localText(L"File to plot to"));
     if (!file) return;
-    doWith(*file, forLocalText(L"Plotted: %ls."), [](auto const& to, std::string& error) {
-        return ProgramSession::current().plot(to, error);
+    std::vector<std::string> remarks;
+    doWith(*file, forLocalText(L"Plotted: %ls."), [&](auto const& to, std::string& error) {
+        return ProgramSession::current().plot(to, error, remarks);
     });
+    for (std::string const& each : remarks)
+        tzhost::commandLine().say(tzhost::fromUtf8(each));
 }
 
 void quitCommand() {

@@ -54,9 +54,13 @@ constexpr std::array kCommands{
     HostCommand{forLocalText(L"OPEN"), openCommand, kAlone,
                 forLocalText(L"Opens a drawing in place of this one.")},
     HostCommand{
+        forLocalText(L"PAGE"), pageCommand, kAlone,
+        forLocalText(
+            L"Sets what plots are put on: paper, orientation, scale, unit, margin and window.")},
+    HostCommand{
         forLocalText(L"PLOT"), plotCommand, kAlone,
         forLocalText(
-            L"Plots the active space, fitted to its extents; the file's ending (.svg, .png, .pdf) says how.")},
+            L"Plots the active space, on the drawing's page if it has one; the file's ending (.svg, .png, .pdf) says how.")},
     HostCommand{forLocalText(L"QUIT"), quitCommand, kAlone, forLocalText(L"Ends the session.")},
     HostCommand{forLocalText(L"SAVE"), saveCommand, kAlone,
                 forLocalText(L"Writes the drawing to a file.")},

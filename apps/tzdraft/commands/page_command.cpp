@@ -1,0 +1,90 @@
+#include "apps/tzdraft/commands/ask.h"
+#include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
+#include "host/page/page_plan.h"
+#include "host/page/page_text.h"
+#include "tz/ed/print.h"
+
+namespace tzdraft {
+namespace {
+
+// Asks for a text until `read` makes a value of it. False when it was cancelled.
+template <class Value, class Read>
+bool askRead(wchar_t const* question,
+             std::string const& present,
+             char const* expected,
+             Value& value,
+             Read read) {
+    for (;;) {
+        Answer<TzString> const answer = askText(question, TzString::fromUtf8(present));
+        if (answer.isCancelled()) return false;
+        auto const found = read(answer.value.toUtf8());
+        if (found) {
+            value = *found;
+            return true;
+        }
+        tzutPrintf(localText(L"\nThat is not what is asked for, expected %ls.\n"),
+                   TzString::fromUtf8(localText(expected)).kwszPtr());
+    }
+}
+
+bool liesOnItsSide(tzhost::Page const& page) {
+    if (page.paper.name != tzhost::PaperName::custom) return page.landscape;
+    return page.paper.width >= page.paper.height;
+}
+
+bool askOrientation(tzhost::Page& page) {
+    Answer<TzString> const word =
+        askKeyword(localText(L"Orientation"), forLocalText(L"Portrait Landscape"),
+                   liesOnItsSide(page) ? L"Landscape" : L"Portrait");
+    if (word.isCancelled()) return false;
+    page.landscape = word.value == L"Landscape";
+    page.paper = tzhost::turned(page.paper, page.landscape);
+    return true;
+}
+
+bool askScale(tzhost::Page& page) {
+    return askRead(localText(L"Scale, N:M or fit"), page.scale ? nameOf(*page.scale) : "fit",
+                   tzhost::kScales, page.scale, tzhost::readScaleOrFit);
+}
+
+bool askMargin(tzhost::Page& page) {
+    return askRead(localText(L"Margin in millimetres"), tzhost::plainText(page.margin),
+                   forLocalText("a number, 0 or more, that leaves something of the paper"),
+                   page.margin, [&](std::string const& text) {
+                       tzhost::Page tried = page;
+                       auto const margin = tzhost::readPlainNumber(text);
+                       tried.margin = margin.value_or(-1.0);
+                       bool const isGood = tried.margin >= 0.0 && tzhost::hasRoom(tried);
+                       return isGood ? margin : std::nullopt;
+                   });
+}
+
+}  // namespace
+
+// What was answered is kept once all is answered.
+void pageCommand() {
+    tzhost::Drawing& drawing = ProgramSession::current().drawing();
+    tzhost::DrawingSettings settings = drawing.settings();
+    tzhost::Page page = settings.page.value_or(tzhost::Page());
+    bool const isAnswered =
+        askRead(localText(L"Paper, such as A3 or 420x297"), nameOf(page.paper), tzhost::kPapers,
+                page.paper, tzhost::readPaper) &&
+        askOrientation(page) && askScale(page) &&
+        askRead(localText(L"What a drawing unit is"), nameOf(page.unit), tzhost::kUnits, page.unit,
+                tzhost::readUnit) &&
+        askMargin(page) &&
+        askRead(localText(L"Window X1,Y1,X2,Y2 or all"), page.window ? nameOf(*page.window) : "all",
+                tzhost::kWindowsOrAll, page.window, tzhost::readWindowOrAll);
+    if (!isAnswered) return;
+    if (auto const problem = tzhost::problemOf(page)) {
+        tzutPrintf(localText(L"\nThe page stays as it was: %ls.\n"),
+                   TzString::fromUtf8(*problem).kwszPtr());
+        return;
+    }
+    settings.page = page;
+    drawing.setSettings(settings);
+}
+
+}  // namespace tzdraft

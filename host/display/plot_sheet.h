@@ -1,0 +1,50 @@
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "host/display/plot_scene.h"
+#include "host/page/page.h"
+
+// A scene with its place on a page. A plot on no paper fills a page of a fixed size, one on paper
+// lies as its page says.
+namespace tzhost {
+
+enum class PlotFormat { svg, png, pdf };
+
+// A page unit is a pixel of PNG, a point of PDF, and 1/96 inch of SVG. Coordinates on the page run
+// to the right and down.
+struct PlotSheet {
+    PlotScene scene;
+    double width = 0.0;              // page units
+    double height = 0.0;             // page units
+    double perMillimetre = 1.0;      // page units
+    double thinnestLine = 1.0;       // page units
+    LayoutPoint middle;              // the point of the view that lies in the page's middle
+    double scale = 1.0;              // page units for a unit of the view
+    std::optional<LayoutBox> shown;  // of the view; nothing when all of it shows
+
+    // From the view to the page.
+    [[nodiscard]] LayoutPoint place(LayoutPoint const& point) const {
+        return {width / 2.0 + (point.x - middle.x) * scale,
+                height / 2.0 - (point.y - middle.y) * scale};
+    }
+};
+
+// The page with room around it: what lies further off leaves no trace on the page.
+[[nodiscard]] inline LayoutBox surroundingsOf(PlotSheet const& sheet) {
+    return {-sheet.width, -sheet.height, 2.0 * sheet.width, 2.0 * sheet.height};
+}
+
+// Fitted to a page of 1600 by 900 pixels, or to one A4 page lying on its side.
+[[nodiscard]] PlotSheet fittedSheet(PlotScene scene, PlotFormat format);
+
+// On a page that problemOf finds nothing wrong with. `window` is the page's window in the view.
+// `dotsPerInch` are those of a PNG.
+[[nodiscard]] PlotSheet paperSheet(PlotScene scene,
+                                   PlotFormat format,
+                                   Page const& page,
+                                   std::optional<PageBox> const& window,
+                                   double dotsPerInch);
+
+}  // namespace tzhost

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <cairo.h>
+
+#include <map>
+#include <set>
+#include <string>
+
+#include "host/display/plot_sheet.h"
+
+// Letters as text: glyphs of fonts that the document holds, with the characters that they stand
+// for, so that a reader finds and copies them.
+//
+//   TextPainter text(cairo, sheet, lockedFaces);
+//   text.show(letters);      // in the colour that is set
+//
+// What no text can show is filled as outlines: glyphs that a font lacks, letters seen from their
+// edge, and faces that may not be embedded, whose names are noted.
+namespace tzhost {
+
+// Adds a path of page coordinates to a canvas that had none.
+void addPath(cairo_t* cairo, std::vector<OutlineStep> const& path);
+
+class TextPainter {
+public:
+    TextPainter(cairo_t* cairo, PlotSheet const& sheet, std::set<std::string>& lockedFaces)
+        : cairo_(cairo), sheet_(sheet), lockedFaces_(lockedFaces) {}
+
+    void show(PlotShape const& letters);
+
+private:
+    using Glyphs = std::vector<PlotGlyph>;
+
+    // Glyphs of one font, size and direction of reading.
+    void showAlike(Glyphs const& glyphs);
+    [[nodiscard]] bool showAsText(Glyphs const& glyphs);
+    void fillOutlines(Glyphs const& glyphs);
+    [[nodiscard]] bool isShown(PlotGlyph const& glyph) const;
+    [[nodiscard]] bool canBeText(PlotGlyph const& glyph);
+    // From Pango units to the page, without the glyph's place.
+    [[nodiscard]] cairo_matrix_t matrixOf(PlotGlyph const& glyph) const;
+
+    cairo_t* cairo_;
+    PlotSheet const& sheet_;
+    std::set<std::string>& lockedFaces_;
+    std::map<GlyphFont, bool> usable_;
+};
+
+}  // namespace tzhost
