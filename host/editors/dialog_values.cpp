@@ -2,9 +2,9 @@
 
 #include <algorithm>
 #include <cmath>
-#include <nlohmann/json.hpp>
 #include <optional>
 
+#include "host/files/json_events.h"
 #include "host/settings/variable_value.h"
 #include "host/text/utf8.h"
 #include "tz/db/database.h"
@@ -16,7 +16,6 @@ namespace tzhost {
 namespace {
 
 using State = CMTextEditorInterface;
-using Json = nlohmann::json;
 
 constexpr int kByLayer = 256;
 constexpr int kByBlock = 0;
@@ -148,40 +147,39 @@ std::wstring showTextColor(State const& state) {
 }
 
 // The members of a background.
-DialogChange readFill(Json const& value) {
-    if (!value.is_boolean()) return {};
-    return [on = value.get<bool>()](State& state) { state.SetBackgroundFill(on ? 1 : 0); };
+DialogChange readFill(JsonValue const& value) {
+    if (value.kind != JsonKind::flag) return {};
+    return [on = value.flag](State& state) { state.SetBackgroundFill(on ? 1 : 0); };
 }
 
-DialogChange readFillColor(Json const& value) {
-    if (!value.is_number() && !value.is_string()) return {};
-    auto const color =
-        readColor(fromUtf8(value.is_string() ? value.get<std::string>() : value.dump()));
+DialogChange readFillColor(JsonValue const& value) {
+    if (value.kind != JsonKind::number && value.kind != JsonKind::text) return {};
+    auto const color = readColor(fromUtf8(value.text));
     if (!color) return {};
     return [color = *color](State& state) { state.SetBackgroundFillColor(color); };
 }
 
-DialogChange readFillScale(Json const& value) {
-    if (!value.is_number() || value.get<double>() <= 0) return {};
-    return [scale = value.get<double>()](State& state) { state.SetBackgroundFillScale(scale); };
+DialogChange readFillScale(JsonValue const& value) {
+    if (value.kind != JsonKind::number || value.number <= 0) return {};
+    return [scale = value.number](State& state) { state.SetBackgroundFillScale(scale); };
 }
 
-DialogChange readFillUse(Json const& value) {
-    if (!value.is_boolean()) return {};
-    return
-        [use = value.get<bool>()](State& state) { state.SetBackgroundFillUseBackgroundColor(use); };
+DialogChange readFillUse(JsonValue const& value) {
+    if (value.kind != JsonKind::flag) return {};
+    return [use = value.flag](State& state) { state.SetBackgroundFillUseBackgroundColor(use); };
 }
 
-DialogChange readFillTransparency(Json const& value) {
+DialogChange readFillTransparency(JsonValue const& value) {
     TzCmTransparency transparency;
-    if (!value.is_number_integer() || transparency.setPercent(value.get<int>()) != Tzad::eOk)
-        return {};
+    if (value.kind != JsonKind::number) return {};
+    auto const percent = wholeWithin(fromUtf8(value.text), 0, 100);
+    if (!percent || transparency.setPercent(*percent) != Tzad::eOk) return {};
     return [transparency](State& state) { state.SetBackgroundFillTransparency(transparency); };
 }
 
 struct BackgroundRow {
     char const* name;
-    DialogChange (*read)(Json const& value);
+    DialogChange (*read)(JsonValue const& value);
 };
 constexpr BackgroundRow kBackground[] = {
     {"fill", readFill},
@@ -193,14 +191,13 @@ constexpr BackgroundRow kBackground[] = {
 
 // Members that are left out stay as they are.
 DialogChange readBackground(State const&, std::wstring_view text) {
-    Json const object = Json::parse(toUtf8(text), nullptr, false);
-    if (!object.is_object()) return {};
+    JsonDocument const document = readJson(toUtf8(text));
+    if (document.failed || document.root.kind != JsonKind::object) return {};
     std::vector<DialogChange> changes;
-    for (auto const& member : object.items()) {
+    for (auto const& [name, value] : document.root.members) {
         auto const* const row = std::ranges::find_if(
-            kBackground, [&](auto const& each) { return member.key() == each.name; });
-        DialogChange change =
-            row == std::end(kBackground) ? DialogChange() : row->read(member.value());
+            kBackground, [key = name](auto const& each) { return key == each.name; });
+        DialogChange change = row == std::end(kBackground) ? DialogChange() : row->read(value);
         if (!change) return {};
         changes.push_back(std::move(change));
     }
