@@ -14,12 +14,14 @@ function(tz_compressed file out)
     get_filename_component(file ${file} ABSOLUTE)
     if(TZ_DEBIAN)
         get_filename_component(name ${file} NAME)
-        set(packed ${CMAKE_BINARY_DIR}/debian/${name}.gz)
+        file(RELATIVE_PATH way ${CMAKE_BINARY_DIR} ${file})
+        string(MAKE_C_IDENTIFIER ${way} folder)
+        set(packed ${CMAKE_BINARY_DIR}/debian/${folder}/${name}.gz)
         add_custom_command(OUTPUT ${packed} DEPENDS ${file}
-            COMMAND ${CMAKE_COMMAND} -E make_directory ${CMAKE_BINARY_DIR}/debian
+            COMMAND ${CMAKE_COMMAND} -E make_directory ${CMAKE_BINARY_DIR}/debian/${folder}
             COMMAND gzip -9nc ${file} > ${packed} VERBATIM)
-        add_custom_target(packed_${name} ALL DEPENDS ${packed})
-        add_dependencies(tz_products packed_${name})
+        add_custom_target(packed_${folder} DEPENDS ${packed})
+        add_dependencies(tz_products packed_${folder})
         set(file ${packed})
     endif()
     set(${out} ${file} PARENT_SCOPE)

@@ -62,8 +62,8 @@ tz_row(host/command_line   USES sdk host/base host/text host/page host/settings 
 tz_row(host/selection      USES sdk host/base host/text host/page host/settings host/platform host/runtime host/shaping host/layout host/database host/display host/command_line LIBRARIES json)
 tz_row(host/editors        USES sdk host/base host/text host/files host/settings host/code_pages host/rtf host/platform host/runtime host/command_line LIBRARIES json)
 
-tz_row(apps/options        LIBRARIES json cli)
+tz_row(apps/options        USES sdk host/text host/files host/resources LIBRARIES json cli)
 tz_row(apps/tzdraft        USES sdk apps/options host/base host/text host/page host/files host/settings host/fonts host/resources host/platform host/faults host/runtime host/shaping host/layout host/database host/drawing_file host/display host/command_line host/selection host/editors LIBRARIES json cli editline)
-tz_row(apps/tzconvert      USES sdk apps/options host/base host/text host/files host/settings host/code_pages host/fonts host/rtf module/globals module/host_calls module/texts module/styles module/fonts module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session LIBRARIES json cli)
+tz_row(apps/tzconvert      USES sdk apps/options host/base host/text host/files host/settings host/code_pages host/fonts host/rtf host/resources module/globals module/host_calls module/texts module/styles module/fonts module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session LIBRARIES json cli)
 
 tz_row(examples            USES sdk)

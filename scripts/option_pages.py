@@ -33,7 +33,8 @@ def tidy(options):
         bounds = RANGE.fullmatch(option.get("value", ""))
         if bounds:
             option["value"] = bounds.group(1)
-            option["help"] += f", from {bounds.group(2)} to {bounds.group(3)}"
+            if "shown" not in option:  # which says it in its own words
+                option["help"] += f", from {bounds.group(2)} to {bounds.group(3)}"
         elif option.get("value") == "DIR:DIR":
             option["value"] = FOLDER
 
@@ -85,7 +86,7 @@ def manual(program, template):
     out = []
     for option, commands in merged(program):
         heading = ", ".join(f"\\fB{roff(name)}\\fR" for name in names_of(option))
-        value = option.get("value", "")
+        value = option.get("shown", option.get("value", ""))
         out.append(f".TP\n{heading}" + (f" \\fI{roff(value)}\\fR" if value else ""))
         few = "" if len(commands) in (0, len(program["commands"])) else ", ".join(commands) + ": "
         out.append(roff(sentence(few + option["help"])))

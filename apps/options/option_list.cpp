@@ -10,7 +10,7 @@ using Json = nlohmann::ordered_json;
 
 constexpr std::string_view kAsked = "--option-list";
 
-Json describe(CLI::Option const& option) {
+Json describe(CLI::Option const& option, CLI::FormatterBase const& words) {
     Json row;
     if (option.get_positional()) {
         row["argument"] = option.get_single_name();
@@ -21,7 +21,11 @@ Json describe(CLI::Option const& option) {
         for (std::string const& each : option.get_lnames())
             names.push_back("--" + each);
         row["names"] = names;
-        if (option.get_items_expected_max() != 0) row["value"] = option.get_type_name();
+        if (option.get_items_expected_max() != 0) {
+            std::string const value = option.get_type_name();
+            row["value"] = value;
+            if (words.get_label(value) != value) row["shown"] = words.get_label(value);
+        }
     }
     row["help"] = option.get_description();
     return row;
@@ -31,7 +35,7 @@ Json optionsOf(CLI::App const& app) {
     Json rows = Json::array();
     auto const isShown = [](CLI::Option const* option) { return !option->get_group().empty(); };
     for (CLI::Option const* each : app.get_options(isShown))
-        rows.push_back(describe(*each));
+        rows.push_back(describe(*each, *app.get_formatter()));
     return rows;
 }
 

@@ -17,6 +17,7 @@ namespace tzapps {
 //   {"names": ["-h", "--help"], "value": "FILE", "help": "write there"}
 //
 // An argument has "argument": its name in place of "names"; an option without a value no "value".
+// Where the value has another name in the user's language, "shown" is that.
 // Nothing when the arguments ask for something else.
 [[nodiscard]] std::optional<std::string>
 optionList(CLI::App const& app, int count, char const* const* arguments);

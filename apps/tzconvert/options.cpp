@@ -6,6 +6,7 @@
 #include <limits>
 #include <sstream>
 
+#include "apps/options/local_help.h"
 #include "apps/options/option_list.h"
 #include "apps/tzconvert/streams.h"
 #include "host/text/near_words.h"
@@ -294,6 +295,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     app.set_version_flag("-v,--version", "tzconvert 1.0");
     ParsedOptions parsed;
     declare(app, parsed.options);
+    tzapps::speakHelp(app, tzapps::localeAsked(count, arguments));
     if (auto const list = tzapps::optionList(app, count, arguments)) {
         parsed.exit = printAnswer(*list);
         return parsed;

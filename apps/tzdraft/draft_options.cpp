@@ -6,6 +6,7 @@
 #include <cstring>
 #include <sstream>
 
+#include "apps/options/local_help.h"
 #include "apps/options/option_list.h"
 #include "apps/tzdraft/page_options.h"
 #include "host/text/visible_text.h"
@@ -97,6 +98,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     app.set_version_flag("--version", "tzdraft 1.0");
     ParsedOptions parsed;
     declare(app, parsed.options);
+    tzapps::speakHelp(app, tzapps::localeAsked(count, arguments));
     if (auto const list = tzapps::optionList(app, count, arguments)) {
         parsed.exit = printAnswer(*list);
         return parsed;

@@ -75,13 +75,14 @@ void declarePage(CLI::App& app, Options& options) {
                 page.margin, readMargin, "millimetres, 0 or more");
     declareRead(app, "--scale", "N:M", "the scale, or \"fit\", as when left out", page.scale,
                 tzhost::readScaleOrFit, tzhost::kScales);
-    declareRead(app, "--unit", "UNIT", "what a drawing unit is: mm (when left out), cm, m, in, ft",
-                page.unit, tzhost::readUnit, tzhost::kUnits);
+    declareRead(app, "--unit", "mm|cm|m|in|ft",
+                "what a drawing unit is: mm (when left out), cm, m, in, ft", page.unit,
+                tzhost::readUnit, tzhost::kUnits);
     declareRead(app, "--window", "X1,Y1,X2,Y2", "plot this part of the world alone", page.window,
                 tzhost::readWindow, tzhost::kWindows);
     declareRead(app, "--dpi", "N", "pixels in an inch of a PNG on paper, 300 when left out",
                 page.dotsPerInch, readDots, "a number from 1 to 10000");
-    declareRead(app, "--space", "SPACE",
+    declareRead(app, "--space", "model|paper|all",
                 "plot the model, the paper, or all: a PDF page for each that holds something",
                 options.space, readSpace, "model, paper or all");
 }

@@ -68,11 +68,6 @@ bool setVariables(Options const& options, std::string& error) {
     return true;
 }
 
-// Of the environment: the first of the three that says something decides.
-std::string localeOfUser() {
-    return firstOf({environment("LC_ALL"), environment("LC_MESSAGES"), environment("LANG")});
-}
-
 // A language that was asked for has the module's texts; one of the environment may be unknown.
 bool isLanguageThere(Options const& options, std::string& error) {
     std::filesystem::path const folder = modulePath(options).parent_path();
@@ -97,7 +92,8 @@ void useLocalTexts(std::string const& locale) {
 }
 
 bool findTexts(Options const& options, std::string& error) {
-    std::string const locale = options.locale.empty() ? localeOfUser() : options.locale;
+    std::string const locale =
+        options.locale.empty() ? tzhost::localeOfEnvironment() : options.locale;
     useLocalTexts(locale);
     if (!isLanguageThere(options, error)) return false;
     tzhost::ResourceSearch search;

@@ -1,6 +1,7 @@
 #include "host/resources/language.h"
 
 #include <algorithm>
+#include <cstdlib>
 
 namespace tzhost {
 
@@ -19,6 +20,14 @@ std::string languageOf(std::string const& name) {
 }
 
 }  // namespace
+
+std::string localeOfEnvironment() {
+    for (char const* const name : {"LC_ALL", "LC_MESSAGES", "LANG"}) {
+        char const* const value = std::getenv(name);
+        if (value && *value != '\0') return value;
+    }
+    return {};
+}
 
 bool isEnglish(std::string const& locale) {
     std::string const language = languageOf(nameOf(locale));

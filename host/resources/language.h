@@ -13,6 +13,9 @@
 
 namespace tzhost {
 
+// The user's: of LC_ALL, LC_MESSAGES and LANG the first that says something, else empty.
+[[nodiscard]] std::string localeOfEnvironment();
+
 // Whether the locale is an English one, empty, or one of the names that stand for no language, "C"
 // and "POSIX".
 [[nodiscard]] bool isEnglish(std::string const& locale);

@@ -91,11 +91,25 @@ class Options(unittest.TestCase):
                            not in text]
                 self.assertEqual(missing, [], page)
 
+    # An option whose help has no row in resources/de/options.texts is told in English.
+    def test_are_told_in_german(self):
+        for name in ("tzdraft", "tzconvert"):
+            lists = [json.loads(run(program(name), "--option-list",
+                                    env=os.environ | {"LC_ALL": locale}))
+                     for locale in ("C", "de_DE.UTF-8")]
+            told = [[option["help"] for command in whole["commands"] + [whole]
+                     for option in command["options"]] for whole in lists]
+            self.assertEqual([here for here, there in zip(*told) if here == there], [], name)
+            manual = read(os.path.join(PREFIX, f"share/man/de/man1/{name}.1"))
+            self.assertIn("zeigt diese Hilfe", manual.replace("Z", "z"))
+        said = run(program("tzdraft"), "--locale=de", "--help")
+        self.assertRegex(said, r"(?s)Aufruf: tzdraft \[OPTIONEN\].*--save DATEI +schreibt")
+
     # What is typed, and what bash and fish offer.
     ROWS = (("tzdraft --scr", ["--script"]), ("tzconvert to-r", ["to-rtf"]),
             ("tzdraft --save dr", ["drawn here"]), ("tzconvert to-rtf --output-dir fo", ["folder"]),
             ("tzconvert to-mtext --norm", ["--normalise"]), ("tzdraft --save locked/", []),
-            ("tzdraft --save gone/", []))
+            ("tzdraft --save gone/", []), ("tzdraft --space pa", ["paper"]))
 
     def test_are_completed(self):
         place = scratch("typed")
