@@ -24,6 +24,10 @@ ObjectList* listOf(TzDbObjectRecord const& owner) {
     return TzDbObjectAccess::imp(*owner.object)->list();
 }
 
+void addToList(TzDbObjectRecord& owner, TzDbObjectRecord& item) {
+    if (ObjectList* const list = listOf(owner)) list->items.push_back(&item);
+}
+
 void removeFromList(TzDbObjectRecord& owner, TzDbObjectRecord& item) noexcept {
     ObjectList* const list = listOf(owner);
     if (!list) return;

@@ -16,6 +16,8 @@ struct ObjectList {
     std::vector<TzDbObjectRecord*> items;
 };
 
+// Puts `item` at the end of the list of `owner`, if it has one.
+void addToList(TzDbObjectRecord& owner, TzDbObjectRecord& item);
 // Takes the last listing of `item` out of the list of `owner`, if it has one.
 void removeFromList(TzDbObjectRecord& owner, TzDbObjectRecord& item) noexcept;
 // The list of a table, a block or a block reference; null for other objects.

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "host/base/memory_faults.h"
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
 #include "host/database/symbol_imp.h"
@@ -36,9 +37,14 @@ void UndoLog::rememberBase() {
     *baseSettings_ = drawing_.settings();
 }
 
-void UndoLog::begin() {
+std::wstring UndoLog::nameOfLast(std::vector<Step> const& steps) {
+    return steps.empty() ? std::wstring() : steps.back().name;
+}
+
+void UndoLog::begin(std::wstring name) {
     if (depth_ == 0) {
         rememberBase();
+        open_.name = std::move(name);
         ++serial_;
     }
     ++depth_;
@@ -69,17 +75,19 @@ bool UndoLog::Step::isKept() const {
                         [](VariableChange const& change) { return isLastPoint(change.slot); });
 }
 
-void UndoLog::end() {
-    if (depth_ == 0 || --depth_ > 0) return;
+bool UndoLog::end() {
+    if (depth_ == 0 || --depth_ > 0) return false;
     collectVariables();
     dropUnchanged();
     if (!baseSettings_->isSameAs(drawing_.settings())) open_.settings = std::move(baseSettings_);
     Step step = std::exchange(open_, {});
-    if (!step.isKept()) return;
+    if (!step.isKept()) return false;
     step.serial = serial_;
     step.entries.shrink_to_fit();
     step.variables.shrink_to_fit();
     steps_.push_back(std::move(step));
+    takenBack_.clear();
+    return true;
 }
 
 void UndoLog::noteChange(TzDbObjectRecord& record) {
@@ -102,38 +110,62 @@ void UndoLog::noteAppended(TzDbObjectRecord& record) noexcept {
     record.notedIn = serial_;
 }
 
-void UndoLog::takeBack(Entry& entry) {
+void UndoLog::exchange(Entry& entry) {
     TzDbObjectRecord& record = *entry.record;
-    record.erased = entry.erased;
+    std::swap(record.erased, entry.erased);
     if (record.object->isKindOf(TzDbSymbolTableRecord::desc())) noteNamesChanged();
-    if (!entry.values) {
-        if (record.owner) removeFromList(*record.owner, record);
-        return;
+    if (entry.values) {
+        entry.values = TzDbObjectAccess::exchange(*record.object, std::move(entry.values));
+        if (record.object->isKindOf(TzDbTextStyleTableRecord::desc())) noteLooksChanged();
+    } else if (record.owner) {
+        if (record.erased) {
+            removeFromList(*record.owner, record);
+        } else {
+            addToList(*record.owner, record);
+        }
     }
-    TzDbObjectAccess::exchange(*record.object, std::move(entry.values));
-    if (record.object->isKindOf(TzDbTextStyleTableRecord::desc())) noteLooksChanged();
 }
 
-void UndoLog::restoreVariables(Step const& step) {
+void UndoLog::exchangeVariables(Step& step) {
     if (step.variables.empty()) return;
     Variables::Snapshot now = Variables::instance().snapshot();
-    for (VariableChange const& change : step.variables)
-        now[change.slot] = change.before;
+    for (VariableChange& change : step.variables)
+        std::swap(now[change.slot], change.other);
     Variables::instance().restore(now);
 }
 
-bool UndoLog::takeBack() {
-    if (steps_.empty()) return false;
-    Step step = std::move(steps_.back());
-    steps_.pop_back();
-    for (auto entry = step.entries.rbegin(); entry != step.entries.rend(); ++entry) {
-        takeBack(*entry);
+// What the step added leaves its lists last first, and comes back first first. Variables go before
+// the settings, which show their style in one of them.
+void UndoLog::exchange(Step& step) {
+    std::reverse(step.entries.begin(), step.entries.end());
+    for (Entry& entry : step.entries)
+        exchange(entry);
+    exchangeVariables(step);
+    if (step.settings) {
+        DrawingSettings const present = drawing_.settings();
+        drawing_.setSettings(*step.settings);
+        *step.settings = present;
     }
-    if (step.settings) drawing_.setSettings(*step.settings);
-    restoreVariables(step);
     noteUserSystem();
+}
+
+// Whole or not at all.
+bool UndoLog::pass(std::vector<Step>& from, std::vector<Step>& to) {
+    if (from.empty()) return false;
+    MemoryFaultPause const isWhole;
+    to.push_back(std::move(from.back()));
+    from.pop_back();
+    exchange(to.back());
     if (depth_ > 0) rememberBase();
     return true;
+}
+
+bool UndoLog::takeBack() {
+    return pass(steps_, takenBack_);
+}
+
+bool UndoLog::doAgain() {
+    return pass(takenBack_, steps_);
 }
 
 }  // namespace tzhost

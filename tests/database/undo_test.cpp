@@ -120,14 +120,20 @@ protected:
     TzDbObjectId id_ = addText(L"abc");
 };
 
-TEST_P(Undo, TakesBackAllOf) {
+TEST_P(Undo, TakesBackAndDoesAgain) {
     std::string const before = view();
     drawing->undoLog().begin();
     GetParam().act(*this, id_);
     drawing->undoLog().end();
-    EXPECT_TRUE(drawing->undoLog().takeBack());
-    EXPECT_EQ(view(), before);
-    EXPECT_FALSE(drawing->undoLog().takeBack());
+    std::string const after = view();
+    for (int round = 0; round < 2; ++round) {
+        EXPECT_TRUE(drawing->undoLog().takeBack());
+        EXPECT_EQ(view(), before);
+        EXPECT_FALSE(drawing->undoLog().takeBack());
+        EXPECT_TRUE(drawing->undoLog().doAgain());
+        EXPECT_EQ(view(), after);
+        EXPECT_FALSE(drawing->undoLog().doAgain());
+    }
     while (tzedRestorePreviousUCS() == 0) {
     }
 }
