@@ -41,6 +41,7 @@ struct LayerImp final : SymbolImp {
     [[nodiscard]] bool isSameAs(TzDbObjectImp const& other) const override;
 
     bool locked = false;
+    bool off = false;
     TzCmColor color = TzCmEntityColor::fromIndex(7);
 };
 

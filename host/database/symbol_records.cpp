@@ -22,6 +22,14 @@ Tzad::ErrorStatus TzDbLayerTableRecord::setIsLocked(bool locked) {
     return assign(*this, "TzDbLayerTableRecord::setIsLocked", &LayerImp::locked, locked);
 }
 
+bool TzDbLayerTableRecord::isOff() const {
+    return valuesOf<LayerImp>(*this).off;
+}
+
+Tzad::ErrorStatus TzDbLayerTableRecord::setIsOff(bool off) {
+    return assign(*this, "TzDbLayerTableRecord::setIsOff", &LayerImp::off, off);
+}
+
 TzCmColor TzDbLayerTableRecord::color() const {
     return valuesOf<LayerImp>(*this).color;
 }

@@ -42,8 +42,8 @@ std::unique_ptr<TzDbObjectImp> LayerImp::copy() const {
 }
 
 bool LayerImp::isSameAs(TzDbObjectImp const& other) const {
-    return SymbolImp::isSameAs(other) &&
-           agree(*this, static_cast<LayerImp const&>(other), &LayerImp::locked, &LayerImp::color);
+    return SymbolImp::isSameAs(other) && agree(*this, static_cast<LayerImp const&>(other),
+                                               &LayerImp::locked, &LayerImp::off, &LayerImp::color);
 }
 
 std::unique_ptr<TzDbObjectImp> LinetypeImp::copy() const {

@@ -5,6 +5,7 @@
 #include <numbers>
 #include <utility>
 
+#include "host/display/shown.h"
 #include "tz/db/entity.h"
 #include "tz/ge/arbitrary_axis.h"
 
@@ -15,9 +16,9 @@ namespace {
 constexpr int kDeepest = 64;
 constexpr int kCircleSides = 128;
 
-bool isInvisible(TzGiDrawable const& drawable) {
+bool isHidden(TzGiDrawable const& drawable) {
     auto const* const entity = dynamic_cast<TzDbEntity const*>(&drawable);
-    return entity && entity->visibility() == TzDb::kInvisible;
+    return entity && !isShown(*entity);
 }
 
 // The pen that a drawable inside another starts with: everything as its layer, and what it says "as
@@ -50,7 +51,7 @@ void DrawPass::draw(TzGiDrawable* drawable) {
 }
 
 void DrawPass::drawNested(TzGiDrawable& drawable) {
-    if (depth_ >= kDeepest || !isWhole() || isInvisible(drawable)) return;
+    if (depth_ >= kDeepest || !isWhole() || isHidden(drawable)) return;
     ++depth_;
     DrawPen const outer = traits_.pen();
     traits_.setPen(penWithin(outer));

@@ -16,9 +16,9 @@ class TzDbDatabase;
 //   pass.draw(jig.entity());
 //   use(pass.list());
 //
-// Entities that say they are invisible are left out, whoever draws them. Blocks within blocks can
-// stand for more than any memory holds, so a pass takes no more nested drawables than kMostNested
-// and no more letters than kMostLetters.
+// Entities that are invisible or on a layer that is off are left out, whoever draws them. Blocks
+// within blocks can stand for more than any memory holds, so a pass takes no more nested drawables
+// than kMostNested and no more letters than kMostLetters.
 namespace tzhost {
 
 class DrawPass {

@@ -133,6 +133,7 @@ template <class Members>
 void describe(Members& members, LayerImp& values) {
     members.color("color", values.color, kLayerColors);
     members.flag("locked", values.locked);
+    members.flag("off", values.off);
 }
 
 template <class Members>

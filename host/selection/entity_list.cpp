@@ -6,6 +6,7 @@
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
 #include "host/display/record_access.h"
+#include "host/display/shown.h"
 #include "tz/db/entity.h"
 #include "tz/db/symbol_table.h"
 
@@ -49,9 +50,14 @@ EntityIds KeptEntities::read() const {
 }
 
 EntityIds entitiesOfActiveSpace() {
-    EntityIds ids;
+    EntityIds all;
     if (Drawing const* const drawing = workingDrawing()) {
-        appendEntities(ids, drawing->activeSpace());
+        appendEntities(all, drawing->activeSpace());
+    }
+    EntityIds ids;
+    for (TzDbObjectId const id : all) {
+        TzDbEntity const* const entity = entityOf(id);
+        if (entity != nullptr && !isOnLayerOff(*entity)) ids.append(id);
     }
     return ids;
 }
@@ -61,8 +67,11 @@ EntityIds newestEntity() {
     Drawing const* const drawing = workingDrawing();
     ObjectList const* const list = drawing ? listOf(*drawing->activeSpace().record()) : nullptr;
     if (list == nullptr) return newest;
-    auto const at = std::find_if(list->items.rbegin(), list->items.rend(),
-                                 [](auto const* record) { return !record->erased; });
+    auto const at =
+        std::find_if(list->items.rbegin(), list->items.rend(), [](TzDbObjectRecord* record) {
+            TzDbEntity const* const entity = entityOf(TzDbObjectId(record));
+            return entity != nullptr && !isOnLayerOff(*entity);
+        });
     if (at != list->items.rend()) newest.append(TzDbObjectId(*at));
     return newest;
 }

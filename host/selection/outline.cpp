@@ -5,6 +5,7 @@
 
 #include "host/database/user_system.h"
 #include "host/display/draw_pass.h"
+#include "host/display/shown.h"
 #include "tz/db/mtext.h"
 
 namespace tzhost {
@@ -84,7 +85,7 @@ bool FlatBox::holds(TzGePoint2d const& point) const {
 
 Outline Outline::of(TzDbEntity& entity, TzGeMatrix3d const& placed) {
     Outline outline;
-    if (entity.visibility() == TzDb::kInvisible) return outline;
+    if (!isShown(entity)) return outline;
     TzGeMatrix3d const toUser = currentUserSystem().matrix().inverse() * placed;
     auto const add = [&](Corners const& corners, Inside inside) {
         Path path;

@@ -9,7 +9,7 @@
 class TzDbEntity;
 
 // Where an entity lies in the user system, for picks, windows and crossings: its lines, and the
-// boxes of its texts as they are turned. What is invisible lies nowhere. Nothing is opened.
+// boxes of its texts as they are turned. What cannot be seen lies nowhere. Nothing is opened.
 //
 //   Outline const outline = Outline::of(*entity);
 //   if (outline.boxHolds(pick)) ...

@@ -68,6 +68,9 @@ public:
     TzDbLayerTableRecord();
     [[nodiscard]] bool isLocked() const;
     Tzad::ErrorStatus setIsLocked(bool locked);
+    // What lies on a layer that is off is neither drawn nor found by a pick.
+    [[nodiscard]] bool isOff() const;
+    Tzad::ErrorStatus setIsOff(bool off);
     [[nodiscard]] TzCmColor color() const;
     Tzad::ErrorStatus setColor(TzCmColor const& color);
 
