@@ -119,6 +119,10 @@ Reply TzEdJigDriver::take(std::wstring_view answer) {
     bool const isMove = answer.starts_with(kMoveMark);
     if (isMove) answer.remove_prefix(1);
     auto point = tzhost::readPoint(answer, tzhost::lastPoint());
+    if (!point && !isMove && has(TzEdJig::kAcceptOtherInputString)) {
+        tzhost::commandLine().leaveInput(std::wstring(answer));
+        return Reply::done(TzEdJig::kString);
+    }
     if (!point)
         return Reply::refused(
             tzhost::localText(L"A point is needed, or ~ and a point to move the cursor."));

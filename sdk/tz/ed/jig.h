@@ -32,13 +32,15 @@ public:
         kCancel = -4,    // the user cancelled
         kNoChange = -6,  // the sample equals the previous one; nothing is drawn
         kOther = -5,     // the host failed
+        kString = -7,    // an answer of another kind, which tzedGetInput gives
         kNull = -1,      // an empty answer
         kNormal = 0,     // a point, or a sample that differs
         kKW1 = 1,        // the first keyword; the n-th gives n, up to 30
     };
     // Bits of the controls. kGovernedByOrthoMode lets ortho mode hold the point;
-    // kAccept3dCoordinates keeps a third coordinate. A drag accepts an empty answer whatever they
-    // say, and the other bits are for hosts with a screen.
+    // kAccept3dCoordinates keeps a third coordinate; with kAcceptOtherInputString an answer that is
+    // no point ends the drag with kString. A drag accepts an empty answer whatever they say, and
+    // the other bits are for hosts with a screen.
     enum UserInputControls : int {
         kGovernedByOrthoMode = 0x1,
         kNullResponseAccepted = 0x2,
