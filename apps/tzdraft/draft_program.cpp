@@ -190,7 +190,7 @@ void Run::tellEarlyEnd() const {
 
 // A call is taken back as a command is.
 void Run::runCall(std::wstring const& line) {
-    session_.beginCommand();
+    session_.beginCommand(line);
     try {
         tzhost::runFunction([&] { callTyped(line); });
     } catch (...) {
@@ -274,7 +274,7 @@ void Run::beginCommand(tzhost::Command const& command) {
     if ((command.flags & tzhost::Command::kUsesImpliedSelection) == 0) {
         tzhost::dropImpliedSelection();
     }
-    session_.beginCommand();
+    session_.beginCommand(command.localName.str());
 }
 
 void Run::endCommand(tzhost::Command const& command) {

@@ -67,14 +67,14 @@ void ProgramSession::replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
     tzhost::MemoryFaultPause const isWhole;
     if (drawing_) {
         // What the command has done so far to the drawing that goes stays one step of its undo.
-        if (isInCommand_) drawing_->undoLog().end();
+        if (isInCommand_) (void)drawing_->undoLog().end();
         tzhost::documents().close();
     }
     std::swap(drawing_, drawing);
     setVariables();  // before the drawing itself shows its style in them
     tzhost::setWorkingDrawing(drawing_.get());
     if (drawing) retired_.push_back(std::move(drawing));
-    if (isInCommand_) drawing_->undoLog().begin();
+    if (isInCommand_) drawing_->undoLog().begin(command_);
     tzhost::documents().open(drawing_.get());
 }
 
@@ -84,9 +84,12 @@ void ProgramSession::replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
     tzhost::Variables::Snapshot variables = tzhost::Variables::instance().snapshot();
     replaceBy(std::move(drawing), setVariables);
     if (!hadDrawing) return;
-    replaced_.push_back({nullptr, std::move(variables)});
+    replaced_.push_back({nullptr, std::move(variables), command_});
     replaced_.back().drawing = std::move(retired_.back());
     retired_.pop_back();
+    replaced_.back().drawing->undoLog().forgetTakenBack();
+    for (Replaced& each : std::exchange(takenBack_, {}))
+        retired_.push_back(std::move(each.drawing));
 }
 
 void ProgramSession::makeNew() {
@@ -131,14 +134,27 @@ bool ProgramSession::isOwn(std::filesystem::path const& file) const {
     return ownFiles_.count(plainPath(file)) > 0;
 }
 
-bool ProgramSession::undo() {
-    if (drawing_->undoLog().takeBack()) return true;
-    if (replaced_.empty()) return false;
-    Replaced before = std::move(replaced_.back());
-    replaced_.pop_back();
-    replaceBy(std::move(before.drawing),
-              [&] { tzhost::Variables::instance().restore(before.variables); });
-    return true;
+std::optional<std::wstring> ProgramSession::pass(ReplacedDrawings& from, ReplacedDrawings& to) {
+    if (from.empty()) return std::nullopt;
+    tzhost::MemoryFaultPause const isWhole;
+    to.push_back({nullptr, tzhost::Variables::instance().snapshot(), from.back().command});
+    Replaced other = std::move(from.back());
+    from.pop_back();
+    replaceBy(std::move(other.drawing),
+              [&] { tzhost::Variables::instance().restore(other.variables); });
+    to.back().drawing = std::move(retired_.back());
+    retired_.pop_back();
+    return other.command;
+}
+
+std::optional<std::wstring> ProgramSession::undo() {
+    std::wstring const name = drawing_->undoLog().nextBack();
+    return drawing_->undoLog().takeBack() ? name : pass(replaced_, takenBack_);
+}
+
+std::optional<std::wstring> ProgramSession::redo() {
+    std::wstring const name = drawing_->undoLog().nextAgain();
+    return drawing_->undoLog().doAgain() ? name : pass(takenBack_, replaced_);
 }
 
 bool ProgramSession::save(std::filesystem::path const& file,
@@ -211,13 +227,14 @@ void ProgramSession::doPostponed() {
         action();
 }
 
-void ProgramSession::beginCommand() {
+void ProgramSession::beginCommand(std::wstring name) {
     isInCommand_ = true;
-    drawing_->undoLog().begin();
+    command_ = std::move(name);
+    drawing_->undoLog().begin(command_);
 }
 
 void ProgramSession::endCommand() {
-    drawing_->undoLog().end();
+    if (drawing_->undoLog().end()) takenBack_.clear();
     retired_.clear();
     if (replaced_.size() > kMostReplaced) replaced_.pop_front();
     isInCommand_ = false;

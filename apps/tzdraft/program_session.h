@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <functional>
 #include <memory>
+#include <optional>
 #include <set>
 #include <string>
 #include <vector>
@@ -69,8 +70,10 @@ public:
     [[nodiscard]] bool wantsToEnd() const { return wantsToEnd_; }
 
     // Takes the last command back; one that replaced the drawing, too, by bringing the drawing
-    // before it back. False when there is nothing to take back.
-    [[nodiscard]] bool undo();
+    // before it back. The name of that command; nothing when there is none.
+    [[nodiscard]] std::optional<std::wstring> undo();
+    // Does again what undo took back last, as long as nothing else has changed a drawing since.
+    [[nodiscard]] std::optional<std::wstring> redo();
 
     // The file name of the module that LOAD proposes.
     void setModule(std::filesystem::path module) { module_ = std::move(module); }
@@ -82,32 +85,38 @@ public:
     void loadLater(std::filesystem::path file);
     void unloadLater();
 
-    // Begin and end of a command, or of a call of a function.
-    void beginCommand();
+    // Begin and end of a command, or of a call of a function; undo names it so.
+    void beginCommand(std::wstring name);
     void endCommand();
     // Does what was asked for the time after the command.
     void doPostponed();
 
 private:
-    // A drawing that another took the place of, with its variables.
+    // A drawing that another took the place of, with its variables and the command that did it.
     struct Replaced {
         std::unique_ptr<tzhost::Drawing> drawing;
         tzhost::Variables::Snapshot variables;
+        std::wstring command;
     };
+    using ReplacedDrawings = std::deque<Replaced>;
 
     void replaceBy(std::unique_ptr<tzhost::Drawing> drawing,
                    std::function<void()> const& setVariables);
     // The same, and undo can bring the present drawing back.
     void replaceForUndo(std::unique_ptr<tzhost::Drawing> drawing,
                         std::function<void()> const& setVariables);
+    // The last drawing of `from` in place of the open one, which goes to the end of `to`.
+    std::optional<std::wstring> pass(ReplacedDrawings& from, ReplacedDrawings& to);
 
     std::unique_ptr<tzhost::Drawing> drawing_;
-    std::deque<Replaced> replaced_;  // for undo, the newest last
+    ReplacedDrawings replaced_;   // for undo, the newest last
+    ReplacedDrawings takenBack_;  // for redo, the next one last
     // Drawings that a command has done away with live until that command has ended.
     std::vector<std::unique_ptr<tzhost::Drawing>> retired_;
     std::vector<std::function<void()>> postponed_;
     std::set<std::filesystem::path> ownFiles_;
     std::filesystem::path module_;
+    std::wstring command_;  // the one that runs
     tzhost::PageChoice page_;
     tzhost::PlotSpace space_ = tzhost::PlotSpace::active;
     bool isInCommand_ = false;

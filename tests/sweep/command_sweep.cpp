@@ -23,6 +23,14 @@ namespace tztest {
 namespace {
 
 constexpr wchar_t kModuleGroup[] = L"TZCORE_MTEXT";
+// Commands of the program that change the drawing at their end or not at all.
+constexpr wchar_t const* kWholeCommands[] = {L"MOVE", L"COPY", L"ROTATE", L"TEXT", L"INSERT"};
+
+bool isSwept(tzhost::Command const& command) {
+    return command.group == kModuleGroup ||
+           std::any_of(std::begin(kWholeCommands), std::end(kWholeCommands),
+                       [&](wchar_t const* name) { return command.globalName == name; });
+}
 
 // What a command was given, in the order in which it asked: answers and blocks of editors.
 struct Recorded {
@@ -149,7 +157,7 @@ tzhost::Answer SweepSource::nextCommand(tzhost::AnswerRequest const& request) {
 tzhost::Answer SweepSource::begin(tzhost::Answer const& line) {
     if (line.kind != tzhost::Answer::Kind::line) return line;
     tzhost::Command const* const command = tzhost::commandStack().find(TzString(line.text));
-    if (!command || command->group != kModuleGroup) return line;
+    if (!command || !isSwept(*command)) return line;
     ++counts_.commands;
     phase_ = Phase::recording;
     command_ = line;

@@ -89,6 +89,26 @@ bool unlock() {
                        [](TzDbLayerTableRecord& layer) { (void)layer.setIsLocked(false); });
 }
 
+bool turnOn() {
+    return changeNamed(localText(L"Layer to turn on"),
+                       [](TzDbLayerTableRecord& layer) { (void)layer.setIsOff(false); });
+}
+
+bool turnOff() {
+    return changeNamed(localText(L"Layer to turn off"),
+                       [](TzDbLayerTableRecord& layer) { (void)layer.setIsOff(true); });
+}
+
+// One that anything lies on stays, and so do "0" and the current one.
+bool remove() {
+    Answer<TzString> const name = askName(localText(L"Layer to delete"), offerLayers());
+    if (name.asked != Asked::given) return !name.isCancelled();
+    Opened<TzDbLayerTableRecord> const layer(layerNamed(name.value), TzDb::kForWrite);
+    if (layer && layer->erase() != Tzad::eOk)
+        tellProblem(localText(L"\"%ls\" is in use and stays."), layer->getName());
+    return true;
+}
+
 bool list() {
     TzDbLayerTable* table = nullptr;
     TzDbSymbolTableIterator* found = nullptr;
@@ -100,8 +120,8 @@ bool list() {
     for (walk->start(); !walk->done(); walk->step()) {
         Opened<TzDbLayerTableRecord> const layer(walk->getRecordId(), TzDb::kForRead);
         if (!layer) continue;
-        tzutPrintf(localText(L"\n\"%ls\", colour %ls%ls"), layer->getName(),
-                   writeColor(layer->color()).c_str(),
+        tzutPrintf(localText(L"\n\"%ls\", colour %ls%ls%ls"), layer->getName(),
+                   writeColor(layer->color()).c_str(), layer->isOff() ? localText(L", off") : L"",
                    layer->isLocked() ? localText(L", locked") : L"");
     }
     tzutPrintf(localText(L"\nCurrent layer: \"%ls\".\n"), currentLayerName().kwszPtr());
@@ -114,10 +134,10 @@ struct Choice {
     bool (*action)();
 };
 
-constexpr wchar_t const* kWords = forLocalText(L"Make Set Color LOck Unlock ?");
+constexpr wchar_t const* kWords = forLocalText(L"Make Set ON OFf Color LOck Unlock Delete ?");
 constexpr Choice kChoices[] = {
-    {L"Make", make}, {L"Set", set},       {L"Color", color},
-    {L"LOck", lock}, {L"Unlock", unlock}, {L"?", list},
+    {L"Make", make}, {L"Set", set},       {L"ON", turnOn},     {L"OFf", turnOff}, {L"Color", color},
+    {L"LOck", lock}, {L"Unlock", unlock}, {L"Delete", remove}, {L"?", list},
 };
 
 bool act(TzString const& word) {

@@ -7,8 +7,15 @@
 namespace tzdraft {
 
 void undoCommand() {
-    if (!ProgramSession::current().undo())
-        tellProblem(localText(L"There is nothing to take back."));
+    auto const command = ProgramSession::current().undo();
+    if (!command) return tellProblem(localText(L"There is nothing to take back."));
+    tzutPrintf(localText(L"\n%ls is taken back.\n"), command->c_str());
+}
+
+void redoCommand() {
+    auto const command = ProgramSession::current().redo();
+    if (!command) return tellProblem(localText(L"There is nothing to do again."));
+    tzutPrintf(localText(L"\n%ls is done again.\n"), command->c_str());
 }
 
 }  // namespace tzdraft
