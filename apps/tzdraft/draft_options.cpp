@@ -9,6 +9,7 @@
 #include "apps/options/local_help.h"
 #include "apps/options/option_list.h"
 #include "apps/tzdraft/page_options.h"
+#include "apps/tzdraft/version.h"
 #include "host/text/visible_text.h"
 
 namespace tzdraft {
@@ -95,7 +96,7 @@ int printAnswer(std::string const& text) {
 ParsedOptions parseOptions(int count, char const* const* arguments) {
     CLI::App app(kPurpose, "tzdraft");
     app.footer(kScripts);
-    app.set_version_flag("--version", "tzdraft 1.0");
+    app.set_version_flag("--version", kVersion);
     ParsedOptions parsed;
     declare(app, parsed.options);
     tzapps::speakHelp(app, tzapps::localeAsked(count, arguments));

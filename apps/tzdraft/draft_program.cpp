@@ -13,10 +13,12 @@
 #include "apps/tzdraft/end_signals.h"
 #include "apps/tzdraft/event_file.h"
 #include "apps/tzdraft/function_call.h"
+#include "apps/tzdraft/near_words.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
+#include "apps/tzdraft/version.h"
 #include "host/base/audit.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/script_source.h"
@@ -59,6 +61,10 @@ private:
     [[nodiscard]] std::optional<std::wstring> nextLine() const;
     [[nodiscard]] static bool endsHere();
     void runCall(std::wstring const& line);
+    void greet() const;
+    static void tellUnknown(std::wstring const& line);
+    // Whether the line means something that can be run.
+    [[nodiscard]] static bool isKnown(std::wstring const& line);
     void runTyped(std::wstring const& line);
     void runGuarded(std::wstring const& line);
     void beginCommand(tzhost::Command const& command);
@@ -204,13 +210,34 @@ bool isCall(std::wstring const& line) {
     return line.front() == L'(';
 }
 
+bool Run::isKnown(std::wstring const& line) {
+    return isCall(line) || tzhost::commandStack().find(TzString(line)) != nullptr;
+}
+
+void Run::tellUnknown(std::wstring const& line) {
+    std::wstring const near = nearestWord(line, commandNames());
+    TzString said = TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str());
+    if (!near.empty()) said += TzString::formatted(localText(L" Near it is %ls."), near.c_str());
+    said += TzString::formatted(localText(L" %ls lists all."), localText(L"HELP"));
+    tzhost::commandLine().sayProblem(said.str());
+}
+
+// To a person who may be here for the first time.
+void Run::greet() const {
+    if (!tzhost::commandLine().isPerson()) return;
+    std::filesystem::path const& file = session_.drawing().file();
+    std::wstring const name = file.empty() ? std::wstring(localText(L"a drawing without a name"))
+                                           : tzhost::fromUtf8(file.string());
+    tzhost::commandLine().say(TzString::formatted(localText(L"%ls, %ls. %ls lists the commands."),
+                                                  TzString::fromUtf8(kVersion).kwszPtr(),
+                                                  name.c_str(), localText(L"HELP"))
+                                  .str());
+}
+
 void Run::runTyped(std::wstring const& line) {
     if (isCall(line)) return runCall(line);
     tzhost::Command const* const command = tzhost::commandStack().find(TzString(line));
-    if (!command) {
-        return tzhost::commandLine().sayProblem(
-            TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str()).str());
-    }
+    if (!command) return tellUnknown(line);
     auto const answers =
         tzhost::commandLine().isPerson() ? tzhost::AnswersFrom::user : tzhost::AnswersFrom::script;
     tzhost::runCommand(*command, answers);
@@ -256,12 +283,17 @@ std::optional<std::wstring> Run::nextLine() const {
     return std::nullopt;
 }
 
-// Enter alone repeats the line before it where a person types; in a script it does nothing.
+// Enter alone repeats the command before it where a person types, but no mistyped one; in a script
+// it does nothing.
 void Run::readCommands() {
     std::wstring last;
     while (auto const line = nextLine()) {
-        if (!line->empty()) last = *line;
-        if (!line->empty() || (!last.empty() && tzhost::commandLine().isPerson())) runGuarded(last);
+        if (line->empty()) {
+            if (!last.empty() && tzhost::commandLine().isPerson()) runGuarded(last);
+            continue;
+        }
+        last = isKnown(*line) ? *line : std::wstring();
+        runGuarded(*line);
     }
 }
 
@@ -349,6 +381,7 @@ int Run::finish() {
 int Run::toItsEnd() {
     if (!begin()) return kUnusable;
     EndSignals const endInOrder;
+    greet();
     readCommands();
     return finish();
 }

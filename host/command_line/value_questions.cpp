@@ -7,9 +7,11 @@
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
 #include "host/command_line/unit_reader.h"
+#include "host/settings/variables.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
 #include "tz/ed/prompts.h"
+#include "tz/ed/units.h"
 
 using tzhost::Armed;
 using tzhost::Question;
@@ -43,8 +45,25 @@ struct Measure {
     QuestionKind kind;
     std::optional<double> (*read)(std::wstring_view text);
     double (*between)(TzGePoint3d const& from, TzGePoint3d const& to);
+    TzString (*shown)(double value);
     wchar_t const* complaint;
 };
+
+int setting(wchar_t const* name) {
+    return static_cast<int>(tzhost::Variables::instance().number(name));
+}
+
+TzString shownDistance(double value) {
+    TzString text;
+    (void)tzdbRToS(value, setting(L"LUNITS"), setting(L"LUPREC"), text);  // finite, so it has one
+    return text;
+}
+
+TzString shownAngle(double radians) {
+    TzString text;
+    (void)tzdbAngToS(radians, setting(L"AUNITS"), setting(L"AUPREC"), text);
+    return text;
+}
 
 double distanceBetween(TzGePoint3d const& from, TzGePoint3d const& to) {
     return from.distanceTo(to);
@@ -57,10 +76,12 @@ double angleBetween(TzGePoint3d const& from, TzGePoint3d const& to) {
 }
 
 constexpr Measure kDistance{QuestionKind::distance, tzhost::readDistance, distanceBetween,
+                            shownDistance,
                             tzhost::forLocalText(L"A length is needed, or a point.")};
-constexpr Measure kAngle{QuestionKind::angle, tzhost::readAngle, angleBetween,
+constexpr Measure kAngle{QuestionKind::angle, tzhost::readAngle, angleBetween, shownAngle,
                          tzhost::forLocalText(L"An angle is needed, or a point.")};
 constexpr Measure kOrientation{QuestionKind::orientation, tzhost::readAngle, angleBetween,
+                               shownAngle,
                                tzhost::forLocalText(L"An angle is needed, or a point.")};
 
 Reply giveNumber(double value, Armed const& armed, double* result) {
@@ -79,7 +100,13 @@ int askMeasure(Measure const& measure, double const* base, wchar_t const* prompt
         }
         auto const point = tzhost::takePoint(answer);
         if (!point) return Reply::unreadable(tzhost::localText(measure.complaint));
-        if (from) return giveNumber(measure.between(*from, *point), question.armed(), result);
+        if (from) {
+            Reply reply = giveNumber(measure.between(*from, *point), question.armed(), result);
+            // What the points came to, which the drafter has not typed.
+            if (reply.kind == Reply::Kind::done)
+                tzhost::commandLine().say(measure.shown(*result).str());
+            return reply;
+        }
         from = point;
         question.setPrompt(tzhost::localText(L"Second point: "));
         return Reply::goOn(Tzad::ePromptNormal);

@@ -123,6 +123,12 @@ constexpr char kCenter[] = "Center point: ";
 
 KeysCase const kCases[] = {
     {"EnterRepeats", {kIdle, "U\r", kIdle, "\r"}, "take back.", 0, kNone},
+    {"EnterRepeatsNoSlip", {kIdle, "U\r", kIdle, "UU\r", kIdle, "\r"}, "\r\nCommand: ", 0, kNone},
+    {"SaysWhereOneIs",
+     {"tzdraft 1.0, a drawing without a name. HELP lists the commands.", ""},
+     kIdle,
+     0,
+     kNone},
     {"ControlCCancels", {kIdle, "CIRCLE\r", kCenter, "1,2\x03"}, "^C\r\nCommand: ", 0, kNone},
     {"ControlCAtTheIdlePrompt", {kIdle, "abc\x03"}, "^C\r\nCommand: ", 0, kNone},
     {"ControlDInsideACommand", {kIdle, "CIRCLE\r", kCenter, "\x04"}, "\r\n", 1, kNone},

@@ -37,8 +37,26 @@ TranscriptCase const kCases[] = {
     {"OpenedStyleIsShown",
      "STYLE\nBig\n\n\n\n\n\n\n\n\n"
      "SAVE\nbig.json\nNEW\nOPEN\nbig.json\nSETVAR\nTEXTSTYLE\n\n",
-     "TEXTSTYLE <Big>:"},
-    {"GoneWithItsModule", "UNLOAD\nMTEXT\n", "There is no command \"MTEXT\".\n"},
+     "TEXTSTYLE is read-only: Big\n"},
+    {"GoneWithItsModule", "UNLOAD\nMTEXT\n",
+     "no command \"MTEXT\". Near it is TEXT. HELP lists all.\n"},
+    {"ListTellsAll",
+     "ATTDEF\n\nNO\n\n17\n0,0\n1\n\nBLOCK\nDOOR\n0,0\nall\n\nINSERT\nDOOR\n5,0\n2\n30\n18\n"
+     "-MTEXT\n0,0\nColumns\nStatic\n20\n2\n1\n10\nOne\n\nLIST\nall\n\n",
+     "  block            DOOR\n  position         5.0000, 0.0000, 0.0000\n  scale            2\n"
+     "  rotation         30\n  NO               18\nMText  #5, layer \"0\"\n"
+     "  location         0.0000, 0.0000, 0.0000\n  attachment       top left\n"
+     "  style            Standard\n  text height      1.0000\n  rotation         0\n"
+     "  line spacing     at least 1\n"},
+    {"NothingNear", "WALTZ\n", "There is no command \"WALTZ\". HELP lists all.\n"},
+    {"UndoSaysWhat", "CIRCLE\n0,0\n1\nundo\nREDO\nexit\n",
+     "CIRCLE is taken back.\nCommand: REDO\nCIRCLE is done again.\nCommand: exit\n"},
+    {"NothingToDoAgain", "REDO\n", "There is nothing to do again.\n"},
+    {"PointsTellTheirDistance", "SETVAR\nLUNITS\n4\nCIRCLE\n1,1\n4,5\n", "4,5\n5\"\n"},
+    {"BlocksAndStylesAreListed", "INSERT\n?\n\nSTYLE\n?\nNew\nNo Such Face\n^C\n",
+     "none yet.\nBlock to insert or [?]: \nCommand: STYLE\nText style name or [?] <Standard>: ?\n"
+     "  Standard\nText style name or [?] <Standard>: New\nFont file or typeface <txt.shx>: "
+     "No Such Face\nThe typeface \"No Such Face\" is not installed; another stands in for it.\n"},
     {"LoadedTwice", "LOAD\n\n", "tzmted.tzx: this module is loaded already\n", tzdraft::kFailed},
     {"NoSuchModule", "LOAD\nmissing.tzx\n",
      "missing.tzx: the module cannot be loaded: ", tzdraft::kFailed},

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "apps/tzdraft/commands/name_list.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
@@ -96,6 +97,17 @@ askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultNam
         if (defaultName.isEmpty()) answer.asked = Asked::empty;
     }
     return answer;
+}
+
+Answer<TzString> askListedName(wchar_t const* question,
+                               tzhost::Offer const& offer,
+                               TzDbObjectId table,
+                               TzString const& defaultName) {
+    for (;;) {
+        Answer<TzString> const answer = askName(question, offer, defaultName);
+        if (answer.asked != Asked::given || answer.value != L"?") return answer;
+        listNames(table);
+    }
 }
 
 std::optional<std::filesystem::path>

@@ -4,6 +4,7 @@
 #include <optional>
 
 #include "host/command_line/answer_source.h"
+#include "tz/db/object_id.h"
 #include "tz/ge/point3d.h"
 #include "tz/text/string.h"
 
@@ -26,6 +27,11 @@ struct Answer {
 // The same for a name, which completion may be offered for (choices.h).
 [[nodiscard]] Answer<TzString>
 askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultName = TzString());
+// The same for a name in a table of the drawing, whose names "?" lists before it asks again.
+[[nodiscard]] Answer<TzString> askListedName(wchar_t const* question,
+                                             tzhost::Offer const& offer,
+                                             TzDbObjectId table,
+                                             TzString const& defaultName = TzString());
 // The name of a file; nothing for none. Completion looks for one without a slash in `home`.
 [[nodiscard]] std::optional<std::filesystem::path> askFile(wchar_t const* question,
                                                            TzString const& defaultFile = TzString(),

@@ -38,6 +38,8 @@ constexpr std::array kCommands{
                 forLocalText(L"Copies what is selected from a base point to others; Enter ends.")},
     HostCommand{forLocalText(L"ERASE"), eraseCommand, kSeesSelection,
                 forLocalText(L"Erases what is selected, but for what lies on locked layers.")},
+    HostCommand{forLocalText(L"EXIT"), quitCommand, kAlone,
+                forLocalText(L"Ends the session, as QUIT does.")},
     HostCommand{forLocalText(L"HELP"), helpCommand, kAlone,
                 forLocalText(L"Lists all commands, or tells about one.")},
     HostCommand{forLocalText(L"INSERT"), insertCommand, kAlone,
@@ -84,6 +86,8 @@ constexpr std::array kCommands{
                 forLocalText(L"Takes the last command back; it asks nothing.")},
     HostCommand{forLocalText(L"UCS"), ucsCommand, kAlone,
                 forLocalText(L"Moves and turns the user coordinate system.")},
+    HostCommand{forLocalText(L"UNDO"), undoCommand, kAlone,
+                forLocalText(L"Takes the last command back, as U does.")},
     HostCommand{
         forLocalText(L"UNLOAD"), unloadCommand, kAlone,
         forLocalText(

@@ -112,7 +112,8 @@ void postWith(std::unique_ptr<TzDbBlockReference> reference, std::vector<Wanted>
 }  // namespace
 
 void insertCommand() {
-    Answer<TzString> const name = askName(localText(L"Block to insert"), offerBlocks());
+    Answer<TzString> const name = askListedName(localText(L"Block to insert or [?]"), offerBlocks(),
+                                                ProgramSession::current().drawing().blockTableId());
     if (name.asked != Asked::given) return;
     TzDbObjectId const block = blockNamed(name.value);
     if (block.isNull()) {

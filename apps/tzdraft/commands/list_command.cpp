@@ -2,10 +2,12 @@
 #include <string>
 
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/color_text.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/settings/variables.h"
+#include "tz/db/block_table.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"
@@ -22,15 +24,21 @@ constexpr wchar_t const* kKinds[] = {
     forLocalText(L"Line"),
 };
 
-constexpr double kDegreesPerRadian = 180 / 3.14159265358979323846;
+// In the order of the attachments, which count from 1.
+constexpr wchar_t const* kAttachments[] = {
+    forLocalText(L"top left"),    forLocalText(L"top center"),    forLocalText(L"top right"),
+    forLocalText(L"middle left"), forLocalText(L"middle center"), forLocalText(L"middle right"),
+    forLocalText(L"bottom left"), forLocalText(L"bottom center"), forLocalText(L"bottom right"),
+};
+
+int setting(wchar_t const* name) {
+    return static_cast<int>(tzhost::Variables::instance().number(name));
+}
 
 // In the drawing's units.
 TzString length(double value) {
-    tzhost::Variables const& variables = tzhost::Variables::instance();
     TzString text;
-    // Every finite value has a text.
-    (void)tzdbRToS(value, static_cast<int>(variables.number(L"LUNITS")),
-                   static_cast<int>(variables.number(L"LUPREC")), text);
+    (void)tzdbRToS(value, setting(L"LUNITS"), setting(L"LUPREC"), text);  // finite, so it has one
     return text;
 }
 
@@ -38,19 +46,57 @@ TzString point(TzGePoint3d const& place) {
     return length(place.x) + L", " + length(place.y) + L", " + length(place.z);
 }
 
-TzString degrees(double radians) {
-    return TzString::formatted(localText(L"%.4g degrees"), radians * kDegreesPerRadian);
+TzString angle(double radians) {
+    TzString text;
+    (void)tzdbAngToS(radians, setting(L"AUNITS"), setting(L"AUPREC"), text);
+    return text;
+}
+
+TzString number(double value) {
+    return TzString::formatted(L"%g", value);
+}
+
+// Of a record of one of the tables.
+TzString nameOf(TzDbObjectId id) {
+    Opened<TzDbSymbolTableRecord> const record(id, TzDb::kForRead);
+    return record ? TzString(record->getName()) : TzString();
 }
 
 void row(wchar_t const* name, TzString const& value) {
     tzutPrintf(L"\n  %-16ls %ls", name, value.kwszPtr());
 }
 
+void listColumns(TzDbMText const& text) {
+    if (text.columnType() == TzDbMText::kNoColumns) return;
+    TextEditorColumns const columns = text.columns();
+    bool const isStatic = columns.columnType == TzDbMText::kStaticColumns;
+    row(localText(L"columns"),
+        TzString::formatted(
+            localText(L"%ls, %d, width %ls, gutter %ls"),
+            localText(isStatic ? forLocalText(L"static") : forLocalText(L"dynamic")),
+            columns.columnCount, length(columns.columnWidth).kwszPtr(),
+            length(columns.columnGutter).kwszPtr()));
+}
+
+void listBackground(TzDbMText const& text) {
+    if (!text.backgroundFillOn()) return;
+    std::wstring const color = text.useBackgroundColorOn() ? std::wstring(localText(L"as the page"))
+                                                           : writeColor(text.backgroundFillColor());
+    row(localText(L"background"),
+        TzString::formatted(localText(L"colour %ls, scale %ls"), color.c_str(),
+                            number(text.backgroundScaleFactor()).kwszPtr()));
+}
+
 void listMText(TzDbMText const& text) {
+    bool const isExact = text.lineSpacingStyle() == TzDb::kExactly;
     row(localText(L"location"), point(text.location()));
-    row(localText(L"attachment"), TzString::formatted(L"%d", static_cast<int>(text.attachment())));
+    row(localText(L"attachment"), localText(kAttachments[static_cast<int>(text.attachment()) - 1]));
+    row(localText(L"style"), nameOf(text.textStyle()));
     row(localText(L"text height"), length(text.textHeight()));
-    row(localText(L"rotation"), degrees(text.rotation()));
+    row(localText(L"rotation"), angle(text.rotation()));
+    row(localText(L"line spacing"),
+        TzString::formatted(isExact ? localText(L"exactly %ls") : localText(L"at least %ls"),
+                            number(text.lineSpacingFactor()).kwszPtr()));
     row(localText(L"width"),
         text.width() > 0 ? length(text.width()) : TzString(localText(L"no wrapping")));
     row(localText(L"measured"), length(text.actualWidth()) + L" x " + length(text.actualHeight()));
@@ -60,24 +106,36 @@ void listMText(TzDbMText const& text) {
         row(localText(L"upper left"), point(corners[0]));
         row(localText(L"lower right"), point(corners[3]));
     }
-    if (text.columnType() != TzDbMText::kNoColumns) {
-        TextEditorColumns const columns = text.columns();
-        row(localText(L"columns"),
-            TzString::formatted(localText(L"%ls, width %ls, gutter %ls"),
-                                localText(columns.columnType == TzDbMText::kStaticColumns
-                                              ? forLocalText(L"static")
-                                              : forLocalText(L"dynamic")),
-                                length(columns.columnWidth).kwszPtr(),
-                                length(columns.columnGutter).kwszPtr()));
-    }
+    listColumns(text);
+    listBackground(text);
     row(localText(L"contents"), text.contents());
 }
 
 void listText(TzDbText const& text) {
     row(localText(L"position"), point(text.position()));
+    row(localText(L"style"), nameOf(text.textStyle()));
     row(localText(L"text height"), length(text.height()));
-    row(localText(L"rotation"), degrees(text.rotation()));
+    row(localText(L"rotation"), angle(text.rotation()));
+    row(localText(L"width factor"), number(text.widthFactor()));
+    row(localText(L"oblique"), angle(text.oblique()));
     row(localText(L"text"), text.textString());
+}
+
+// Of several lines, where these stand and what they say.
+void listDefinition(TzDbAttributeDefinition const& definition) {
+    row(localText(L"tag"), definition.tag());
+    row(localText(L"prompt"), definition.prompt());
+    TzDbMText const* const lines = definition.getMTextAttributeDefinitionConst();
+    if (lines) {
+        listMText(*lines);
+    } else {
+        listText(definition);
+    }
+}
+
+void listAttribute(TzDbAttribute const& attribute) {
+    row(localText(L"tag"), attribute.tag());
+    listText(attribute);
 }
 
 void listLine(TzDbLine const& line) {
@@ -92,8 +150,16 @@ void listCircle(TzDbCircle const& circle) {
 }
 
 void listReference(TzDbBlockReference const& reference) {
+    row(localText(L"block"), nameOf(reference.blockTableRecord()));
     row(localText(L"position"), point(reference.position()));
-    row(localText(L"scale"), TzString::formatted(L"%g", reference.scale()));
+    row(localText(L"scale"), number(reference.scale()));
+    row(localText(L"rotation"), angle(reference.rotation()));
+    TzArray<TzDbObjectId> ids;
+    reference.attributes(ids);
+    for (TzDbObjectId const id : ids) {
+        Opened<TzDbAttribute> const attribute(id, TzDb::kForRead);
+        if (attribute) row(attribute->tag(), attribute->textString());
+    }
 }
 
 // Tells about the entity when it is of the class; false when it is not.
@@ -117,7 +183,9 @@ void listEntity(TzDbEntity const& entity) {
     tzutPrintf(localText(L"\n%ls  #%llX, layer \"%ls\""), kindOf(entity).c_str(),
                static_cast<unsigned long long>(entity.objectId().handle()),
                entity.layer().kwszPtr());
-    (void)(listAs(entity, listMText) || listAs(entity, listText) || listAs(entity, listLine) ||
+    if (!entity.color().isByLayer()) row(localText(L"colour"), writeColor(entity.color()));
+    (void)(listAs(entity, listMText) || listAs(entity, listDefinition) ||
+           listAs(entity, listAttribute) || listAs(entity, listText) || listAs(entity, listLine) ||
            listAs(entity, listCircle) || listAs(entity, listReference));
 }
 

@@ -47,6 +47,10 @@ void setvarCommand() {
         return;
     }
     TzString const shown(tzhost::writeValue(*present));
+    if (tzhost::findVariable(name.value.str())->access == tzhost::Access::readOnly) {
+        return tellProblem(localText(L"%ls is read-only: %ls"), name.value.kwszPtr(),
+                           shown.kwszPtr());
+    }
     Answer<TzString> const value = askText(TzString::formatted(
         localText(L"New value for %ls <%ls>"), name.value.kwszPtr(), shown.kwszPtr()));
     if (value.asked != Asked::given) return;

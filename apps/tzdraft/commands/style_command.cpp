@@ -5,6 +5,7 @@
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
+#include "host/fonts/machine_fonts.h"
 #include "tz/db/extensions.h"
 #include "tz/ed/print.h"
 
@@ -62,6 +63,17 @@ bool take(Answer<Value> const& answer, Value& place) {
     return !answer.isCancelled();
 }
 
+// A face whose texts will be shown in another is likely a slip. Vertical faces have an "@" before
+// their name.
+void tellMissing(TzString const& face) {
+    TzString const name = face.left(1) == L"@" ? face.mid(1) : face;
+    if (!name.isEmpty() && tzhost::englishNameOf(name.str()).empty()) {
+        tzutPrintf(
+            localText(L"\nThe typeface \"%ls\" is not installed; another stands in for it.\n"),
+            name.kwszPtr());
+    }
+}
+
 // "a.shx,b.shx" names a font file with its big font.
 bool askFont(StyleAnswers& values) {
     TzString shown = values.font;
@@ -73,6 +85,7 @@ bool askFont(StyleAnswers& values) {
     values.font = isPair ? answer.left(comma) : answer;
     values.bigFont = isPair ? answer.mid(comma + 1) : TzString();
     if (isFontFile(values.font)) return true;
+    tellMissing(values.font);
     return take(askYesNo(localText(L"Bold?"), values.bold), values.bold) &&
            take(askYesNo(localText(L"Italic?"), values.italic), values.italic);
 }
@@ -141,7 +154,11 @@ void styleCommand() {
             ProgramSession::current().drawing().textstyle(), TzDb::kForRead);
         if (present) name = present->getName();
     }
-    if (!take(askName(localText(L"Text style name"), offerStyles(), name), name)) return;
+    if (!take(askListedName(localText(L"Text style name or [?]"), offerStyles(),
+                            ProgramSession::current().drawing().textStyleTableId(), name),
+              name)) {
+        return;
+    }
     StyleAnswers values = startingValues(name);
     if (!askAll(values)) return;
     TzDbObjectId const id = styleNamed(name);
