@@ -67,8 +67,8 @@ TEST(GermanSession, DrawsWhatTheEnglishOneDraws) {
 TEST(GermanSession, HasNoLineOfTheEnglishOne) {
     std::set<std::string> const english = linesOf(play("global.scr", "en").screen);
     for (std::string const& line : linesOf(play("german.scr", "de").screen)) {
-        // The question of an attribute is the drafter's own text.
-        bool const isDrafters = line.starts_with("RAUM ");
+        // The question of an attribute is the drafter's own text, and so is its name.
+        bool const isDrafters = line.find("RAUM ") <= 2;  // LISTE indents it
         EXPECT_TRUE(isDrafters || english.count(line) == 0) << line;
     }
 }

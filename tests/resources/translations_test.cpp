@@ -156,8 +156,9 @@ std::wstring capitalsOf(std::wstring const& word) {
 }
 
 // The keywords of the host's commands.
-constexpr wchar_t const* kHostQuestions[] = {
-    L"Yes No", L"Single Multiple", L"Make Set Color LOck Unlock ?", L"World X Y Z 3point"};
+constexpr wchar_t const* kHostQuestions[] = {L"Yes No", L"Single Multiple",
+                                             L"Make Set ON OFf Color LOck Unlock Delete ?",
+                                             L"World X Y Z 3point"};
 
 TEST_P(Translations, HaveWordsThatAreToldApart) {
     std::map<std::wstring, std::wstring> texts;

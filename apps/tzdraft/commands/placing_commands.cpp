@@ -93,7 +93,7 @@ std::optional<TzGeMatrix3d> askTurn(PlacingDrag& drag, TzGePoint3d const& base) 
         if (status != TzEdJig::kString) return std::nullopt;
         std::wstring const typed = tzhost::commandLine().takeInput().value_or(L"");
         if (auto const radians = tzhost::readAngle(typed)) return turned(base, *radians);
-        tzhost::commandLine().say(localText(L"An angle is needed, or a point."));
+        tzhost::commandLine().sayProblem(localText(L"An angle is needed, or a point."));
     }
 }
 
