@@ -28,14 +28,18 @@ void followStyle(TzDbText& text) {
 bool askHeight(TzGePoint3d const& start, double& height) {
     height = heightOfStyle();
     if (height > 0) return true;
-    tzhost::Variables& variables = tzhost::Variables::instance();
-    Answer<double> const answer =
-        askLength(localText(L"Text height"), &start, variables.number(L"TEXTSIZE"));
-    if (answer.asked != Asked::given) return false;
+    Answer<double> const answer = askLength(localText(L"Text height"), &start,
+                                            tzhost::Variables::instance().number(L"TEXTSIZE"));
     height = answer.value;
+    return answer.asked == Asked::given;
+}
+
+// The next text proposes it, unless the style decides.
+void keepHeight(double height) {
+    if (heightOfStyle() > 0) return;
     // A length above 0 is within the limits.
-    (void)variables.set(L"TEXTSIZE", tzhost::VariableValue(height), tzhost::Writer::user);
-    return true;
+    (void)tzhost::Variables::instance().set(L"TEXTSIZE", tzhost::VariableValue(height),
+                                            tzhost::Writer::user);
 }
 
 }  // namespace
@@ -60,6 +64,7 @@ void placeText(TzDbText& text, TextPlace const& place) {
     (void)text.setRotation(place.rotation);
     (void)text.setHeight(place.height);
     followStyle(text);
+    keepHeight(place.height);
 }
 
 void textCommand() {

@@ -17,11 +17,11 @@ struct TextPlace {
     double height = 0;
 };
 
-// Asks for start point, height (unless the style has one, kept in TEXTSIZE) and angle; nothing
-// after a cancel.
+// Asks for start point, height (unless the style has one) and angle; nothing after a cancel.
 [[nodiscard]] std::optional<TextPlace> askTextPlace();
 
-// Puts a new text there, on the layer for texts, with the proportions of its style.
+// Puts a new text there, on the layer for texts, with the proportions of its style; its height is
+// the one that the next text proposes.
 void placeText(TzDbText& text, TextPlace const& place);
 
 }  // namespace tzdraft
