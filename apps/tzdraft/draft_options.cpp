@@ -54,7 +54,8 @@ void declare(CLI::App& app, Options& options) {
     app.add_flag("--quiet", options.isQuiet, "keep the transcript of a script to errors");
     declareFile(app, "--save", options.save, "write the drawing at the end");
     declareFile(app, "--svg", options.svg,
-                "plot the active space at the end, fitted to its extents or on its page");
+                "plot the active space at the end, fitted to its extents or on its page; '-' is "
+                "standard output, and the transcript goes to standard error then");
     declareFile(app, "--png", options.png, "the same as a PNG picture");
     declareFile(app, "--pdf", options.pdf, "the same as a PDF page");
     declarePage(app, options);

@@ -40,6 +40,9 @@ struct Options {
     std::vector<std::string> faults;  // NAME[:K][=STATUS]
 };
 
+// Whether a plot goes to standard output, so that the transcript goes to standard error.
+[[nodiscard]] bool plotsToOutput(Options const& options);
+
 struct ParsedOptions {
     Options options;
     std::optional<int> exit;  // the program ends at once with this status

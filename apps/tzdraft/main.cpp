@@ -25,6 +25,7 @@ int main(int count, char** arguments) {
     std::signal(SIGPIPE, SIG_IGN);  // and so is a reader that goes away
     tzdraft::ParsedOptions const parsed = tzdraft::parseOptions(count, arguments);
     if (parsed.exit) return *parsed.exit;
+    if (tzdraft::plotsToOutput(parsed.options)) tzhost::keepStandardOutput();
     std::string problem;  // with the transcript, the first one
     tzdraft::Screens screens;
     screens.output = [&](std::string_view text) {

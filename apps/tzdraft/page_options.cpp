@@ -58,7 +58,17 @@ std::optional<tzhost::PlotSpace> readSpace(std::string const& text) {
     return at != std::end(kSpaces) ? std::optional(at->second) : std::nullopt;
 }
 
+int plotsOnOutput(Options const& options) {
+    auto const files = {&options.svg, &options.png, &options.pdf};
+    return static_cast<int>(
+        std::count_if(files.begin(), files.end(), [](auto const* file) { return *file == "-"; }));
+}
+
 }  // namespace
+
+bool plotsToOutput(Options const& options) {
+    return plotsOnOutput(options) > 0;
+}
 
 void declarePage(CLI::App& app, Options& options) {
     tzhost::PageChoice& page = options.page;
@@ -92,6 +102,8 @@ void checkPage(Options const& options) {
         if (auto const problem = tzhost::problemOf(*tzhost::pageOf(std::nullopt, options.page)))
             throw CLI::ValidationError("--paper", *problem);
     }
+    if (plotsOnOutput(options) > 1)
+        throw CLI::ValidationError("-", "standard output takes one plot alone");
     bool const hasPicture = !options.svg.empty() || !options.png.empty();
     if (options.space == tzhost::PlotSpace::all && hasPicture)
         throw CLI::ValidationError("--space", localText("only a PDF has a page for each space"));

@@ -4,13 +4,16 @@
 #include <array>
 #include <new>
 #include <set>
+#include <string_view>
 
 #include "host/base/fault_point.h"
 #include "host/database/drawing.h"
 #include "host/display/draw_pass.h"
 #include "host/display/plot_paint.h"
 #include "host/display/record_access.h"
+#include "host/files/file_bytes.h"
 #include "host/files/safe_file.h"
+#include "host/files/standard_streams.h"
 #include "host/page/page_plan.h"
 #include "host/page/page_text.h"
 #include "host/text/local_text.h"
@@ -18,6 +21,7 @@
 namespace tzhost {
 namespace {
 
+constexpr std::string_view kStandardOutput = "-";
 constexpr double kDotsPerInch = 300.0;
 constexpr double kMostDots = 30'000.0;  // on a side of a picture
 
@@ -75,10 +79,16 @@ public:
     [[nodiscard]] PlotReport takeReport() { return std::move(report_); }
 
 private:
+    [[nodiscard]] std::string name() const {
+        return order_.file == kStandardOutput ? localText("standard output") : order_.file;
+    }
     bool fail(std::string const& why) {
-        report_.problem = order_.file + ": " + why;
+        report_.problem = name() + ": " + why;
         return false;
     }
+    [[nodiscard]] bool paint(ByteTaker const& take);
+    [[nodiscard]] bool writeOutput();
+    [[nodiscard]] bool writeFile();
     [[nodiscard]] bool checkPage();
     [[nodiscard]] bool addSheet(SpaceToPlot const& space);
     [[nodiscard]] bool addPaper(PlotScene scene, ViewAxes const& axes);
@@ -109,7 +119,7 @@ bool Plot::checkPage() {
 void Plot::noteLeftOut(bool hasWindow) {
     char const* const what = hasWindow ? forLocalText("what lies outside the window is left out")
                                        : forLocalText("what lies outside the page is left out");
-    std::string const remark = order_.file + ": " + localText(what);
+    std::string const remark = name() + ": " + localText(what);
     auto& remarks = report_.remarks;
     if (std::find(remarks.begin(), remarks.end(), remark) == remarks.end())
         remarks.push_back(remark);
@@ -149,21 +159,39 @@ bool Plot::make() {
 // Each face that had to be left out of the document, with what became of its letters.
 void Plot::noteLocked(std::set<std::string> const& faces) {
     for (std::string const& face : faces) {
-        report_.remarks.push_back(order_.file + ": " + face + ": " +
+        report_.remarks.push_back(name() + ": " + face + ": " +
                                   localText("may not be embedded, its letters are outlines"));
     }
 }
 
+bool Plot::paint(ByteTaker const& take) {
+    std::set<std::string> lockedFaces;
+    bool const painted = paintPlot(sheets_, order_.format, take, lockedFaces);
+    noteLocked(lockedFaces);
+    return painted;
+}
+
 bool Plot::write() {
+    return order_.file == kStandardOutput ? writeOutput() : writeFile();
+}
+
+bool Plot::writeOutput() {
+    std::string reason;
+    bool const painted = paint([&](std::string_view bytes) {
+        if (reason.empty() && !writeStandardOutput(bytes)) reason = systemReason();
+        return reason.empty();
+    });
+    if (!reason.empty()) return fail(localText("cannot be written") + ": " + reason);
+    return painted || fail(localText("the picture could not be made"));
+}
+
+bool Plot::writeFile() {
     SafeFile target(order_.file);
     bool written = target.isOpen();
-    ByteTaker const take = [&](std::string_view bytes) {
-        written = written && target.write(bytes);
-        return written;
-    };
-    std::set<std::string> lockedFaces;
-    bool const painted = written && paintPlot(sheets_, order_.format, take, lockedFaces);
-    noteLocked(lockedFaces);
+    bool const painted = written && paint([&](std::string_view bytes) {
+                             written = written && target.write(bytes);
+                             return written;
+                         });
     if (written && !painted) return fail(localText("the picture could not be made"));
     if (written && target.commit()) return true;
     return fail(localText("cannot be written") + ": " + target.reason());

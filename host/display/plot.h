@@ -20,8 +20,8 @@ enum class PlotSpace { active, model, paper, all };
 
 struct PlotOrder {
     PlotFormat format = PlotFormat::svg;
-    std::string file;
-    PageChoice page;  // stands above the drawing's own page
+    std::string file;  // "-" is standard output
+    PageChoice page;   // stands above the drawing's own page
     PlotSpace space = PlotSpace::active;
 };
 

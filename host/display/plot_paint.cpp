@@ -1,23 +1,21 @@
 #include "host/display/plot_paint.h"
 
 #include <cairo-pdf.h>
-#include <cairo-svg.h>
 #include <cairo.h>
 
 #include <algorithm>
-#include <array>
 #include <cmath>
 #include <cstdlib>
 #include <ctime>
 #include <memory>
 #include <new>
-#include <numeric>
 #include <optional>
 #include <string_view>
 
 #include "host/base/result_time.h"
 #include "host/display/plot_clip.h"
 #include "host/display/plot_text.h"
+#include "host/display/svg_writer.h"
 
 namespace tzhost {
 namespace {
@@ -62,25 +60,8 @@ std::string dateText() {
     return text;
 }
 
-// Cairo numbers the surfaces of the process and names a picture by its number. The same drawing
-// must give the same file, so the number goes.
-void unnumber(std::string& svg) {
-    constexpr std::string_view kName = "id=\"surface";
-    std::size_t const at = svg.find(kName);
-    if (at == std::string::npos) return;
-    std::size_t const digits = at + kName.size();
-    svg.erase(digits, svg.find('"', digits) - digits);
-}
-
 Surface makeSurface(PlotFormat format, PlotSheet const& page, Output& output) {
-    switch (format) {
-    case PlotFormat::svg: {
-        Surface surface(
-            cairo_svg_surface_create_for_stream(takeBytes, &output, page.width, page.height));
-        cairo_svg_surface_set_document_unit(surface.get(), CAIRO_SVG_UNIT_PX);
-        return surface;
-    }
-    case PlotFormat::pdf: {
+    if (format == PlotFormat::pdf) {
         Surface surface(
             cairo_pdf_surface_create_for_stream(takeBytes, &output, page.width, page.height));
         // Left alone, Cairo takes the clock and writes it with its zone.
@@ -89,8 +70,6 @@ Surface makeSurface(PlotFormat format, PlotSheet const& page, Output& output) {
                                            dateText().c_str());
         }
         return surface;
-    }
-    case PlotFormat::png: break;
     }
     return Surface(cairo_image_surface_create(CAIRO_FORMAT_RGB24,
                                               static_cast<int>(std::lround(page.width)),
@@ -106,11 +85,6 @@ public:
     void paint(PlotShape const& shape);
 
 private:
-    // Nothing for a path that has a coordinate that is not finite.
-    [[nodiscard]] std::optional<std::vector<OutlineStep>>
-    placed(std::vector<OutlineStep> const& path) const;
-    [[nodiscard]] bool isTooSmall(PlotShape const& letters) const;
-    void paintBaseline(PlotShape const& letters);
     void setStroke(PlotShape const& shape, double before);
     void stroke(PlotShape const& shape, std::vector<OutlineStep> const& path);
 
@@ -120,43 +94,20 @@ private:
     LayoutBox near_;
 };
 
-// Lines on the edge show in their whole width, when it is the thinnest.
 void Painter::clip() {
-    if (!sheet_.shown) return;
-    LayoutPoint const from = sheet_.place({sheet_.shown->left, sheet_.shown->top});
-    LayoutPoint const to = sheet_.place({sheet_.shown->right, sheet_.shown->bottom});
-    double const edge = sheet_.thinnestLine / 2.0;
-    cairo_rectangle(cairo_, from.x - edge, from.y - edge, to.x - from.x + 2.0 * edge,
-                    to.y - from.y + 2.0 * edge);
+    auto const box = sheet_.clip();
+    if (!box) return;
+    cairo_rectangle(cairo_, box->left, box->bottom, box->width(), box->height());
     cairo_clip(cairo_);
 }
 
-std::optional<std::vector<OutlineStep>>
-Painter::placed(std::vector<OutlineStep> const& path) const {
-    std::vector<OutlineStep> result = path;
-    for (OutlineStep& step : result) {
-        for (LayoutPoint& each : step.points) {
-            each = sheet_.place(each);
-            if (!std::isfinite(each.x) || !std::isfinite(each.y)) return std::nullopt;
-        }
-    }
-    return result;
-}
-
 void Painter::setStroke(PlotShape const& shape, double before) {
-    double const width = shape.lineWeight * sheet_.perMillimetre;
-    cairo_set_line_width(cairo_, std::max(width, sheet_.thinnestLine));
+    StrokeLook const look = strokeOf(sheet_, shape);
+    cairo_set_line_width(cairo_, look.width);
     cairo_set_line_cap(cairo_, CAIRO_LINE_CAP_ROUND);
     cairo_set_line_join(cairo_, CAIRO_LINE_JOIN_ROUND);
-    std::vector<double> dashes = shape.dashes;
-    for (double& each : dashes)
-        each *= sheet_.scale;
-    double const period = std::accumulate(dashes.begin(), dashes.end(), 0.0);
-    // Dashes that run into each other, or longer than anything, show as a solid line.
-    bool const isVisible = period > 2.0 * sheet_.thinnestLine && std::isfinite(period);
-    // An odd number of dashes goes round twice.
-    cairo_set_dash(cairo_, dashes.data(), isVisible ? static_cast<int>(dashes.size()) : 0,
-                   isVisible ? std::fmod(before, 2.0 * period) : 0.0);
+    cairo_set_dash(cairo_, look.dashes.data(), static_cast<int>(look.dashes.size()),
+                   look.offsetAfter(before));
 }
 
 void Painter::stroke(PlotShape const& shape, std::vector<OutlineStep> const& path) {
@@ -172,28 +123,14 @@ void Painter::stroke(PlotShape const& shape, std::vector<OutlineStep> const& pat
     }
 }
 
-// Cairo draws on a grid of 1/256 page unit, where such letters vanish.
-bool Painter::isTooSmall(PlotShape const& letters) const {
-    constexpr double kLeastLetter = 1.0 / 64.0;  // page units
-    return letters.letterHeight > 0.0 && letters.letterHeight * sheet_.scale < kLeastLetter;
-}
-
-void Painter::paintBaseline(PlotShape const& letters) {
-    auto const line = placed({
-        {OutlineKind::move, {letters.from}},
-        {OutlineKind::line, {letters.to}},
-    });
-    if (line) stroke(letters, *line);
-}
-
 void Painter::paint(PlotShape const& shape) {
     PlotColor const& color = shape.color;
     cairo_set_source_rgba(cairo_, color.red, color.green, color.blue, color.alpha);
-    if (isTooSmall(shape)) return paintBaseline(shape);
-    if (text_ && !shape.glyphs.empty()) return text_->show(shape);
-    auto const path = placed(shape.path);
+    bool const isBaseline = isTooSmall(sheet_, shape);
+    if (text_ && !shape.glyphs.empty() && !isBaseline) return text_->show(shape);
+    auto const path = placedPath(sheet_, isBaseline ? baselineOf(shape) : shape.path);
     if (!path) return;
-    if (shape.kind == PlotKind::stroke) return stroke(shape, *path);
+    if (shape.kind == PlotKind::stroke || isBaseline) return stroke(shape, *path);
     addPath(cairo_, reachesBeyond(*path, near_) ? clippedArea(*path, near_) : *path);
     cairo_fill(cairo_);
 }
@@ -237,15 +174,8 @@ bool paintPlot(std::vector<PlotSheet> const& sheets,
                PlotFormat format,
                ByteTaker const& take,
                std::set<std::string>& lockedFaces) {
-    if (format != PlotFormat::svg) return paintPages(sheets, format, take, lockedFaces);
-    std::string svg;
-    ByteTaker const collect = [&](std::string_view bytes) {
-        svg += bytes;
-        return true;
-    };
-    bool const good = paintPages(sheets, format, collect, lockedFaces);
-    unnumber(svg);
-    return good && take(svg);
+    if (format == PlotFormat::svg) return SvgWriter(sheets.front(), take).write();
+    return paintPages(sheets, format, take, lockedFaces);
 }
 
 }  // namespace tzhost

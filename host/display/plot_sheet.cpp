@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <numeric>
 #include <utility>
 
 #include "host/page/page_plan.h"
@@ -35,6 +36,53 @@ double unitsInInch(PlotFormat format, double dotsPerInch) {
 
 }  // namespace
 
+std::optional<LayoutBox> PlotSheet::clip() const {
+    if (!shown) return std::nullopt;
+    LayoutPoint const from = place({shown->left, shown->top});
+    LayoutPoint const to = place({shown->right, shown->bottom});
+    double const edge = thinnestLine / 2.0;
+    return LayoutBox{from.x - edge, from.y - edge, to.x + edge, to.y + edge};
+}
+
+std::optional<std::vector<OutlineStep>> placedPath(PlotSheet const& sheet,
+                                                   std::vector<OutlineStep> const& path) {
+    std::vector<OutlineStep> result = path;
+    for (OutlineStep& step : result) {
+        for (LayoutPoint& each : step.points) {
+            each = sheet.place(each);
+            if (!std::isfinite(each.x) || !std::isfinite(each.y)) return std::nullopt;
+        }
+    }
+    return result;
+}
+
+// Cairo draws on a grid of 1/256 page unit, where such letters vanish.
+bool isTooSmall(PlotSheet const& sheet, PlotShape const& shape) {
+    constexpr double kLeastLetter = 1.0 / 64.0;  // page units
+    return shape.letterHeight > 0.0 && shape.letterHeight * sheet.scale < kLeastLetter;
+}
+
+std::vector<OutlineStep> baselineOf(PlotShape const& letters) {
+    return {{OutlineKind::move, {letters.from}}, {OutlineKind::line, {letters.to}}};
+}
+
+// An odd number of dashes goes round twice.
+double StrokeLook::offsetAfter(double before) const {
+    double const period = std::accumulate(dashes.begin(), dashes.end(), 0.0);
+    return dashes.empty() ? 0.0 : std::fmod(before, 2.0 * period);
+}
+
+StrokeLook strokeOf(PlotSheet const& sheet, PlotShape const& shape) {
+    StrokeLook look;
+    look.width = std::max(shape.lineWeight * sheet.perMillimetre, sheet.thinnestLine);
+    for (double const each : shape.dashes)
+        look.dashes.push_back(each * sheet.scale);
+    double const period = std::accumulate(look.dashes.begin(), look.dashes.end(), 0.0);
+    bool const isVisible = period > 2.0 * sheet.thinnestLine && std::isfinite(period);
+    if (!isVisible) look.dashes.clear();
+    return look;
+}
+
 PlotSheet fittedSheet(PlotScene scene, PlotFormat format) {
     PlotSheet sheet = emptySheet(format);
     sheet.scene = std::move(scene);
@@ -65,6 +113,7 @@ PlotSheet paperSheet(PlotScene scene,
     sheet.height = sheetOf(page).height * sheet.perMillimetre;
     sheet.thinnestLine = kThinnest * sheet.perMillimetre;
     if (format == PlotFormat::png) sheet.thinnestLine = std::max(sheet.thinnestLine, 1.0);
+    sheet.isPaper = true;
     sheet.middle = {plan.middleX, plan.middleY};
     sheet.scale = plan.scale * sheet.perMillimetre;
     if (plan.leavesOut)

@@ -2,6 +2,7 @@
 
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "host/display/plot_scene.h"
 #include "host/page/page.h"
@@ -23,13 +24,35 @@ struct PlotSheet {
     LayoutPoint middle;              // the point of the view that lies in the page's middle
     double scale = 1.0;              // page units for a unit of the view
     std::optional<LayoutBox> shown;  // of the view; nothing when all of it shows
+    bool isPaper = false;            // the page has a size in millimetres
 
     // From the view to the page.
     [[nodiscard]] LayoutPoint place(LayoutPoint const& point) const {
         return {width / 2.0 + (point.x - middle.x) * scale,
                 height / 2.0 - (point.y - middle.y) * scale};
     }
+    // What may be drawn on, on the page: a thinnest line on the edge of what is shown shows whole.
+    [[nodiscard]] std::optional<LayoutBox> clip() const;
 };
+
+// A path on the page; nothing for one with a coordinate that is not finite.
+[[nodiscard]] std::optional<std::vector<OutlineStep>>
+placedPath(PlotSheet const& sheet, std::vector<OutlineStep> const& path);
+
+// Whether letters would vanish in the grid of a page, and the line that they show as then.
+[[nodiscard]] bool isTooSmall(PlotSheet const& sheet, PlotShape const& shape);
+[[nodiscard]] std::vector<OutlineStep> baselineOf(PlotShape const& letters);
+
+// How a line is drawn, in page units. Dashes that run into each other, or longer than anything,
+// show as a solid line, which has none.
+struct StrokeLook {
+    double width = 0.0;
+    std::vector<double> dashes;
+
+    // Where in the dashes a line goes on that was so long before.
+    [[nodiscard]] double offsetAfter(double before) const;
+};
+[[nodiscard]] StrokeLook strokeOf(PlotSheet const& sheet, PlotShape const& shape);
 
 // The page with room around it: what lies further off leaves no trace on the page.
 [[nodiscard]] inline LayoutBox surroundingsOf(PlotSheet const& sheet) {

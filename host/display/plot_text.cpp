@@ -22,15 +22,6 @@ struct OptionsFree {
 };
 using FontOptions = std::unique_ptr<cairo_font_options_t, OptionsFree>;
 
-bool isSame(LayoutPoint const& a, LayoutPoint const& b) {
-    return a.x == b.x && a.y == b.y;
-}
-
-bool areAlike(PlotGlyph const& a, PlotGlyph const& b) {
-    return a.font == b.font && a.rightToLeft == b.rightToLeft && isSame(a.along, b.along) &&
-           isSame(a.down, b.down);
-}
-
 // The font of a glyph as it lies on the page; null when it cannot lie so.
 ScaledFont fontOn(cairo_matrix_t const& toPage, PangoFont* font) {
     // A change of the fonts' unit, which is a thousand pixels, to that of the page.
@@ -92,45 +83,16 @@ bool TextPainter::canBeText(PlotGlyph const& glyph) {
     return at->second;
 }
 
-// Whether a part of the glyph's outline lies within what the page shows.
-bool TextPainter::isShown(PlotGlyph const& glyph) const {
-    if (!sheet_.shown) return true;
-    LayoutBox const& shown = *sheet_.shown;
-    bool isBelow[4] = {true, true, true, true};
-    auto const add = [&](double x, double y) {
-        double const atX = glyph.origin.x + glyph.along.x * x + glyph.down.x * y;
-        double const atY = glyph.origin.y + glyph.along.y * x + glyph.down.y * y;
-        bool const beyond[4] = {atX<shown.left, atX> shown.right, atY<shown.bottom, atY> shown.top};
-        for (int i = 0; i < 4; ++i)
-            isBelow[i] = isBelow[i] && beyond[i];
-    };
-    bool hasOutline = false;
-    if (glyph.font && glyph.glyph != PANGO_GLYPH_EMPTY) {
-        for (OutlineStep const& step : outlineOf(glyph.font, glyph.glyph)) {
-            std::size_t const points =
-                step.kind == OutlineKind::curve ? 3 : (step.kind == OutlineKind::close ? 0 : 1);
-            for (std::size_t i = 0; i < points; ++i)
-                add(step.points[i].x, step.points[i].y);
-            hasOutline = true;
-        }
-    }
-    if (!hasOutline) add(0.0, 0.0);
-    return std::none_of(std::begin(isBelow), std::end(isBelow), [](bool all) { return all; });
-}
-
-bool TextPainter::showAsText(Glyphs const& glyphs) {
+bool TextPainter::showAsText(AlikeGlyphs const& glyphs) {
     if (!canBeText(glyphs.front())) return false;
     ScaledFont const font = fontOn(matrixOf(glyphs.front()), glyphs.front().font.get());
     if (!font) return false;
-    std::string text;
+    std::string const text = wordsOf(glyphs);
     std::vector<cairo_glyph_t> placed;
     std::vector<cairo_text_cluster_t> clusters;
     for (PlotGlyph const& each : glyphs) {
-        if (!each.text.empty() || clusters.empty()) {
+        if (!each.text.empty() || clusters.empty())
             clusters.push_back({static_cast<int>(each.text.size()), 0});
-            // Characters that are read to the left come the other way round.
-            text.insert(each.rightToLeft ? 0 : text.size(), each.text);
-        }
         if (each.glyph == PANGO_GLYPH_EMPTY) continue;
         LayoutPoint const at = sheet_.place(each.origin);
         if (!std::isfinite(at.x) || !std::isfinite(at.y)) return false;
@@ -147,7 +109,7 @@ bool TextPainter::showAsText(Glyphs const& glyphs) {
     return true;
 }
 
-void TextPainter::fillOutlines(Glyphs const& glyphs) {
+void TextPainter::fillOutlines(AlikeGlyphs const& glyphs) {
     LayoutBox const nearby = surroundingsOf(sheet_);
     for (PlotGlyph const& each : glyphs) {
         if (!each.font || each.glyph == PANGO_GLYPH_EMPTY) continue;
@@ -165,22 +127,12 @@ void TextPainter::fillOutlines(Glyphs const& glyphs) {
     }
 }
 
-void TextPainter::showAlike(Glyphs const& glyphs) {
-    if (!showAsText(glyphs)) fillOutlines(glyphs);
-}
-
 void TextPainter::show(PlotShape const& letters) {
-    Glyphs alike;
-    bool isWithText = false;
-    for (PlotGlyph const& each : letters.glyphs) {
-        if (!isShown(each)) continue;
-        bool const asText = canBeText(each);
-        if (!alike.empty() && (!areAlike(alike.back(), each) || asText != isWithText))
-            showAlike(std::exchange(alike, {}));
-        isWithText = asText;
-        alike.push_back(each);
-    }
-    if (!alike.empty()) showAlike(alike);
+    eachAlike(
+        letters, sheet_, [&](PlotGlyph const& glyph) { return canBeText(glyph); },
+        [&](AlikeGlyphs const& glyphs) {
+            if (!showAsText(glyphs)) fillOutlines(glyphs);
+        });
 }
 
 }  // namespace tzhost

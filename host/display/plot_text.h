@@ -6,7 +6,7 @@
 #include <set>
 #include <string>
 
-#include "host/display/plot_sheet.h"
+#include "host/display/plot_glyphs.h"
 
 // Letters as text: glyphs of fonts that the document holds, with the characters that they stand
 // for, so that a reader finds and copies them.
@@ -29,13 +29,8 @@ public:
     void show(PlotShape const& letters);
 
 private:
-    using Glyphs = std::vector<PlotGlyph>;
-
-    // Glyphs of one font, size and direction of reading.
-    void showAlike(Glyphs const& glyphs);
-    [[nodiscard]] bool showAsText(Glyphs const& glyphs);
-    void fillOutlines(Glyphs const& glyphs);
-    [[nodiscard]] bool isShown(PlotGlyph const& glyph) const;
+    [[nodiscard]] bool showAsText(AlikeGlyphs const& glyphs);
+    void fillOutlines(AlikeGlyphs const& glyphs);
     [[nodiscard]] bool canBeText(PlotGlyph const& glyph);
     // From Pango units to the page, without the glyph's place.
     [[nodiscard]] cairo_matrix_t matrixOf(PlotGlyph const& glyph) const;

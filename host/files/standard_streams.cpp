@@ -1,5 +1,7 @@
 #include "host/files/standard_streams.h"
 
+#include <cerrno>
+
 #include <fcntl.h>
 #include <initializer_list>
 #include <unistd.h>
@@ -11,6 +13,28 @@ void openStandardStreams() {
     for (int const each : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO}) {
         if (fcntl(each, F_GETFD) < 0) (void)open("/dev/null", O_RDWR);
     }
+}
+
+namespace {
+
+int resultOutput = STDOUT_FILENO;
+
+}  // namespace
+
+void keepStandardOutput() {
+    constexpr int kAboveStreams = 3;
+    int const kept = fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, kAboveStreams);
+    if (kept < 0 || dup2(STDERR_FILENO, STDOUT_FILENO) < 0) return;
+    resultOutput = kept;
+}
+
+bool writeStandardOutput(std::string_view bytes) {
+    while (!bytes.empty()) {
+        ssize_t const written = ::write(resultOutput, bytes.data(), bytes.size());
+        if (written < 0 && errno != EINTR) return false;
+        if (written > 0) bytes.remove_prefix(static_cast<std::size_t>(written));
+    }
+    return true;
 }
 
 }  // namespace tzhost

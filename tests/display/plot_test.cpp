@@ -216,6 +216,25 @@ TEST(Plots, NeedNoFontsOfTheViewer) {
     EXPECT_NE(pdf.find("/FontFile"), std::string::npos);
 }
 
+// Twelve letters with an outline, of seven kinds: A, n, a, the mark, g, o, the sign.
+TEST(Plots, DefineAGlyphOnceAndTellTheWords) {
+    DrawOp next = text(L"go<on", 1);
+    std::get<DrawnText>(next.what).position = {0, 5, 0};
+    std::string const svg =
+        painted(makeScene({text(L"Anna & An", 1), next}, ViewAxes()), PlotFormat::svg);
+    EXPECT_NE(svg.find("aria-label=\"Anna &amp; An\""), std::string::npos) << svg;
+    EXPECT_NE(svg.find("aria-label=\"go&lt;on\""), std::string::npos) << svg;
+    std::string_view const rest(svg);
+    auto const count = [&](std::string_view part) {
+        int found = 0;
+        for (std::size_t at = 0; (at = rest.find(part, at)) != std::string_view::npos; ++at)
+            ++found;
+        return found;
+    };
+    EXPECT_EQ(count("<use "), 12);
+    EXPECT_EQ(count("<path id="), 7);
+}
+
 // The names and dates that would differ between two runs are left out or told from outside.
 TEST(Plots, OfOneSceneAreTheSameFile) {
     PlotScene const scene = makeScene({text(L"Plan", 1)}, ViewAxes());

@@ -40,6 +40,7 @@ constexpr BadRow kUsage[] = {
     {"MarginBelowZero", "--margin -1", 2, "--margin: \"-1\" is none"},
     {"DotsBelowOne", "--dpi 0", 2, "--dpi: \"0\" is none"},
     {"OrientationTwice", "--portrait --landscape", 2, "--portrait excludes --landscape"},
+    {"OutputOfTwo", "--svg - --pdf -", 2, "-: standard output takes one plot alone"},
     {"PictureOfAllSpaces", "--space all --png a.png", 2, "--space: only a PDF has a page"},
 };
 

@@ -42,6 +42,16 @@ INSTANTIATE_TEST_SUITE_P(Rows, Pages, testing::ValuesIn(kPages), [](auto const& 
     return row.param.name;
 });
 
+TEST(Plots, GoToStandardOutputAlone) {
+    std::string const script = scratch("line.scr", "LINE\n0,0\n1,1\n\n").string();
+    tztest::ProgramRun const run = tztest::startProgram("--script " + script + " --svg -");
+    EXPECT_EQ(run.status, 0);
+    EXPECT_TRUE(run.output.starts_with("<?xml")) << run.output;
+    EXPECT_TRUE(run.output.ends_with("</svg>\n")) << run.output;
+    EXPECT_NE(run.errors.find("LINE"), std::string::npos) << run.errors;
+    EXPECT_EQ(tztest::startProgram("--script " + script + " --pdf - 2>&1 >/dev/full #").status, 2);
+}
+
 TEST(Plots, LieAsPageAndOptionsSay) {
     std::string const drawing = scratch("a3.json", R"({"format": "tz-drawing", "version": 1,
         "page": {"paper": "A3"}, "entities": [{"type": "LINE", "end": [999, 0, 0]}]})")
