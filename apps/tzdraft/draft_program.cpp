@@ -13,7 +13,6 @@
 #include "apps/tzdraft/end_signals.h"
 #include "apps/tzdraft/event_file.h"
 #include "apps/tzdraft/function_call.h"
-#include "apps/tzdraft/near_words.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/start.h"
@@ -30,6 +29,7 @@
 #include "host/selection/selection_sets.h"
 #include "host/settings/settings.h"
 #include "host/text/local_text.h"
+#include "host/text/near_words.h"
 #include "host/text/utf8.h"
 #include "host/text/visible_text.h"
 
@@ -215,7 +215,7 @@ bool Run::isKnown(std::wstring const& line) {
 }
 
 void Run::tellUnknown(std::wstring const& line) {
-    std::wstring const near = nearestWord(line, commandNames());
+    std::wstring const near = tzhost::nearestWord(line, commandNames());
     TzString said = TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str());
     if (!near.empty()) said += TzString::formatted(localText(L" Near it is %ls."), near.c_str());
     said += TzString::formatted(localText(L" %ls lists all."), localText(L"HELP"));
