@@ -37,6 +37,15 @@ void* operator new(std::size_t size) {
     }
 }
 
+// All forms are of one kind: a sanitizer keeps its own of those that are not here.
+void* operator new(std::size_t size, std::nothrow_t const&) noexcept {
+    try {
+        return operator new(size);
+    } catch (std::bad_alloc const&) {
+        return nullptr;
+    }
+}
+
 void operator delete(void* block) noexcept {
     std::free(block);
 }
