@@ -102,8 +102,8 @@ int askMeasure(Measure const& measure, double const* base, wchar_t const* prompt
         if (!point) return Reply::unreadable(tzhost::localText(measure.complaint));
         if (from) {
             Reply reply = giveNumber(measure.between(*from, *point), question.armed(), result);
-            // What the points came to, which the drafter has not typed.
-            if (reply.kind == Reply::Kind::done)
+            // What the points came to, which a person has not typed. A script is not told.
+            if (reply.kind == Reply::Kind::done && tzhost::commandLine().isPerson())
                 tzhost::commandLine().say(measure.shown(*result).str());
             return reply;
         }

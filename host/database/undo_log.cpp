@@ -164,6 +164,10 @@ bool UndoLog::takeBack() {
     return pass(steps_, takenBack_);
 }
 
+void UndoLog::forgetTakenBack() {
+    takenBack_.clear();
+}
+
 bool UndoLog::doAgain() {
     return pass(takenBack_, steps_);
 }

@@ -38,7 +38,7 @@ public:
     bool takeBack();
     // Does again what was taken back last; false when there is nothing.
     bool doAgain();
-    void forgetTakenBack() { takenBack_.clear(); }
+    void forgetTakenBack();
     // The names of the steps that takeBack and doAgain would take; empty for none.
     [[nodiscard]] std::wstring nextBack() const { return nameOfLast(steps_); }
     [[nodiscard]] std::wstring nextAgain() const { return nameOfLast(takenBack_); }

@@ -97,7 +97,7 @@ constexpr KeptCase kKept[] = {
      R"("color":"#102030","locked":true}],"currentLayer":"WALLS","currentTextStyle":"fancy")",
      R"("layer":"Walls","color":256)"},
     {"LayersKeepTheirOrder", R"("layers":[{"name":"b"},{"name":"a"}])",
-     "{\"name\":\"b\",\"color\":7,\"locked\":false},\n  {\"name\":\"a\""},
+     "{\"name\":\"b\",\"color\":7,\"locked\":false,\"off\":false},\n  {\"name\":\"a\""},
     {"Linetypes", R"("linetypes":[{"name":"Dashed","dashes":[1,-0.5]}])", R"("dashes":[1,-0.5])"},
     {"Systems", R"("ucs":{"origin":[1,2,3],"x":[0,1,0],"y":[0,0,1]})",
      R"("ucs":{"origin":[1,2,3],"x":[0,1,0],"y":[0,0,1]})"},
@@ -112,7 +112,7 @@ constexpr KeptCase kKept[] = {
     {"UnknownOfLines", R"("entities":[{"type":"ATTDEF","mtext":{"background":{"edge":1}}}])",
      R"("transparency":0,"edge":1})"},
     {"UnknownOfALayer", R"("layers":[{"name":"0","frozen":true}])",
-     R"("locked":false,"frozen":true})"},
+     R"("locked":false,"off":false,"frozen":true})"},
     {"UnknownOfABlock", R"("blocks":[{"name":"B","author":"me"}])",
      R"("entities":[],"author":"me"})"},
 };

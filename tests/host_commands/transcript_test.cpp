@@ -52,7 +52,6 @@ TranscriptCase const kCases[] = {
     {"UndoSaysWhat", "CIRCLE\n0,0\n1\nundo\nREDO\nexit\n",
      "CIRCLE is taken back.\nCommand: REDO\nCIRCLE is done again.\nCommand: exit\n"},
     {"NothingToDoAgain", "REDO\n", "There is nothing to do again.\n"},
-    {"PointsTellTheirDistance", "SETVAR\nLUNITS\n4\nCIRCLE\n1,1\n4,5\n", "4,5\n5\"\n"},
     {"BlocksAndStylesAreListed", "INSERT\n?\n\nSTYLE\n?\nNew\nNo Such Face\n^C\n",
      "none yet.\nBlock to insert or [?]: \nCommand: STYLE\nText style name or [?] <Standard>: ?\n"
      "  Standard\nText style name or [?] <Standard>: New\nFont file or typeface <txt.shx>: "
