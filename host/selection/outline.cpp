@@ -60,6 +60,34 @@ bool segmentTouches(TzGePoint2d const& a, TzGePoint2d const& b, FlatBox const& b
     return *least <= 0 && *most >= 0;
 }
 
+// Whether c and d lie on both sides of the line through a and b, or on it.
+bool liesBetween(TzGePoint2d const& a,
+                 TzGePoint2d const& b,
+                 TzGePoint2d const& c,
+                 TzGePoint2d const& d) {
+    auto const [least, most] = std::minmax({sideOf(a, b, c), sideOf(a, b, d)});
+    return least <= 0 && most >= 0;
+}
+
+bool segmentsMeet(TzGePoint2d const& a,
+                  TzGePoint2d const& b,
+                  TzGePoint2d const& c,
+                  TzGePoint2d const& d) {
+    return !isBeyondOneSide(a, b, FlatBox::between(c, d)) && liesBetween(a, b, c, d) &&
+           liesBetween(c, d, a, b);
+}
+
+bool linesMeet(std::vector<TzGePoint2d> const& one, std::vector<TzGePoint2d> const& other) {
+    std::size_t const last = one.size() - 1;
+    for (std::size_t i = 0; i <= last; ++i) {
+        TzGePoint2d const& to = one[std::min(i + 1, last)];  // a point alone is a short line
+        for (std::size_t k = 1; k < other.size(); ++k) {
+            if (segmentsMeet(one[i], to, other[k - 1], other[k])) return true;
+        }
+    }
+    return false;
+}
+
 // By the number of edges to the right of the point.
 bool areaHolds(std::vector<TzGePoint2d> const& area, TzGePoint2d const& point) {
     bool isInside = false;
@@ -143,6 +171,14 @@ bool Outline::touches(FlatBox const& box) const {
         }
     }
     return false;
+}
+
+bool Outline::meets(std::vector<TzGePoint2d> const& line) const {
+    return std::any_of(paths_.begin(), paths_.end(), [&](Path const& path) {
+        bool const isInside =
+            path.inside == Inside::belongs && areaHolds(path.points, line.front());
+        return isInside || linesMeet(path.points, line);
+    });
 }
 
 }  // namespace tzhost

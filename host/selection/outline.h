@@ -37,6 +37,8 @@ public:
     [[nodiscard]] bool isWithin(FlatBox const& box) const;
     // Whether a part of it lies in the box; the inside of a text is a part of the text.
     [[nodiscard]] bool touches(FlatBox const& box) const;
+    // Whether a line through points, one at least, meets a part of it; as touches() sees parts.
+    [[nodiscard]] bool meets(std::vector<TzGePoint2d> const& line) const;
 
 private:
     // What a path encloses; an inside that belongs to the entity makes the path a closed one.

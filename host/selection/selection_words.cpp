@@ -7,6 +7,7 @@
 
 #include "host/command_line/point_input.h"
 #include "host/runtime/words.h"
+#include "host/selection/fence.h"
 #include "host/selection/pick.h"
 #include "host/text/local_text.h"
 
@@ -38,6 +39,24 @@ Answered readCrossing(Words const& words) {
     return readBox(words, Touch::crossing);
 }
 
+// The points of the line, or those that are asked for when the word stands alone.
+Answered readFence(Words const& words) {
+    if (words.size() == 1) {
+        auto const fence = askFence();
+        if (!fence) return SelectionAnswer{SelectionAnswer::Kind::cancelled, EntityIds()};
+        return answerWith(entitiesAcross(*fence));
+    }
+    FencePoints fence;
+    for (std::size_t i = 1; i < words.size(); ++i) {
+        auto const point = readPoint(words[i], fence.empty() ? lastPoint() : fence.back());
+        if (!point) return std::nullopt;
+        fence.push_back(*point);
+    }
+    if (fence.size() < 2) return std::nullopt;
+    setLastPoint(fence.back());  // a refused answer leaves the last point
+    return answerWith(entitiesAcross(fence));
+}
+
 Answered readAll(Words const&) {
     return answerWith(entitiesOfActiveSpace());
 }
@@ -61,25 +80,33 @@ Answered readRemove(Words const&) {
 struct WordRow {
     wchar_t const* words;  // the whole one, a blank, and the short one
     Answered (*read)(Words const& words);
-    std::size_t count;  // of words on the line
+    std::size_t least;  // words on the line
+    std::size_t most;
+    std::wstring_view form;  // what follows the whole word, for who asks
 };
+
+constexpr std::size_t kAnyCount = std::wstring_view::npos;
+constexpr std::wstring_view kTwoPoints = L" X,Y X,Y";
 
 constexpr WordRow kWords[] = {
-    {forLocalText(L"window w"), readWindow, 3},     {forLocalText(L"crossing c"), readCrossing, 3},
-    {forLocalText(L"all all"), readAll, 1},         {forLocalText(L"last l"), readLast, 1},
-    {forLocalText(L"previous p"), readPrevious, 1}, {forLocalText(L"add a"), readAdd, 1},
-    {forLocalText(L"remove r"), readRemove, 1},
+    {forLocalText(L"window w"), readWindow, 3, 3, kTwoPoints},
+    {forLocalText(L"crossing c"), readCrossing, 3, 3, kTwoPoints},
+    {forLocalText(L"fence f"), readFence, 1, kAnyCount, {}},
+    {forLocalText(L"all all"), readAll, 1, 1, {}},
+    {forLocalText(L"last l"), readLast, 1, 1, {}},
+    {forLocalText(L"previous p"), readPrevious, 1, 1, {}},
+    {forLocalText(L"add a"), readAdd, 1, 1, {}},
+    {forLocalText(L"remove r"), readRemove, 1, 1, {}},
 };
 
-// The row of a word that stands on a line of `count` words.
-WordRow const*
-rowOf(std::wstring_view word, std::size_t count, wchar_t const* (*shown)(wchar_t const*)) {
+// The row of a word, whatever follows it.
+WordRow const* rowOf(std::wstring_view word, wchar_t const* (*shown)(wchar_t const*)) {
     for (WordRow const& row : kWords) {
         Words const names = splitWords(shown(row.words));
         bool const isWord = std::any_of(names.begin(), names.end(), [&](std::wstring_view name) {
             return isSameWord(word, name);
         });
-        if (isWord && row.count == count) return &row;
+        if (isWord) return &row;
     }
     return nullptr;
 }
@@ -91,9 +118,11 @@ wchar_t const* asGlobal(wchar_t const* words) {
 // The row that a line means: a local word wins over a global one, and "_word" is only global.
 WordRow const* rowMeant(Words const& words) {
     std::wstring_view word = words.front();
-    if (word.starts_with(L'_')) return rowOf(word.substr(1), words.size(), asGlobal);
-    WordRow const* const local = rowOf(word, words.size(), localText);
-    return local ? local : rowOf(word, words.size(), asGlobal);
+    bool const isGlobal = word.starts_with(L'_');
+    WordRow const* row = isGlobal ? nullptr : rowOf(word, localText);
+    if (row == nullptr) row = rowOf(isGlobal ? word.substr(1) : word, asGlobal);
+    bool const fits = row != nullptr && words.size() >= row->least && words.size() <= row->most;
+    return fits ? row : nullptr;
 }
 
 Answered readHandles(Words const& words) {
@@ -118,6 +147,16 @@ EntityIds entitiesIn(FlatBox const& box, Touch touch) {
         }
     }
     return found;
+}
+
+std::wstring selectionWords() {
+    std::wstring text;
+    for (WordRow const& row : kWords) {
+        if (!text.empty()) text += L", ";
+        text += splitWords(localText(row.words)).front();
+        text += row.form;
+    }
+    return text;
 }
 
 std::optional<SelectionAnswer> readSelection(std::wstring_view text) {

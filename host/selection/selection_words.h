@@ -1,6 +1,7 @@
 #pragma once
 
 #include <optional>
+#include <string>
 #include <string_view>
 
 #include "host/selection/entity_list.h"
@@ -16,18 +17,23 @@ enum class Touch { within, crossing };
 
 struct SelectionAnswer {
     enum class Kind {
-        entities,  // these
-        add,       // what follows is added
-        remove,    // what follows is taken out
+        entities,   // these
+        add,        // what follows is added
+        remove,     // what follows is taken out
+        cancelled,  // so is the selection, at a question for a point
     };
     Kind kind = Kind::entities;
     EntityIds ids;
 };
 
-// Handles with blanks between them, each taken once; "w" or "c" with two points; "all", "last",
-// "previous", "add", "remove"; or one point, which takes the newest entity whose box holds it.
-// Words count without case, their first letters and a leading "_" too. Points become the last
-// point. Nothing for any other text, and for handles of what is not in the active space.
+// Handles with blanks between them, each taken once; "w" or "c" with two points; "f" with more of
+// them, or alone, which asks for them; "all", "last", "previous", "add", "remove"; or one point,
+// which takes the newest entity whose box holds it. Words count without case, their first letters
+// and a leading "_" too. Points become the last point. Nothing for any other text, and for handles
+// of what is not in the active space.
 [[nodiscard]] std::optional<SelectionAnswer> readSelection(std::wstring_view text);
+
+// The words in the language of the session, as a user is told them: "window X,Y X,Y, ...".
+[[nodiscard]] std::wstring selectionWords();
 
 }  // namespace tzhost

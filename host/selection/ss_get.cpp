@@ -92,6 +92,7 @@ private:
             isRemoving_ = true;
             question_.setPrompt(Prompts::shown(prompts_.remove, kRemovePrompt));
             break;
+        case SelectionAnswer::Kind::cancelled: return Reply::done(Tzad::ePromptCancel);
         }
         return Reply::goOn(Tzad::ePromptNormal);
     }

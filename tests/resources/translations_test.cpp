@@ -198,7 +198,7 @@ TEST_P(Translations, HaveWordsForSelectingThatAreToldApart) {
         EXPECT_TRUE(taken.insert(row.local.substr(gap + 1)).second) << tzhost::toUtf8(row.local);
         EXPECT_TRUE(taken.insert(row.local.substr(0, gap)).second) << tzhost::toUtf8(row.local);
     }
-    EXPECT_EQ(count, 6) << "window, crossing, last, previous, add and remove";
+    EXPECT_EQ(count, 7) << "window, crossing, fence, last, previous, add and remove";
 }
 
 // Each command that HELP knows in English it knows in the language.

@@ -117,6 +117,13 @@ constexpr SelectionRow kSelections[] = {
     {"CrossingInsideText", "c 21,20.6 21.1,20.7\n\n", "5100 3"},
     // A refused answer leaves the last point, 0,0; the second corner is read from the first.
     {"WindowFromLast", "w 7,7 zz\nw @-1,-1 @4,4\n\n", "5100 1 4"},
+    {"Fence", "f 1.5,-1 1.5,1 8,4 5.5,6.5\n\n", "5100 1 2"},
+    {"FenceAtAnEnd", "_F 1,3 1,1 3,3\n\n", "5100 4"},
+    {"FenceByOutline", "f 20.1,22 20.3,22.5\n$1\n\n", "5100 1"},
+    {"FenceInsideText", "fence 21,20.6 @0.1,0.1\n\n", "5100 3"},
+    {"FencePointByPoint", "f\n1.5,-1\n~3,3\n9,9\nU\n@0,2\n\n\n", "5100 1"},
+    {"FenceTakenBack", "f\n9,9\nU\n1,1\n\n$2\n\n", "5100 2"},
+    {"FenceCancelled", "$1\nf\n0,0\n^C", "-5002 none"},
     {"Remove", "all\nremove\n$1 $4\nadd\n$1\n\n", "5100 2 3 1"},
     {"RemoveByCrossing", "all\nR\nc 1,-1 6,6\n\n", "5100 3"},
     {"Nothing", "\n", "-5001 none"},
@@ -124,7 +131,7 @@ constexpr SelectionRow kSelections[] = {
     {"Cancel", "$1\n^C", "-5002 none"},
     {"InputEnds", "$1\n", "-5002 none"},
     {"OtherSpace", "$5\n$1\n\n", "5100 1"},
-    {"Refused", "#ZZ\nwindow 1,1\nall 1\n#\n#1/\n1,1,1,1\n$1\n\n", "5100 1"},
+    {"Refused", "#ZZ\nwindow 1,1\nall 1\nf 1,1\nf 1,1 z\n#\n#1/\n1,1,1,1\n$1\n\n", "5100 1"},
 };
 
 class SelectionTable : public Selections, public testing::WithParamInterface<SelectionRow> {};
