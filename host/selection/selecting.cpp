@@ -3,19 +3,9 @@
 #include <utility>
 
 #include "host/selection/input_filters.h"
-#include "host/text/local_text.h"
 #include "tz/rx/status.h"
-#include "tz/text/string.h"
 
 namespace tzhost {
-
-namespace {
-
-std::wstring counted(int count, wchar_t const* format) {
-    return TzString::formatted(format, count).str();
-}
-
-}  // namespace
 
 Selecting::Selecting(SelectionMode mode, ListFilter filter)
     : mode_(mode), filter_(std::move(filter)) {}
@@ -26,32 +16,32 @@ Selecting::Records& Selecting::members() {
     return members_;
 }
 
-std::wstring Selecting::add(EntityIds const& ids) {
+Added Selecting::add(EntityIds const& ids) {
     Records const& known = members();
     EntityIds fresh;
-    int locked = 0;
-    int leftOut = 0;
+    Added added;
     for (TzDbObjectId const id : ids) {
-        if (entityOf(id) == nullptr || (!known.empty() && known.count(id.record()) > 0)) continue;
-        if (mode_.leavesOutLocked && isOnLockedLayer(id)) {
-            ++locked;
+        if (entityOf(id) == nullptr) continue;
+        if (!known.empty() && known.count(id.record()) > 0) {
+            ++added.alreadyThere;
+        } else if (mode_.leavesOutLocked && isOnLockedLayer(id)) {
+            ++added.onLockedLayers;
         } else if (filter_.lets(id)) {
             fresh.append(id);
         } else {
-            ++leftOut;
+            ++added.leftOut;
         }
     }
-    leftOut += fresh.length();
+    added.leftOut += fresh.length();
     if (!fresh.isEmpty()) filterAdded(entities_, fresh);
-    leftOut -= fresh.length();
+    added.leftOut -= fresh.length();
     entities_.append(fresh);
-    std::wstring report = counted(fresh.length(), localText(L"%d found"));
-    if (locked > 0) report += counted(locked, localText(L", %d on a locked layer"));
-    if (leftOut > 0) report += counted(leftOut, localText(L", %d left out"));
-    return report;
+    added.fresh = fresh.length();
+    added.total = entities_.length();
+    return added;
 }
 
-std::wstring Selecting::remove(EntityIds const& ids) {
+Removed Selecting::remove(EntityIds const& ids) {
     Records& known = members();
     EntityIds going;
     for (TzDbObjectId const id : ids) {
@@ -66,7 +56,7 @@ std::wstring Selecting::remove(EntityIds const& ids) {
     }
     entities_ = std::move(staying);
     indexed_ = entities_.length();
-    return counted(going.length(), localText(L"%d removed"));
+    return {going.length(), entities_.length()};
 }
 
 int Selecting::finish(int status) {

@@ -1,11 +1,11 @@
 #pragma once
 
-#include <string>
 #include <unordered_set>
 
 #include "host/selection/entity_list.h"
 #include "host/selection/list_filter.h"
 #include "host/selection/selection_mode.h"
+#include "host/selection/selection_report.h"
 
 // A selection while it is being made: what was added so far, by the rules of its mode and filters.
 //
@@ -19,10 +19,9 @@ class Selecting {
 public:
     Selecting(SelectionMode mode, ListFilter filter);
 
-    // Adds what is new, or takes out what is there, of ids that each stand there once. What the
-    // user is told about it: "2 found".
-    std::wstring add(EntityIds const& ids);
-    std::wstring remove(EntityIds const& ids);
+    // Adds what is new, or takes out what is there, of ids that each stand there once.
+    Added add(EntityIds const& ids);
+    Removed remove(EntityIds const& ids);
     // Ends the selection: 5100 when something is selected, else -5001, or the status of a cancel or
     // a keyword, which leaves nothing selected.
     [[nodiscard]] int finish(int status);

@@ -8,6 +8,7 @@
 #include "host/command_line/question.h"
 #include "host/selection/pick.h"
 #include "host/selection/selecting.h"
+#include "host/selection/selection_report.h"
 #include "host/selection/selection_sets.h"
 #include "host/selection/selection_words.h"
 #include "host/text/local_text.h"
@@ -78,11 +79,11 @@ private:
 
     Reply take(std::wstring_view text) {
         auto const answer = readSelection(text);
-        if (!answer) return Reply::refused(localText(L"That selects nothing here."));
+        if (!answer) return Reply::refused(refusedSelection());
         switch (answer->kind) {
         case SelectionAnswer::Kind::entities:
-            commandLine().say(isRemoving_ ? selecting_.remove(answer->ids)
-                                          : selecting_.add(answer->ids));
+            commandLine().say(isRemoving_ ? reportOf(selecting_.remove(answer->ids))
+                                          : reportOf(selecting_.add(answer->ids)));
             break;
         case SelectionAnswer::Kind::add:
             isRemoving_ = false;

@@ -219,6 +219,10 @@ constexpr CareCase kCare[] = {
      "rotation <0>: |\r|style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
      "textHeight <3>: |\r",
      "attachment <5>: "},
+    {"SelectionsAreCounted",
+     "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
+     "1 removed, 0 total|window\r",
+     "nothing here. Type a point, #HANDLE, window X,Y X,Y, crossing X,Y X,Y, fence, all, last, "},
     {"StylesComplete", ": |STYLE\r|: |sta\t", "ndard"},
     {"VariablesComplete", ": |SETVAR\r|: |textsi\t\r", "for textsize"},
     {"CommandsComplete", ": |HELP\r|list: |qui\t\r", "Ends the session."},
