@@ -25,11 +25,11 @@
 #include "host/runtime/command_runner.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
+#include "host/runtime/words.h"
 #include "host/selection/entity_list.h"
 #include "host/selection/selection_sets.h"
 #include "host/settings/settings.h"
 #include "host/text/local_text.h"
-#include "host/text/near_words.h"
 #include "host/text/utf8.h"
 #include "host/text/visible_text.h"
 
@@ -214,10 +214,10 @@ bool Run::isKnown(std::wstring const& line) {
     return isCall(line) || tzhost::commandStack().find(TzString(line)) != nullptr;
 }
 
+// Answers do not follow a command on its line, though who tries it still is told which one it is.
 void Run::tellUnknown(std::wstring const& line) {
-    std::wstring const near = tzhost::nearestWord(line, commandNames());
     TzString said = TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str());
-    if (!near.empty()) said += TzString::formatted(localText(L" Near it is %ls."), near.c_str());
+    said += nearCommand(line.substr(0, line.find(L' '))).c_str();
     said += TzString::formatted(localText(L" %ls lists all."), localText(L"HELP"));
     tzhost::commandLine().sayProblem(said.str());
 }
@@ -287,13 +287,14 @@ std::optional<std::wstring> Run::nextLine() const {
 // it does nothing.
 void Run::readCommands() {
     std::wstring last;
-    while (auto const line = nextLine()) {
-        if (line->empty()) {
+    while (auto const typed = nextLine()) {
+        std::wstring const line(tzhost::withoutBlanksAround(*typed));
+        if (line.empty()) {
             if (!last.empty() && tzhost::commandLine().isPerson()) runGuarded(last);
             continue;
         }
-        last = isKnown(*line) ? *line : std::wstring();
-        runGuarded(*line);
+        last = isKnown(line) ? line : std::wstring();
+        runGuarded(line);
     }
 }
 

@@ -5,6 +5,7 @@
 #include <cstdio>
 #include <filesystem>
 #include <histedit.h>
+#include <poll.h>
 #include <unistd.h>
 #include <utility>
 
@@ -18,6 +19,10 @@ namespace {
 
 constexpr int kKeptLines = 1000;
 constexpr char kHistoryName[] = "history";
+constexpr wchar_t kEscape = 0x1B;
+constexpr wchar_t kCancel = 3;  // Ctrl-C
+// How long the rest of a key may take that the terminal sends as Escape and more.
+constexpr int kKeyMilliseconds = 50;
 
 // Empty when the user has no folder for it: then nothing is kept.
 std::filesystem::path historyFile() {
@@ -30,6 +35,11 @@ std::filesystem::path historyFile() {
 void useTerminalCharacters() {
     char const* const chosen = std::setlocale(LC_CTYPE, "");
     if (!chosen || std::string_view(chosen) == "C") std::setlocale(LC_CTYPE, "C.UTF-8");
+}
+
+bool moreFollowsAtOnce() {
+    pollfd keys{STDIN_FILENO, POLLIN, 0};
+    return poll(&keys, 1, kKeyMilliseconds) > 0;
 }
 
 }  // namespace
@@ -48,6 +58,7 @@ public:
 private:
     static Editor& of(EditLine* line);
     static wchar_t* prompt(EditLine* line) { return of(line).prompt_.data(); }
+    static int readKey(EditLine* line, wchar_t* key);
     static unsigned char cancel(EditLine* line, wint_t key);
     static unsigned char suspend(EditLine* line, wint_t key);
     static unsigned char complete(EditLine* line, wint_t key);
@@ -82,6 +93,7 @@ TerminalSource::Editor::Editor() {
     el_wset(line_, EL_CLIENTDATA, this);
     el_wset(line_, EL_PROMPT, &Editor::prompt);
     el_wset(line_, EL_HIST, history_w, history_);
+    el_wset(line_, EL_GETCFN, &Editor::readKey);
     bindKeys();
 }
 
@@ -117,6 +129,16 @@ TerminalSource::Editor& TerminalSource::Editor::of(EditLine* line) {
     void* data = nullptr;
     el_wget(line, EL_CLIENTDATA, &data);
     return *static_cast<Editor*>(data);
+}
+
+// Escape alone cancels like Ctrl-C. To the line editor it would be the first half of a key, so that
+// the answer typed next would lose its first character.
+int TerminalSource::Editor::readKey(EditLine* line, wchar_t* key) {
+    el_wset(line, EL_GETCFN, EL_BUILTIN_GETCFN);
+    int const count = el_wgetc(line, key);
+    el_wset(line, EL_GETCFN, &Editor::readKey);
+    if (count == 1 && *key == kEscape && !moreFollowsAtOnce()) *key = kCancel;
+    return count;
 }
 
 unsigned char TerminalSource::Editor::cancel(EditLine* line, wint_t /*key*/) {

@@ -124,7 +124,7 @@ Reply TzEdJigDriver::take(std::wstring_view answer) {
         return Reply::done(TzEdJig::kString);
     }
     if (!point)
-        return Reply::refused(
+        return Reply::unreadable(
             tzhost::localText(L"A point is needed, or ~ and a point to move the cursor."));
     if (!has(TzEdJig::kAccept3dCoordinates)) point->z = 0;
     return isMove ? moveTo(*point) : pick(*point);

@@ -4,18 +4,13 @@
 
 #include "host/base/event_sink.h"
 #include "host/base/fault_point.h"
+#include "host/runtime/words.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
 
 namespace tzhost {
 
 namespace {
-
-std::wstring_view withoutBlanksAround(std::wstring_view text) {
-    std::size_t const first = text.find_first_not_of(L" \t");
-    text.remove_prefix(first == std::wstring_view::npos ? text.size() : first);
-    return text.substr(0, text.find_last_not_of(L" \t") + 1);
-}
 
 bool isText(QuestionKind kind) {
     return kind == QuestionKind::string || kind == QuestionKind::symbol;
@@ -100,7 +95,11 @@ Reply Question::replyTo(std::wstring_view answer, Reader const& read) {
     }
     Reply reply = read(answer);
     if (reply.kind != Reply::Kind::unreadable) return reply;
-    if (!armed_.has(Armed::kFreeText)) return Reply::refused(std::move(reply.complaint));
+    if (!armed_.has(Armed::kFreeText)) {
+        if (kind_ != QuestionKind::keyword && armed_.words.count() > 0)
+            reply.complaint += localText(L" One of the words in question will do, too.");
+        return Reply::refused(std::move(reply.complaint));
+    }
     line_.leaveInput(std::wstring(answer));
     return Reply::done(Tzad::ePromptKeyword);
 }

@@ -20,8 +20,8 @@ using tzhost::Reply;
 
 namespace {
 
-constexpr wchar_t const* kNoPoint =
-    tzhost::forLocalText(L"A point is needed: x,y or x,y,z, or one from the last point.");
+constexpr wchar_t const* kNoPoint = tzhost::forLocalText(
+    L"A point is needed: x,y or x,y,z; @x,y or @length<angle go from the last one.");
 
 std::optional<double> readPlainNumber(std::wstring_view text) {
     tzhost::UnitReader reader(text);

@@ -152,6 +152,43 @@ std::string sentenceOf(std::string_view message) {
     return expected == message.npos ? text : text + std::string(message.substr(expected));
 }
 
+// What the parser's sentences are made of; a longer piece stands before one that it holds.
+constexpr char const* kPieces[] = {
+    forLocalText("unexpected "),
+    forLocalText("expected "),
+    forLocalText("end of input"),
+    forLocalText("string literal"),
+    forLocalText("number literal"),
+    forLocalText("true literal"),
+    forLocalText("false literal"),
+    forLocalText("null literal"),
+    forLocalText("or a literal"),
+    forLocalText("invalid literal"),
+    forLocalText("invalid string: "),
+    forLocalText("invalid number; "),
+    forLocalText("missing closing quote"),
+    forLocalText("forbidden character after backslash"),
+    forLocalText("control character"),
+    forLocalText("must be escaped to"),
+    forLocalText("must be followed by 4 hex digits"),
+    forLocalText("must be followed by"),
+    forLocalText("must follow"),
+    forLocalText("digit after exponent sign"),
+    forLocalText("digit after"),
+};
+
+std::string inLocalWords(std::string sentence) {
+    for (char const* const piece : kPieces) {
+        std::string const local = localText(piece);
+        std::size_t const length = std::string_view(piece).size();
+        for (std::size_t at = sentence.find(piece); at != sentence.npos;
+             at = sentence.find(piece, at + local.size())) {
+            sentence.replace(at, length, local);
+        }
+    }
+    return sentence;
+}
+
 std::string explain(nlohmann::json::exception const& error) {
     std::string_view const message = error.what();
     if (message.find("UTF-8") != message.npos)
@@ -159,7 +196,7 @@ std::string explain(nlohmann::json::exception const& error) {
     if (message.find("out_of_range") != message.npos) {
         return localText("is too large a number, expected one below 1.8e308");
     }
-    return localText("is no JSON here: ") + sentenceOf(message);
+    return localText("is no JSON here: ") + inLocalWords(sentenceOf(message));
 }
 
 // Hands the careful parser's events over, but for the first `known` of them.

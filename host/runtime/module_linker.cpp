@@ -29,9 +29,28 @@ private:
     T before_;
 };
 
-std::string loaderError() {
+// What the loader says in English, in whatever language.
+constexpr char const* kLoaderWords[] = {
+    forLocalText("cannot open shared object file"),
+    forLocalText("file too short"),
+    forLocalText("invalid ELF header"),
+    forLocalText("undefined symbol"),
+};
+
+// The loader's reason; it has colons between its parts, and the file, which is told anyway, ahead.
+std::string loaderError(std::filesystem::path const& file) {
     char const* const text = dlerror();
-    return text ? text : localText("the dynamic loader gives no reason");
+    if (!text) return localText("the dynamic loader gives no reason");
+    constexpr std::string_view kMark = ": ";
+    std::string rest(text);
+    if (rest.starts_with(file.string() + ": ")) rest.erase(0, file.string().size() + kMark.size());
+    std::size_t const mark = rest.find(kMark);
+    std::string const what = rest.substr(0, mark);
+    auto const* const known = std::find(std::begin(kLoaderWords), std::end(kLoaderWords), what);
+    if (known == std::end(kLoaderWords)) return rest;
+    if (mark == std::string::npos) return localText(*known);
+    std::string const why = rest.substr(mark + kMark.size());
+    return localText(*known) + ": " + localText(why.c_str());
 }
 
 }  // namespace
@@ -67,7 +86,7 @@ std::string DynamicLinker::openingProblem(LoadedModule& module) {
     MemoryFaultPause const pause;  // what the loader runs could not pass a failure on
     module.loaderHandle = dlopen(module.file.c_str(), RTLD_NOW | RTLD_LOCAL);
     if (!module.loaderHandle)
-        return localText("the module cannot be loaded") + ": " + loaderError();
+        return localText("the module cannot be loaded") + ": " + loaderError(module.file);
     module.entry = reinterpret_cast<TzRxEntryPoint>(dlsym(module.loaderHandle, "tzrxEntryPoint"));
     if (module.entry) return {};
     dlclose(module.loaderHandle);

@@ -6,8 +6,13 @@
 
 namespace tzhost {
 
+namespace {
+
+constexpr std::wstring_view kBlanks = L" \t";
+
+}  // namespace
+
 Words splitWords(std::wstring_view text) {
-    constexpr std::wstring_view kBlanks = L" \t";
     Words words;
     for (std::size_t start = text.find_first_not_of(kBlanks); start != text.npos;
          start = text.find_first_not_of(kBlanks)) {
@@ -16,6 +21,11 @@ Words splitWords(std::wstring_view text) {
         text.remove_prefix(words.back().size());
     }
     return words;
+}
+
+std::wstring_view withoutBlanksAround(std::wstring_view text) {
+    text.remove_prefix(std::min(text.size(), text.find_first_not_of(kBlanks)));
+    return text.substr(0, text.find_last_not_of(kBlanks) + 1);
 }
 
 bool isSameWord(std::wstring_view a, std::wstring_view b) {

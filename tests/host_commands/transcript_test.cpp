@@ -20,7 +20,7 @@ struct TranscriptCase {
 TranscriptCase const kCases[] = {
     {"HelpOnOne", "HELP\nU\n", "Takes the last command back; it asks nothing.\n"},
     {"HelpOnAModulesCommand", "HELP\n_mtext\n", "Writes a multi-line text between two corners, in"},
-    {"HelpOnWhatIsGone", "UNLOAD\nHELP\n_mtext\n", "There is no help on \"_mtext\".\n"},
+    {"HelpOnWhatIsGone", "UNLOAD\nHELP\n_mtext\n", "There is no help on \"_mtext\"."},
     {"ControlCharactersShow", "TEXT\n0,0\n\n\n\x1B[6n\xC2\x9B\nLIST\nlast\n\n",
      "text             \\U+001B[6n\\U+009B\n"},
     {"HelpOnNothing", "HELP\nDANCE\n", "There is no help on \"DANCE\".\n"},

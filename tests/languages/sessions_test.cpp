@@ -73,6 +73,18 @@ TEST(GermanSession, HasNoLineOfTheEnglishOne) {
     }
 }
 
+// What the loader and the parser of files say in English whatever the language.
+TEST(GermanSession, HasNoEnglishOfLibraries) {
+    fs::path const file = scratch("broken.json", "{\"a\": -}");
+    fs::path const script =
+        scratch("broken.scr", "LADEN\n/nein.tzx\nÖFFNEN\n" + file.string() + "\n");
+    std::string const seen = tztest::runProgram({"--locale", "de", "--script", script}).output;
+    for (char const* const text :
+         {": die Datei lässt sich nicht öffnen: Datei oder Ordner nicht gefunden\n",
+          ": ist hier kein JSON: ungültige Zahl; erwartet wird eine Ziffer nach '-'\n"})
+        EXPECT_NE(seen.find(text), seen.npos) << seen;
+}
+
 // Each script of examples/ runs in every language: no local word takes the place of a word in it.
 TEST(Examples, DrawTheSameInEachLanguage) {
     int count = 0;

@@ -159,7 +159,7 @@ std::wstring capitalsOf(std::wstring const& word) {
 // The keywords of the host's commands.
 constexpr wchar_t const* kHostQuestions[] = {L"Yes No", L"Single Multiple",
                                              L"Make Set ON OFf Color LOck Unlock Delete ?",
-                                             L"World X Y Z 3point"};
+                                             L"World X Y Z 3Point"};
 
 TEST_P(Translations, HaveWordsThatAreToldApart) {
     std::map<std::wstring, std::wstring> texts;

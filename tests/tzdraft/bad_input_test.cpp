@@ -134,7 +134,7 @@ constexpr BadRow kUnusable[] = {
     {"VariablePoint", "--var VIEWCTR=1", 2, "--var VIEWCTR=1: VIEWCTR takes a point"},
     {"VariableNoValue", "--var LUNITS", 2, "--var LUNITS: expected NAME=VALUE"},
     {"ModuleMissing", "--module {}/nosuch.tzx", 2,
-     "{}/nosuch.tzx: the module cannot be loaded: {}/nosuch.tzx: cannot open shared object file: "
+     "{}/nosuch.tzx: the module cannot be loaded: cannot open shared object file: "
      "No such file or directory\n"},
     {"ScriptLong", "--script {long}", 2, "{long}: the script cannot be read: File name too long"},
     {"ModuleDamaged", "--module {}/text.txt", 2, "{}/text.txt: the module cannot be loaded"},

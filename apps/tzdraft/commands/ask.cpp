@@ -110,12 +110,11 @@ Answer<TzString> askListedName(wchar_t const* question,
     }
 }
 
-std::optional<std::filesystem::path>
+Answer<std::filesystem::path>
 askFile(wchar_t const* question, TzString const& defaultFile, std::filesystem::path const& home) {
     tzhost::Offer const offer{tzhost::Offer::Kind::files, {}, tzhost::fromUtf8(home.string())};
     Answer<TzString> const file = askName(question, offer, defaultFile);
-    if (file.asked != Asked::given) return std::nullopt;
-    return std::filesystem::path(file.value.toUtf8());
+    return {file.asked, std::filesystem::path(file.value.toUtf8())};
 }
 
 Answer<TzString>
@@ -129,12 +128,14 @@ askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defa
     return answer;
 }
 
-Answer<double> askReal(wchar_t const* question, double defaultValue) {
+Answer<double> askSize(wchar_t const* question, double defaultValue, Zero zero) {
     TzString shown;
     (void)tzdbRToS(defaultValue, kDecimal, kShownDecimals, shown);
     TzString const prompt = withDefault(question, shown);
     Answer<double> answer;
-    answer.asked = askUntilDecided(nullptr, [&] { return tzedGetReal(prompt, &answer.value); });
+    answer.asked = askUntilDecided(
+        nullptr, [&] { return tzedGetReal(prompt, &answer.value); },
+        zero == Zero::refused ? kNoZero | kNoNegative : kNoNegative);
     if (answer.asked == Asked::empty) answer = {Asked::given, defaultValue};
     return answer;
 }

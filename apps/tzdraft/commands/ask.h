@@ -1,9 +1,8 @@
 #pragma once
 
 #include <filesystem>
-#include <optional>
 
-#include "host/command_line/answer_source.h"
+#include "host/command_line/command_line.h"
 #include "tz/db/object_id.h"
 #include "tz/ge/point3d.h"
 #include "tz/text/string.h"
@@ -11,7 +10,8 @@
 // The questions of the program's own commands, with their defaults shown as "<...>".
 namespace tzdraft {
 
-enum class Asked { given, empty, cancelled };
+// `refused` is the answer of a script that the command has no use for.
+enum class Asked { given, empty, cancelled, refused };
 
 template <class Value>
 struct Answer {
@@ -20,6 +20,18 @@ struct Answer {
 
     [[nodiscard]] bool isCancelled() const { return asked == Asked::cancelled; }
 };
+
+// Asks again until the command has a use for the answer; `accepts` says what is wrong with it. A
+// script is asked once: what follows may be the next command.
+template <class Ask, class Accepts>
+[[nodiscard]] auto askUntil(Ask ask, Accepts accepts) {
+    for (;;) {
+        auto answer = ask();
+        if (answer.asked != Asked::given || accepts(answer)) return answer;
+        answer.asked = Asked::refused;
+        if (!tzhost::commandLine().isPerson()) return answer;
+    }
+}
 
 // Without a default an empty answer is `empty`; with one it gives the default.
 [[nodiscard]] Answer<TzString> askText(wchar_t const* question,
@@ -32,15 +44,17 @@ askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultNam
                                              tzhost::Offer const& offer,
                                              TzDbObjectId table,
                                              TzString const& defaultName = TzString());
-// The name of a file; nothing for none. Completion looks for one without a slash in `home`.
-[[nodiscard]] std::optional<std::filesystem::path> askFile(wchar_t const* question,
-                                                           TzString const& defaultFile = TzString(),
-                                                           std::filesystem::path const& home = {});
+// The name of a file. Completion looks for one without a slash in `home`.
+[[nodiscard]] Answer<std::filesystem::path> askFile(wchar_t const* question,
+                                                    TzString const& defaultFile = TzString(),
+                                                    std::filesystem::path const& home = {});
 // The global word of the keyword; the default is one of the words. `keywords` are the global words,
 // blanks between them; their local text has the local ones in the same order, and those are shown.
 [[nodiscard]] Answer<TzString>
 askKeyword(wchar_t const* question, wchar_t const* keywords, wchar_t const* defaultWord = nullptr);
-[[nodiscard]] Answer<double> askReal(wchar_t const* question, double defaultValue);
+// Neither below 0 nor, where that is no use, 0 itself.
+enum class Zero { taken, refused };
+[[nodiscard]] Answer<double> askSize(wchar_t const* question, double defaultValue, Zero zero);
 // A length above 0, also by a point from `base`, which may be null; without a default (0) an empty
 // answer is `empty`.
 [[nodiscard]] Answer<double>

@@ -10,8 +10,10 @@ namespace {
 
 constexpr wchar_t const* kKinds = forLocalText(L"Single Multiple");
 
-bool isTag(TzString const& text) {
-    return !text.isEmpty() && text.findOneOf(L" \t") < 0;
+bool isTag(Answer<TzString> const& tag) {
+    bool const hasBlanks = tag.value.findOneOf(L" \t") >= 0;
+    if (hasBlanks) tellProblem(localText(L"A tag has no blanks."));
+    return !hasBlanks;
 }
 
 // The lines that a multi-line definition holds. `contents` is markup.
@@ -31,12 +33,9 @@ void attdefCommand() {
     Answer<TzString> const kind =
         askKeyword(localText(L"Lines of the attribute"), kKinds, L"Single");
     if (kind.isCancelled()) return;
-    Answer<TzString> const tag = askText(localText(L"Attribute tag"));
+    Answer<TzString> const tag =
+        askUntil([] { return askText(localText(L"Attribute tag")); }, isTag);
     if (tag.asked != Asked::given) return;
-    if (!isTag(tag.value)) {
-        tellProblem(localText(L"A tag has no blanks."));
-        return;
-    }
     Answer<TzString> const prompt = askText(localText(L"Prompt for its value"), tag.value);
     if (prompt.isCancelled()) return;
     Answer<TzString> const value = askText(localText(L"Default value"));

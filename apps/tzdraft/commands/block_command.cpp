@@ -8,6 +8,7 @@
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
+#include "host/database/symbol_name.h"
 #include "host/database/user_system.h"
 #include "tz/db/block_table.h"
 #include "tz/ed/print.h"
@@ -15,14 +16,27 @@
 namespace tzdraft {
 namespace {
 
-// A new block of that name; the null id when the name is taken or no name of a block.
+// A new block of a name that is free.
 TzDbObjectId newBlock(TzString const& name) {
     TzDbBlockTable* table = nullptr;
     if (ProgramSession::current().drawing().getBlockTable(table, TzDb::kForWrite) != Tzad::eOk)
         return {};
     Opened<TzDbBlockTable> const opened(table);
-    if (table->has(name)) return {};
     return findOrAdd<TzDbBlockTableRecord>(table, name);
+}
+
+// A name that a new block can have.
+bool isFree(Answer<TzString> const& name) {
+    tzhost::Drawing const& drawing = ProgramSession::current().drawing();
+    bool const isTaken = !tzhost::Drawing::find(drawing.blockTableId(), name.value.str()).isNull();
+    if (isTaken) {
+        tellProblem(localText(L"There is a block \"%ls\" already."), name.value.kwszPtr());
+    } else if (!tzhost::isSymbolName(name.value.str())) {
+        tellProblem(localText(L"\"%ls\" cannot be the name of a new block."), name.value.kwszPtr());
+    } else {
+        return true;
+    }
+    return false;
 }
 
 // Blocks keep their entities in the axes of the user system that they were made in.
@@ -40,18 +54,15 @@ void moveInto(TzDbObjectId id, std::vector<TzDbObjectId> const& entities, TzGePo
 }  // namespace
 
 void blockCommand() {
-    Answer<TzString> const name = askName(localText(L"Name of the new block"), offerBlocks());
+    Answer<TzString> const name = askUntil(
+        [] { return askName(localText(L"Name of the new block"), offerBlocks()); }, isFree);
     if (name.asked != Asked::given) return;
     PointAnswer const base = askPoint(localText(L"Base point"), nullptr);
     if (base.asked != Asked::given) return;
     std::vector<TzDbObjectId> const entities = selectEntities(OnLockedLayers::leftOut);
     if (entities.empty()) return;
-    TzDbObjectId const block = newBlock(name.value);
-    if (block.isNull()) {
-        tellProblem(localText(L"\"%ls\" cannot be the name of a new block."), name.value.kwszPtr());
-        return;
-    }
-    moveInto(block, entities, base.point);
+    if (TzDbObjectId const block = newBlock(name.value); !block.isNull())
+        moveInto(block, entities, base.point);
 }
 
 }  // namespace tzdraft

@@ -1,10 +1,12 @@
 #include "apps/tzdraft/commands/choices.h"
 
 #include "apps/tzdraft/program_session.h"
+#include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/symbol_names.h"
 #include "host/runtime/command_stack.h"
 #include "host/settings/variable_table.h"
+#include "host/text/near_words.h"
 
 namespace tzdraft {
 namespace {
@@ -58,6 +60,12 @@ std::vector<std::wstring> commandNames() {
         names.push_back(L'_' + each.globalName.str());
     }
     return names;
+}
+
+std::wstring nearCommand(std::wstring_view typed) {
+    std::wstring const near = tzhost::nearestWord(typed, commandNames());
+    if (near.empty()) return near;
+    return TzString::formatted(localText(L" Near it is %ls."), near.c_str()).str();
 }
 
 }  // namespace tzdraft

@@ -13,5 +13,7 @@ namespace tzdraft {
 
 // The names of all commands: the local one, and "_" with the global one.
 [[nodiscard]] std::vector<std::wstring> commandNames();
+// " Near it is NAME.", of the command that was likely meant; empty when none was.
+[[nodiscard]] std::wstring nearCommand(std::wstring_view typed);
 
 }  // namespace tzdraft

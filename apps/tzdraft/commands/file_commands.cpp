@@ -18,17 +18,49 @@ std::wstring shownPath(std::filesystem::path const& file) {
     return tzhost::fromUtf8((unknown ? file : whole).lexically_normal().string());
 }
 
+using File = Answer<std::filesystem::path>;
+
 // Hands a file to an operation of the session. A person is told what was done, since the name may
 // have been proposed, completed or relative; a failure is told to everybody.
 template <class Operation>
-void doWith(std::filesystem::path const& file, wchar_t const* done, Operation operation) {
+bool isDone(File const& file, wchar_t const* done, Operation operation) {
     tzhost::CommandLine& line = tzhost::commandLine();
     std::string error;
-    if (!operation(file, error)) {
+    if (!operation(file.value, error)) {
         line.sayFailure(tzhost::fromUtf8(error));
-    } else if (line.isPerson()) {
-        line.say(TzString::formatted(localText(done), shownPath(file).c_str()).str());
+        return false;
     }
+    if (line.isPerson())
+        line.say(TzString::formatted(localText(done), shownPath(file.value).c_str()).str());
+    return true;
+}
+
+bool isOpened(File const& file) {
+    return !mayReplace() ||
+           isDone(file, forLocalText(L"Opened: %ls."), [](auto const& from, std::string& error) {
+               return ProgramSession::current().open(from, error);
+           });
+}
+
+bool isSaved(File const& file) {
+    if (!mayOverwrite(file.value)) return true;
+    // A person has just been asked; nobody asks a script.
+    auto const ifReadOnly =
+        tzhost::commandLine().isPerson() ? tzhost::IfReadOnly::replace : tzhost::IfReadOnly::refuse;
+    return isDone(file, forLocalText(L"Saved: %ls."), [&](auto const& to, std::string& error) {
+        return ProgramSession::current().save(to, error, ifReadOnly);
+    });
+}
+
+bool isPlotted(File const& file) {
+    std::vector<std::string> remarks;
+    bool const isMade =
+        isDone(file, forLocalText(L"Plotted: %ls."), [&](auto const& to, std::string& error) {
+            return ProgramSession::current().plot(to, error, remarks);
+        });
+    for (std::string const& each : remarks)
+        tzhost::commandLine().say(tzhost::fromUtf8(each));
+    return isMade;
 }
 
 }  // namespace
@@ -38,35 +70,17 @@ void newCommand() {
 }
 
 void openCommand() {
-    auto const file = askFile(localText(L"Drawing to open"));
-    if (!file || !mayReplace()) return;
-    doWith(*file, forLocalText(L"Opened: %ls."), [](auto const& from, std::string& error) {
-        return ProgramSession::current().open(from, error);
-    });
+    (void)askUntil([] { return askFile(localText(L"Drawing to open")); }, isOpened);
 }
 
 void saveCommand() {
     TzString const present =
         TzString::fromUtf8(ProgramSession::current().drawing().file().string());
-    auto const file = askFile(localText(L"Save drawing as"), present);
-    if (!file || !mayOverwrite(*file)) return;
-    // A person has just been asked; nobody asks a script.
-    auto const ifReadOnly =
-        tzhost::commandLine().isPerson() ? tzhost::IfReadOnly::replace : tzhost::IfReadOnly::refuse;
-    doWith(*file, forLocalText(L"Saved: %ls."), [ifReadOnly](auto const& to, std::string& error) {
-        return ProgramSession::current().save(to, error, ifReadOnly);
-    });
+    (void)askUntil([&] { return askFile(localText(L"Save drawing as"), present); }, isSaved);
 }
 
 void plotCommand() {
-    auto const file = askFile(localText(L"File to plot to"));
-    if (!file) return;
-    std::vector<std::string> remarks;
-    doWith(*file, forLocalText(L"Plotted: %ls."), [&](auto const& to, std::string& error) {
-        return ProgramSession::current().plot(to, error, remarks);
-    });
-    for (std::string const& each : remarks)
-        tzhost::commandLine().say(tzhost::fromUtf8(each));
+    (void)askUntil([] { return askFile(localText(L"File to plot to")); }, isPlotted);
 }
 
 void quitCommand() {

@@ -43,20 +43,32 @@ TzString registeredName(TzString const& typed) {
     return function ? function->name : TzString();
 }
 
+bool isTold(Answer<TzString> const& name) {
+    if (name.value == L"?") {
+        listCommands();
+        return true;
+    }
+    TzString const registered = registeredName(name.value);
+    std::wstring const text = registered.isEmpty() ? std::wstring() : helpFor(registered);
+    if (!text.empty()) {
+        tzutPrintf(L"\n%ls\n", text.c_str());
+        return true;
+    }
+    tellProblem(
+        L"%ls%ls",
+        TzString::formatted(localText(L"There is no help on \"%ls\"."), name.value.kwszPtr())
+            .kwszPtr(),
+        nearCommand(name.value.str()).c_str());
+    return false;
+}
+
 }  // namespace
 
 void helpCommand() {
-    Answer<TzString> const name =
-        askName(localText(L"Command, or Enter for the list"), offerCommands());
-    if (name.isCancelled()) return;
-    if (name.asked == Asked::empty) return listCommands();
-    TzString const registered = registeredName(name.value);
-    std::wstring const text = registered.isEmpty() ? std::wstring() : helpFor(registered);
-    if (text.empty()) {
-        tellProblem(localText(L"There is no help on \"%ls\"."), name.value.kwszPtr());
-    } else {
-        tzutPrintf(L"\n%ls\n", text.c_str());
-    }
+    Answer<TzString> const name = askUntil(
+        [] { return askName(localText(L"Command, or Enter for the list"), offerCommands()); },
+        isTold);
+    if (name.asked == Asked::empty) listCommands();
 }
 
 }  // namespace tzdraft

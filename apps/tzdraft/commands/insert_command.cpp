@@ -112,14 +112,19 @@ void postWith(std::unique_ptr<TzDbBlockReference> reference, std::vector<Wanted>
 }  // namespace
 
 void insertCommand() {
-    Answer<TzString> const name = askListedName(localText(L"Block to insert or [?]"), offerBlocks(),
-                                                ProgramSession::current().drawing().blockTableId());
+    TzDbObjectId block;
+    Answer<TzString> const name = askUntil(
+        [] {
+            return askListedName(localText(L"Block to insert or [?]"), offerBlocks(),
+                                 ProgramSession::current().drawing().blockTableId());
+        },
+        [&](Answer<TzString> const& answer) {
+            block = blockNamed(answer.value);
+            if (block.isNull())
+                tellProblem(localText(L"There is no block \"%ls\"."), answer.value.kwszPtr());
+            return !block.isNull();
+        });
     if (name.asked != Asked::given) return;
-    TzDbObjectId const block = blockNamed(name.value);
-    if (block.isNull()) {
-        tellProblem(localText(L"There is no block \"%ls\"."), name.value.kwszPtr());
-        return;
-    }
     std::unique_ptr<TzDbBlockReference> reference = askReference(block);
     if (!reference) return;
     std::vector<Wanted> attributes = attributesOf(block);

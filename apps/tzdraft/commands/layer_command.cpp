@@ -34,47 +34,66 @@ void makeCurrent(TzDbObjectId layer) {
         (void)ProgramSession::current().drawing().setClayer(layer);  // a layer's id is taken
 }
 
-bool make() {
-    Answer<TzString> const name =
-        askName(localText(L"Name of the new layer, which becomes current"), offerLayers());
-    if (name.asked != Asked::given) return !name.isCancelled();
+// The layer of that name, which is made where there is none.
+TzDbObjectId layerToBe(TzString const& name) {
     TzDbLayerTable* table = nullptr;
     if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForWrite) != Tzad::eOk)
-        return true;
+        return {};
     Opened<TzDbLayerTable> const opened(table);
-    TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name.value);
+    TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name);
     if (id.isNull())
-        tellProblem(localText(L"\"%ls\" cannot be the name of a layer."), name.value.kwszPtr());
-    makeCurrent(id);
-    return true;
+        tellProblem(localText(L"\"%ls\" cannot be the name of a layer."), name.kwszPtr());
+    return id;
+}
+
+// Asks for a name until `find` gives its layer.
+Answer<TzDbObjectId> askLayer(wchar_t const* question,
+                              TzString const& proposed,
+                              TzDbObjectId (*find)(TzString const&) = layerNamed) {
+    Answer<TzDbObjectId> layer;
+    layer.asked = askUntil([&] { return askName(question, offerLayers(), proposed); },
+                           [&](Answer<TzString> const& name) {
+                               layer.value = find(name.value);
+                               return !layer.value.isNull();
+                           })
+                      .asked;
+    return layer;
+}
+
+bool make() {
+    auto const layer =
+        askLayer(localText(L"Name of the new layer, which becomes current"), L"", layerToBe);
+    if (layer.asked == Asked::given) makeCurrent(layer.value);
+    return !layer.isCancelled();
 }
 
 bool set() {
-    Answer<TzString> const name =
-        askName(localText(L"Layer to make current"), offerLayers(), currentLayerName());
-    if (name.asked == Asked::given) makeCurrent(layerNamed(name.value));
-    return !name.isCancelled();
+    auto const layer = askLayer(localText(L"Layer to make current"), currentLayerName());
+    if (layer.asked == Asked::given) makeCurrent(layer.value);
+    return !layer.isCancelled();
 }
 
 // Changes the layer that the user names.
 template <class Change>
 bool changeNamed(wchar_t const* question, Change change) {
-    Answer<TzString> const name = askName(question, offerLayers(), currentLayerName());
-    if (name.asked != Asked::given) return !name.isCancelled();
-    TzDbObjectId const id = layerNamed(name.value);
-    Opened<TzDbLayerTableRecord> const layer(id, TzDb::kForWrite);
+    auto const named = askLayer(question, currentLayerName());
+    if (named.asked != Asked::given) return !named.isCancelled();
+    Opened<TzDbLayerTableRecord> const layer(named.value, TzDb::kForWrite);
     if (layer) change(*layer.get());
     return true;
 }
 
 bool color() {
-    Answer<TzString> const text = askText(localText(L"Colour, 1 to 255 or #RRGGBB"), L"7");
+    std::optional<TzCmColor> chosen;
+    Answer<TzString> const text =
+        askUntil([] { return askText(localText(L"Colour, 1 to 255 or #RRGGBB"), L"7"); },
+                 [&](Answer<TzString> const& answer) {
+                     chosen = readColor(answer.value.str());
+                     if (!chosen)
+                         tellProblem(localText(L"\"%ls\" is no colour."), answer.value.kwszPtr());
+                     return chosen.has_value();
+                 });
     if (text.asked != Asked::given) return !text.isCancelled();
-    std::optional<TzCmColor> const chosen = readColor(text.value.str());
-    if (!chosen) {
-        tellProblem(localText(L"\"%ls\" is no colour."), text.value.kwszPtr());
-        return true;
-    }
     return changeNamed(localText(L"Layer to colour"),
                        [&](TzDbLayerTableRecord& layer) { (void)layer.setColor(*chosen); });
 }
@@ -94,19 +113,30 @@ bool turnOn() {
                        [](TzDbLayerTableRecord& layer) { (void)layer.setIsOff(false); });
 }
 
+// A person who goes on drawing there is told.
+void hide(TzDbLayerTableRecord& layer) {
+    (void)layer.setIsOff(true);
+    bool const isCurrent = layer.objectId() == ProgramSession::current().drawing().clayer();
+    if (isCurrent && tzhost::commandLine().isPerson())
+        tzutPrintf(localText(L"\n\"%ls\" is current: what is drawn now does not show.\n"),
+                   layer.getName());
+}
+
 bool turnOff() {
-    return changeNamed(localText(L"Layer to turn off"),
-                       [](TzDbLayerTableRecord& layer) { (void)layer.setIsOff(true); });
+    return changeNamed(localText(L"Layer to turn off"), hide);
 }
 
 // One that anything lies on stays, and so do "0" and the current one.
+TzDbObjectId removed(TzString const& name) {
+    TzDbObjectId const id = layerNamed(name);
+    Opened<TzDbLayerTableRecord> const layer(id, TzDb::kForWrite);
+    if (!layer || layer->erase() == Tzad::eOk) return id;
+    tellProblem(localText(L"\"%ls\" is in use and stays."), layer->getName());
+    return {};
+}
+
 bool remove() {
-    Answer<TzString> const name = askName(localText(L"Layer to delete"), offerLayers());
-    if (name.asked != Asked::given) return !name.isCancelled();
-    Opened<TzDbLayerTableRecord> const layer(layerNamed(name.value), TzDb::kForWrite);
-    if (layer && layer->erase() != Tzad::eOk)
-        tellProblem(localText(L"\"%ls\" is in use and stays."), layer->getName());
-    return true;
+    return !askLayer(localText(L"Layer to delete"), L"", removed).isCancelled();
 }
 
 bool list() {

@@ -9,7 +9,7 @@ void loadCommand() {
     ProgramSession& session = ProgramSession::current();
     auto const file =
         askFile(localText(L"Module to load"), session.moduleName(), session.moduleFolder());
-    if (file) session.loadLater(*file);
+    if (file.asked == Asked::given) session.loadLater(file.value);
 }
 
 void unloadCommand() {

@@ -33,31 +33,38 @@ tzhost::WriteResult write(TzString const& name, std::wstring const& value) {
     return variables.setFromText(name.str(), value, tzhost::Writer::user);
 }
 
+bool isVariableOrList(Answer<TzString> const& name) {
+    if (name.value == L"?" || tzhost::Variables::instance().get(name.value.str())) return true;
+    tellProblem(localText(L"There is no system variable \"%ls\"; ? lists them."),
+                name.value.kwszPtr());
+    return false;
+}
+
+// "." stands for the empty text, which Enter cannot give.
+bool isWritten(TzString const& name, TzString const& value) {
+    tzhost::WriteResult const written = write(name, value == L"." ? std::wstring() : value.str());
+    if (!written.isDone()) tellProblem(L"%ls", written.reason.c_str());
+    return written.isDone();
+}
+
 }  // namespace
 
 void setvarCommand() {
-    Answer<TzString> const name = askName(localText(L"Variable name or [?]"), offerVariables());
+    Answer<TzString> const name =
+        askUntil([] { return askName(localText(L"Variable name or [?]"), offerVariables()); },
+                 isVariableOrList);
     if (name.asked != Asked::given) return;
     if (name.value == L"?") return listVariables();
-    tzhost::Variables& variables = tzhost::Variables::instance();
-    tzhost::VariableValue const* const present = variables.get(name.value.str());
-    if (!present) {
-        tellProblem(localText(L"There is no system variable \"%ls\"; ? lists them."),
-                    name.value.kwszPtr());
-        return;
-    }
-    TzString const shown(tzhost::writeValue(*present));
+    TzString const shown(tzhost::writeValue(*tzhost::Variables::instance().get(name.value.str())));
     if (tzhost::findVariable(name.value.str())->access == tzhost::Access::readOnly) {
         return tellProblem(localText(L"%ls is read-only: %ls"), name.value.kwszPtr(),
                            shown.kwszPtr());
     }
-    Answer<TzString> const value = askText(TzString::formatted(
-        localText(L"New value for %ls <%ls>"), name.value.kwszPtr(), shown.kwszPtr()));
-    if (value.asked != Asked::given) return;
-    // "." stands for the empty text, which Enter cannot give.
-    std::wstring const text = value.value == L"." ? std::wstring() : value.value.str();
-    tzhost::WriteResult const written = write(name.value, text);
-    if (!written.isDone()) tellProblem(L"%ls", written.reason.c_str());
+    TzString const question = TzString::formatted(localText(L"New value for %ls <%ls>"),
+                                                  name.value.kwszPtr(), shown.kwszPtr());
+    (void)askUntil(
+        [&] { return askText(question); },
+        [&](Answer<TzString> const& value) { return isWritten(name.value, value.value); });
 }
 
 }  // namespace tzdraft

@@ -5,6 +5,7 @@
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
+#include "host/database/symbol_name.h"
 #include "host/fonts/machine_fonts.h"
 #include "tz/db/extensions.h"
 #include "tz/ed/print.h"
@@ -92,8 +93,10 @@ bool askFont(StyleAnswers& values) {
 
 bool askAll(StyleAnswers& values) {
     return askFont(values) &&
-           take(askReal(localText(L"Text height, 0 for any"), values.height), values.height) &&
-           take(askReal(localText(L"Width factor"), values.widthFactor), values.widthFactor) &&
+           take(askSize(localText(L"Text height, 0 for any"), values.height, Zero::taken),
+                values.height) &&
+           take(askSize(localText(L"Width factor"), values.widthFactor, Zero::refused),
+                values.widthFactor) &&
            take(askAngle(localText(L"Obliquing angle"), values.oblique), values.oblique) &&
            take(askYesNo(localText(L"Backward?"), values.backward), values.backward) &&
            take(askYesNo(localText(L"Upside-down?"), values.upsideDown), values.upsideDown) &&
@@ -145,28 +148,37 @@ StyleAnswers startingValues(TzString const& name) {
     return style ? presentValues(*style.get()) : StyleAnswers();
 }
 
+bool canBeStyle(Answer<TzString> const& name) {
+    bool const isName = tzhost::isSymbolName(name.value.str());
+    if (!isName)
+        tellProblem(localText(L"\"%ls\" cannot be the name of a text style."),
+                    name.value.kwszPtr());
+    return isName;
+}
+
+TzString presentName() {
+    Opened<TzDbTextStyleTableRecord> const present(ProgramSession::current().drawing().textstyle(),
+                                                   TzDb::kForRead);
+    return present ? TzString(present->getName()) : TzString();
+}
+
 }  // namespace
 
 void styleCommand() {
-    TzString name;
-    {
-        Opened<TzDbTextStyleTableRecord> const present(
-            ProgramSession::current().drawing().textstyle(), TzDb::kForRead);
-        if (present) name = present->getName();
-    }
-    if (!take(askListedName(localText(L"Text style name or [?]"), offerStyles(),
-                            ProgramSession::current().drawing().textStyleTableId(), name),
-              name)) {
-        return;
-    }
+    Answer<TzString> const named = askUntil(
+        [] {
+            return askListedName(localText(L"Text style name or [?]"), offerStyles(),
+                                 ProgramSession::current().drawing().textStyleTableId(),
+                                 presentName());
+        },
+        canBeStyle);
+    if (named.asked != Asked::given) return;
+    TzString const& name = named.value;
     StyleAnswers values = startingValues(name);
     if (!askAll(values)) return;
     TzDbObjectId const id = styleNamed(name);
     Opened<TzDbTextStyleTableRecord> const style(id, TzDb::kForWrite);
-    if (!style) {
-        tellProblem(localText(L"\"%ls\" cannot be the name of a text style."), name.kwszPtr());
-        return;
-    }
+    if (!style) return;
     if (write(*style.get(), values) != Tzad::eOk) {
         tellProblem(localText(L"One of these values cannot be kept; the others are."));
     }

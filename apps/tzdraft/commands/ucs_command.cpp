@@ -52,17 +52,28 @@ void world() {
 void threePoints() {
     PointAnswer const origin = askPoint(localText(L"New origin"), nullptr);
     if (origin.asked != Asked::given) return;
-    PointAnswer const onX = askPoint(localText(L"Point on the positive X axis"), &origin.point);
+    TzGeVector3d x;
+    auto const isAxis = [&](PointAnswer const& answer) {
+        x = answer.point - origin.point;
+        if (x.isZeroLength()) tellProblem(localText(L"That is the origin itself."));
+        return !x.isZeroLength();
+    };
+    PointAnswer const onX = askUntil(
+        [&] { return askPoint(localText(L"Point on the positive X axis"), &origin.point); },
+        isAxis);
     if (onX.asked != Asked::given) return;
-    PointAnswer const towardsY =
-        askPoint(localText(L"Point on the side of the positive Y axis"), &origin.point);
+    TzGeVector3d z;
+    auto const isBeside = [&](PointAnswer const& answer) {
+        z = x.crossProduct(answer.point - origin.point);
+        if (z.isZeroLength()) tellProblem(localText(L"The three points lie on one line."));
+        return !z.isZeroLength();
+    };
+    PointAnswer const towardsY = askUntil(
+        [&] {
+            return askPoint(localText(L"Point on the side of the positive Y axis"), &origin.point);
+        },
+        isBeside);
     if (towardsY.asked != Asked::given) return;
-    TzGeVector3d x = onX.point - origin.point;
-    TzGeVector3d z = x.crossProduct(towardsY.point - origin.point);
-    if (x.isZeroLength() || z.isZeroLength()) {
-        tellProblem(localText(L"The three points lie on one line."));
-        return;
-    }
     x.normalize();
     z.normalize();
     TzGeMatrix3d system;
@@ -75,9 +86,9 @@ struct Choice {
     void (*action)();
 };
 
-constexpr wchar_t const* kWords = forLocalText(L"World X Y Z 3point");
+constexpr wchar_t const* kWords = forLocalText(L"World X Y Z 3Point");
 constexpr Choice kChoices[] = {
-    {L"World", world}, {L"X", turnX}, {L"Y", turnY}, {L"Z", turnZ}, {L"3point", threePoints},
+    {L"World", world}, {L"X", turnX}, {L"Y", turnY}, {L"Z", turnZ}, {L"3Point", threePoints},
 };
 
 }  // namespace
