@@ -1,5 +1,8 @@
 #include "host/drawing_file/members.h"
 
+#include <algorithm>
+#include <iterator>
+
 #include "host/database/geometry.h"
 #include "host/text/local_text.h"
 #include "tz/db/mtext.h"
@@ -19,7 +22,41 @@ bool isPlain(MTextBackground const& background) {
            background.transparency == fresh.transparency && !background.useBackgroundColor;
 }
 
+// In the order of the justifications.
+constexpr char const* kJustifications[TzDbText::kJustifications] = {
+    "Left", "Center", "Right", "TL", "TC", "TR", "ML", "MC", "MR", "BL", "BC", "BR",
+};
+constexpr char const* kJustificationForm =
+    forLocalText("Left, Center, Right, TL, TC, TR, ML, MC, MR, BL, BC or BR");
+
+void readJustification(MemberReader& members, TzDbText::Justification& justification) {
+    JsonValue const* const member = members.takeOf("justification", JsonKind::text);
+    if (!member) return;
+    auto const at = std::find(std::begin(kJustifications), std::end(kJustifications), member->text);
+    if (at == std::end(kJustifications)) {
+        return members.complain("justification", localText("is no justification, expected ") +
+                                                     localText(kJustificationForm));
+    }
+    justification = static_cast<TzDbText::Justification>(at - kJustifications);
+}
+
 }  // namespace
+
+// The alignment point decides where a justified text lies; without one its position is it.
+void describePlace(MemberReader& members, TextImp& values) {
+    members.point("position", values.alignmentPoint);
+    readJustification(members, values.justification);
+    TzGePoint3d alignment = values.alignmentPoint;
+    members.point("alignment", alignment);
+    if (values.justification != TzDbText::kLeft) values.alignmentPoint = alignment;
+}
+
+void describePlace(MemberWriter& members, TextImp& values) {
+    members.point("position", values.position());
+    if (values.justification == TzDbText::kLeft) return;
+    writeText(members.begin("justification"), kJustifications[values.justification]);
+    members.point("alignment", values.alignmentPoint);
+}
 
 void describeHeights(MemberReader& members, TextEditorColumns& columns) {
     std::vector<double> heights;

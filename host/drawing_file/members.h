@@ -27,6 +27,9 @@ void describeBackground(MemberReader& members, MTextImp& values);
 void describeBackground(MemberWriter& members, MTextImp& values);
 void describeTransparency(MemberReader& members, TzCmTransparency& transparency);
 void describeTransparency(MemberWriter& members, TzCmTransparency& transparency);
+// A text's place: a justified one has two points.
+void describePlace(MemberReader& members, TextImp& values);
+void describePlace(MemberWriter& members, TextImp& values);
 void describeLines(MemberReader& members, DefinitionImp& values);
 void describeLines(MemberWriter& members, DefinitionImp& values);
 // A direction that is parallel to the normal is malformed; another is turned to a right angle.
@@ -81,7 +84,7 @@ void describeOwn(Members& members, MTextImp& values) {
 
 template <class Members>
 void describeOwn(Members& members, TextImp& values) {
-    members.point("position", values.position);
+    describePlace(members, values);
     members.direction("normal", values.normal);
     members.number("rotation", values.rotation, Range::any);
     members.number("textHeight", values.height, Range::positive);

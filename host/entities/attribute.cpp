@@ -63,7 +63,7 @@ bool TzDbAttributeDefinition::subWorldDraw(TzGiWorldDraw* draw) {
     DefinitionImp const& values = valuesOf<DefinitionImp>(*this);
     if (values.lines) return values.lines->worldDraw(draw);
     tzhost::TextFrame const frame{
-        values.position, tzhost::directionAt(values.normal, values.rotation), values.normal};
+        values.position(), tzhost::directionAt(values.normal, values.rotation), values.normal};
     tzhost::drawRuns(*draw, frame, values.layout().runs);
     return true;
 }

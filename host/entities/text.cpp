@@ -21,12 +21,35 @@ TzDbText::TzDbText(TzDbObjectImp* imp) : TzDbEntity(imp) {}
 TzDbText::~TzDbText() = default;
 
 TzGePoint3d TzDbText::position() const {
-    return valuesOf<TextImp>(*this).position;
+    return valuesOf<TextImp>(*this).position();
 }
 
 Tzad::ErrorStatus TzDbText::setPosition(TzGePoint3d const& position) {
-    return assign(*this, "TzDbText::setPosition", &TextImp::position, position,
-                  tzhost::isFinite(position), Tzad::eDegenerateGeometry);
+    TextImp const& values = valuesOf<TextImp>(*this);
+    // Without going through a difference, which would round the numbers.
+    TzGePoint3d const point = values.justification == kLeft
+                                  ? position
+                                  : values.alignmentPoint + (position - values.position());
+    return assign(*this, "TzDbText::setPosition", &TextImp::alignmentPoint, point,
+                  tzhost::isFinite(point), Tzad::eDegenerateGeometry);
+}
+
+TzDbText::Justification TzDbText::justification() const {
+    return valuesOf<TextImp>(*this).justification;
+}
+
+Tzad::ErrorStatus TzDbText::setJustification(Justification justification) {
+    return assign(*this, "TzDbText::setJustification", &TextImp::justification, justification,
+                  justification >= kLeft && justification < kJustifications);
+}
+
+TzGePoint3d TzDbText::alignmentPoint() const {
+    return valuesOf<TextImp>(*this).alignmentPoint;
+}
+
+Tzad::ErrorStatus TzDbText::setAlignmentPoint(TzGePoint3d const& point) {
+    return assign(*this, "TzDbText::setAlignmentPoint", &TextImp::alignmentPoint, point,
+                  tzhost::isFinite(point), Tzad::eDegenerateGeometry);
 }
 
 TzGeVector3d TzDbText::normal() const {
@@ -111,7 +134,7 @@ Tzad::ErrorStatus TzDbText::getPlane(TzGePlane& plane, TzDb::Planarity& planarit
 namespace {
 
 tzhost::TextFrame frameOf(TextImp const& values) {
-    return {values.position, tzhost::directionAt(values.normal, values.rotation), values.normal};
+    return {values.position(), tzhost::directionAt(values.normal, values.rotation), values.normal};
 }
 
 // Draws a single line unless the display takes the entity whole.
@@ -130,7 +153,8 @@ bool TzDbText::subWorldDraw(TzGiWorldDraw* draw) {
 
 Tzad::ErrorStatus TzDbText::subTransformBy(TzGeMatrix3d const& matrix) {
     TextImp const& now = valuesOf<TextImp>(*this);
-    tzhost::TextFrame const frame = frameOf(now);
+    tzhost::TextFrame const frame{now.alignmentPoint, tzhost::directionAt(now.normal, now.rotation),
+                                  now.normal};
     auto const turned = tzhost::transformed(matrix, frame.origin, frame.normal, frame.direction);
     double const factor = turned ? now.widthFactor * turned->scaleAlong / turned->scaleUp : 0.0;
     if (!turned || !tzhost::isPositive(now.height * turned->scaleUp) ||
@@ -139,7 +163,7 @@ Tzad::ErrorStatus TzDbText::subTransformBy(TzGeMatrix3d const& matrix) {
     }
     if (auto const status = tzhost::beginChange(*this)) return status;
     TextImp& values = valuesOf<TextImp>(*this);
-    values.position = turned->origin;
+    values.alignmentPoint = turned->origin;
     bool const isTurned = turned->direction != frame.direction || turned->normal != frame.normal;
     values.normal = turned->normal;
     if (isTurned) {

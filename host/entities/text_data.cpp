@@ -70,7 +70,8 @@ void addText(ListBuilder& list, TzDbText const& text) {
     tzhost::TextImp const& values = tzhost::valuesOf<tzhost::TextImp>(text);
     list.string(kText, values.shownText().c_str());
     list.string(kStyle, styleName(values.style).c_str());
-    list.triple(kPosition, values.position.x, values.position.y, values.position.z);
+    TzGePoint3d const position = values.position();
+    list.triple(kPosition, position.x, position.y, position.z);
     list.real(kHeight, values.height);
     list.real(kWidthFactor, values.widthFactor);
     list.real(kRotation, values.rotation);

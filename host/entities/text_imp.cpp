@@ -5,6 +5,7 @@
 #include "host/database/exact_values.h"
 #include "host/database/geometry.h"
 #include "host/database/symbol_imp.h"
+#include "host/entities/justification.h"
 #include "host/entities/mtext_imp.h"
 #include "host/entities/style_look.h"
 #include "host/layout/line_layout.h"
@@ -17,9 +18,9 @@ std::unique_ptr<TzDbObjectImp> TextImp::copy() const {
 
 bool TextImp::isSameAs(TzDbObjectImp const& other) const {
     return TextStyledImp::isSameAs(other) &&
-           agree(*this, static_cast<TextImp const&>(other), &TextImp::text, &TextImp::position,
-                 &TextImp::normal, &TextImp::rotation, &TextImp::height, &TextImp::widthFactor,
-                 &TextImp::oblique);
+           agree(*this, static_cast<TextImp const&>(other), &TextImp::text,
+                 &TextImp::alignmentPoint, &TextImp::justification, &TextImp::normal,
+                 &TextImp::rotation, &TextImp::height, &TextImp::widthFactor, &TextImp::oblique);
 }
 
 bool TextImp::showFieldText(std::wstring const& shown) {
@@ -36,6 +37,15 @@ LineLayout TextImp::layout() const {
     input.style.widthFactor = widthFactor;
     input.style.oblique = oblique;
     return layOutLine(input);
+}
+
+TzGePoint3d TextImp::position() const {
+    if (justification == TzDbText::kLeft || !isOneLine()) return alignmentPoint;
+    LayoutPoint const anchor = anchorOf(box(), lookOfStyle(style), justification);
+    TzGeVector3d const along = directionAt(normal, rotation);
+    TzGePoint3d const start =
+        alignmentPoint - along * anchor.x - normal.crossProduct(along) * anchor.y;
+    return isFinite(start) ? start : alignmentPoint;  // of a text larger than numbers are
 }
 
 LayoutBox TextImp::box() const {
@@ -93,7 +103,7 @@ LayoutBox DefinitionImp::box() const {
     TzGeVector3d const up = normal.crossProduct(along);
     LayoutBox box;
     for (int i = 0; i < corners.length(); ++i) {
-        TzGeVector3d const offset = corners[i] - position;
+        TzGeVector3d const offset = corners[i] - alignmentPoint;
         double const x = offset.dotProduct(along);
         double const y = offset.dotProduct(up);
         if (i == 0) box = {x, y, x, y};

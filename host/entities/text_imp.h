@@ -6,6 +6,7 @@
 #include "host/database/entity_imp.h"
 #include "host/layout/layout_types.h"
 #include "tz/db/mtext.h"
+#include "tz/db/text.h"
 #include "tz/ge/point3d.h"
 #include "tz/ge/vector3d.h"
 
@@ -23,9 +24,12 @@ struct TextImp : TextStyledImp {
     // The box in the text's own frame: origin at the position, x along the rotation.
     [[nodiscard]] virtual LayoutBox box() const;
     [[nodiscard]] LineLayout layout() const;
+    // The start of the baseline.
+    [[nodiscard]] TzGePoint3d position() const;
 
     std::wstring text;
-    TzGePoint3d position;
+    TzGePoint3d alignmentPoint;
+    TzDbText::Justification justification = TzDbText::kLeft;
     TzGeVector3d normal = TzGeVector3d::kZAxis;
     double rotation = 0.0;
     double height = 0.2;
@@ -33,6 +37,9 @@ struct TextImp : TextStyledImp {
     double oblique = 0.0;
 
 private:
+    // Whether it is a single line, which its justification places.
+    [[nodiscard]] virtual bool isOneLine() const { return true; }
+
     mutable LayoutBox box_;           // as of `looks_`
     mutable unsigned int looks_ = 0;  // generation of the text styles, 0 when nothing is known
 };
@@ -58,6 +65,9 @@ struct DefinitionImp final : TextImp {
     std::wstring tag;
     std::wstring prompt;
     std::unique_ptr<TzDbMText> lines;  // null for a single-line definition
+
+private:
+    [[nodiscard]] bool isOneLine() const override { return lines == nullptr; }
 };
 
 }  // namespace tzhost

@@ -110,6 +110,9 @@ BadCase const kBad[] = {
      "\"3FFFFFFFFFFFFFFF\""},
     {"Space", ",\"entities\":[{\"type\":\"LINE\",\"space\":\"outer\"}]}",
      ":1: member \"space\": is no space, expected \"model\" or \"paper\""},
+    {"Justification", ",\"entities\":[{\"type\":\"TEXT\",\"justification\":\"top\"}]}",
+     ":1: member \"justification\": is no justification, expected Left, Center, Right, TL, TC, TR, "
+     "ML, MC, MR, BL, BC or BR"},
     {"UnknownLayer", ",\"entities\":[{\"type\":\"LINE\",\n\"layer\":\"Walls\"}]}",
      ":2: member \"layer\": names \"Walls\", expected the name of a layer of this drawing"},
     {"UnknownStyle", ",\"entities\":[{\"type\":\"TEXT\",\"style\":\"Fancy\"}]}",

@@ -50,6 +50,20 @@ constexpr KeptCase kKept[] = {
     {"Background", R"("entities":[{"type":"MTEXT","background":{"fill":true,"color":"#0a0B0c"}}])",
      R"("background":{"fill":true,"color":"#0A0B0C","scale":1.5,"useBackgroundColor":false,)"
      R"("transparency":0})"},
+    {"Justified",
+     R"("entities":[{"type":"TEXT","justification":"TR","alignment":[3,4,0],"textHeight":2}])",
+     R"("position":[3,2,0],"justification":"TR","alignment":[3,4,0])"},
+    {"JustifiedAtItsPosition",
+     R"("entities":[{"type":"TEXT","position":[1,2,3],"justification":"BL"}])",
+     R"("position":[1,2,3],"justification":"BL","alignment":[1,2,3])"},
+    {"JustifiedUpsideDown",
+     R"("textStyles":[{"name":"s","upsideDown":true}],"entities":[)"
+     R"({"type":"TEXT","style":"s","justification":"TL","textHeight":1}])",
+     R"("position":[0,1,0],"justification":"TL")"},
+    {"JustifiedDownwards",
+     R"("textStyles":[{"name":"s","vertical":true}],"entities":[)"
+     R"({"type":"TEXT","style":"s","justification":"Right","textHeight":1,"text":"AB"}])",
+     R"("position":[0,2.5,0],"justification":"Right")"},
     {"Page", R"("page":{"paper":"legal","scale":[0.5,1e3],"tray":2})",
      R"("page":{"paper":"legal","landscape":true,"margin":10,"scale":[0.5,1000],"unit":"mm",)"
      R"("window":null,"tray":2})"},

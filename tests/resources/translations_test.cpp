@@ -159,7 +159,9 @@ std::wstring capitalsOf(std::wstring const& word) {
 // The keywords of the host's commands.
 constexpr wchar_t const* kHostQuestions[] = {L"Yes No", L"Single Multiple",
                                              L"Make Set ON OFf Color LOck Unlock Delete ?",
-                                             L"World X Y Z 3Point"};
+                                             L"World X Y Z 3Point",
+                                             L"Justify Left Center Right Middle TL TC TR ML MC "
+                                             L"MR BL BC BR"};
 
 TEST_P(Translations, HaveWordsThatAreToldApart) {
     std::map<std::wstring, std::wstring> texts;

@@ -36,6 +36,8 @@ public:
     }
     // "Question [Local/Words] <Word>: " on a line of its own; no default when it is null.
     [[nodiscard]] TzString prompt(wchar_t const* question, wchar_t const* defaultWord) const;
+    // The same with the first word alone.
+    [[nodiscard]] TzString promptWithFirst(wchar_t const* question) const;
 
 private:
     [[nodiscard]] TzString localOf(TzString const& global) const;
@@ -62,6 +64,12 @@ TzString Words::prompt(wchar_t const* question, wchar_t const* defaultWord) cons
     return text + L": ";
 }
 
+TzString Words::promptWithFirst(wchar_t const* question) const {
+    std::wstring const words = locals_.str();
+    return TzString::formatted(L"\n%ls [%ls]: ", question,
+                               words.substr(0, words.find(L' ')).c_str());
+}
+
 // Asks until the host gives a value, an empty answer or a cancel.
 template <class Ask>
 Asked askUntilDecided(wchar_t const* keywords, Ask ask, int flags = 0) {
@@ -75,6 +83,22 @@ Asked askUntilDecided(wchar_t const* keywords, Ask ask, int flags = 0) {
         default: break;
         }
     }
+}
+
+PointAnswer
+askPointBy(TzString const& prompt, TzString const& keywordList, TzGePoint3d const* base) {
+    double const from[3] = {base ? base->x : 0, base ? base->y : 0, base ? base->z : 0};
+    double point[3] = {0, 0, 0};
+    PointAnswer answer;
+    bool isWord = false;
+    answer.asked = askUntilDecided(keywordList, [&] {
+        int const status = tzedGetPoint(base ? from : nullptr, prompt, point);
+        isWord = status == Tzad::ePromptKeyword;
+        return status;
+    });
+    if (isWord) (void)tzedGetInput(answer.word);  // an empty word matches none of the caller's
+    answer.point = TzGePoint3d(point[0], point[1], point[2]);
+    return answer;
 }
 
 }  // namespace
@@ -175,22 +199,17 @@ PointAnswer askPoint(wchar_t const* question,
                      TzGePoint3d const* base,
                      wchar_t const* keywords,
                      wchar_t const* defaultWord) {
-    std::optional<Words> const words = keywords ? std::optional<Words>(keywords) : std::nullopt;
-    TzString const prompt =
-        words ? words->prompt(question, defaultWord) : TzString::formatted(L"\n%ls: ", question);
-    TzString const list = words ? words->list() : TzString();
-    double const from[3] = {base ? base->x : 0, base ? base->y : 0, base ? base->z : 0};
-    double point[3] = {0, 0, 0};
-    PointAnswer answer;
-    bool isWord = false;
-    answer.asked = askUntilDecided(list, [&] {
-        int const status = tzedGetPoint(base ? from : nullptr, prompt, point);
-        isWord = status == Tzad::ePromptKeyword;
-        return status;
-    });
-    if (isWord) (void)tzedGetInput(answer.word);  // an empty word matches none of the caller's
-    answer.point = TzGePoint3d(point[0], point[1], point[2]);
-    return answer;
+    if (!keywords) return askPointBy(TzString::formatted(L"\n%ls: ", question), TzString(), base);
+    Words const words(keywords);
+    return askPointBy(words.prompt(question, defaultWord), words.list(), base);
+}
+
+PointAnswer askPointOrMore(wchar_t const* question, wchar_t const* keywords) {
+    Words const words(keywords);
+    TzString const prompt = tzhost::commandLine().isPerson()
+                                ? words.promptWithFirst(question)
+                                : TzString::formatted(L"\n%ls: ", question);
+    return askPointBy(prompt, words.list(), nullptr);
 }
 
 }  // namespace tzdraft

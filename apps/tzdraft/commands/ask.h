@@ -69,10 +69,16 @@ struct PointAnswer {
     Asked asked = Asked::cancelled;
     TzGePoint3d point;
     TzString word;
+
+    [[nodiscard]] bool isWord() const { return !word.isEmpty(); }
 };
 [[nodiscard]] PointAnswer askPoint(wchar_t const* question,
                                    TzGePoint3d const* base,
                                    wchar_t const* keywords = nullptr,
                                    wchar_t const* defaultWord = nullptr);
+
+// The same for a question that used to have no keywords: a person is shown the first of them, and a
+// script nothing, so that its transcript stays.
+[[nodiscard]] PointAnswer askPointOrMore(wchar_t const* question, wchar_t const* keywords);
 
 }  // namespace tzdraft

@@ -19,7 +19,7 @@ bool isTag(Answer<TzString> const& tag) {
 // The lines that a multi-line definition holds. `contents` is markup.
 std::unique_ptr<TzDbMText> linesOf(TextPlace const& place, TzString const& contents) {
     auto lines = newEntity<TzDbMText>();
-    (void)lines->setLocation(place.position);  // as of the definition, which has taken them
+    (void)lines->setLocation(place.point);  // as of the definition, which has taken them
     (void)lines->setNormal(place.normal);
     (void)lines->setDirection(tzhost::directionAt(place.normal, place.rotation));
     (void)lines->setTextHeight(place.height);
@@ -40,14 +40,15 @@ void attdefCommand() {
     if (prompt.isCancelled()) return;
     Answer<TzString> const value = askText(localText(L"Default value"));
     if (value.isCancelled()) return;
-    std::optional<TextPlace> const place = askTextPlace();
+    bool const isOneLine = kind.value != L"Multiple";
+    std::optional<TextPlace> const place = askTextPlace(isOneLine ? Justified::yes : Justified::no);
     if (!place) return;
     auto definition = newEntity<TzDbAttributeDefinition>();
     placeText(*definition, *place);
     (void)definition->setTag(tag.value);
     (void)definition->setPrompt(prompt.value);
     (void)definition->setTextString(value.value);
-    if (kind.value == L"Multiple") {
+    if (!isOneLine) {
         auto lines = linesOf(*place, value.value);
         if (definition->setMTextAttributeDefinition(lines.get()) == Tzad::eOk)
             (void)lines.release();

@@ -80,8 +80,11 @@ constexpr std::array kCommands{
                 forLocalText(L"Shows and sets a system variable; ? lists them.")},
     HostCommand{forLocalText(L"STYLE"), styleCommand, kAlone,
                 forLocalText(L"Makes or changes a text style and makes it current.")},
-    HostCommand{forLocalText(L"TEXT"), textCommand, kAlone,
-                forLocalText(L"Writes a single line of text.")},
+    HostCommand{
+        forLocalText(L"TEXT"), textCommand, kAlone,
+        forLocalText(
+            L"Writes a single line of text; Justify, or a word of it such as MC, at the start "
+            L"point says what of the text lies there.")},
     HostCommand{forLocalText(L"U"), undoCommand, kAlone,
                 forLocalText(L"Takes the last command back; it asks nothing.")},
     HostCommand{forLocalText(L"UCS"), ucsCommand, kAlone,

@@ -36,7 +36,8 @@ Wanted wantedFor(TzDbAttributeDefinition const& definition) {
     (void)attribute.setLayer(definition.layerId());
     (void)attribute.setColor(definition.color());
     (void)attribute.setTextStyle(definition.textStyle());
-    (void)attribute.setPosition(definition.position());
+    (void)attribute.setJustification(definition.justification());
+    (void)attribute.setAlignmentPoint(definition.alignmentPoint());
     (void)attribute.setNormal(definition.normal());
     (void)attribute.setRotation(definition.rotation());
     (void)attribute.setHeight(definition.height());

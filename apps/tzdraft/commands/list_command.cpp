@@ -24,8 +24,9 @@ constexpr wchar_t const* kKinds[] = {
     forLocalText(L"Line"),
 };
 
-// In the order of the attachments, which count from 1.
-constexpr wchar_t const* kAttachments[] = {
+// In the order of the justifications, of which the last nine are the attachments, counted from 1.
+constexpr wchar_t const* kJustifications[TzDbText::kJustifications] = {
+    forLocalText(L"left"),        forLocalText(L"centered"),      forLocalText(L"right"),
     forLocalText(L"top left"),    forLocalText(L"top center"),    forLocalText(L"top right"),
     forLocalText(L"middle left"), forLocalText(L"middle center"), forLocalText(L"middle right"),
     forLocalText(L"bottom left"), forLocalText(L"bottom center"), forLocalText(L"bottom right"),
@@ -90,7 +91,8 @@ void listBackground(TzDbMText const& text) {
 void listMText(TzDbMText const& text) {
     bool const isExact = text.lineSpacingStyle() == TzDb::kExactly;
     row(localText(L"location"), point(text.location()));
-    row(localText(L"attachment"), localText(kAttachments[static_cast<int>(text.attachment()) - 1]));
+    row(localText(L"attachment"),
+        localText(kJustifications[TzDbText::kRight + static_cast<int>(text.attachment())]));
     row(localText(L"style"), nameOf(text.textStyle()));
     row(localText(L"text height"), length(text.textHeight()));
     row(localText(L"rotation"), angle(text.rotation()));
@@ -113,6 +115,10 @@ void listMText(TzDbMText const& text) {
 
 void listText(TzDbText const& text) {
     row(localText(L"position"), point(text.position()));
+    if (text.justification() != TzDbText::kLeft) {
+        row(localText(L"justification"), localText(kJustifications[text.justification()]));
+        row(localText(L"alignment point"), point(text.alignmentPoint()));
+    }
     row(localText(L"style"), nameOf(text.textStyle()));
     row(localText(L"text height"), length(text.height()));
     row(localText(L"rotation"), angle(text.rotation()));

@@ -11,6 +11,53 @@
 namespace tzdraft {
 namespace {
 
+constexpr wchar_t const* kWords =
+    forLocalText(L"Justify Left Center Right Middle TL TC TR ML MC MR BL BC BR");
+constexpr wchar_t const* kJustifyWords =
+    forLocalText(L"Left Center Right Middle TL TC TR ML MC MR BL BC BR");
+
+struct WordRow {
+    wchar_t const* word;
+    TzDbText::Justification justification;
+};
+
+constexpr WordRow kRows[] = {
+    {L"Left", TzDbText::kLeft},       {L"Center", TzDbText::kCenter},
+    {L"Right", TzDbText::kRight},     {L"Middle", TzDbText::kMiddleCenter},
+    {L"TL", TzDbText::kTopLeft},      {L"TC", TzDbText::kTopCenter},
+    {L"TR", TzDbText::kTopRight},     {L"ML", TzDbText::kMiddleLeft},
+    {L"MC", TzDbText::kMiddleCenter}, {L"MR", TzDbText::kMiddleRight},
+    {L"BL", TzDbText::kBottomLeft},   {L"BC", TzDbText::kBottomCenter},
+    {L"BR", TzDbText::kBottomRight},
+};
+
+// By a word of the point's question or, after "Justify", of one more. False after a cancel.
+bool justify(TzString word, TzDbText::Justification& justification) {
+    if (word == L"Justify") {
+        Answer<TzString> const answer =
+            askKeyword(localText(L"Justification"), kJustifyWords, L"Left");
+        if (answer.isCancelled()) return false;
+        word = answer.value;
+    }
+    for (WordRow const& row : kRows) {
+        if (word == row.word) justification = row.justification;
+    }
+    return true;
+}
+
+// The start point, or the alignment point after the keyword that says what lies there. It is in
+// user coordinates.
+PointAnswer askStart(TzDbText::Justification& justification) {
+    for (;;) {
+        wchar_t const* const question = justification == TzDbText::kLeft
+                                            ? localText(L"Start point")
+                                            : localText(L"Alignment point");
+        PointAnswer answer = askPointOrMore(question, kWords);
+        if (!answer.isWord()) return answer;
+        if (!justify(answer.word, justification)) return PointAnswer();
+    }
+}
+
 // The height of a style that has one of its own, else 0.
 double heightOfStyle() {
     Opened<TzDbTextStyleTableRecord> const style(ProgramSession::current().drawing().textstyle(),
@@ -44,14 +91,16 @@ void keepHeight(double height) {
 
 }  // namespace
 
-std::optional<TextPlace> askTextPlace() {
-    PointAnswer const start = askPoint(localText(L"Start point"), nullptr);
+std::optional<TextPlace> askTextPlace(Justified justified) {
     TextPlace place;
+    PointAnswer const start = justified == Justified::yes
+                                  ? askStart(place.justification)
+                                  : askPoint(localText(L"Start point"), nullptr);
     if (start.asked != Asked::given || !askHeight(start.point, place.height)) return std::nullopt;
     Answer<double> const angle = askAngle(localText(L"Rotation angle"), 0);
     if (angle.isCancelled()) return std::nullopt;
     UserPlane const plane = userPlane();
-    place.position = toWorld(start.point);
+    place.point = toWorld(start.point);
     place.normal = plane.normal;
     place.rotation = plane.rotation(angle.value);
     return place;
@@ -59,7 +108,8 @@ std::optional<TextPlace> askTextPlace() {
 
 void placeText(TzDbText& text, TextPlace const& place) {
     TzTextSetLayer::setTextLayer(&text);
-    (void)text.setPosition(place.position);  // the host gives only values that a text takes
+    (void)text.setJustification(place.justification);
+    (void)text.setAlignmentPoint(place.point);  // the host gives only values that a text takes
     (void)text.setNormal(place.normal);
     (void)text.setRotation(place.rotation);
     (void)text.setHeight(place.height);
@@ -68,7 +118,7 @@ void placeText(TzDbText& text, TextPlace const& place) {
 }
 
 void textCommand() {
-    std::optional<TextPlace> const place = askTextPlace();
+    std::optional<TextPlace> const place = askTextPlace(Justified::yes);
     if (!place) return;
     Answer<TzString> const contents = askText(localText(L"Text"));
     if (contents.asked != Asked::given) return;

@@ -7,15 +7,42 @@
 
 struct resbuf;
 
-// A single-line text, from its position along the X axis of its plane turned by the rotation.
+// A single-line text along the X axis of its plane turned by the rotation. Its justification says
+// which part of it lies at its alignment point; it stays there whatever becomes of the letters.
 // Getters [any]; setters [write-open] with the refusals of TzDbMText.
 class TZ_API TzDbText : public TzDbEntity {
 public:
     TzDbText();
     ~TzDbText() override;
 
+    // Points on the baseline, and on the box from there to the top of capitals, whose foot is the
+    // baseline.
+    enum Justification : int {
+        kLeft,
+        kCenter,
+        kRight,
+        kTopLeft,
+        kTopCenter,
+        kTopRight,
+        kMiddleLeft,
+        kMiddleCenter,
+        kMiddleRight,
+        kBottomLeft,
+        kBottomCenter,
+        kBottomRight,
+    };
+    static constexpr int kJustifications = 12;
+
+    // The start of the baseline. Setting it moves the alignment point with the text.
     [[nodiscard]] TzGePoint3d position() const;
     Tzad::ErrorStatus setPosition(TzGePoint3d const& position);
+    // The alignment point stays where it is. A definition of several lines has it at their
+    // attachment, whatever its justification.
+    [[nodiscard]] Justification justification() const;
+    Tzad::ErrorStatus setJustification(Justification justification);
+    // That of a text justified to the left is its position.
+    [[nodiscard]] TzGePoint3d alignmentPoint() const;
+    Tzad::ErrorStatus setAlignmentPoint(TzGePoint3d const& point);
     [[nodiscard]] TzGeVector3d normal() const;
     Tzad::ErrorStatus setNormal(TzGeVector3d const& normal);
     // Radians from the X axis of the plane, which the arbitrary axis rule gives.
