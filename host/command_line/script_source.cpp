@@ -2,13 +2,13 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <cstring>
 #include <fstream>
 #include <iostream>
 #include <sstream>
 #include <utility>
 
 #include "host/text/local_text.h"
+#include "host/text/system_words.h"
 #include "host/text/utf8.h"
 
 namespace tzhost {
@@ -65,8 +65,7 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
     std::ostringstream whole;
     // A folder opens, and its first read fails.
     if (!input || (input.peek() != Traits::eof() && !(whole << input.rdbuf())) || errno == EISDIR) {
-        error = file + ": " + localText("the script cannot be read") + ": " +
-                localText(std::strerror(errno));
+        error = file + ": " + localText("the script cannot be read") + ": " + systemWords(errno);
         return nullptr;
     }
     std::string const text = whole.str();

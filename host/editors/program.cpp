@@ -2,7 +2,6 @@
 
 #include <cerrno>
 #include <csignal>
-#include <cstring>
 #include <fcntl.h>
 #include <sys/wait.h>
 #include <unistd.h>
@@ -10,6 +9,7 @@
 #include "host/editors/lent_terminal.h"
 #include "host/editors/passed_signals.h"
 #include "host/text/local_text.h"
+#include "host/text/system_words.h"
 #include "tz/text/string.h"
 
 namespace tzhost {
@@ -68,7 +68,7 @@ int follow(pid_t child, LentTerminal const& terminal, int report, int& reason) {
 }
 
 std::string notRun(int reason) {
-    return localText("cannot be run") + ": " + localText(std::strerror(reason));
+    return localText("cannot be run") + ": " + systemWords(reason);
 }
 
 std::string problemOf(int status) {

@@ -1,12 +1,12 @@
 #include "host/files/file_bytes.h"
 
 #include <cerrno>
-#include <cstring>
 
 #include "host/files/file_kind.h"
 #include "host/files/file_reader.h"
 #include "host/files/safe_file.h"
 #include "host/text/local_text.h"
+#include "host/text/system_words.h"
 
 namespace tzhost {
 
@@ -33,8 +33,7 @@ bool writeFileSafely(std::string const& path, std::string_view bytes) {
 }
 
 std::string systemReason() {
-    return errno == kNoFile ? localText("it is a device or a pipe")
-                            : localText(std::strerror(errno));
+    return errno == kNoFile ? localText("it is a device or a pipe") : systemWords(errno);
 }
 
 }  // namespace tzhost

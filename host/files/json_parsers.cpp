@@ -9,6 +9,7 @@
 #include <nlohmann/json.hpp>
 #include <rapidjson/reader.h>
 
+#include "host/text/filled.h"
 #include "host/text/local_text.h"
 
 namespace tzhost {
@@ -152,41 +153,34 @@ std::string sentenceOf(std::string_view message) {
     return expected == message.npos ? text : text + std::string(message.substr(expected));
 }
 
-// What the parser's sentences are made of; a longer piece stands before one that it holds.
-constexpr char const* kPieces[] = {
-    forLocalText("unexpected "),
-    forLocalText("expected "),
+// What its sentences are put together of: whole ones before those that have parts.
+constexpr char const* kSentences[] = {
     forLocalText("end of input"),
-    forLocalText("string literal"),
-    forLocalText("number literal"),
     forLocalText("true literal"),
     forLocalText("false literal"),
     forLocalText("null literal"),
-    forLocalText("or a literal"),
-    forLocalText("invalid literal"),
-    forLocalText("invalid string: "),
-    forLocalText("invalid number; "),
-    forLocalText("missing closing quote"),
-    forLocalText("forbidden character after backslash"),
-    forLocalText("control character"),
-    forLocalText("must be escaped to"),
-    forLocalText("must be followed by 4 hex digits"),
-    forLocalText("must be followed by"),
-    forLocalText("must follow"),
+    forLocalText("string literal"),
+    forLocalText("number literal"),
+    forLocalText("'[', '{', or a literal"),
+    forLocalText("digit after '-'"),
+    forLocalText("digit after '.'"),
     forLocalText("digit after exponent sign"),
-    forLocalText("digit after"),
+    forLocalText("'+', '-', or digit after exponent"),
+    forLocalText("invalid literal"),
+    forLocalText("invalid number"),
+    forLocalText("invalid string: missing closing quote"),
+    forLocalText("invalid string: '\\u' must be followed by 4 hex digits"),
+    forLocalText("invalid string: surrogate U+D800..U+DBFF must be followed by U+DC00..U+DFFF"),
+    forLocalText("invalid string: surrogate U+DC00..U+DFFF must follow U+D800..U+DBFF"),
+    forLocalText("invalid string: forbidden character after backslash"),
+    forLocalText("%s; expected %s"),
+    forLocalText("unexpected %s"),
+    forLocalText("invalid string: control character %s must be escaped to %s"),
+    forLocalText("%s or %s"),
 };
 
-std::string inLocalWords(std::string sentence) {
-    for (char const* const piece : kPieces) {
-        std::string const local = localText(piece);
-        std::size_t const length = std::string_view(piece).size();
-        for (std::size_t at = sentence.find(piece); at != sentence.npos;
-             at = sentence.find(piece, at + local.size())) {
-            sentence.replace(at, length, local);
-        }
-    }
-    return sentence;
+std::string inWords(std::string const& sentence) {
+    return localMessage(sentence, kSentences, inWords);
 }
 
 std::string explain(nlohmann::json::exception const& error) {
@@ -196,7 +190,7 @@ std::string explain(nlohmann::json::exception const& error) {
     if (message.find("out_of_range") != message.npos) {
         return localText("is too large a number, expected one below 1.8e308");
     }
-    return localText("is no JSON here: ") + inLocalWords(sentenceOf(message));
+    return localText("is no JSON here: ") + inWords(sentenceOf(message));
 }
 
 // Hands the careful parser's events over, but for the first `known` of them.

@@ -3,7 +3,6 @@
 #include <cerrno>
 #include <csignal>
 #include <cstdlib>
-#include <cstring>
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -12,6 +11,7 @@
 #include "host/files/file_kind.h"
 #include "host/files/part_file.h"
 #include "host/text/local_text.h"
+#include "host/text/system_words.h"
 
 namespace tzhost {
 namespace {
@@ -133,7 +133,7 @@ bool SafeFile::fail() {
 }
 
 std::string SafeFile::reason() const {
-    return localText(words_ ? words_ : std::strerror(problem_));
+    return words_ ? localText(words_) : systemWords(problem_);
 }
 
 bool SafeFile::write(std::string_view bytes) {

@@ -10,7 +10,9 @@
 #include "host/base/memory_faults.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/documents.h"
+#include "host/text/filled.h"
 #include "host/text/local_text.h"
+#include "host/text/system_words.h"
 
 namespace tzhost {
 namespace {
@@ -30,27 +32,27 @@ private:
 };
 
 // What the loader says in English, in whatever language.
-constexpr char const* kLoaderWords[] = {
-    forLocalText("cannot open shared object file"),
+constexpr char const* kLoaderTexts[] = {
+    forLocalText("cannot open shared object file: %s"),
+    forLocalText("cannot read file data: %s"),
     forLocalText("file too short"),
     forLocalText("invalid ELF header"),
-    forLocalText("undefined symbol"),
+    forLocalText("wrong ELF class: %s"),
+    forLocalText("undefined symbol: %s"),
 };
 
-// The loader's reason; it has colons between its parts, and the file, which is told anyway, ahead.
+std::string inWords(std::string const& part) {
+    return localText(part.c_str());
+}
+
+// The loader's reason, without the file, which is told anyway, before it.
 std::string loaderError(std::filesystem::path const& file) {
     char const* const text = dlerror();
     if (!text) return localText("the dynamic loader gives no reason");
-    constexpr std::string_view kMark = ": ";
-    std::string rest(text);
-    if (rest.starts_with(file.string() + ": ")) rest.erase(0, file.string().size() + kMark.size());
-    std::size_t const mark = rest.find(kMark);
-    std::string const what = rest.substr(0, mark);
-    auto const* const known = std::find(std::begin(kLoaderWords), std::end(kLoaderWords), what);
-    if (known == std::end(kLoaderWords)) return rest;
-    if (mark == std::string::npos) return localText(*known);
-    std::string const why = rest.substr(mark + kMark.size());
-    return localText(*known) + ": " + localText(why.c_str());
+    std::string reason(text);
+    std::string const ahead = file.string() + ": ";
+    if (reason.starts_with(ahead)) reason.erase(0, ahead.size());
+    return localMessage(reason, kLoaderTexts, inWords);
 }
 
 }  // namespace
@@ -106,7 +108,7 @@ std::string DynamicLinker::startingProblem(LoadedModule& module) const {
             .toUtf8();
     } catch (std::exception const& thrown) {
         MemoryFaultPause const pause;
-        return localText("the module failed at its start") + ": " + thrown.what();
+        return localText("the module failed at its start") + ": " + systemWords(thrown);
     } catch (...) {
         MemoryFaultPause const pause;
         return localText("the module failed at its start");
