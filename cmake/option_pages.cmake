@@ -21,7 +21,8 @@ endfunction()
 file(MAKE_DIRECTORY ${CMAKE_BINARY_DIR}/pages)
 foreach(program tzdraft tzconvert)
     set(pages ${CMAKE_BINARY_DIR}/pages)
-    add_custom_command(OUTPUT ${pages}/${program}.json DEPENDS ${program}
+    add_custom_command(OUTPUT ${pages}/${program}.json
+        DEPENDS ${program} tzmted_beside_module
         COMMAND ${CMAKE_COMMAND} -E env LC_ALL=C $<TARGET_FILE:${program}> --option-list
             > ${pages}/${program}.json VERBATIM)
     tz_option_page(${pages}/${program}.json ${program}.1 man

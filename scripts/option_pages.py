@@ -11,8 +11,8 @@ The template of a manual page is a manual page with a part that the options take
     More about that option, after what --help says.
     .\\" end
 
-What completes a value hangs on its name: FILE is a file, DIR a folder, words with "|" between them
-are those words, and all else is the user's."""
+What completes a value are the words that the list names for it, else it hangs on its name: FILE is a
+file, DIR a folder, words with "|" between them are those words, and all else is the user's."""
 import json
 import re
 import sys
@@ -44,6 +44,8 @@ def kind_of(option):
     value = option.get("value", "")
     if "argument" in option or value == FILES:
         return FILES
+    if "words" in option:
+        return option["words"]
     if "|" in value:
         return value.split("|")
     return FOLDER if value == FOLDER else NOTHING

@@ -1,7 +1,6 @@
 #include "apps/options/local_help.h"
 
 #include <map>
-#include <string_view>
 
 #include "host/files/file_bytes.h"
 #include "host/files/install_paths.h"
@@ -13,7 +12,6 @@ namespace tzapps {
 namespace {
 
 constexpr char kTable[] = "options.texts";
-constexpr std::string_view kLocale = "--locale";
 
 using Words = std::map<std::string, std::string>;  // English, local
 
@@ -55,16 +53,6 @@ void speakHelp(CLI::App& app, std::string const& locale) {
     for (auto const& [english, local] : words)
         app.get_formatter()->label(english, local);
     translate(app, words);
-}
-
-std::string localeAsked(int count, char const* const* arguments) {
-    for (int at = 1; at < count; ++at) {
-        std::string_view const word = arguments[at];
-        if (word == kLocale && at + 1 < count) return arguments[at + 1];
-        if (word.starts_with(kLocale) && word.substr(kLocale.size()).starts_with('='))
-            return std::string(word.substr(kLocale.size() + 1));
-    }
-    return tzhost::localeOfEnvironment();
 }
 
 }  // namespace tzapps

@@ -14,7 +14,4 @@ namespace tzapps {
 // English. Called once, after all is declared.
 void speakHelp(CLI::App& app, std::string const& locale);
 
-// The locale that the arguments name by --locale LL or --locale=LL; without it the environment's.
-[[nodiscard]] std::string localeAsked(int count, char const* const* arguments);
-
 }  // namespace tzapps

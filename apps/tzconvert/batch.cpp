@@ -11,9 +11,11 @@
 #include "apps/tzconvert/machine.h"
 #include "apps/tzconvert/normalising.h"
 #include "apps/tzconvert/places.h"
+#include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/report.h"
 #include "apps/tzconvert/streams.h"
 #include "apps/tzconvert/warnings.h"
+#include "host/text/system_words.h"
 
 namespace tzconvert {
 namespace {
@@ -69,16 +71,16 @@ void Batch::tellWarnings(std::string const& file, Warnings const& warnings) {
     if (!warnings.empty()) ++warned_;
     if (options_.isQuiet) return;
     for (std::string const& warning : warnings)
-        tell(shownName(file) + ": warning: " + warning);
+        tell(shownName(file) + localText(": warning: ") + warning);
 }
 
 void Batch::summarise() const {
     if (inputs_.size() < 2 || options_.isQuiet) return;
     std::size_t const failed = inputs_.size() - reports_.size();
-    std::string text = std::to_string(reports_.size()) + " of " + std::to_string(inputs_.size()) +
-                       " files converted";
-    if (failed > 0) text += ", " + std::to_string(failed) + " failed";
-    if (warned_ > 0) text += ", " + std::to_string(warned_) + " with warnings";
+    std::string text = filled(localText("%s of %s files converted"),
+                              {std::to_string(reports_.size()), std::to_string(inputs_.size())});
+    if (failed > 0) text += filled(localText(", %s failed"), {std::to_string(failed)});
+    if (warned_ > 0) text += filled(localText(", %s with warnings"), {std::to_string(warned_)});
     tell(text);
 }
 
@@ -88,7 +90,7 @@ Failure Batch::convertFile(Input const& input, Warnings& warnings) {
     } catch (std::bad_alloc const&) {
     } catch (std::length_error const&) {
     }
-    return shownName(input.file) + ": memory cannot hold its conversion";
+    return shownName(input.file) + ": " + localText("memory cannot hold its conversion");
 }
 
 Failure Batch::convertUnguarded(Input const& input, Warnings& warnings) {
@@ -111,7 +113,8 @@ Failure Batch::makeFolderOf(std::string const& target) const {
     std::error_code problem;
     std::filesystem::create_directories(std::filesystem::path(target).parent_path(), problem);
     if (!problem) return {};
-    return target + ": cannot be written: " + problem.message();
+    return target + ": " + localText("cannot be written") + ": " +
+           tzhost::systemWords(problem.value());
 }
 
 Failure Batch::convertText(std::string const& file,

@@ -3,6 +3,9 @@
 #include <algorithm>
 #include <utility>
 
+#include "apps/tzconvert/program_texts.h"
+#include "host/text/system_words.h"
+
 namespace tzconvert {
 namespace {
 
@@ -47,7 +50,8 @@ private:
             }
         }
         if (problem) {
-            inputs_.failures.push_back(folder.string() + ": cannot be read: " + problem.message());
+            inputs_.failures.push_back(folder.string() + ": " + localText("cannot be read") + ": " +
+                                       tzhost::systemWords(problem.value()));
         }
         std::sort(files.begin(), files.end());
         for (fs::path const& file : files)

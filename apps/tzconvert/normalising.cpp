@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/text_codec.h"
 #include "host/rtf/normaliser.h"
 
@@ -10,15 +11,17 @@ namespace {
 
 void appendCount(std::string& text, int count, char const* one, char const* several) {
     if (count == 0) return;
-    text += (text.empty() ? "" : ", ") + std::to_string(count) + " " + (count == 1 ? one : several);
+    text += (text.empty() ? "" : ", ") + std::to_string(count) + " " +
+            localText(count == 1 ? one : several);
 }
 
 void addWhatIsLeftOut(Warnings& warnings, tzhost::NormalisedRtf const& rtf) {
     std::string counts;
-    appendCount(counts, rtf.pictures, "picture", "pictures");
-    appendCount(counts, rtf.notes, "note", "notes");
-    appendCount(counts, rtf.headers, "header or footer", "headers and footers");
-    if (!counts.empty()) warnings.push_back("left out: " + counts);
+    appendCount(counts, rtf.pictures, forLocalText("picture"), forLocalText("pictures"));
+    appendCount(counts, rtf.notes, forLocalText("note"), forLocalText("notes"));
+    appendCount(counts, rtf.headers, forLocalText("header or footer"),
+                forLocalText("headers and footers"));
+    if (!counts.empty()) warnings.push_back(localText("left out: ") + counts);
 }
 
 Failure normalise(std::string const& file, std::string& document, Warnings& warnings) {

@@ -6,8 +6,11 @@
 #include <limits>
 #include <sstream>
 
+#include "apps/options/language.h"
 #include "apps/options/local_help.h"
 #include "apps/options/option_list.h"
+#include "apps/options/usage.h"
+#include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/streams.h"
 #include "host/text/near_words.h"
 #include "host/text/utf8.h"
@@ -59,7 +62,9 @@ void declareColor(CLI::App& app, char const* name, Color& color, char const* hel
            name,
            [name, &color](std::string const& text) {
                std::optional<unsigned int> const read = colorOf(text);
-               if (!read) throw CLI::ValidationError(name, "\"" + text + "\" is not RRGGBB");
+               if (!read)
+                   throw CLI::ValidationError(name,
+                                              filled(localText("\"%s\" is not RRGGBB"), {text}));
                color = *read;
            },
            help)
@@ -67,7 +72,9 @@ void declareColor(CLI::App& app, char const* name, Color& color, char const* hel
 }
 
 CLI::Validator aName() {
-    return {[](std::string& text) { return text.empty() ? "an empty name" : std::string(); }, ""};
+    return {
+        [](std::string& text) { return text.empty() ? localText("an empty name") : std::string(); },
+        ""};
 }
 
 // Infinite values and those that are no number fail too.
@@ -76,7 +83,8 @@ CLI::Validator aboveZero() {
                 double value = 0;
                 bool const isAbove = CLI::detail::lexical_cast(text, value) && value > 0 &&
                                      value <= std::numeric_limits<double>::max();
-                return isAbove ? std::string() : text + " is no number above 0";
+                return isAbove ? std::string()
+                               : filled(localText("%s is no number above 0"), {text});
             },
             ""};
 }
@@ -88,7 +96,8 @@ CLI::Validator sayable() {
                 bool const isSayable = CLI::detail::lexical_cast(text, value) &&
                                        (value == 0 || (std::abs(value) >= kLeastInMarkup &&
                                                        std::abs(value) < kBeyondMarkup));
-                return isSayable ? std::string() : text + " is no number that markup can say";
+                return isSayable ? std::string()
+                                 : filled(localText("%s is no number that markup can say"), {text});
             },
             ""};
 }
@@ -98,7 +107,7 @@ CLI::Validator notZero() {
     return {[](std::string& text) {
                 double value = 1;
                 bool const isZero = CLI::detail::lexical_cast(text, value) && value == 0;
-                return isZero ? text + " is no tracking" : std::string();
+                return isZero ? filled(localText("%s is no tracking"), {text}) : std::string();
             },
             ""};
 }
@@ -175,6 +184,10 @@ void declareFiles(CLI::App& app, Options& options) {
         ->check(aName());
     app.add_flag("-q,--quiet", options.isQuiet, "no warnings and no summary");
     app.add_flag("--werror", options.warningsAreErrors, "warnings end with status 1");
+    app.add_option(
+           "--locale", options.locale,
+           "the language, such as de; the environment's (LC_ALL, LC_MESSAGES, LANG) without it")
+        ->type_name("LL");
 }
 
 void declare(CLI::App& app, Options& options) {
@@ -197,12 +210,12 @@ void declare(CLI::App& app, Options& options) {
 // What options say together.
 void checkTogether(Options const& options) {
     if (options.files.size() > 1 && options.outputDir.empty())
-        throw CLI::ValidationError("FILE", "several of them need --output-dir");
+        throw CLI::ValidationError("FILE", localText("several of them need --output-dir"));
     if (options.isRecursive && options.outputDir.empty())
-        throw CLI::ValidationError("--recursive", "it needs --output-dir");
+        throw CLI::ValidationError("--recursive", localText("it needs --output-dir"));
     bool const isTextOnOutput = options.outputDir.empty() && options.output.empty();
     if (isTextOnOutput && options.report == "-")
-        throw CLI::ValidationError("--report", "the result goes there");
+        throw CLI::ValidationError("--report", localText("the result goes there"));
 }
 
 constexpr char kHelp[] = "help";
@@ -227,28 +240,31 @@ std::vector<std::wstring> optionNames(CLI::App const& command) {
 // "; did you mean ...?", or nothing when no word is near.
 std::string nearMiss(std::string const& typed, std::vector<std::wstring> const& words) {
     std::wstring const near = tzhost::nearestWord(tzhost::fromUtf8(typed), words);
-    return near.empty() ? "" : "; did you mean " + tzhost::toUtf8(near) + "?";
+    return near.empty() ? "" : filled(localText("; did you mean %s?"), {tzhost::toUtf8(near)});
 }
 
 // What is wrong with the first word, which should be a command.
 std::string explainCommand(std::vector<std::string> const& rest) {
-    std::string text = "expected";
+    std::string names;
     for (DirectionRow const& row : kDirections)
-        text += std::string(&row == kDirections ? " " : ", ") + row.name;
-    if (rest.empty()) return text;
-    return text + ", not \"" + rest.front() + "\"" + nearMiss(rest.front(), commandNames());
+        names += std::string(&row == kDirections ? "" : ", ") + row.name;
+    if (rest.empty()) return filled(localText("expected %s"), {names});
+    return filled(localText("expected %s, not \"%s\""), {names, rest.front()}) +
+           nearMiss(rest.front(), commandNames());
 }
 
 // What is wrong, in a line.
 std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
     std::vector<std::string> const rest = app.remaining();
     if (app.get_subcommands().empty()) return explainCommand(rest);
-    if (!rest.empty()) return "options stand after the command, not \"" + rest.front() + "\"";
+    if (!rest.empty()) {
+        return filled(localText("options stand after the command, not \"%s\""), {rest.front()});
+    }
     CLI::App const& command = *app.get_subcommands().front();
     std::vector<std::string> const unknown = command.remaining();
-    if (unknown.empty()) return wrong.what();
+    if (unknown.empty()) return tzapps::problemWith(wrong);
     std::string const option = unknown.front().substr(0, unknown.front().find('='));
-    return wrong.what() + nearMiss(option, optionNames(command));
+    return tzapps::problemWith(wrong) + nearMiss(option, optionNames(command));
 }
 
 // What was asked of the program itself, and the exit status after it.
@@ -270,7 +286,7 @@ std::optional<std::vector<char const*>> wordsOf(int count, char const* const* ar
     if (words.size() < 2 || std::string_view(words[1]) != kHelp) return words;
     words.erase(words.begin() + 1);
     if (words.size() > 1 && !isCommand(words[1])) {
-        tell(explainCommand({words[1]}) + "; try --help");
+        tell(explainCommand({words[1]}) + localText("; try --help"));
         return std::nullopt;
     }
     words.push_back("--help");
@@ -295,8 +311,11 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     app.set_version_flag("-v,--version", "tzconvert 1.0");
     ParsedOptions parsed;
     declare(app, parsed.options);
-    tzapps::speakHelp(app, tzapps::localeAsked(count, arguments));
-    if (auto const list = tzapps::optionList(app, count, arguments)) {
+    std::string const locale = tzapps::localeAsked(count, arguments);
+    tzapps::useLanguage(locale);
+    tzapps::speakHelp(app, locale);
+    if (auto const list =
+            tzapps::optionList(app, {{"--locale", tzapps::languages()}}, count, arguments)) {
         parsed.exit = printAnswer(*list);
         return parsed;
     }
@@ -317,7 +336,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
         app.exit(CLI::CallForHelp(), text);
         parsed.exit = printAnswer(text.str());
     } catch (CLI::ParseError const& wrong) {
-        tell(explain(app, wrong) + "; try --help");
+        tell(explain(app, wrong) + localText("; try --help"));
         parsed.exit = kUnusable;
     }
     return parsed;

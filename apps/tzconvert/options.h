@@ -55,6 +55,7 @@ struct Options {
     std::string output;     // empty: standard output
     std::string outputDir;  // empty: none
     std::string report;     // empty: none
+    std::string locale;     // empty: the environment's
 };
 
 struct ParsedOptions {

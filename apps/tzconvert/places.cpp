@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "apps/tzconvert/program_texts.h"
 #include "host/files/safe_file.h"
 
 namespace tzconvert {
@@ -31,11 +32,12 @@ Places::Place Places::placeOf(std::string const& file) {
 Failure Places::checkReport() const {
     if (options_.report.empty() || options_.report == "-") return {};
     Place const place = placeOf(options_.report);
-    if (inputs_.count(place) != 0) return "--report " + options_.report + ": it is an input";
+    if (inputs_.count(place) != 0)
+        return filled(localText("--report %s: it is an input"), {options_.report});
     bool const isTarget = std::any_of(files_.begin(), files_.end(), [&](Input const& input) {
         return placeOf(targetOf(options_, input)) == place;
     });
-    if (isTarget) return "--report " + options_.report + ": a result goes there";
+    if (isTarget) return filled(localText("--report %s: a result goes there"), {options_.report});
     return {};
 }
 
@@ -43,9 +45,10 @@ Failure Places::checkTarget(std::string const& file, std::string const& target) 
     if (target.empty()) return {};
     std::string const name = shownName(file);
     Place const place = placeOf(target);
-    if (inputs_.count(place) != 0) return name + ": its result would take the place of " + target;
+    if (inputs_.count(place) != 0)
+        return filled(localText("%s: its result would take the place of %s"), {name, target});
     if (targets_.count(place) != 0)
-        return name + ": " + target + " is another file's result already";
+        return filled(localText("%s: %s is another file's result already"), {name, target});
     return {};
 }
 

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <cstdio>
 
+#include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/text_codec.h"
 #include "host/files/file_bytes.h"
 #include "host/files/file_reader.h"
@@ -14,7 +15,7 @@ namespace {
 constexpr std::size_t kPiece = 1 << 16;
 
 std::string faultAt(std::size_t offset, char const* reason) {
-    return "byte " + std::to_string(offset) + ": " + reason;
+    return filled(localText("byte %s: "), {std::to_string(offset)}) + localText(reason);
 }
 
 // What is wrong with what the reader gives, if anything. The bytes are never there as a whole.
@@ -31,8 +32,8 @@ Failure decodeAll(tzhost::FileReader& reader, std::wstring& text) {
         kept = bytes.size() - decoded.size;
         std::copy(bytes.end() - static_cast<std::ptrdiff_t>(kept), bytes.end(), piece.begin());
     }
-    if (reader.hasFailed()) return "cannot be read: " + tzhost::systemReason();
-    return kept > 0 ? Failure(faultAt(offset, "not UTF-8")) : Failure();
+    if (reader.hasFailed()) return localText("cannot be read") + ": " + tzhost::systemReason();
+    return kept > 0 ? Failure(faultAt(offset, kNotUtf8)) : Failure();
 }
 
 Failure takeAll(tzhost::FileReader& reader, std::string& bytes) {
@@ -40,7 +41,8 @@ Failure takeAll(tzhost::FileReader& reader, std::string& bytes) {
     std::string piece(kPiece, '\0');
     while (std::size_t const count = reader.read(piece.data(), kPiece))
         bytes.append(piece, 0, count);
-    return reader.hasFailed() ? "cannot be read: " + tzhost::systemReason() : Failure();
+    return reader.hasFailed() ? localText("cannot be read") + ": " + tzhost::systemReason()
+                              : Failure();
 }
 
 // What `take` finds wrong with a file that it reads, under the name of the file.
@@ -63,7 +65,7 @@ Failure writeStandardOutput(std::string_view bytes) {
         std::fflush(stdout) == 0) {
         return {};
     }
-    return "standard output: " + tzhost::systemReason();
+    return localText("standard output") + ": " + tzhost::systemReason();
 }
 
 }  // namespace
@@ -74,7 +76,7 @@ void tell(std::string const& line) {
 }
 
 std::string shownName(std::string const& file) {
-    return file == "-" ? "standard input" : file;
+    return file == "-" ? localText("standard input") : file;
 }
 
 Failure readText(std::string const& file, std::wstring& text) {
@@ -105,7 +107,7 @@ Failure writeText(std::string const& file, std::wstring_view text) {
 Failure writeBytes(std::string const& file, std::string_view bytes) {
     if (file.empty()) return writeStandardOutput(bytes);
     if (tzhost::writeFileSafely(file, bytes)) return {};
-    return file + ": cannot be written: " + tzhost::systemReason();
+    return file + ": " + localText("cannot be written") + ": " + tzhost::systemReason();
 }
 
 }  // namespace tzconvert

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 
+#include "apps/tzconvert/program_texts.h"
 #include "host/text/utf8.h"
 
 namespace tzconvert {
@@ -84,14 +85,14 @@ Decoded decodeText(std::string_view bytes, std::wstring& text) {
         rest = appendPlain(rest, text);
         if (rest.empty()) return {bytes.size(), nullptr};
         std::size_t const at = bytes.size() - rest.size();
-        if (rest[0] == 0) return {at, "a zero character"};
+        if (rest[0] == 0) return {at, forLocalText("a zero character")};
         std::string_view const part = longBytes(rest);
         std::size_t const good = std::min(tzhost::firstBadByte(part), part.size());
         text += tzhost::fromUtf8(part.substr(0, good));
         if (good < part.size()) {
             bool const isAtTheEnd = part.size() == rest.size();
             bool const isOpen = isAtTheEnd && isCutOff(part.substr(good));
-            return {at + good, isOpen ? nullptr : "not UTF-8"};
+            return {at + good, isOpen ? nullptr : kNotUtf8};
         }
         rest.remove_prefix(good);
     }

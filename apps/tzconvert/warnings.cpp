@@ -2,6 +2,8 @@
 
 #include <algorithm>
 
+#include "apps/tzconvert/program_texts.h"
+
 namespace tzconvert {
 namespace {
 
@@ -11,12 +13,12 @@ struct IncidentRow {
 };
 // A font file that a proxy stands for comes back as itself, and a late code holds: neither warns.
 constexpr IncidentRow kIncidents[] = {
-    {kUnknownCode, "unknown codes, kept as text"},
-    {kStackWithoutSign, "stacks without a sign, kept as text"},
-    {kFaceWithoutFile, "faces that no file is known of"},
-    {kTrackingIgnored, "further \\T codes, lost"},
-    {kCharWidthIgnored, "further \\W codes, lost"},
-    {kObliqueIgnored, "further \\Q codes, lost"},
+    {kUnknownCode, forLocalText("unknown codes, kept as text")},
+    {kStackWithoutSign, forLocalText("stacks without a sign, kept as text")},
+    {kFaceWithoutFile, forLocalText("faces that no file is known of")},
+    {kTrackingIgnored, forLocalText("further \\T codes, lost")},
+    {kCharWidthIgnored, forLocalText("further \\W codes, lost")},
+    {kObliqueIgnored, forLocalText("further \\Q codes, lost")},
 };
 
 void add(Warnings& warnings, std::string const& text, int count) {
@@ -27,7 +29,8 @@ void add(Warnings& warnings, std::string const& text, int count) {
 void add(Warnings& warnings, std::string const& text, RtfLosses::Kind const& kind) {
     if (kind.count == 0) return;
     add(warnings, text, kind.count);
-    warnings.back() += ", the first \\" + std::string(kind.first.begin(), kind.first.end());
+    std::string const word(kind.first.begin(), kind.first.end());
+    warnings.back() += filled(localText(", the first %s"), {"\\" + word});
 }
 
 template <class Char>
@@ -53,9 +56,10 @@ bool holdsMarkup(std::basic_string_view<Char> input) {
 template <class Char>
 void look(Warnings& warnings, Direction direction, std::basic_string_view<Char> input) {
     if (!readsRtf(direction)) {
-        if (beginsAsRtf(input)) warnings.emplace_back("it looks like RTF; to-mtext converts that");
+        if (beginsAsRtf(input))
+            warnings.push_back(localText("it looks like RTF; to-mtext converts that"));
     } else if (!beginsAsRtf(input) && holdsMarkup(input)) {
-        warnings.emplace_back("it looks like markup; to-rtf converts that");
+        warnings.push_back(localText("it looks like markup; to-rtf converts that"));
     }
 }
 
@@ -63,14 +67,16 @@ void look(Warnings& warnings, Direction direction, std::basic_string_view<Char> 
 
 void addIncidents(Warnings& warnings, MarkupFindings const& found) {
     for (IncidentRow const& row : kIncidents)
-        add(warnings, row.text, found.incidentCounts.of(row.incident));
+        add(warnings, localText(row.text), found.incidentCounts.of(row.incident));
 }
 
 void addLosses(Warnings& warnings, RtfLosses const& losses) {
-    add(warnings, "unknown words, passed over", losses.unknownWords);
-    add(warnings, "texts lost with the unknown word before them, which --normalise keeps",
+    add(warnings, localText("unknown words, passed over"), losses.unknownWords);
+    add(warnings,
+        localText("texts lost with the unknown word before them, which --normalise keeps"),
         losses.texts);
-    if (losses.hasTextBehindEnd) warnings.emplace_back("what stands behind the last \"}\" is lost");
+    if (losses.hasTextBehindEnd)
+        warnings.push_back(localText("what stands behind the last \"}\" is lost"));
 }
 
 void addLook(Warnings& warnings, Direction direction, std::wstring_view input) {

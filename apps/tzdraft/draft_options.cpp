@@ -3,13 +3,17 @@
 #include <CLI/CLI.hpp>
 #include <cerrno>
 #include <cstdio>
-#include <cstring>
 #include <sstream>
 
+#include "apps/options/language.h"
 #include "apps/options/local_help.h"
 #include "apps/options/option_list.h"
+#include "apps/options/usage.h"
 #include "apps/tzdraft/page_options.h"
+#include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/version.h"
+#include "host/page/page_text.h"
+#include "host/text/system_words.h"
 #include "host/text/visible_text.h"
 
 namespace tzdraft {
@@ -26,7 +30,7 @@ constexpr char kScripts[] =
 
 // Some files are left out by an empty name; nobody means that by writing the option.
 std::string problemWithName(std::string const& name) {
-    return name.empty() ? "the file name is empty" : "";
+    return name.empty() ? localText("the file name is empty") : "";
 }
 
 void declareText(CLI::App& app,
@@ -88,7 +92,8 @@ int printAnswer(std::string const& text) {
     bool const isWritten =
         std::fwrite(text.data(), 1, text.size(), stdout) == text.size() && std::fflush(stdout) == 0;
     if (isWritten) return kDone;
-    std::fprintf(stderr, "tzdraft: standard output: %s\n", std::strerror(errno));
+    std::fprintf(stderr, "tzdraft: %s: %s\n", localText("standard output").c_str(),
+                 tzhost::systemWords(errno).c_str());
     return kUnusable;
 }
 
@@ -100,8 +105,12 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     app.set_version_flag("--version", kVersion);
     ParsedOptions parsed;
     declare(app, parsed.options);
-    tzapps::speakHelp(app, tzapps::localeAsked(count, arguments));
-    if (auto const list = tzapps::optionList(app, count, arguments)) {
+    std::string const locale = tzapps::localeAsked(count, arguments);
+    tzapps::useLanguage(locale);
+    tzapps::speakHelp(app, locale);
+    tzapps::ValueWords const words{{"--locale", tzapps::languages()},
+                                   {"--paper", tzhost::paperNames()}};
+    if (auto const list = tzapps::optionList(app, words, count, arguments)) {
         parsed.exit = printAnswer(*list);
         return parsed;
     }
@@ -113,8 +122,9 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
         app.exit(asked, text);
         parsed.exit = printAnswer(text.str());
     } catch (CLI::ParseError const& wrong) {
-        std::string const problem = tzhost::visible(wrong.what(), tzhost::LineFeeds::shown);
-        std::fprintf(stderr, "tzdraft: %s; try --help\n", problem.c_str());
+        std::string const problem = tzapps::problemWith(wrong) + localText("; try --help");
+        std::fprintf(stderr, "tzdraft: %s\n",
+                     tzhost::visible(problem, tzhost::LineFeeds::shown).c_str());
         parsed.exit = kUnusable;
     }
     return parsed;

@@ -30,6 +30,7 @@
 #include "host/selection/selection_sets.h"
 #include "host/settings/settings.h"
 #include "host/text/local_text.h"
+#include "host/text/system_words.h"
 #include "host/text/utf8.h"
 #include "host/text/visible_text.h"
 
@@ -256,7 +257,7 @@ void Run::runGuarded(std::wstring const& line) {
         session_.doPostponed();
     } catch (std::exception const& problem) {
         tzhost::commandLine().sayProblem(line + localText(L" ended early: ") +
-                                         tzhost::fromUtf8(problem.what()));
+                                         tzhost::fromUtf8(tzhost::systemWords(problem)));
     }
     tzhost::freeAllSets();  // the audit has counted them
     if (options_.isStrict && !tzhost::worstAudit().clean()) tellLeftOver(line);

@@ -1,12 +1,12 @@
 #include <cerrno>
 #include <csignal>
 #include <cstdio>
-#include <cstring>
 #include <utility>
 
 #include "apps/tzdraft/draft_options.h"
 #include "apps/tzdraft/draft_program.h"
 #include "host/files/standard_streams.h"
+#include "host/text/system_words.h"
 
 namespace {
 
@@ -29,7 +29,7 @@ int main(int count, char** arguments) {
     std::string problem;  // with the transcript, the first one
     tzdraft::Screens screens;
     screens.output = [&](std::string_view text) {
-        if (problem.empty() && !write(stdout, text)) problem = std::strerror(errno);
+        if (problem.empty() && !write(stdout, text)) problem = tzhost::systemWords(errno);
     };
     screens.errors = [](std::string_view text) { (void)write(stderr, text); };  // the last resort
     screens.outputProblem = [&] { return problem; };

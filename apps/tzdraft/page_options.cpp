@@ -7,12 +7,14 @@
 #include "apps/tzdraft/program_texts.h"
 #include "host/page/page_plan.h"
 #include "host/page/page_text.h"
+#include "host/text/filled.h"
 
 namespace tzdraft {
 namespace {
 
 [[noreturn]] void refuse(char const* option, std::string const& text, std::string const& expected) {
-    throw CLI::ValidationError(option, "\"" + text + "\" " + "is none, expected" + " " + expected);
+    throw CLI::ValidationError(
+        option, tzhost::filled(localText("\"%s\" is none, expected %s"), {text, expected}));
 }
 
 // An option with a text that `read` makes a value of.
@@ -28,7 +30,7 @@ void declareRead(CLI::App& app,
            name,
            [=, &value](std::string const& text) {
                auto const found = read(text);
-               if (!found) refuse(name, text, expected);
+               if (!found) refuse(name, text, localText(expected));
                value = *found;
            },
            help)
@@ -82,7 +84,7 @@ void declarePage(CLI::App& app, Options& options) {
            "the paper lies on its side, as papers with a name do without being told")
         ->excludes(portrait);
     declareRead(app, "--margin", "MM", "the margin on each side of the paper, 10 when left out",
-                page.margin, readMargin, "millimetres, 0 or more");
+                page.margin, readMargin, forLocalText("millimetres, 0 or more"));
     declareRead(app, "--scale", "N:M", "the scale, or \"fit\", as when left out", page.scale,
                 tzhost::readScaleOrFit, tzhost::kScales);
     declareRead(app, "--unit", "mm|cm|m|in|ft",
@@ -91,10 +93,10 @@ void declarePage(CLI::App& app, Options& options) {
     declareRead(app, "--window", "X1,Y1,X2,Y2", "plot this part of the world alone", page.window,
                 tzhost::readWindow, tzhost::kWindows);
     declareRead(app, "--dpi", "N", "pixels in an inch of a PNG on paper, 300 when left out",
-                page.dotsPerInch, readDots, "a number from 1 to 10000");
+                page.dotsPerInch, readDots, forLocalText("a number from 1 to 10000"));
     declareRead(app, "--space", "model|paper|all",
                 "plot the model, the paper, or all: a PDF page for each that holds something",
-                options.space, readSpace, "model, paper or all");
+                options.space, readSpace, forLocalText("model, paper or all"));
 }
 
 void checkPage(Options const& options) {
@@ -103,7 +105,7 @@ void checkPage(Options const& options) {
             throw CLI::ValidationError("--paper", *problem);
     }
     if (plotsOnOutput(options) > 1)
-        throw CLI::ValidationError("-", "standard output takes one plot alone");
+        throw CLI::ValidationError("-", localText("standard output takes one plot alone"));
     bool const hasPicture = !options.svg.empty() || !options.png.empty();
     if (options.space == tzhost::PlotSpace::all && hasPicture)
         throw CLI::ValidationError("--space", localText("only a PDF has a page for each space"));

@@ -2,6 +2,7 @@
 
 #include <cstdlib>
 
+#include "apps/options/language.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/editors/editor_programs.h"
@@ -20,7 +21,6 @@ namespace {
 
 constexpr char kModuleName[] = "tzmted.tzx";
 constexpr wchar_t kResourceName[] = L"TzmtedRes.dll";
-constexpr char kTextsName[] = "tzdraft.texts";
 
 // The first that says something.
 std::string firstOf(std::initializer_list<std::string> candidates) {
@@ -70,31 +70,17 @@ bool setVariables(Options const& options, std::string& error) {
 
 // A language that was asked for has the module's texts; one of the environment may be unknown.
 bool isLanguageThere(Options const& options, std::string& error) {
-    std::filesystem::path const folder = modulePath(options).parent_path();
-    std::string const library = TzString(kResourceName).toUtf8();
-    bool const isThere = !options.resources.empty() || tzhost::isEnglish(options.locale) ||
-                         tzhost::translatedFile(folder, options.locale, library);
-    if (isThere) return true;
-    error = "--locale " + options.locale + ": " +
-            localText("no texts of this language; there are") + " en";
-    for (std::string const& each : tzhost::languagesWith(folder, library))
-        error += ", " + each;
-    return false;
-}
-
-// The host's own texts. What such a table lacks is shown in English.
-void useLocalTexts(std::string const& locale) {
-    auto const file = tzhost::translatedFile(tzhost::libraryFolder(), locale, kTextsName);
-    auto const bytes = file ? tzhost::readFile(file->string()) : std::nullopt;
-    std::vector<std::string> faults;  // shown where the table is made
-    tzhost::setLocalTexts(bytes ? tzhost::readLocalTexts(*bytes, faults)
-                                : std::vector<tzhost::LocalTextRow>());
+    if (!options.resources.empty()) return true;
+    auto const problem = tzapps::problemWithLanguage(
+        options.locale, modulePath(options).parent_path(), TzString(kResourceName).toUtf8());
+    error = problem.value_or("");
+    return !problem;
 }
 
 bool findTexts(Options const& options, std::string& error) {
     std::string const locale =
         options.locale.empty() ? tzhost::localeOfEnvironment() : options.locale;
-    useLocalTexts(locale);
+    tzapps::useLanguage(locale);
     if (!isLanguageThere(options, error)) return false;
     tzhost::ResourceSearch search;
     search.folder = modulePath(options).parent_path().string();

@@ -86,6 +86,13 @@ std::optional<Paper> readPaper(std::string_view text) {
     return Paper{PaperName::custom, sides->first, sides->second};
 }
 
+std::vector<std::string> paperNames() {
+    std::vector<std::string> names;
+    for (PaperRow const& row : kPaperRows)
+        names.emplace_back(row.name);
+    return names;
+}
+
 std::string nameOf(Paper const& paper) {
     for (PaperRow const& row : kPaperRows) {
         if (row.paper.name == paper.name) return row.name;

@@ -3,6 +3,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "host/page/page.h"
 
@@ -13,6 +14,8 @@ namespace tzhost {
 // A3, letter, or WxH in millimetres, each side from 1 to 5000.
 [[nodiscard]] std::optional<Paper> readPaper(std::string_view text);
 [[nodiscard]] std::string nameOf(Paper const& paper);
+// The names that papers have.
+[[nodiscard]] std::vector<std::string> paperNames();
 
 // N:M, both above 0 and their quotient a number.
 [[nodiscard]] std::optional<PageScale> readScale(std::string_view text);

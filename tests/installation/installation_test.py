@@ -109,7 +109,9 @@ class Options(unittest.TestCase):
     ROWS = (("tzdraft --scr", ["--script"]), ("tzconvert to-r", ["to-rtf"]),
             ("tzdraft --save dr", ["drawn here"]), ("tzconvert to-rtf --output-dir fo", ["folder"]),
             ("tzconvert to-mtext --norm", ["--normalise"]), ("tzdraft --save locked/", []),
-            ("tzdraft --save gone/", []), ("tzdraft --space pa", ["paper"]))
+            ("tzdraft --save gone/", []), ("tzdraft --space pa", ["paper"]),
+            ("tzdraft --paper A", ["A0", "A1", "A2", "A3", "A4"]),
+            ("tzconvert to-rtf --locale d", ["de"]))
 
     def test_are_completed(self):
         place = scratch("typed")

@@ -36,25 +36,28 @@ std::regex const& marked() {
     return kMarked;
 }
 
-// Calls `look` with each source file of the host and of its program.
+// Calls `look` with each source file of the host and of its programs.
 template <class Look>
 void forEachHostSource(Look look) {
     fs::path const source(std::getenv("TZ_TEST_SOURCE"));
-    for (char const* const folder : {"apps/tzdraft", "host"})
-        for (fs::directory_entry const& entry : fs::recursive_directory_iterator(source / folder))
-            if (entry.path().extension() == ".cpp") look(entry.path());
+    for (char const* const folder : {"apps", "host"}) {
+        for (fs::directory_entry const& entry : fs::recursive_directory_iterator(source / folder)) {
+            std::string const ending = entry.path().extension();
+            if (ending == ".cpp" || ending == ".h") look(entry.path());
+        }
+    }
 }
 
 // Two words in small letters make a text; comments and what is included are none.
-void addUnmarked(fs::path const& file, std::vector<std::string>& texts) {
-    static std::regex const kText(R"re("(?:[^"\\\n]|\\.)*")re");
+void addUnmarked(fs::path const& file, std::vector<TextInCode>& texts) {
+    static std::regex const kText(R"re("(?:[^"\\\n]|\\.)*"(?:\s*"(?:[^"\\\n]|\\.)*")*)re");
     static std::regex const kWords("[a-z]{2} [a-z]{2}");
     static std::regex const kComment(R"re((^|\s)//[^\n]*)re");
     std::string const code =
         std::regex_replace(std::regex_replace(contentsOf(file), kComment, ""), marked(), "");
     for (Words text(code.begin(), code.end(), kText), end; text != end; ++text)
         if (std::regex_search(text->str(), kWords))
-            texts.push_back(file.filename().string() + ": " + text->str());
+            texts.push_back({file.filename().string(), meantBy(text->str())});
 }
 
 }  // namespace
@@ -69,8 +72,8 @@ std::set<std::wstring> hostTextsInCode() {
     return texts;
 }
 
-std::vector<std::string> unmarkedTextsInCode() {
-    std::vector<std::string> texts;
+std::vector<TextInCode> unmarkedTextsInCode() {
+    std::vector<TextInCode> texts;
     forEachHostSource([&](fs::path const& file) { addUnmarked(file, texts); });
     return texts;
 }

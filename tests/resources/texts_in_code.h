@@ -6,8 +6,12 @@
 #include <string>
 #include <vector>
 
-// The texts that the source of the host and of its program marks for translation.
+// The texts that the source of the host and of its programs marks for translation.
 [[nodiscard]] std::set<std::wstring> hostTextsInCode();
 
-// Texts there that read like English and are not marked, each "file: text".
-[[nodiscard]] std::vector<std::string> unmarkedTextsInCode();
+struct TextInCode {
+    std::string file;  // its name without folders
+    std::wstring text;
+};
+// Texts there that read like English and are not marked.
+[[nodiscard]] std::vector<TextInCode> unmarkedTextsInCode();

@@ -23,9 +23,9 @@ struct BadRow {
 // Arguments that are no arguments, in a process of their own.
 constexpr BadRow kUsage[] = {
     {"UnknownOption", "--nonsense", 2, "The following argument was not expected: --nonsense"},
-    {"ValueMissing", "--script", 2, "--script: 1 required FILE missing"},
+    {"ValueMissing", "--script", 2, "--script needs a value"},
     {"TwoDrawings", "a.json b.json", 2, "The following argument was not expected: b.json"},
-    {"VariableMissing", "--script /dev/null --var", 2, "--var: 1 required NAME=VALUE missing"},
+    {"VariableMissing", "--script /dev/null --var", 2, "--var needs a value"},
     {"ResultNameless", "--png ''", 2, "--png: the file name is empty"},
     {"ScriptNameless", "--script ''", 2, "--script: the file name is empty"},
     {"DrawingNameless", "''", 2, "DRAWING: the file name is empty"},

@@ -59,7 +59,7 @@ TEST(Faults, ReachMemoryOfFunctionCalls) {
 #ifdef __SANITIZE_ADDRESS__
     GTEST_SKIP() << "the sanitizer's own operator new serves in this build";
 #endif
-    expectStruckFunctions("operator new", "(x \"a\") ended early");
+    expectStruckFunctions("operator new", "(x \"a\") ended early: there is not enough memory");
 }
 
 // A misspelt name used to look like a fault that was survived.
