@@ -43,6 +43,13 @@ std::filesystem::path plainPath(std::filesystem::path const& file) {
     return unknown ? file : plain;
 }
 
+// A person typed a name that leads elsewhere than it may seem; a script is not told.
+void tellPerson(wchar_t const* what, std::filesystem::path const& file) {
+    tzhost::CommandLine& line = tzhost::commandLine();
+    std::wstring const name = tzhost::fromUtf8(file.string());
+    if (line.isPerson()) line.say(TzString::formatted(what, name.c_str()).str());
+}
+
 }  // namespace
 
 ProgramSession::ProgramSession() {
@@ -210,6 +217,8 @@ void ProgramSession::loadLater(std::filesystem::path file) {
         std::string error;
         if (!tzhost::dynamicLinker().load(file, error))
             tzhost::commandLine().sayFailure(tzhost::fromUtf8(error));
+        else
+            tellPerson(localText(L"Loaded: %ls."), file);
     });
 }
 
@@ -217,8 +226,11 @@ void ProgramSession::unloadLater() {
     postponed_.emplace_back([] {
         auto const& modules = tzhost::dynamicLinker().modules();
         std::string error = localText("No module is loaded.");
-        if (modules.empty() || !tzhost::dynamicLinker().unload(modules.back()->file, error))
+        std::filesystem::path const file = modules.empty() ? "" : modules.back()->file;
+        if (modules.empty() || !tzhost::dynamicLinker().unload(file, error))
             tzhost::commandLine().sayProblem(tzhost::fromUtf8(error));
+        else
+            tellPerson(localText(L"Unloaded: %ls."), file);
     });
 }
 

@@ -69,6 +69,8 @@ private:
     void remember(std::wstring const& text);
     void show(std::vector<std::wstring> const& choices) const;
 
+    // Where the line is edited: prompts are for the person even when the transcript goes elsewhere.
+    std::FILE* const screen_ = isatty(STDOUT_FILENO) == 1 ? stdout : stderr;
     EditLine* line_;
     HistoryW* history_;
     struct sigaction interruptBefore_ {};
@@ -89,7 +91,7 @@ TerminalSource::Editor::Editor() {
     history_w(history_, &event, H_SETSIZE, kKeptLines);
     history_w(history_, &event, H_SETUNIQUE, 1);
     history_w(history_, &event, H_LOAD, historyFile().c_str());  // none at the first session
-    line_ = el_init("tzdraft", stdin, stdout, stderr);
+    line_ = el_init("tzdraft", stdin, screen_, stderr);
     el_wset(line_, EL_CLIENTDATA, this);
     el_wset(line_, EL_PROMPT, &Editor::prompt);
     el_wset(line_, EL_HIST, history_w, history_);
@@ -196,8 +198,8 @@ void TerminalSource::Editor::show(std::vector<std::wstring> const& choices) cons
     for (std::wstring const& each : choices)
         text += tzhost::toUtf8(tzhost::visible(each, tzhost::LineFeeds::shown)) + "  ";
     text += "\n";
-    std::fwrite(text.data(), 1, text.size(), stdout);
-    std::fflush(stdout);
+    std::fwrite(text.data(), 1, text.size(), screen_);
+    std::fflush(screen_);
 }
 
 void TerminalSource::Editor::remember(std::wstring const& text) {
@@ -207,8 +209,8 @@ void TerminalSource::Editor::remember(std::wstring const& text) {
 }
 
 tzhost::Answer TerminalSource::Editor::noLine() {
-    std::fputs(isCancelled_ ? "^C\n" : "\n", stdout);
-    std::fflush(stdout);
+    std::fputs(isCancelled_ ? "^C\n" : "\n", screen_);
+    std::fflush(screen_);
     hasEnded_ = !isCancelled_ && !isLeft_;
     return {isCancelled_ ? tzhost::Answer::Kind::cancel : tzhost::Answer::Kind::end, {}};
 }

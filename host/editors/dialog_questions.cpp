@@ -16,7 +16,9 @@ int askValue(DialogValue const& row, CMTextEditorInterface const& state, DialogC
         DialogChange change = row.read(state, answer);
         if (!change) {
             return Reply::refused(
-                TzString::formatted(localText(L"That is no value for %ls."), row.name).str());
+                TzString::formatted(localText(L"That is no value for %ls, expected %ls."), row.name,
+                                    localText(row.expected))
+                    .str());
         }
         changes.add(std::move(change));
         return Reply::done(Tzad::ePromptNormal);

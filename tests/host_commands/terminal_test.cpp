@@ -248,7 +248,7 @@ constexpr CareCase kCare[] = {
     // Enter keeps a value; what is no value is asked for again.
     {"PropertiesAreAskedFor",
      "$--var MTEXTED=OLDEDITOR|: |-MTEXT\r|: |0,0\r|: |9,-9\r|: |one\r|: |\r|: |MTPROP\r|: |#1\r|"
-     "textHeight <0.2>: |0\r|no value for textHeight|3\r|attachment <1>: |5\r|width <9>: |\r|"
+     "textHeight <0.2>: |0\r|no value for textHeight, expected a number above 0.|3\r|attachment <1>: |5\r|width <9>: |\r|"
      "rotation <0>: |\r|style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
      "textHeight <3>: |\r",
      "attachment <5>: "},
@@ -256,6 +256,9 @@ constexpr CareCase kCare[] = {
      "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
      "1 removed, 0 total|window\r",
      "nothing here. Type a point, #HANDLE, window X,Y X,Y, crossing X,Y X,Y, fence, all, last, "},
+    {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |\r", "Loaded: /"},
+    // The questions used to show nowhere.
+    {"TranscriptInAFile", "$>seen.txt|Command: |CIRCLE\r", "Center point: "},
     {"StylesComplete", ": |STYLE\r|: |sta\t", "ndard"},
     {"VariablesComplete", ": |SETVAR\r|: |textsi\t\r", "for textsize"},
     {"CommandsComplete", ": |HELP\r|list: |qui\t\r", "Ends the session."},
