@@ -189,7 +189,9 @@ unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {
     }
     if (completion.choices.empty()) return CC_REFRESH_BEEP;
     editor.show(completion.choices);
-    return CC_REDISPLAY;
+    // Shown from here on; to redisplay clears the lines above, of a long prompt's choices too.
+    el_wset(line, EL_REFRESH);
+    return CC_NORM;
 }
 
 // Below the line that is edited, which then is shown anew.

@@ -259,6 +259,9 @@ constexpr CareCase kCare[] = {
     {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |\r", "Loaded: /"},
     // The questions used to show nowhere.
     {"TranscriptInAFile", "$>seen.txt|Command: |CIRCLE\r", "Center point: "},
+    // Below a question of two lines the choices used to be cleared again.
+    {"ChoicesOfALongQuestion", "$$(printf %0210d 1).json|Command: |SAVE\r|json>: |\t",
+     "there.json  \r\nSave drawing as <000"},
     {"StylesComplete", ": |STYLE\r|: |sta\t", "ndard"},
     {"VariablesComplete", ": |SETVAR\r|: |textsi\t\r", "for textsize"},
     {"CommandsComplete", ": |HELP\r|list: |qui\t\r", "Ends the session."},
