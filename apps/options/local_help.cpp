@@ -1,6 +1,7 @@
 #include "apps/options/local_help.h"
 
 #include <map>
+#include <memory>
 
 #include "host/files/file_bytes.h"
 #include "host/files/install_paths.h"
@@ -31,7 +32,21 @@ std::string inWords(Words const& words, std::string const& english) {
     return at == words.end() ? english : at->second;
 }
 
-void translate(CLI::App& app, Words const& words) {
+// Names of files to give, like those of values, are looked up.
+class Formatter : public CLI::Formatter {
+public:
+    explicit Formatter(CLI::Formatter const& other) : CLI::Formatter(other) {}
+
+    std::string make_option_name(CLI::Option const* option, bool isPositional) const override {
+        std::string const name = CLI::Formatter::make_option_name(option, isPositional);
+        return isPositional ? get_label(name) : name;
+    }
+};
+
+void translate(CLI::App& app,
+               Words const& words,
+               std::shared_ptr<CLI::FormatterBase> const& formatter) {
+    app.formatter(formatter);
     app.description(inWords(words, app.get_description()));
     app.footer(inWords(words, app.get_footer()));
     for (CLI::Option* const each : app.get_options()) {
@@ -39,7 +54,7 @@ void translate(CLI::App& app, Words const& words) {
         if (!each->get_group().empty()) each->group(inWords(words, each->get_group()));
     }
     for (CLI::App* const each : app.get_subcommands({})) {
-        translate(*each, words);
+        translate(*each, words, formatter);
         each->group(inWords(words, each->get_group()));
     }
 }
@@ -49,10 +64,11 @@ void translate(CLI::App& app, Words const& words) {
 void speakHelp(CLI::App& app, std::string const& locale) {
     Words const words = wordsOf(locale);
     if (words.empty()) return;
-    // The commands share the formatter, which looks headings and names of values up.
+    auto const formatter = std::make_shared<Formatter>(
+        dynamic_cast<CLI::Formatter const&>(*app.get_formatter()));
     for (auto const& [english, local] : words)
-        app.get_formatter()->label(english, local);
-    translate(app, words);
+        formatter->label(english, local);
+    translate(app, words, formatter);
 }
 
 }  // namespace tzapps

@@ -83,6 +83,8 @@ TEST(GermanSession, HasNoEnglishOfLibraries) {
          {": die Datei lässt sich nicht öffnen: Datei oder Ordner nicht gefunden\n",
           ": ist hier kein JSON: ungültige Zahl; erwartet wird eine Ziffer nach '-'\n"})
         EXPECT_NE(seen.find(text), seen.npos) << seen;
+    std::string const help = tztest::runProgram({"--locale", "de", "--help"}).output;
+    EXPECT_NE(help.find("\n  ZEICHNUNG  "), help.npos) << help;
 }
 
 // Each script of examples/ runs in every language: no local word takes the place of a word in it.
