@@ -64,8 +64,8 @@ void translate(CLI::App& app,
 void speakHelp(CLI::App& app, std::string const& locale) {
     Words const words = wordsOf(locale);
     if (words.empty()) return;
-    auto const formatter = std::make_shared<Formatter>(
-        dynamic_cast<CLI::Formatter const&>(*app.get_formatter()));
+    auto const formatter =
+        std::make_shared<Formatter>(dynamic_cast<CLI::Formatter const&>(*app.get_formatter()));
     for (auto const& [english, local] : words)
         formatter->label(english, local);
     translate(app, words, formatter);

@@ -83,7 +83,7 @@ TEST(GermanSession, HasNoEnglishOfLibraries) {
          {": die Datei lässt sich nicht öffnen: Datei oder Ordner nicht gefunden\n",
           ": ist hier kein JSON: ungültige Zahl; erwartet wird eine Ziffer nach '-'\n"})
         EXPECT_NE(seen.find(text), seen.npos) << seen;
-    std::string const help = tztest::runProgram({"--locale", "de", "--help"}).output;
+    std::string const help = tztest::startProgram("--locale de --help").output;
     EXPECT_NE(help.find("\n  ZEICHNUNG  "), help.npos) << help;
 }
 
