@@ -4,6 +4,7 @@
 #include <new>
 #include <optional>
 #include <string>
+#include <unistd.h>
 #include <vector>
 
 #include "apps/tzdraft/commands/bodies.h"
@@ -15,6 +16,7 @@
 #include "apps/tzdraft/function_call.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
+#include "apps/tzdraft/progress_line.h"
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
 #include "apps/tzdraft/version.h"
@@ -52,6 +54,7 @@ public:
 private:
     bool begin();
     bool openSource();
+    void watchJobs();
     bool openDrawing();
     bool planFaults();
     void tellIdleFaults() const;
@@ -80,6 +83,7 @@ private:
     Options const& options_;
     Screens screens_;
     std::unique_ptr<tzhost::AnswerSource> source_;
+    std::unique_ptr<ProgressLine> progress_;  // null where nobody looks on
     EventFile events_;
     ProgramSession session_;
     tzhost::FaultPlan faults_;
@@ -102,6 +106,14 @@ bool Run::openSource() {
     std::string error;
     source_ = tzhost::ScriptSource::open(options_.script.empty() ? "-" : options_.script, error);
     return source_ ? true : complain(error);
+}
+
+// Nobody looks on where a script answers, or where the transcript goes to a file.
+void Run::watchJobs() {
+    if (!tzhost::commandLine().isPerson() || isatty(STDOUT_FILENO) != 1) return;
+    progress_ =
+        std::make_unique<ProgressLine>(screens_.output, [] { tzhost::commandLine().freshLine(); });
+    tzhost::setJobWatcher(progress_.get());
 }
 
 // A person may name a drawing that is not there yet; to a script that is a mistake.
@@ -158,6 +170,7 @@ bool Run::begin() {
     tzhost::CommandLine& line = tzhost::commandLine();
     line.reset();
     line.setScreen([this](tzhost::Shown kind, std::wstring_view text) {
+        if (progress_) progress_->clear();
         auto const& screen = kind == tzhost::Shown::error ? screens_.errors : screens_.output;
         screen(tzhost::toUtf8(text));
     });
@@ -169,6 +182,7 @@ bool Run::begin() {
     if (!configureHost(options_, settings_, error)) return complain(error);
     if (!openSource() || !planFaults()) return false;
     line.setSource(source_.get());
+    watchJobs();
     if (options_.isStrict) line.endScriptAtProblems();
     if (options_.isQuiet && !line.isPerson()) line.keepToProblems();
     if (!options_.events.empty() && !events_.begin(options_.events, error)) return complain(error);
@@ -393,6 +407,7 @@ Run::~Run() {
     tzhost::dynamicLinker().unloadAll();
     tzhost::clearCommandHooks();
     (void)tzhost::commandStack().removeGroup(kHostCommandGroup);
+    tzhost::setJobWatcher(nullptr);
     tzhost::commandLine().reset();
 }
 

@@ -7,6 +7,7 @@
 #include <string_view>
 
 #include "host/base/fault_point.h"
+#include "host/base/job.h"
 #include "host/database/drawing.h"
 #include "host/display/draw_pass.h"
 #include "host/display/plot_paint.h"
@@ -137,8 +138,10 @@ bool Plot::addPaper(PlotScene scene, ViewAxes const& axes) {
 
 bool Plot::addSheet(SpaceToPlot const& space) {
     DrawPass pass(&drawing_, DrawPass::Entities::strokes);
-    for (TzDbObjectId const& id : space.entities)
+    for (TzDbObjectId const& id : space.entities) {
+        Job::step();
         pass.draw(objectOf<TzDbEntity>(id));
+    }
     if (pass.hasTooManyLetters()) return fail(localText("it has more letters than a plot takes"));
     if (!pass.isWhole()) return fail(localText("its blocks stand for too much to plot"));
     ViewAxes const axes = viewAxes(space.space);
@@ -200,6 +203,7 @@ bool Plot::writeFile() {
 }  // namespace
 
 PlotReport plotDrawing(TzDbDatabase& database, PlotOrder const& order) try {
+    Job const job(localText(L"Plotting"));
     Plot plot(*drawingOf(&database), order);
     // What is lacking in a plot that is not there is no news.
     if (!plot.make() || !plot.write()) return {plot.takeReport().problem, {}};

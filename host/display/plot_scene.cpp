@@ -6,8 +6,10 @@
 #include <utility>
 
 #include "host/base/entity_drawing.h"
+#include "host/base/job.h"
 #include "host/display/plot_ink.h"
 #include "host/layout/line_layout.h"
+#include "host/text/local_text.h"
 
 namespace tzhost {
 namespace {
@@ -180,6 +182,7 @@ void addTo(BoxBuilder& builder, PlotShape const& shape) {
 }  // namespace
 
 std::optional<LayoutBox> extentsOf(PlotScene const& scene) {
+    Job const job(localText(L"Measuring"));
     BoxBuilder builder;
     scene([&](PlotShape const& shape) { addTo(builder, shape); });
     return builder.box;
@@ -188,8 +191,11 @@ std::optional<LayoutBox> extentsOf(PlotScene const& scene) {
 PlotScene makeScene(DrawList list, ViewAxes const& axes) {
     auto const kept = std::make_shared<DrawList const>(std::move(list));
     return [kept, axes](ShapeTaker const& take) {
-        for (DrawOp const& op : *kept)
+        Job const job(nullptr, kept->size());
+        for (DrawOp const& op : *kept) {
+            Job::step();
             std::visit([&](auto const& what) { eachShape(what, axes, op.pen, take); }, op.what);
+        }
     };
 }
 

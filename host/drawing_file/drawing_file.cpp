@@ -3,6 +3,7 @@
 #include <cstdio>
 #include <new>
 
+#include "host/base/job.h"
 #include "host/drawing_file/drawing_reader.h"
 #include "host/drawing_file/drawing_writer.h"
 #include "host/files/file_bytes.h"
@@ -79,6 +80,7 @@ DrawingRead readUnguarded(std::filesystem::path const& file) {
 
 // What was read so far is gone when memory runs short, so that there is enough for the message.
 DrawingRead readDrawing(std::filesystem::path const& file) try {
+    Job const job(localText(L"Opening"));
     return readUnguarded(file);
 } catch (std::bad_alloc const&) {
     DrawingRead result;

@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "host/base/job.h"
 #include "host/drawing_file/members.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
@@ -156,6 +157,7 @@ bool DrawingReader::endBlock() {
 
 bool DrawingReader::entity(JsonValue const& value) {
     if (!readsEntities_) return true;
+    Job::step();
     entities_.read(value, block_);
     return !context_.failed;
 }

@@ -1,8 +1,10 @@
 #include "host/drawing_file/drawing_writer.h"
 
+#include "host/base/job.h"
 #include "host/drawing_file/entity_writer.h"
 #include "host/drawing_file/members.h"
 #include "host/drawing_file/page_member.h"
+#include "host/text/local_text.h"
 
 namespace tzhost::drawingfile {
 namespace {
@@ -22,6 +24,7 @@ private:
     template <class Imp>
     void table(char const* name, TzDbObjectId table);
     void blocks();
+    [[nodiscard]] std::size_t countEntities() const;
     void entities(TzDbObjectId block, Named space, bool& first);
     [[nodiscard]] bool flush();
 
@@ -98,6 +101,7 @@ void DrawingWriter::table(char const* name, TzDbObjectId table) {
 void DrawingWriter::entities(TzDbObjectId block, Named space, bool& first) {
     for (TzDbObjectRecord const* const each :
          valuesOf<BlockImp>(*block.record()->object).entities->items) {
+        Job::step();
         if (each->erased) continue;
         out_ += first ? "\n  " : ",\n  ";
         first = false;
@@ -137,7 +141,16 @@ bool DrawingWriter::flush() {
     return written;
 }
 
+// Those of blocks, too, and erased ones, which are passed over.
+std::size_t DrawingWriter::countEntities() const {
+    std::size_t count = 0;
+    for (TzDbObjectRecord const* const each : listOf(*drawing_.blockTableId().record())->items)
+        count += valuesOf<BlockImp>(*each->object).entities->items.size();
+    return count;
+}
+
 bool DrawingWriter::write() {
+    Job const job(localText(L"Saving"), countEntities());
     header();
     blocks();
     members_.begin("entities") += '[';

@@ -1,5 +1,6 @@
 #include "host/selection/fence.h"
 
+#include "host/base/job.h"
 #include "host/command_line/point_input.h"
 #include "host/database/user_system.h"
 #include "host/selection/outline.h"
@@ -77,6 +78,7 @@ int askPoint(FencePoints& fence) {
 EntityIds entitiesAcross(FencePoints const& fence) {
     EntityIds found;
     if (fence.size() < 2) return found;
+    Job const job(localText(L"Selecting"));
     std::vector<TzGePoint2d> line;
     for (TzGePoint3d const& point : fence)
         line.push_back(point.convert2d());

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "host/base/job.h"
 #include "host/database/user_system.h"
 #include "host/display/draw_pass.h"
 #include "host/display/shown.h"
@@ -112,6 +113,7 @@ bool FlatBox::holds(TzGePoint2d const& point) const {
 }
 
 Outline Outline::of(TzDbEntity& entity, TzGeMatrix3d const& placed) {
+    Job::step();
     Outline outline;
     if (!isShown(entity)) return outline;
     TzGeMatrix3d const toUser = currentUserSystem().matrix().inverse() * placed;

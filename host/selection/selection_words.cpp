@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "host/base/job.h"
 #include "host/command_line/point_input.h"
 #include "host/runtime/words.h"
 #include "host/selection/fence.h"
@@ -139,6 +140,7 @@ Answered readHandles(Words const& words) {
 }  // namespace
 
 EntityIds entitiesIn(FlatBox const& box, Touch touch) {
+    Job const job(localText(L"Selecting"));
     EntityIds found;
     for (TzDbObjectId const id : entitiesOfActiveSpace()) {
         Outline const outline = Outline::of(*entityOf(id));

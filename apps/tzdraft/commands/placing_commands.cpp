@@ -13,6 +13,7 @@
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
+#include "host/base/job.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/point_input.h"
 #include "host/database/user_system.h"
@@ -46,7 +47,9 @@ void tellStaying(std::ptrdiff_t count) {
 }
 
 void moveAll(Entities const& entities, TzGeMatrix3d const& placed) {
+    tzhost::Job const job(localText(L"Moving"), entities.size());
     tellStaying(std::count_if(entities.begin(), entities.end(), [&](TzDbObjectId id) {
+        tzhost::Job::step();
         Opened<TzDbEntity> const entity(id, TzDb::kForWrite);
         return !entity || entity->transformBy(placed) != Tzad::eOk;
     }));
@@ -57,8 +60,10 @@ void copyAll(Entities const& entities, std::vector<TzGeMatrix3d> const& places) 
                                              TzDb::kForWrite);
     if (!space) return;
     std::ptrdiff_t staying = 0;
+    tzhost::Job const job(localText(L"Copying"), entities.size() * places.size());
     for (TzGeMatrix3d const& placed : places) {
         staying += std::count_if(entities.begin(), entities.end(), [&](TzDbObjectId id) {
+            tzhost::Job::step();
             Opened<TzDbEntity> const entity(id, TzDb::kForRead);
             return !entity || !copyInto(*space.get(), *entity.get(), placed);
         });

@@ -2,6 +2,8 @@
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/commands/selection_set.h"
+#include "apps/tzdraft/program_texts.h"
+#include "host/base/job.h"
 #include "tz/db/entity.h"
 
 namespace tzdraft {
@@ -13,7 +15,10 @@ void selectCommand() {
 }
 
 void eraseCommand() {
-    for (TzDbObjectId const id : selectEntities(OnLockedLayers::leftOut)) {
+    std::vector<TzDbObjectId> const ids = selectEntities(OnLockedLayers::leftOut);
+    tzhost::Job const job(localText(L"Erasing"), ids.size());
+    for (TzDbObjectId const id : ids) {
+        tzhost::Job::step();
         Opened<TzDbEntity> const entity(id, TzDb::kForWrite);
         if (entity) (void)entity->erase();  // open for write: not refused but by a fault plan
     }
