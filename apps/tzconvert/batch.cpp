@@ -45,13 +45,14 @@ private:
     [[nodiscard]] Failure convertText(std::string const& file,
                                       std::string const& target,
                                       Converted& converted,
-                                      Warnings& warnings) const;
+                                      Warnings& warnings);
     [[nodiscard]] Failure makeFolderOf(std::string const& target) const;
     void tellWarnings(std::string const& file, Warnings const& warnings);
 
     Options const& options_;
     std::vector<Input> const& inputs_;
     Places places_;
+    FontTables fonts_;
     std::vector<FileReport> reports_;
     int warned_ = 0;  // files
 };
@@ -120,13 +121,13 @@ Failure Batch::makeFolderOf(std::string const& target) const {
 Failure Batch::convertText(std::string const& file,
                            std::string const& target,
                            Converted& converted,
-                           Warnings& warnings) const {
+                           Warnings& warnings) {
     std::wstring text;
     if (Failure failure =
             options_.normalises ? readNormalised(file, text, warnings) : readText(file, text))
         return failure;
     if (!options_.normalises) addLook(warnings, options_.direction, text);
-    converted = convert(options_, std::move(text));
+    converted = convert(options_, fonts_, std::move(text));
     addIncidents(warnings, converted.found);
     // What the normaliser writes is the converter's own, and so is what a round trip reads.
     if (options_.direction == Direction::toMtext && !options_.normalises)

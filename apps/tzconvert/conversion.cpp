@@ -38,9 +38,8 @@ MarkupFindings startFindings(Options const& options) {
 
 }  // namespace
 
-Converted convert(Options const& options, std::wstring text) {
-    // An entry of the map file that a proxy took the place of comes back with the next look-up.
-    CMTextFontMapDatabase(0).ResetContents();
+Converted convert(Options const& options, FontTables& fonts, std::wstring text) {
+    fonts.prepare();
     ConversionSession session(startOf(options));
     MarkupFindings found = startFindings(options);
     RtfLosses losses;

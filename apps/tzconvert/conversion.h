@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "apps/tzconvert/font_tables.h"
 #include "apps/tzconvert/options.h"
 #include "module/markup/session/conversion_session.h"
 
@@ -17,8 +18,8 @@ struct Converted {
     RtfLosses losses;
 };
 
-// Gives `text` up as soon as it is read. The result is that of a new session: the font tables are
-// emptied first, and the scales know no sizes yet.
-[[nodiscard]] Converted convert(Options const& options, std::wstring text);
+// Gives `text` up as soon as it is read. The result is that of a new session: the font tables hold
+// the map alone, and the scales know no sizes yet.
+[[nodiscard]] Converted convert(Options const& options, FontTables& fonts, std::wstring text);
 
 }  // namespace tzconvert

@@ -11,7 +11,10 @@
 
 #include <gtest/gtest.h>
 
+#include "apps/tzconvert/font_tables.h"
 #include "apps/tzconvert/text_codec.h"
+#include "host/fonts/font_map_path.h"
+#include "tz/mte/font_map_database.h"
 
 namespace {
 
@@ -297,8 +300,10 @@ TEST(Files, OfABatchGiveWhatTheyGiveAlone) {
     write("own.ini", "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\nother.shx=Else,0,0,0,0\n"
                      "[Proxy Fonts]\nProxy 1=Drawn\n");
     write("lends.txt", "\\Fnone;a");
+    write("lends2.txt", "\\Fhouse|c1;a");
     write("mapped.txt", "{\\Fhouse|c0;b}");
-    for (char const* files : {"mapped.txt", "lends.txt mapped.txt"}) {
+    for (char const* files :
+         {"mapped.txt", "lends.txt mapped.txt", "lends.txt lends2.txt mapped.txt"}) {
         EXPECT_EQ(run("round-trip --font Arial --font-map own.ini --output-dir batch " +
                           std::string(files),
                       "")
@@ -306,6 +311,39 @@ TEST(Files, OfABatchGiveWhatTheyGiveAlone) {
                   0);
         EXPECT_EQ(contentsOf("batch/mapped.mtext"), "{\\Fhouse.shx|c0;b}") << files;
     }
+}
+
+// The tables are kept from conversion to conversion, yet each begins as if they were filled anew.
+TEST(FontTables, HoldWhatTheMapSays) {
+    auto const faceOf = [](wchar_t const* file) {
+        auto const& table = CMTextFontMapDatabase::m_mapFileToFont;
+        auto const at = table.find(CStdStrW(file));
+        if (at == table.end()) return std::string("none");
+        auto const& entry = static_cast<CMTextFileToFontMapEntry const&>(*at->second);
+        return TzString(entry.m_sFaceName).toUtf8();
+    };
+    auto const lend = [](wchar_t const* file) {
+        CMTextFontMapDatabase fonts(0);
+        fonts.AddFontSubstitute(file, L"Lent", false, false, kAnsiCharset, 0,
+                                CMTextFontMapDatabase::MapTypeProxy, 0);
+    };
+    write("kept.ini", "[SHX Map]\nhouse.shx=Drawn,0,0,0,0\n");
+    std::string const before = tzhost::setFontMapFile("kept.ini");
+    tzconvert::FontTables tables;
+    tables.prepare();
+    auto const* const kept = CMTextFontMapDatabase::m_mapFileToFont.begin()->second;
+    lend(L"new.shx");
+    tables.prepare();
+    EXPECT_EQ(CMTextFontMapDatabase::m_mapFileToFont.begin()->second, kept) << "filled again";
+    lend(L"house.shx");
+    EXPECT_EQ(faceOf(L"house.shx"), "none");
+    tables.prepare();
+    EXPECT_EQ(faceOf(L"house.shx"), "Drawn");
+    write("kept.ini", "[SHX Map]\nhouse.shx=Other face,0,0,0,0\n");
+    tables.prepare();
+    EXPECT_EQ(faceOf(L"house.shx"), "Other face");
+    CMTextFontMapDatabase(0).ResetContents();
+    tzhost::setFontMapFile(before);
 }
 
 // A name in plain letters used to be taken for an English one.
