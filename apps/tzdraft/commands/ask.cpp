@@ -6,6 +6,7 @@
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
+#include "host/settings/variables.h"
 #include "host/text/utf8.h"
 #include "tz/ed/prompts.h"
 #include "tz/ed/units.h"
@@ -179,8 +180,10 @@ Answer<double> askLength(wchar_t const* question, TzGePoint3d const* base, doubl
 }
 
 Answer<double> askAngle(wchar_t const* question, double defaultRadians) {
+    // In the units in which an answer is read.
+    int const units = static_cast<int>(tzhost::Variables::instance().number(L"AUNITS"));
     TzString shown;
-    (void)tzdbAngToS(defaultRadians, 0, kShownDecimals, shown);
+    (void)tzdbAngToS(defaultRadians, units, kShownDecimals, shown);
     TzString const prompt = withDefault(question, shown);
     Answer<double> answer;
     answer.asked =
