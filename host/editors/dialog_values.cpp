@@ -22,6 +22,8 @@ constexpr int kByLayer = 256;
 constexpr int kByBlock = 0;
 constexpr double kLeastSpacing = 0.25;
 constexpr double kMostSpacing = 4.0;
+// In the names of styles that an external reference brought along.
+constexpr wchar_t kReferenceSign = L'|';
 
 // Nothing unless the whole text is a number from `least` to `most`.
 std::optional<double> realWithin(std::wstring_view text, double least, double most) {
@@ -103,10 +105,13 @@ DialogChange readRotation(State const&, std::wstring_view text) {
     return [value = *radians](State& state) { state.SetRotation(value); };
 }
 
+// Whether the session can have the style: styles of external references are left out of its list,
+// and a document in a style that it lacks becomes a message in the place of the text.
 bool isStyle(std::wstring const& name) {
     EasyObject<TzDbTextStyleTable> styles;
     TzDbDatabase* const database = tzdbHostApplicationServices()->workingDatabase();
-    return database && database->getTextStyleTable(styles.object, TzDb::kForRead) == Tzad::eOk &&
+    return name.find(kReferenceSign) == name.npos && database &&
+           database->getTextStyleTable(styles.object, TzDb::kForRead) == Tzad::eOk &&
            styles->has(name.c_str());
 }
 

@@ -110,13 +110,13 @@ void feedEditor(CMTextEditorInterface& editor, EasyObject<TzDbMText>& text) {
     editor.SetMTextDatabase(text->database());
 }
 
-CStdStrW contentsForEditor(TzDbMText const& text) {
+bool contentsForEditor(TzDbMText const& text, CStdStrW& contents) {
     EasyObject<TzDbField> field;
-    bool const hasField =
-        text.getField(kTextFieldKey, field.object, TzDb::kForRead) == Tzad::eOk && field.object;
-    CStdStrW contents = hasField ? field->getFieldCode(0) : text.contents();
+    Tzad::ErrorStatus const status = text.getField(kTextFieldKey, field.object, TzDb::kForRead);
+    if (status != Tzad::eOk && status != Tzad::eKeyNotFound) return false;
+    contents = field.object ? field->getFieldCode(0) : text.contents();
     convertBackslashesInFields(contents, kDoubleBackslashes);
-    return contents;
+    return true;
 }
 
 // A value that the text refuses leaves it with the one that it has.

@@ -12,8 +12,9 @@
 
 // Fills an editor from a text, whose height becomes the working text size.
 void feedEditor(CMTextEditorInterface& editor, EasyObject<TzDbMText>& text);
-// The contents for the editor: with the codes of the field, when there is one.
-[[nodiscard]] CStdStrW contentsForEditor(TzDbMText const& text);
+// The contents for the editor: with the codes of the field, when there is one. False, and
+// `contents` stays as it is, when there is a field that cannot be opened.
+[[nodiscard]] bool contentsForEditor(TzDbMText const& text, CStdStrW& contents);
 
 // Writes everything back to a text that is open for write. The colour is written when it is no
 // longer `fedColor`. A text with fields gets them as a field: its own in a drawing, else one that

@@ -46,13 +46,16 @@ void makeRoom(EasyObject<TzDbMText>& text, HiddenText& session) {
     session.hide();
 }
 
-// What the dialog ended with; a text of a newer format is not shown to it.
+// What the dialog ended with. It is not shown a text of a newer format, nor one whose field cannot
+// be opened: what it left would take the place of the field.
 int runDialog(CMTextEditorInterface& editor,
               EasyObject<TzDbMText>& text,
               MTETabType tab,
               unsigned int flags) {
-    CStdStrW const contents = contentsForEditor(*text.object);
-    if (MTextVersioner(text.object).too_new(contents.c_str())) return kEditorLeft;
+    CStdStrW contents;
+    if (!contentsForEditor(*text.object, contents) ||
+        MTextVersioner(text.object).too_new(contents.c_str()))
+        return kEditorLeft;
     editor.SetMTextString(contents);
     editor.SetActiveTab(static_cast<CMTextEditorInterface::EditTab>(tab));
     return (flags & kNoDialogMask) != 0 ? kEditorLeft : editor.DoModal();
