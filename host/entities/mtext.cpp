@@ -70,10 +70,13 @@ double TzDbMText::rotation() const {
     return tzhost::angleAbout(normal(), zeroDirection(*this), direction());
 }
 
+// The angle that the text has leaves its direction as it is, to the last bit: made anew from the
+// angle it would be another in every eighth text.
 Tzad::ErrorStatus TzDbMText::setRotation(double radians) {
     bool const valid = std::isfinite(radians);
-    TzGeVector3d direction = zeroDirection(*this);
-    if (valid) direction.rotateBy(radians, normal());
+    bool const isNew = radians != rotation();
+    TzGeVector3d direction = isNew ? zeroDirection(*this) : this->direction();
+    if (valid && isNew) direction.rotateBy(radians, normal());
     return assign(*this, "TzDbMText::setRotation", &MTextImp::direction, direction, valid,
                   Tzad::eDegenerateGeometry);
 }

@@ -14,7 +14,8 @@ void UpdateAttachPoint(EasyObject<TzDbMText>& text,
     TzGeVector3d const down = direction.crossProduct(text->normal()) * height;
     BoxPlace const from = placeOfAttachment(text->attachment());
     BoxPlace const to = placeOfAttachment(newPoint);
-    TzGePoint3d const topLeft = text->location() - across * from.across() - down * from.down();
-    // A place that is not finite is refused, and the text stays where it is.
-    (void)text->setLocation(topLeft + across * to.across() + down * to.down());
+    // The way from one place to the other, so that a text whose place stays keeps its location to
+    // the last bit. A location that is not finite is refused, and the text stays where it is.
+    (void)text->setLocation(text->location() + across * (to.across() - from.across()) +
+                            down * (to.down() - from.down()));
 }

@@ -105,6 +105,17 @@ TEST_F(DrawingTest, DirectionStaysInThePlane) {
     EXPECT_TRUE(text.direction().isPerpendicularTo(text.normal()));
 }
 
+TEST_F(DrawingTest, RotationThatATextHasKeepsItsDirectionToTheLastBit) {
+    TzDbMText text;
+    for (int tenths = 0; tenths < 60; ++tenths) {
+        ASSERT_EQ(text.setDirection({std::cos(tenths * 0.1), std::sin(tenths * 0.1), 0}),
+                  Tzad::eOk);
+        TzGeVector3d const before = text.direction();
+        ASSERT_EQ(text.setRotation(text.rotation()), Tzad::eOk);
+        EXPECT_TRUE(text.direction().isEqualTo(before, TzGeTol(0))) << tenths;
+    }
+}
+
 TEST_F(DrawingTest, AttachmentMovesTheLocationAndNotTheText) {
     for (wchar_t const* const typeface : {L"DejaVu Sans", L"@DejaVu Sans"}) {
         TzDbMText text;

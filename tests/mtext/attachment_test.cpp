@@ -51,6 +51,17 @@ TEST(Attachment, LeavesTheTextWhereItIs) {
     }
 }
 
+// There and back the location would end beside itself in one text of ten.
+TEST(Attachment, ThatStaysKeepsTheLocationToTheLastBit) {
+    TzDbMText text;
+    describe(text, point(9), 3.3);
+    EXPECT_EQ(text.setLocation({0.1, 0.2, 0.3}), Tzad::eOk);
+    EXPECT_EQ(text.setDirection({0.6, 0.8, 0}), Tzad::eOk);
+    EasyObject<TzDbMText> held(&text, EasyFlags::kNone);
+    UpdateAttachPoint(held, point(9), kMeasureHeight);
+    EXPECT_TRUE(text.location().isEqualTo({0.1, 0.2, 0.3}, TzGeTol(0)));
+}
+
 struct MoveRow {
     int from;
     int to;
