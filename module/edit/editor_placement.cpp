@@ -5,6 +5,7 @@
 #include <cmath>
 
 #include "module/host_calls/sys_var.h"
+#include "module/host_calls/truncate.h"
 #include "tz/ed/view.h"
 #include "tz/mte/globals.h"
 #include "tz/pal/windows_calls.h"
@@ -37,11 +38,6 @@ constexpr int kTopLeft = 0;
 constexpr int kTopRight = 1;
 constexpr int kBottomLeft = 2;
 constexpr int kCorners = 4;
-
-int truncated(double value) {
-    return static_cast<int>(
-        std::clamp(value, static_cast<double>(INT_MIN), static_cast<double>(INT_MAX)));
-}
 
 RECT windowRect(HWND window) {
     RECT rect{};
@@ -114,7 +110,7 @@ void setPoints(double textHeight, double factor) {
         RECT const area = windowRect(GetDrawingAreaWindow());
         double const pixels =
             textHeight * (area.bottom - area.top) / CTzadSysVar::GetDouble(L"VIEWSIZE");
-        giPoints = truncated(std::min(pixels / factor, INT_MAX - 1.0)) + 1;
+        giPoints = truncatedToInt(std::min(pixels / factor, INT_MAX - 1.0)) + 1;
     }
     if (giPoints < kLeastPoints) gwysiwyg = 0;
 }
@@ -128,8 +124,8 @@ int insideDesktop(int begin, int length, int low, int high) {
 void setRect(ScreenBox const& box, RECT const& desktop) {
     double const mostWidth = kMostOfDesktop * (desktop.right - desktop.left);
     double const mostHeight = kMostOfDesktop * (desktop.bottom - desktop.top);
-    int const width = truncated(std::min(std::max(box.width, kLeastWidth), mostWidth));
-    int const height = truncated(std::min(std::max(box.height, kLeastHeight), mostHeight));
+    int const width = truncatedToInt(std::min(std::max(box.width, kLeastWidth), mostWidth));
+    int const height = truncatedToInt(std::min(std::max(box.height, kLeastHeight), mostHeight));
     int const left = insideDesktop(gcPoint.x, width, desktop.left, desktop.right);
     int const top = insideDesktop(gcPoint.y, height, desktop.top, desktop.bottom);
     gcRect = {left, top, left + width, top + height};

@@ -1,23 +1,9 @@
 // Lengths of a session: drawing units, twips of font sizes, twips of margins.
 
-#include <climits>
-#include <cmath>
-
+#include "module/host_calls/truncate.h"
 #include "module/host_calls/unit_converter.h"
 #include "tz/mte/editor_state.h"
 #include "tz/mte/globals.h"
-
-namespace {
-
-// The nearest whole number that an int holds; 0 for no number.
-int truncated(double value) {
-    if (std::isnan(value)) return 0;
-    if (value >= static_cast<double>(INT_MAX)) return INT_MAX;
-    if (value <= static_cast<double>(INT_MIN)) return INT_MIN;
-    return static_cast<int>(value);
-}
-
-}  // namespace
 
 double CMTextEditorState::GetMaximumSize() const {
     return m_fontScale.ScaleTwipsToUnits(m_nMaximumTwipSize);
@@ -45,7 +31,7 @@ int CMTextEditorState::TwipsAdjustedForLinearUnits(int twips) {
 
 int CMTextEditorState::CalcMarginFromWidth(double width) {
     double const ratio = width / g_dTextSize / m_dCharWidth / m_dTracking / g_dWidthFactor;
-    return truncated(UnitsToTwips(g_dTextSize, 1) * ratio * gdTweakFactor);
+    return truncatedToInt(UnitsToTwips(g_dTextSize, 1) * ratio * gdTweakFactor);
 }
 
 double CMTextEditorState::CalcWidthFromMargin(int margin) {

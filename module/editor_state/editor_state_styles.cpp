@@ -12,9 +12,6 @@
 
 namespace {
 
-// Names that an external reference brought along hold this sign.
-constexpr wchar_t kReferenceSign = L'|';
-
 bool isEastAsianPage(int page) {
     return page == kCodePage932 || page == kCodePage936 || page == kCodePage949 ||
            page == kCodePage950;
@@ -68,7 +65,8 @@ void CMTextEditorState::LoadStyles() {
         EasyObject<TzDbTextStyleTableRecord> record;
         CStyleInfoEntry entry;
         if (walk->getRecord(record.object, TzDb::kForRead) != Tzad::eOk ||
-            !GetStyleInfoFromDrawing(*record.object, entry) || entry.name.find(kReferenceSign) >= 0)
+            !GetStyleInfoFromDrawing(*record.object, entry) ||
+            entry.name.find(kExternalStyleMark) >= 0)
             continue;
         if (entry.typeface.isEmpty()) takeFaceOfFile(m_fontMap, entry);
         if (entry.height == 0.0) {
