@@ -7,7 +7,7 @@ namespace {
 
 constexpr int kRubberBand = 2;
 constexpr auto kControls = static_cast<TzEdJig::UserInputControls>(
-    TzEdJig::kGovernedByOrthoMode | TzEdJig::kNullResponseAccepted | TzEdJig::kGovernedByUCSDetect);
+    TzEdJig::kGovernedByOrthoMode | TzEdJig::kNullResponseAccepted | TzEdJig::kAccept3dCoordinates);
 
 }  // namespace
 

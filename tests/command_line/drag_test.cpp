@@ -103,11 +103,11 @@ constexpr DragRow kDrags[] = {
     {"PickWhereItIs", "0,0", 0, "s(0,0,0) u d 0"},
     {"Moves", "~1,2\n~3,4\n3,4", 0, "s(0,0,0) u d s(1,2,0) u d s(3,4,0) u d 0"},
     {"MovesNowhere", "~1,2\n~1,2\n", 0, "s(0,0,0) u d s(1,2,0) u d s-6 -1"},
-    {"Enter", "", 0x1000, "s(0,0,0) u d -1"},
+    {"Enter", "", 0x80, "s(0,0,0) u d -1"},
     {"Keyword", "h", 0, "s(0,0,0) u d 2"},
     {"Cancel", "~1,1\n^C", 0, "s(0,0,0) u d s(1,1,0) u d -4"},
     {"Refused", "x\n~y\n~\n", 0, "s(0,0,0) u d -1"},
-    {"Relative", "@1,1", 0x1000, "s(0,0,0) u d s(11,21,30) u d 0"},
+    {"Relative", "@1,1", 0x80, "s(0,0,0) u d s(11,21,30) u d 0"},
     {"Flat", "1,2,3", 1, "s(0,0,0) u d s(1,2,0) u d 0"},
     {"InSpace", "1,2,3", 0x1080, "s(0,0,0) u d s(1,2,3) u d 0"},
 };
@@ -202,7 +202,7 @@ TEST_F(Drags, TellEvents) {
     telemetry.set_end_point({});
     telemetry.SendEvent(1, 128);
     EXPECT_EQ(session.events(),
-              R"({"event":"prompt","kind":"drag","text":"Corner: ","keywords":"Width","flags":4096}
+              R"({"event":"prompt","kind":"drag","text":"Corner: ","keywords":"Width","flags":128}
 {"event":"frame","draw":[]}
 {"event":"frame","draw":[]}
 {"event":"answer","line":"~1,2","status":0}

@@ -49,9 +49,9 @@ public:
         kNoNegativeResponseAccepted = 0x10,
         kNoZeroResponseAccepted = 0x20,
         kInitialBlankTerminatesInput = 0x40,
-        kGovernedByUCSDetect = 0x80,
+        kAccept3dCoordinates = 0x80,
         kAnyBlankTerminatesInput = 0x200,
-        kAccept3dCoordinates = 0x1000,
+        kGovernedByUCSDetect = 0x1000,
     };
 
     TzEdJig();
