@@ -24,6 +24,8 @@ namespace {
 constexpr int kNoEmptyAnswer = 1;
 constexpr int kEmptyAnswerTaken = 4;
 
+constexpr int kLongestKeyword = 255;  // letters
+
 // The keywords of a selection go to the alignment while this lives.
 class [[nodiscard]] SelectionKeywords {
 public:
@@ -50,9 +52,13 @@ void showEach(TzArray<TzDbObjectId> const& ids, Show const& show) {
     }
 }
 
+// A keyword has one letter at least and 255 at most, as in a buffer with its closing zero.
 int askKeyword(TzString const& prompt, unsigned int keywords, TzString& answer) {
     tzedInitGet(kEmptyAnswerTaken, gStringTable[keywords]);
-    return tzedGetKword(prompt, answer);
+    int const status = tzedGetKword(prompt, answer);
+    if (status != Tzad::ePromptNormal) return status;
+    if (answer.isEmpty()) return Tzad::ePromptError;
+    return answer.length() > kLongestKeyword ? Tzad::ePromptTooLong : status;
 }
 
 }  // namespace

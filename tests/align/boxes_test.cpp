@@ -68,7 +68,7 @@ TEST_P(Boxes, LieOnThePlane) {
     TzDbObjectId const id;
     GivenMaker maker(id, row.system, {row.base, row.sides[0], row.sides[1], row.sides[2]});
     maker.setViewDirectionForProjection(row.viewed);
-    TzGeBoundBlock3d const box = maker.makeBoundBox();
+    TzGeBoundBlock3d const box = maker.makeBoundBox().value();
     EXPECT_EQ(textOf(box), row.box);
     TzGePoint3d upperLeft;
     TzGeVector3d sides[3];

@@ -19,7 +19,7 @@ class GivenMaker final : public TzMTextAlignBoundBoxMaker {
 public:
     GivenMaker(TzDbObjectId const& id, TzGeMatrix3d const& system, TzGeBoundBlock3d const& box)
         : TzMTextAlignBoundBoxMaker(id, system), box_(box) {}
-    [[nodiscard]] TzGeBoundBlock3d makeWcsBoundBox() const override { return box_; }
+    [[nodiscard]] Box makeWcsBoundBox() const override { return box_; }
 
 private:
     TzGeBoundBlock3d box_;

@@ -202,6 +202,13 @@ TEST(Spacing, NeedsOneDegree) {
                         {"", std::sin(angle), std::cos(angle)});
         EXPECT_EQ(option.hasError(), row.error) << row.degrees;
     }
+    // Long lines at one degree, whose ends are rounded.
+    double const degree = std::numbers::pi / 180;
+    for (double const length : {1.0, 10.0, 50.0, 57.29, 100.0, 1000.0}) {
+        Moved const run(option, kSystems[0], tagTextDirection::TL,
+                        {"", length * std::sin(degree), length * std::cos(degree)});
+        EXPECT_FALSE(option.hasError()) << length;
+    }
 }
 
 // The text that the others follow stands at 4,4; two more with one parameter keep their order.

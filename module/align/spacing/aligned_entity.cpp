@@ -32,9 +32,12 @@ void TzMTextAlignManipulatorEntity::cloneDbEntity() {
 
 void TzMTextAlignManipulatorEntity::calculateOriginalBoundingBoxInEcs() {
     BoundBoxMakerHolder const maker = boundBoxMaker();
-    if (maker) m_boundingBox = maker->makeBoundBox();
-    if (!m_boundingBox.isEmpty()) return;
-    // The place of a text that was not measured is unknown, so the text is not moved.
+    if (!maker) return;
+    if (auto const box = maker->makeBoundBox()) {
+        m_boundingBox = *box;  // an empty one stands at the plane's origin, and goes from there
+        return;
+    }
+    // A text that cannot be opened is left out.
     delete m_clone;
     m_clone = nullptr;
 }

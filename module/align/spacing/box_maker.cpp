@@ -25,15 +25,15 @@ void TzMTextAlignBoundBoxMaker::setViewDirectionForProjection(TzGeVector3d const
     m_projectOnPlane = !direction.isZeroLength();
 }
 
-TzGeBoundBlock3d TzMTextAlignBoundBoxMaker::makeBoundBox() const {
-    TzGeBoundBlock3d box = m_projectOnPlane ? makeWcsBoundBoxOnWorkingPlane() : makeWcsBoundBox();
-    if (!box.isEmpty()) adjustBoundingBoxOnTheWorkingPlane(box);
+TzMTextAlignBoundBoxMaker::Box TzMTextAlignBoundBoxMaker::makeBoundBox() const {
+    Box box = m_projectOnPlane ? makeWcsBoundBoxOnWorkingPlane() : makeWcsBoundBox();
+    if (box && !box->isEmpty()) adjustBoundingBoxOnTheWorkingPlane(*box);
     return box;
 }
 
-TzGeBoundBlock3d TzMTextAlignBoundBoxMaker::makeWcsBoundBoxOnWorkingPlane() const {
-    TzGeBoundBlock3d box = makeWcsBoundBox();
-    if (!box.isEmpty() && !isOnTheWorkingPlane(box)) projection(box);
+TzMTextAlignBoundBoxMaker::Box TzMTextAlignBoundBoxMaker::makeWcsBoundBoxOnWorkingPlane() const {
+    Box box = makeWcsBoundBox();
+    if (box && !box->isEmpty() && !isOnTheWorkingPlane(*box)) projection(*box);
     return box;
 }
 

@@ -2,6 +2,7 @@
 
 #include <memory>
 #include <new>
+#include <optional>
 
 #include "tz/db/object_id.h"
 #include "tz/ge/bound_block3d.h"
@@ -11,7 +12,7 @@
 // turned, to a box along the axes of the plane. A derived class measures its kind of text.
 //
 //   TzMTextAlignBoundBoxMakerText maker(id, workingSystem);
-//   TzGeBoundBlock3d const box = maker.makeBoundBox();    // in coordinates of the working plane
+//   auto const box = maker.makeBoundBox();    // in coordinates of the working plane
 //
 // Id and system are borrowed. Makers are freed by BoundBoxMakerRelease, never through a pointer to
 // this class: its only virtual operation is the measuring.
@@ -20,16 +21,19 @@ public:
     TzMTextAlignBoundBoxMaker(TzDbObjectId const& id, TzGeMatrix3d const& coordSystem)
         : m_id(id), m_coordSystem(coordSystem) {}
 
-    // The box in world coordinates, as a base and sides; empty when the text cannot be measured.
-    [[nodiscard]] virtual TzGeBoundBlock3d makeWcsBoundBox() const = 0;
+    // A box, which is empty when the text cannot be measured; nothing when it cannot be opened.
+    using Box = std::optional<TzGeBoundBlock3d>;
+
+    // The box in world coordinates, as a base and sides.
+    [[nodiscard]] virtual Box makeWcsBoundBox() const = 0;
 
     // A text off the working plane is then laid on it along this direction. A zero vector turns
     // that off, as it is at first.
     void setViewDirectionForProjection(TzGeVector3d const& direction);
 
-    // The box on the working plane, between its upper left and its lower right corner; z is 0. A
-    // text that cannot be measured gives an empty box, which reads as the plane's origin.
-    [[nodiscard]] TzGeBoundBlock3d makeBoundBox() const;
+    // The box on the working plane, between its upper left and its lower right corner; z is 0. An
+    // empty one reads as the plane's origin.
+    [[nodiscard]] Box makeBoundBox() const;
 
 protected:
     ~TzMTextAlignBoundBoxMaker() = default;
@@ -48,7 +52,7 @@ private:
         int second;
     };
 
-    [[nodiscard]] TzGeBoundBlock3d makeWcsBoundBoxOnWorkingPlane() const;
+    [[nodiscard]] Box makeWcsBoundBoxOnWorkingPlane() const;
     [[nodiscard]] bool isOnTheWorkingPlane(TzGeBoundBlock3d const& box) const;
     void projection(TzGeBoundBlock3d& box) const;
     void adjustBoundingBoxOnTheWorkingPlane(TzGeBoundBlock3d& box) const;

@@ -12,7 +12,8 @@ void TzMTextAlignOptionCurrentSpace::initialize() {
     m_hasError = false;
 }
 
-// An angle of exactly one degree is wide enough.
+// An angle of one degree is wide enough, also where the rounding of the points makes it a hair
+// less.
 TzMTextAlignOption::Offsets
 TzMTextAlignOptionCurrentSpace::createOffsetFor(Entities const& entities,
                                                 Indices const& sortedIndices,
@@ -20,7 +21,8 @@ TzMTextAlignOptionCurrentSpace::createOffsetFor(Entities const& entities,
                                                 TzGeMatrix3d const& coordSystem) {
     TzGeVector3d const extension = extensionLineDirection(coordSystem);
     TzGeVector3d const along = baseline.direction();
-    m_hasError = angleThreshold() > std::min(along.angleTo(extension), along.angleTo(-extension));
+    double const angle = std::min(along.angleTo(extension), along.angleTo(-extension));
+    m_hasError = angleThreshold() - angle > TzGeContext::gTol.equalVector();
     if (m_hasError) return Offsets(entities.size());
     Positions positions;
     calculateNewPosition(positions, entities, sortedIndices, extension, baseline, coordSystem);

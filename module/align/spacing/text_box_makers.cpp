@@ -30,15 +30,15 @@ std::optional<FrameBox> measured(TzDbText const& text) {
 
 }  // namespace
 
-TzGeBoundBlock3d TzMTextAlignBoundBoxMakerMText::makeWcsBoundBox() const {
+TzMTextAlignBoundBoxMaker::Box TzMTextAlignBoundBoxMakerMText::makeWcsBoundBox() const {
     EasyObject<TzDbMText> text;
-    if (tzdbOpenObject(text.object, id(), TzDb::kForRead) != Tzad::eOk) return {};
+    if (tzdbOpenObject(text.object, id(), TzDb::kForRead) != Tzad::eOk) return std::nullopt;
     TzGeVector3d const across = text->direction() * text->actualWidth();
     TzGeVector3d const up = text->normal().crossProduct(text->direction()) * text->actualHeight();
     BoxPlace const attached = placeOfAttachment(text->attachment());
     TzGePoint3d const lowerLeft =
         text->location() - across * attached.across() + up * (attached.down() - 1.0);
-    return {lowerLeft, across, up, TzGeVector3d::kIdentity};
+    return TzGeBoundBlock3d(lowerLeft, across, up, TzGeVector3d::kIdentity);
 }
 
 // Takes the width of a multi-line definition, open for read, away while it lives.
@@ -78,12 +78,12 @@ private:
     TzDbAttributeDefinition* m_definition;
 };
 
-TzGeBoundBlock3d TzMTextAlignBoundBoxMakerText::makeWcsBoundBox() const {
+TzMTextAlignBoundBoxMaker::Box TzMTextAlignBoundBoxMakerText::makeWcsBoundBox() const {
     EasyObject<TzDbText> text;
-    if (tzdbOpenObject(text.object, id(), TzDb::kForRead) != Tzad::eOk) return {};
+    if (tzdbOpenObject(text.object, id(), TzDb::kForRead) != Tzad::eOk) return std::nullopt;
     AttributeDefHacker const unwrapped(tzrxCast<TzDbAttributeDefinition>(text.object));
     auto const box = measured(*text.object);
-    if (!box) return {};
+    if (!box) return TzGeBoundBlock3d();
     TzGeBoundBlock3d block(TzGePoint3d(box->low[0], box->low[1], box->low[2]),
                            TzGeVector3d(box->high[0] - box->low[0], 0, 0),
                            TzGeVector3d(0, box->high[1] - box->low[1], 0), TzGeVector3d::kIdentity);

@@ -2,14 +2,13 @@
 
 #include "module/align/spacing/box_maker.h"
 
-// The makers of the boxes of both kinds of texts. A text that cannot be opened or measured gives an
-// empty box.
+// The makers of the boxes of both kinds of texts.
 
 // Multi-line texts: the box of the text as it is laid out.
 class TzMTextAlignBoundBoxMakerMText final : public TzMTextAlignBoundBoxMaker {
 public:
     using TzMTextAlignBoundBoxMaker::TzMTextAlignBoundBoxMaker;
-    [[nodiscard]] TzGeBoundBlock3d makeWcsBoundBox() const override;
+    [[nodiscard]] Box makeWcsBoundBox() const override;
 };
 
 // Single-line texts and attribute definitions. A definition with several lines is measured without
@@ -18,7 +17,7 @@ public:
 class TzMTextAlignBoundBoxMakerText final : public TzMTextAlignBoundBoxMaker {
 public:
     using TzMTextAlignBoundBoxMaker::TzMTextAlignBoundBoxMaker;
-    [[nodiscard]] TzGeBoundBlock3d makeWcsBoundBox() const override;
+    [[nodiscard]] Box makeWcsBoundBox() const override;
 
 private:
     class AttributeDefHacker;
