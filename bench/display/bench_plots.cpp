@@ -1,7 +1,11 @@
 // Plots of 20,000 notes of 25 letters as text, beside the same glyphs as plain paths: their time,
-// and beside it the bytes of both files.
+// their bytes, and the memory that they take.
 #include <benchmark/benchmark.h>
+#include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
+#include <random>
 #include <set>
 #include <string>
 
@@ -13,25 +17,68 @@ namespace {
 using namespace tzhost;
 
 constexpr int kNotes = 20'000;
-constexpr int kNotesInARow = 100;
-constexpr wchar_t kNote[] = L"Drain %05d to the manhole";
+constexpr int kLetters = 25;  // of a note
 
-PlotScene notes() {
+struct Face {
+    wchar_t const* name;
+    wchar_t first;  // of the letters that it is asked for
+    unsigned int letters;
+};
+constexpr Face kFaces[] = {
+    {L"DejaVu Sans", L'!', 62},
+    {L"DejaVu Serif", L'\u00C0', 190},
+    {L"Droid Sans Fallback", L'\u4E00', 6000},
+    {L"Liberation Sans", L'\u0410', 64},
+};
+
+// What the notes say: one text with a number in it, or letters by chance in a face by turns.
+enum Words { numbered, byChance };
+
+struct Note {
+    wchar_t const* face;
+    std::wstring text;
+};
+
+Note noteOf(Words words, int number) {
+    if (words == numbered) {
+        TzString const text = TzString::formatted(L"Drain %05d to the manhole", number);
+        return {kFaces[0].name, text.str()};
+    }
+    static std::mt19937 chance(1);
+    Face const& face = kFaces[static_cast<std::size_t>(number) % std::size(kFaces)];
+    Note note{face.name, {}};
+    for (int i = 0; i < kLetters; ++i)
+        note.text += static_cast<wchar_t>(face.first + static_cast<int>(chance() % face.letters));
+    return note;
+}
+
+void add(DrawList& list, Note const& note, TzGePoint3d const& place) {
+    DrawOp op;
+    op.pen.color = TzCmEntityColor::fromIndex(7);
+    DrawnText text{note.text.c_str(), place, TzGeVector3d::kZAxis, TzGeVector3d::kXAxis, {}, true};
+    text.style.setTextSize(2.0);
+    text.style.setFont(note.face, false, false, 0, 0);
+    op.what = text;
+    list.push_back(op);
+}
+
+PlotScene notes(Words words) {
+    constexpr int kNotesInARow = 100;
     DrawList list;
     for (int i = 0; i < kNotes; ++i) {
-        DrawOp op;
-        op.pen.color = TzCmEntityColor::fromIndex(7);
-        DrawnText text{TzString::formatted(kNote, i),
-                       TzGePoint3d(i % kNotesInARow * 40.0, i / kNotesInARow * 5.0, 0.0),
-                       TzGeVector3d::kZAxis,
-                       TzGeVector3d::kXAxis,
-                       {},
-                       true};
-        text.style.setTextSize(2.0);
-        text.style.setFont(L"DejaVu Sans", false, false, 0, 0);
-        op.what = text;
-        list.push_back(op);
+        add(list, noteOf(words, i),
+            TzGePoint3d(i % kNotesInARow * 60.0, i / kNotesInARow * 5.0, 0.0));
     }
+    return makeScene(std::move(list), ViewAxes());
+}
+
+// The letters of all notes in one text.
+PlotScene oneNote() {
+    Note whole{kFaces[0].name, {}};
+    for (int i = 0; i < kNotes; ++i)
+        whole.text += noteOf(numbered, i).text;
+    DrawList list;
+    add(list, whole, TzGePoint3d());
     return makeScene(std::move(list), ViewAxes());
 }
 
@@ -58,46 +105,86 @@ std::size_t bytesOf(PlotSheet const& sheet, PlotFormat format) {
 }
 
 void plotNotes(benchmark::State& state) {
-    constexpr double kMostTime = 1.5;
+    constexpr double kMostTime = 0.8;
     auto const format = static_cast<PlotFormat>(state.range(0));
-    PlotSheet const text = fittedSheet(notes(), format);
+    PlotSheet const text = fittedSheet(notes(static_cast<Words>(state.range(1))), format);
     PlotSheet plain = text;
     plain.scene = plainPaths(text.scene);
     tzbench::AgainstFloor against(state, kMostTime);
     while (state.KeepRunning())
         against.turn([&] { return bytesOf(text, format); }, [&] { return bytesOf(plain, format); });
 }
-BENCHMARK(plotNotes)
-    ->Arg(static_cast<int>(PlotFormat::svg))
-    ->Arg(static_cast<int>(PlotFormat::pdf))
-    ->UseManualTime()
-    ->Iterations(3)
-    ->Unit(benchmark::kMillisecond);
 
-// The ratio is that of the sizes: a byte counts as a microsecond.
-void sizeOfNotes(benchmark::State& state) {
-    constexpr double kMostSize = 0.5;
+// One text of as many letters takes as long as all notes.
+void plotOneText(benchmark::State& state) {
+    constexpr double kMostTime = 1.3;
     auto const format = static_cast<PlotFormat>(state.range(0));
-    PlotSheet const text = fittedSheet(notes(), format);
+    tzbench::AgainstFloor against(state, kMostTime);
+    while (state.KeepRunning()) {
+        against.turn([&] { return bytesOf(fittedSheet(oneNote(), format), format); },
+                     [&] { return bytesOf(fittedSheet(notes(numbered), format), format); });
+    }
+}
+
+void tell(benchmark::State& state, double work, double floor, double bound) {
+    state.counters["work"] = work;
+    state.counters["floor"] = floor;
+    state.counters["ratio"] = work / floor;
+    state.counters["bound"] = bound;
+}
+
+void sizeOfNotes(benchmark::State& state) {
+    constexpr double kMostSize = 0.1;
+    auto const format = static_cast<PlotFormat>(state.range(0));
+    PlotSheet const text = fittedSheet(notes(static_cast<Words>(state.range(1))), format);
     PlotSheet plain = text;
     plain.scene = plainPaths(text.scene);
-    double ours = 0.0;
-    double theirs = 0.0;
-    while (state.KeepRunning()) {
-        ours = static_cast<double>(bytesOf(text, format));
-        theirs = static_cast<double>(bytesOf(plain, format));
-        state.SetIterationTime(ours * 1e-6);
+    for (auto _ : state) {
+        tell(state, static_cast<double>(bytesOf(text, format)),
+             static_cast<double>(bytesOf(plain, format)), kMostSize);
     }
-    state.counters["work"] = ours;
-    state.counters["floor"] = theirs;
-    state.counters["ratio"] = ours / theirs;
-    state.counters["bound"] = kMostSize;
 }
-BENCHMARK(sizeOfNotes)
+
+// The peak of memory of a process that plots the notes.
+double peakOf(PlotFormat format, Words words) {
+    constexpr double kKilobyte = 1024.0;
+    pid_t const child = fork();
+    if (child == 0) {
+        benchmark::DoNotOptimize(bytesOf(fittedSheet(notes(words), format), format));
+        _exit(0);
+    }
+    rusage used{};
+    int status = 0;
+    return wait4(child, &status, 0, &used) == child && status == 0
+               ? static_cast<double>(used.ru_maxrss) * kKilobyte
+               : 0.0;
+}
+
+// Against a kilobyte for each letter.
+void memoryOfNotes(benchmark::State& state) {
+    constexpr double kMostBytes = 1024.0;
+    auto const format = static_cast<PlotFormat>(state.range(0));
+    for (auto _ : state) {
+        double const peak = peakOf(format, static_cast<Words>(state.range(1)));
+        if (peak == 0.0) return state.SkipWithError("the plot failed");
+        tell(state, peak, kMostBytes * kNotes * kLetters, 1.0);
+    }
+}
+
+void eachFormat(benchmark::internal::Benchmark* bench) {
+    constexpr int kSvg = static_cast<int>(PlotFormat::svg);
+    constexpr int kPdf = static_cast<int>(PlotFormat::pdf);
+    bench->ArgsProduct({{kSvg, kPdf}, {numbered, byChance}})->Iterations(1);
+}
+// The processes of the first start small.
+BENCHMARK(memoryOfNotes)->Apply(eachFormat)->Unit(benchmark::kMillisecond);
+BENCHMARK(plotNotes)->Apply(eachFormat)->UseManualTime()->Unit(benchmark::kMillisecond);
+BENCHMARK(plotOneText)
     ->Arg(static_cast<int>(PlotFormat::svg))
     ->Arg(static_cast<int>(PlotFormat::pdf))
     ->UseManualTime()
     ->Iterations(1)
     ->Unit(benchmark::kMillisecond);
+BENCHMARK(sizeOfNotes)->Apply(eachFormat)->Unit(benchmark::kMillisecond);
 
 }  // namespace
