@@ -121,7 +121,7 @@ void LetterShapes::add(OutlinedLetter const& letter) {
     }
     shape_.glyphs.push_back({letter.font, letter.glyph, frame_.place(letter.origin),
                              frame_.turn(letter.along), frame_.turn(letter.down), letter.text,
-                             letter.rightToLeft});
+                             letter.rightToLeft, letter.spread});
     ++letters_;
 }
 

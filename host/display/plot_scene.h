@@ -34,6 +34,7 @@ struct PlotGlyph {
     LayoutPoint down;
     std::string text;
     bool rightToLeft = false;
+    bool spread = false;
 };
 
 struct PlotShape {

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cmath>
 #include <memory>
+#include <string_view>
 #include <utility>
 
 #include "host/display/plot_clip.h"
@@ -44,6 +45,37 @@ ScaledFont fontOn(cairo_matrix_t const& toPage, PangoFont* font) {
                                              &identity, options.get()));
     bool const isGood = cairo_scaled_font_status(made.get()) == CAIRO_STATUS_SUCCESS;
     return isGood ? std::move(made) : nullptr;
+}
+
+// Where letters stand side by side along the page's edge, as their font says, a reader joins them
+// to words by their places. Of others it would make words of one letter.
+bool areJoinedByPlace(PlotGlyph const& glyph) {
+    constexpr double kLeastSlope = 1e-3;
+    double const x = std::fabs(glyph.along.x);
+    double const y = std::fabs(glyph.along.y);
+    bool const isMirrored = glyph.along.x * glyph.down.y > glyph.along.y * glyph.down.x;
+    return std::min(x, y) <= kLeastSlope * std::max(x, y) && !isMirrored && !glyph.spread;
+}
+
+bool isBlank(std::string_view text) {
+    return text.find_first_not_of(" \u00A0\t") == std::string_view::npos;
+}
+
+// Which characters the glyphs stand for: each glyph for its own, or those of a word for all of it.
+std::vector<cairo_text_cluster_t> clustersOf(AlikeGlyphs const& glyphs) {
+    bool const keepsWords = !areJoinedByPlace(glyphs.front());
+    bool isInWord = false;
+    std::vector<cairo_text_cluster_t> clusters;
+    for (PlotGlyph const& each : glyphs) {
+        bool const isOfWord = each.text.empty() ? isInWord : !isBlank(each.text);
+        bool const goesOn = each.text.empty() || (keepsWords && isInWord && isOfWord);
+        if (clusters.empty() || !goesOn) clusters.push_back({0, 0});
+        clusters.back().num_bytes += static_cast<int>(each.text.size());
+        if (each.glyph != PANGO_GLYPH_EMPTY) ++clusters.back().num_glyphs;
+        isInWord = isOfWord;
+    }
+    if (glyphs.front().rightToLeft) std::reverse(clusters.begin(), clusters.end());
+    return clusters;
 }
 
 }  // namespace
@@ -89,23 +121,19 @@ bool TextPainter::showAsText(AlikeGlyphs const& glyphs) {
     if (!font) return false;
     std::string const text = wordsOf(glyphs);
     std::vector<cairo_glyph_t> placed;
-    std::vector<cairo_text_cluster_t> clusters;
     for (PlotGlyph const& each : glyphs) {
-        if (!each.text.empty() || clusters.empty())
-            clusters.push_back({static_cast<int>(each.text.size()), 0});
         if (each.glyph == PANGO_GLYPH_EMPTY) continue;
         LayoutPoint const at = sheet_.place(each.origin);
         if (!std::isfinite(at.x) || !std::isfinite(at.y)) return false;
         placed.push_back({each.glyph, at.x, at.y});
-        ++clusters.back().num_glyphs;
     }
-    bool const isBackward = glyphs.front().rightToLeft;
-    if (isBackward) std::reverse(clusters.begin(), clusters.end());
+    std::vector<cairo_text_cluster_t> const clusters = clustersOf(glyphs);
     cairo_set_scaled_font(cairo_, font.get());
-    cairo_show_text_glyphs(
-        cairo_, text.data(), static_cast<int>(text.size()), placed.data(),
-        static_cast<int>(placed.size()), clusters.data(), static_cast<int>(clusters.size()),
-        isBackward ? CAIRO_TEXT_CLUSTER_FLAG_BACKWARD : static_cast<cairo_text_cluster_flags_t>(0));
+    cairo_show_text_glyphs(cairo_, text.data(), static_cast<int>(text.size()), placed.data(),
+                           static_cast<int>(placed.size()), clusters.data(),
+                           static_cast<int>(clusters.size()),
+                           glyphs.front().rightToLeft ? CAIRO_TEXT_CLUSTER_FLAG_BACKWARD
+                                                      : static_cast<cairo_text_cluster_flags_t>(0));
     return true;
 }
 

@@ -4,6 +4,7 @@
 
 #include <cmath>
 #include <memory>
+#include <string_view>
 #include <vector>
 
 #include "host/shaping/glyph_shapes.h"
@@ -25,7 +26,7 @@ using Glyphs = std::unique_ptr<PangoGlyphString, GlyphsFree>;
 
 // The characters of the cluster that begins, from left to right, at a glyph; none when it began
 // before.
-std::string clusterAt(std::string const& text, PangoGlyphString const& glyphs, int index) {
+std::string clusterAt(std::string_view text, PangoGlyphString const& glyphs, int index) {
     int const* const starts = glyphs.log_clusters;
     int const start = starts[index];
     if (index > 0 && starts[index - 1] == start) return {};
@@ -39,7 +40,8 @@ std::string clusterAt(std::string const& text, PangoGlyphString const& glyphs, i
             ++next;
         if (next < glyphs.num_glyphs && starts[next] > start) end = starts[next];
     }
-    return text.substr(static_cast<std::size_t>(start), static_cast<std::size_t>(end - start));
+    return std::string(
+        text.substr(static_cast<std::size_t>(start), static_cast<std::size_t>(end - start)));
 }
 
 class Outliner {
@@ -51,6 +53,7 @@ public:
         double const mirrorY = run.mirroredY ? -scale_ : scale_;
         letter_.along = {mirrorX * run.widthFactor, 0.0};
         letter_.down = {-mirrorX * slant_, -mirrorY};
+        letter_.spread = run.tracking != 1.0;
     }
 
     void outline();
@@ -94,10 +97,11 @@ void Outliner::addItem(PangoItem const& item, Utf8Text const& utf8, PangoGlyphSt
                                  [](PangoFont* font) { g_object_unref(font); });
     }
     letter_.rightToLeft = item.analysis.level % 2 != 0;
+    std::string_view const text =
+        std::string_view(utf8.bytes)
+            .substr(static_cast<std::size_t>(item.offset), static_cast<std::size_t>(item.length));
     for (int i = 0; i < glyphs.num_glyphs; ++i) {
-        letter_.text = clusterAt(utf8.bytes.substr(static_cast<std::size_t>(item.offset),
-                                                   static_cast<std::size_t>(item.length)),
-                                 glyphs, i);
+        letter_.text = clusterAt(text, glyphs, i);
         addGlyph(glyphs.glyphs[i]);
     }
 }

@@ -43,6 +43,7 @@ struct OutlinedLetter {
     // belongs to the one before it.
     std::string text;
     bool rightToLeft = false;  // the letters are read from the last to the first
+    bool spread = false;       // they stand further apart or closer together than the font says
 };
 using LetterTaker = std::function<void(OutlinedLetter const& letter)>;
 
