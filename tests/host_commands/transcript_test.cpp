@@ -24,7 +24,7 @@ TranscriptCase const kCases[] = {
     {"ControlCharactersShow", "TEXT\n0,0\n\n\n\x1B[6n\xC2\x9B\nLIST\nlast\n\n",
      "text             \\U+001B[6n\\U+009B\n"},
     // It used to be 57.2958, which the answer 1 is not.
-    {"AnglesAsTheyAreRead", "SETVAR\nAUNITS\n3\nSTYLE\n\n\n\n\n1\n\n\n\n\nSTYLE\n\n\n\n\n",
+    {"AnglesAsTheyAreRead", "SETVAR\nAUNITS\n3\nSTYLE\n\n\n\n\n1\n\n\n\n\nSTYLE\n\n\n\n\n^C\n",
      "Obliquing angle <1.0000r>: "},
     {"HelpOnNothing", "HELP\nDANCE\n", "There is no help on \"DANCE\".\n"},
     {"HelpLists", "HELP\n\n", "CIRCLE           Draws a circle from its center and radius.\n"},
