@@ -4,11 +4,10 @@
 #include "host/command_line/point_input.h"
 #include "host/database/user_system.h"
 #include "host/selection/outline.h"
+#include "host/selection/rubber_line.h"
 #include "host/text/local_text.h"
-#include "tz/db/entity.h"
 #include "tz/ed/jig.h"
 #include "tz/ed/prompts.h"
-#include "tz/gi/draw.h"
 #include "tz/rx/status.h"
 
 namespace tzhost {
@@ -16,18 +15,6 @@ namespace tzhost {
 namespace {
 
 constexpr int kUndo = TzEdJig::kKW1;
-
-// The line as it is drawn while it grows; world coordinates.
-class FenceView final : public TzDbEntity {
-public:
-    std::vector<TzGePoint3d> points;
-
-protected:
-    bool subWorldDraw(TzGiWorldDraw* draw) override {
-        if (draw) draw->geometry().polyline(static_cast<int>(points.size()), points.data());
-        return true;
-    }
-};
 
 // From a fence that has points to the cursor.
 class FenceDrag final : public TzEdJig {
@@ -53,9 +40,7 @@ public:
     [[nodiscard]] TzDbEntity* entity() const override { return &view_; }
 
 private:
-    static constexpr int kRubberBand = 2;
-
-    mutable FenceView view_;
+    mutable RubberLine view_;
 };
 
 // What the question for the next point, the first one too, ended with.

@@ -8,6 +8,7 @@
 #include "host/base/job.h"
 #include "host/command_line/point_input.h"
 #include "host/runtime/words.h"
+#include "host/selection/corners.h"
 #include "host/selection/fence.h"
 #include "host/selection/pick.h"
 #include "host/text/local_text.h"
@@ -22,7 +23,17 @@ Answered answerWith(EntityIds ids) {
     return SelectionAnswer{SelectionAnswer::Kind::entities, std::move(ids)};
 }
 
+Answered cancelled() {
+    return SelectionAnswer{SelectionAnswer::Kind::cancelled, EntityIds()};
+}
+
+// The box between the points of the line, or those that are asked for when the word stands alone.
 Answered readBox(Words const& words, Touch touch) {
+    if (words.size() == 1) {
+        auto const asked = askBox();
+        if (!asked) return cancelled();
+        return answerWith(asked->box ? entitiesIn(*asked->box, touch) : EntityIds());
+    }
     if (words.size() != 3) return std::nullopt;
     auto const first = readPoint(words[1], lastPoint());
     auto const second = first ? readPoint(words[2], *first) : std::nullopt;
@@ -44,7 +55,7 @@ Answered readCrossing(Words const& words) {
 Answered readFence(Words const& words) {
     if (words.size() == 1) {
         auto const fence = askFence();
-        if (!fence) return SelectionAnswer{SelectionAnswer::Kind::cancelled, EntityIds()};
+        if (!fence) return cancelled();
         return answerWith(entitiesAcross(*fence));
     }
     FencePoints fence;
@@ -81,23 +92,20 @@ Answered readRemove(Words const&) {
 struct WordRow {
     wchar_t const* words;  // the whole one, a blank, and the short one
     Answered (*read)(Words const& words);
-    std::size_t least;  // words on the line
-    std::size_t most;
-    std::wstring_view form;  // what follows the whole word, for who asks
+    std::size_t most;  // words on the line
 };
 
 constexpr std::size_t kAnyCount = std::wstring_view::npos;
-constexpr std::wstring_view kTwoPoints = L" X,Y X,Y";
 
 constexpr WordRow kWords[] = {
-    {forLocalText(L"window w"), readWindow, 3, 3, kTwoPoints},
-    {forLocalText(L"crossing c"), readCrossing, 3, 3, kTwoPoints},
-    {forLocalText(L"fence f"), readFence, 1, kAnyCount, {}},
-    {forLocalText(L"all all"), readAll, 1, 1, {}},
-    {forLocalText(L"last l"), readLast, 1, 1, {}},
-    {forLocalText(L"previous p"), readPrevious, 1, 1, {}},
-    {forLocalText(L"add a"), readAdd, 1, 1, {}},
-    {forLocalText(L"remove r"), readRemove, 1, 1, {}},
+    {forLocalText(L"window w"), readWindow, 3},
+    {forLocalText(L"crossing c"), readCrossing, 3},
+    {forLocalText(L"fence f"), readFence, kAnyCount},
+    {forLocalText(L"all all"), readAll, 1},
+    {forLocalText(L"last l"), readLast, 1},
+    {forLocalText(L"previous p"), readPrevious, 1},
+    {forLocalText(L"add a"), readAdd, 1},
+    {forLocalText(L"remove r"), readRemove, 1},
 };
 
 // The row of a word, whatever follows it.
@@ -122,8 +130,7 @@ WordRow const* rowMeant(Words const& words) {
     bool const isGlobal = word.starts_with(L'_');
     WordRow const* row = isGlobal ? nullptr : rowOf(word, localText);
     if (row == nullptr) row = rowOf(isGlobal ? word.substr(1) : word, asGlobal);
-    bool const fits = row != nullptr && words.size() >= row->least && words.size() <= row->most;
-    return fits ? row : nullptr;
+    return row != nullptr && words.size() <= row->most ? row : nullptr;
 }
 
 Answered readHandles(Words const& words) {
@@ -156,7 +163,6 @@ std::wstring selectionWords() {
     for (WordRow const& row : kWords) {
         if (!text.empty()) text += L", ";
         text += splitWords(localText(row.words)).front();
-        text += row.form;
     }
     return text;
 }

@@ -26,14 +26,14 @@ struct SelectionAnswer {
     EntityIds ids;
 };
 
-// Handles with blanks between them, each taken once; "w" or "c" with two points; "f" with more of
-// them, or alone, which asks for them; "all", "last", "previous", "add", "remove"; or one point,
-// which takes the newest entity whose box holds it. Words count without case, their first letters
-// and a leading "_" too. Points become the last point. Nothing for any other text, and for handles
-// of what is not in the active space.
+// Handles with blanks between them, each taken once; "w" or "c" with two points or "f" with more of
+// them, which are asked for when the word stands alone; "all", "last", "previous", "add", "remove";
+// or one point, which takes the newest entity whose box holds it. Words count without case, their
+// first letters and a leading "_" too. Points become the last point. Nothing for any other text,
+// and for handles of what is not in the active space.
 [[nodiscard]] std::optional<SelectionAnswer> readSelection(std::wstring_view text);
 
-// The words in the language of the session, as a user is told them: "window X,Y X,Y, ...".
+// The words in the language of the session, as a user is told them: "window, crossing, ...".
 [[nodiscard]] std::wstring selectionWords();
 
 }  // namespace tzhost

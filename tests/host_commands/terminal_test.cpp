@@ -254,8 +254,8 @@ constexpr CareCase kCare[] = {
      "attachment <5>: "},
     {"SelectionsAreCounted",
      "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
-     "1 removed, 0 total|window\r",
-     "nothing here. Type a point, #HANDLE, window X,Y X,Y, crossing X,Y X,Y, fence, all, last, "},
+     "1 removed, 0 total|what\r",
+     "nothing here. Type a point, #HANDLE, window, crossing, fence, all, last, "},
     {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |\r", "Loaded: /"},
     // The questions used to show nowhere.
     {"TranscriptInAFile", "$>seen.txt|Command: |CIRCLE\r", "Center point: "},

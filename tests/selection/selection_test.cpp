@@ -110,6 +110,9 @@ constexpr SelectionRow kSelections[] = {
     {"WindowAnyCorner", "_W 8,8 4,4\n\n", "5100 2"},
     {"WindowHoldsNotAll", "w -1,-1 6,6\n\n", "5100 1 4"},
     {"Crossing", "c 1,-1 6,6\n\n", "5100 1 2 4"},
+    {"CrossingByCorners", "_C\n1,-1\n~3,3\n6,6\n\n", "5100 1 2 4"},
+    {"WindowGivenUp", "w\n\nw\n9,9\n\n$1\n\n", "5100 1"},
+    {"WindowCancelled", "$1\nwindow\n0,0\n^C", "-5002 none"},
     {"CrossingBesideLine", "c 5,6 6,7\n$1\n\n", "5100 2 1"},
     {"CrossingMissesLine", "c 5.1,6 5.2,7\n$1\n\n", "5100 1"},
     // In the box around the turned text, but not in the text.
