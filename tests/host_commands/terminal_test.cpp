@@ -230,6 +230,8 @@ constexpr CareCase kCare[] = {
      "\"c\".\r\nBlock to insert"},
     {"AxesAgain", ": |UCS\r|: |3P\r|: |0,0\r|axis: |0,0\r|itself.\r\nPoint|1,0\r|Y axis: |2,0\r",
      "line.\r\nPoint"},
+    {"HelpFitsTheScreen", "$$(stty cols 60)|Command: |HELP\r|list: |\r",
+     "Copies what is selected from a base point\r\n                 to others; Enter ends.\r\n"},
     {"HelpAgain", ": |HELP\r|: |LINI\r|LINE.\r\nCommand, or|?\r", "UNLOAD  "},
     {"FilesAgain",
      ": |SAVE\r|: |/none/a\r|directory\r\nSave|d.json\r|: |OPEN\r|: |none\r|ory\r\nDrawing|\r|: |PLOT\r"

@@ -1,5 +1,7 @@
 #include <algorithm>
 #include <map>
+#include <sys/ioctl.h>
+#include <unistd.h>
 
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
@@ -7,6 +9,7 @@
 #include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/help_topics.h"
 #include "apps/tzdraft/program_texts.h"
+#include "host/command_line/command_line.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
 #include "tz/ed/print.h"
@@ -15,6 +18,30 @@ namespace tzdraft {
 namespace {
 
 constexpr std::size_t kNameWidth = 16;
+constexpr std::size_t kLeastRoom = 20;  // beside the names; where there is less, lines stay whole
+
+// Of a person's screen; 0 where nobody looks at one.
+std::size_t screenColumns() {
+    winsize size{};
+    bool const isSeen =
+        tzhost::commandLine().isPerson() && ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) == 0;
+    return isSeen ? size.ws_col : 0;
+}
+
+// Broken at blanks, so that it fits on the screen after `indent` columns.
+std::wstring fitted(std::wstring_view text, std::size_t indent) {
+    std::size_t const columns = screenColumns();
+    std::wstring shown;
+    if (columns >= indent + kLeastRoom) {
+        while (text.size() > columns - indent) {
+            std::size_t const blank = text.rfind(L' ', columns - indent);
+            if (blank == text.npos) break;
+            shown += std::wstring(text.substr(0, blank)) + L'\n' + std::wstring(indent, L' ');
+            text.remove_prefix(blank + 1);
+        }
+    }
+    return shown.append(text);
+}
 
 // By the name as it is shown: the local one, and the global one where that is another.
 void listCommands() {
@@ -29,7 +56,7 @@ void listCommands() {
     }
     for (auto const& [name, text] : helpByName) {
         std::wstring const blanks(width - name.size(), L' ');
-        tzutPrintf(L"\n%ls%ls %ls", name.c_str(), blanks.c_str(), text.c_str());
+        tzutPrintf(L"\n%ls%ls %ls", name.c_str(), blanks.c_str(), fitted(text, width + 1).c_str());
     }
     tzutPrintf(L"\n");
 }
