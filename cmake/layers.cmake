@@ -9,7 +9,7 @@
 # (and the smallest host the loader).
 #
 # Names of libraries: json (nlohmann-json), fastjson (RapidJSON), ini (SimpleIni), fontconfig,
-# pango (with GLib), cairo, cli (CLI11), editline (libedit).
+# pango (with GLib), cairo, boxes (Boost.Geometry), cli (CLI11), editline (libedit).
 
 tz_row(sdk)
 
@@ -59,7 +59,7 @@ tz_row(host/entities       USES sdk host/base host/text host/page host/settings 
 tz_row(host/drawing_file   USES sdk host/base host/text host/page host/files host/settings host/runtime host/shaping host/layout host/database host/fields host/entities LIBRARIES json)
 tz_row(host/display        USES sdk host/base host/text host/page host/files host/settings host/platform host/runtime host/shaping host/layout host/database LIBRARIES json pango cairo)
 tz_row(host/command_line   USES sdk host/base host/text host/page host/settings host/platform host/runtime host/shaping host/layout host/database host/display LIBRARIES json editline)
-tz_row(host/selection      USES sdk host/base host/text host/page host/settings host/platform host/runtime host/shaping host/layout host/database host/display host/command_line LIBRARIES json)
+tz_row(host/selection      USES sdk host/base host/text host/page host/settings host/platform host/runtime host/shaping host/layout host/database host/display host/command_line LIBRARIES json boxes)
 tz_row(host/editors        USES sdk host/base host/text host/files host/settings host/code_pages host/rtf host/platform host/runtime host/command_line LIBRARIES json)
 
 tz_row(apps/options        USES sdk host/text host/files host/resources LIBRARIES json cli)

@@ -116,7 +116,7 @@ TzDbObjectRecord& Drawing::addObject(TzDbObject* object,
     record.handle = handle;
     record.object = object;
     TzDbObjectAccess::imp(*object)->record = &record;
-    if (list) list->items.push_back(&record);
+    if (list) addToList(*owner, record);
     openNew(record);
     undoLog_.noteAppended(record);
     return record;

@@ -8,6 +8,7 @@
 #include <string>
 #include <unordered_map>
 
+#include "host/base/change_journal.h"
 #include "host/database/object_record.h"
 #include "host/database/undo_log.h"
 #include "host/page/page.h"
@@ -111,6 +112,8 @@ public:
     [[nodiscard]] long long serial() const { return serial_; }
 
     [[nodiscard]] UndoLog& undoLog() { return undoLog_; }
+    // What changed, taken back and done again included.
+    [[nodiscard]] ChangeJournal& changes() { return changes_; }
 
     // Takes a new object over and gives it an id: open for write, and last in the list of `owner`,
     // if that has one. When memory fails the object stays the caller's. A handle of 0 takes the
@@ -147,6 +150,7 @@ private:
     std::filesystem::path fileName_;
     long long serial_;
     UndoLog undoLog_;
+    ChangeJournal changes_;
 };
 
 // The drawing that operations without a database work on; null for none. Not owned. Its globals are

@@ -20,6 +20,7 @@ TzDbObject::~TzDbObject() {
     if (imp_ && imp_->record && imp_->record->object == this) {
         imp_->record->object = nullptr;
         imp_->record->erased = true;
+        imp_->record->drawing->changes().note(*imp_->record, tzhost::ChangeJournal::Kind::values);
     }
     delete imp_;
 }

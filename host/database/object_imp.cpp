@@ -35,6 +35,7 @@ void beginHostChange(TzDbObject& object) {
     if (imp->embedder) return beginHostChange(*imp->embedder);
     if (!imp->record) return;
     imp->record->drawing->undoLog().noteChange(*imp->record);
+    imp->record->drawing->changes().note(*imp->record, ChangeJournal::Kind::values);
     imp->record->changed = true;
 }
 

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 
+#include "host/database/drawing.h"
 #include "host/database/symbol_imp.h"
 
 namespace tzhost {
@@ -25,12 +26,16 @@ ObjectList* listOf(TzDbObjectRecord const& owner) {
 }
 
 void addToList(TzDbObjectRecord& owner, TzDbObjectRecord& item) {
-    if (ObjectList* const list = listOf(owner)) list->items.push_back(&item);
+    ObjectList* const list = listOf(owner);
+    if (!list) return;
+    list->items.push_back(&item);
+    item.drawing->changes().note(item, ChangeJournal::Kind::listed);
 }
 
 void removeFromList(TzDbObjectRecord& owner, TzDbObjectRecord& item) noexcept {
     ObjectList* const list = listOf(owner);
     if (!list) return;
+    item.drawing->changes().note(item, ChangeJournal::Kind::unlisted);
     auto const at = std::find(list->items.rbegin(), list->items.rend(), &item);
     if (at != list->items.rend()) list->items.erase(std::next(at).base());
 }

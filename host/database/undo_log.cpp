@@ -112,6 +112,7 @@ void UndoLog::noteAppended(TzDbObjectRecord& record) noexcept {
 
 void UndoLog::exchange(Entry& entry) {
     TzDbObjectRecord& record = *entry.record;
+    record.drawing->changes().note(record, ChangeJournal::Kind::values);
     std::swap(record.erased, entry.erased);
     if (record.object->isKindOf(TzDbSymbolTableRecord::desc())) noteNamesChanged();
     if (entry.values) {

@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "host/base/job.h"
+#include "host/database/geometry.h"
 #include "host/database/user_system.h"
 #include "host/display/draw_pass.h"
 #include "host/display/shown.h"
@@ -120,8 +121,11 @@ Outline Outline::of(TzDbEntity& entity, TzGeMatrix3d const& placed) {
     auto const add = [&](Corners const& corners, Inside inside) {
         Path path;
         path.inside = inside;
-        for (TzGePoint3d const& each : corners)
-            path.points.push_back((toUser * each).convert2d());
+        for (TzGePoint3d const& each : corners) {
+            TzGePoint3d const user = toUser * each;
+            if (!isFinite(user)) return;
+            path.points.push_back(user.convert2d());
+        }
         if (!path.points.empty()) outline.paths_.push_back(std::move(path));
     };
     if (auto const* const text = dynamic_cast<TzDbMText const*>(&entity)) {
@@ -142,8 +146,8 @@ Outline Outline::of(TzDbEntity& entity, TzGeMatrix3d const& placed) {
     return outline;
 }
 
-bool Outline::boxHolds(TzGePoint2d const& point) const {
-    if (paths_.empty()) return false;
+std::optional<FlatBox> Outline::box() const {
+    if (paths_.empty()) return std::nullopt;
     TzGePoint2d const first = paths_.front().points.front();
     FlatBox box{first, first};
     for (Path const& path : paths_) {
@@ -152,7 +156,12 @@ bool Outline::boxHolds(TzGePoint2d const& point) const {
             box.high = {std::max(box.high.x, each.x), std::max(box.high.y, each.y)};
         }
     }
-    return box.holds(point);
+    return box;
+}
+
+bool Outline::boxHolds(TzGePoint2d const& point) const {
+    auto const around = box();
+    return around && around->holds(point);
 }
 
 bool Outline::isWithin(FlatBox const& box) const {

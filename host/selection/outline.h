@@ -1,5 +1,6 @@
 #pragma once
 
+#include <optional>
 #include <vector>
 
 #include "tz/db/object_id.h"
@@ -9,7 +10,8 @@
 class TzDbEntity;
 
 // Where an entity lies in the user system, for picks, windows and crossings: its lines, and the
-// boxes of its texts as they are turned. What cannot be seen lies nowhere. Nothing is opened.
+// boxes of its texts as they are turned. What cannot be seen lies nowhere, nor does what goes
+// beyond doubles. Nothing is opened.
 //
 //   Outline const outline = Outline::of(*entity);
 //   if (outline.boxHolds(pick)) ...
@@ -31,7 +33,9 @@ public:
     [[nodiscard]] static Outline of(TzDbEntity& entity,
                                     TzGeMatrix3d const& placed = TzGeMatrix3d::kIdentity);
 
-    // Whether the point lies in the box around all of it; on the edge counts.
+    // The box around all of it; nothing for what lies nowhere.
+    [[nodiscard]] std::optional<FlatBox> box() const;
+    // Whether the point lies in that box; on the edge counts.
     [[nodiscard]] bool boxHolds(TzGePoint2d const& point) const;
     // Whether all of it lies in the box.
     [[nodiscard]] bool isWithin(FlatBox const& box) const;

@@ -1,7 +1,9 @@
 #include "host/selection/pick.h"
 
 #include <algorithm>
+#include <cstddef>
 #include <cstdint>
+#include <iterator>
 #include <string>
 
 #include "host/database/drawing.h"
@@ -9,6 +11,7 @@
 #include "host/database/open_state.h"
 #include "host/database/user_system.h"
 #include "host/display/record_access.h"
+#include "host/selection/box_index.h"
 #include "host/selection/outline.h"
 #include "host/text/utf8.h"
 #include "tz/db/shapes.h"
@@ -20,28 +23,28 @@ namespace {
 constexpr wchar_t kHandleMark = L'#';
 constexpr wchar_t kInside = L'/';
 constexpr int kDeepest = 64;
-constexpr int kMostLooks = 100'000;
-
-using Records = std::vector<TzDbObjectRecord*>;
-
-Records const* itemsOf(TzDbObjectId owner) {
-    ObjectList const* const list = owner.isNull() ? nullptr : listOf(*owner.record());
-    return list ? &list->items : nullptr;
-}
+constexpr std::ptrdiff_t kMostLooks = 1'000'000;
 
 // What stands inside a block reference: its attributes, which have the reference's own coordinates,
 // and the entities of its block.
 struct Inside {
-    Records const* items;
+    TzDbObjectRecord const* owner;  // that lists them; null for none
     TzGeMatrix3d placed;
+
+    [[nodiscard]] ObjectList const* list() const { return owner ? listOf(*owner) : nullptr; }
+    [[nodiscard]] std::ptrdiff_t size() const { return list() ? std::ssize(list()->items) : 0; }
+    // The items whose boxes may hold the point.
+    [[nodiscard]] ItemsAtPoint at(TzGePoint3d const& user) const {
+        return itemsAt(owner, placed, user.convert2d());
+    }
 };
 
 std::vector<Inside> insidesOf(Picked const& reference) {
     auto const* const insert = objectOf<TzDbBlockReference>(reference.id);
     if (insert == nullptr) return {};
     return {
-        {itemsOf(reference.id), reference.placed},
-        {itemsOf(insert->blockTableRecord()), reference.placed * insert->blockTransform()},
+        {reference.id.record(), reference.placed},
+        {insert->blockTableRecord().record(), reference.placed * insert->blockTransform()},
     };
 }
 
@@ -58,17 +61,18 @@ bool boxHolds(TzDbObjectRecord* record, TzGeMatrix3d const& placed, TzGePoint3d 
     return entity != nullptr && Outline::of(*entity, placed).boxHolds(user.convert2d());
 }
 
-// Blocks within blocks can stand for more than one can look at: `looks` says at how many entities
-// of blocks within the first one the search may look yet.
+// Blocks within blocks can stand for more than one can look at: `looks` says how many entities the
+// blocks within the first one may have that the search looks into yet. All of a block count, also
+// when an index leaves most of them out, so that no pick depends on whether there is one.
 std::optional<Picked>
-pickInside(Picked const& outer, TzGePoint3d const& user, int depth, int& looks) {
+pickInside(Picked const& outer, TzGePoint3d const& user, int depth, std::ptrdiff_t& looks) {
     if (objectOf<TzDbBlockReference>(outer.id) == nullptr) return outer;
     if (depth == kDeepest) return std::nullopt;
     for (Inside const& inside : insidesOf(outer)) {
-        if (inside.items == nullptr) continue;
-        for (auto at = inside.items->rbegin(); at != inside.items->rend(); ++at) {
-            if (depth > 0 && --looks < 0) return std::nullopt;
-            if (!boxHolds(*at, inside.placed, user)) continue;
+        if (depth > 0 && (looks -= inside.size()) < 0) return std::nullopt;
+        auto const [items, holdIt] = inside.at(user);
+        for (auto at = items.rbegin(); at != items.rend(); ++at) {
+            if (!holdIt && !boxHolds(*at, inside.placed, user)) continue;
             auto const found = pickInside(stepInto(outer, inside, *at), user, depth + 1, looks);
             if (found) return found;
         }
@@ -78,12 +82,13 @@ pickInside(Picked const& outer, TzGePoint3d const& user, int depth, int& looks) 
 
 std::optional<Picked> findInside(Picked const& outer, std::uint64_t handle) {
     for (Inside const& inside : insidesOf(outer)) {
-        if (inside.items == nullptr) continue;
+        ObjectList const* const list = inside.list();
+        if (list == nullptr) continue;
         auto const at =
-            std::find_if(inside.items->begin(), inside.items->end(), [handle](auto const* record) {
+            std::find_if(list->items.begin(), list->items.end(), [handle](auto const* record) {
                 return record->handle == handle && !record->erased;
             });
-        if (at != inside.items->end()) return stepInto(outer, inside, *at);
+        if (at != list->items.end()) return stepInto(outer, inside, *at);
     }
     return std::nullopt;
 }
@@ -92,13 +97,14 @@ std::optional<Picked> findInside(Picked const& outer, std::uint64_t handle) {
 
 std::optional<Picked> pickAt(TzGePoint3d const& user, Depth depth) {
     Drawing const* const drawing = workingDrawing();
-    Records const* const items = drawing ? itemsOf(drawing->activeSpace()) : nullptr;
-    if (items == nullptr) return std::nullopt;
-    for (auto at = items->rbegin(); at != items->rend(); ++at) {
-        if (!boxHolds(*at, TzGeMatrix3d::kIdentity, user)) continue;
+    if (drawing == nullptr) return std::nullopt;
+    Inside const space{drawing->activeSpace().record(), TzGeMatrix3d::kIdentity};
+    auto const [items, holdIt] = space.at(user);
+    for (auto at = items.rbegin(); at != items.rend(); ++at) {
+        if (!holdIt && !boxHolds(*at, TzGeMatrix3d::kIdentity, user)) continue;
         Picked const top{TzDbObjectId(*at), TzDbObjectId(*at), {}, {}};
         if (depth == Depth::top) return top;
-        int looks = kMostLooks;
+        std::ptrdiff_t looks = kMostLooks;
         if (auto const found = pickInside(top, user, 0, looks)) return found;
     }
     return std::nullopt;

@@ -7,7 +7,7 @@ import tree
 
 INCLUDE = re.compile(r'^\s*#\s*include\s*([<"])([^>"]+)[>"]')
 LIBRARIES = [
-    ("nlohmann/", "json"), ("rapidjson/", "fastjson"), ("SimpleIni", "ini"), ("fontconfig/", "fontconfig"), ("pango/", "pango"),
+    ("nlohmann/", "json"), ("rapidjson/", "fastjson"), ("boost/", "boxes"), ("SimpleIni", "ini"), ("fontconfig/", "fontconfig"), ("pango/", "pango"),
     ("glib", "pango"), ("cairo", "cairo"), ("CLI/", "cli"), ("histedit", "editline"),
     ("editline/", "editline"), ("gtest/", "tests"), ("gmock/", "tests"), ("benchmark/", "tests"),
 ]
