@@ -39,16 +39,6 @@ mode_t newPermissions() {
     return 0666 & ~mask;
 }
 
-// Flushes the folder, so that the renaming survives a crash. Where folders cannot be flushed the
-// system does it in its own time.
-void flushFolder(std::filesystem::path const& folder) {
-    int const handle =
-        open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
-    if (handle < 0) return;
-    (void)fsync(handle);
-    (void)close(handle);
-}
-
 // A descriptor for the file when the program's own output goes there ("/dev/stdout"), else -1. Such
 // a file must not be replaced, since others write to it too.
 int ownOutput(std::filesystem::path const& target) {
@@ -79,6 +69,14 @@ std::filesystem::path followLinks(std::filesystem::path const& path) {
         file = file.parent_path() / fs::read_symlink(file, error);
     }
     return file;
+}
+
+void flushFolder(std::filesystem::path const& folder) {
+    int const handle =
+        open(folder.empty() ? "." : folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    if (handle < 0) return;
+    (void)fsync(handle);
+    (void)close(handle);
 }
 
 SafeFile::SafeFile(std::filesystem::path const& target, IfReadOnly ifReadOnly)
@@ -150,17 +148,23 @@ bool SafeFile::write(std::string_view bytes) {
 }
 
 bool SafeFile::commit() {
-    if (problem_ != 0) return false;
-    if (!part_.empty()) return takePlace();
-    return close(std::exchange(file_, -1)) == 0 || fail();
+    bool const isPart = !part_.empty();
+    if (!flush() || !takePlace()) return false;
+    if (isPart) flushFolder(folder());
+    return true;
+}
+
+bool SafeFile::flush() {
+    return problem_ == 0 && (part_.empty() || fsync(file_) == 0 || fail());
 }
 
 bool SafeFile::takePlace() {
-    if (fsync(file_) != 0 || rename(part_.c_str(), target_.c_str()) != 0) return fail();
+    if (problem_ != 0) return false;
+    bool const isPart = !part_.empty();
+    if (isPart && rename(part_.c_str(), target_.c_str()) != 0) return fail();
     part_.clear();
-    (void)close(std::exchange(file_, -1));  // it was flushed, so that nothing is left to fail
-    flushFolder(target_.parent_path());
-    return true;
+    bool const isClosed = close(std::exchange(file_, -1)) == 0;
+    return isClosed || isPart || fail();  // a part was flushed, so that nothing is left to fail
 }
 
 }  // namespace tzhost

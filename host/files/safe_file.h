@@ -13,6 +13,10 @@ namespace tzhost {
 // path, such as a pipe.
 [[nodiscard]] std::filesystem::path followLinks(std::filesystem::path const& path);
 
+// Flushes a folder, so that renamings in it survive a crash. Where folders cannot be flushed the
+// system does it in its own time. An empty path is the working folder.
+void flushFolder(std::filesystem::path const& folder);
+
 // What becomes of a file that may not be written to.
 enum class IfReadOnly { refuse, replace };
 
@@ -39,6 +43,12 @@ public:
     [[nodiscard]] bool isOpen() const { return file_ >= 0; }
     [[nodiscard]] bool write(std::string_view bytes);
     [[nodiscard]] bool commit();
+    // The steps of commit, for files that take their places together (safe_files.h): the flush,
+    // which another way to the disk may stand for; the renaming; then flushFolder.
+    [[nodiscard]] bool flush();
+    [[nodiscard]] bool takePlace();
+    [[nodiscard]] int descriptor() const { return file_; }
+    [[nodiscard]] std::filesystem::path folder() const { return target_.parent_path(); }
     // The system's number of what went wrong first, 0 for nothing, and its words.
     [[nodiscard]] int problem() const { return problem_; }
     [[nodiscard]] std::string reason() const;
@@ -46,8 +56,6 @@ public:
 private:
     // Makes the unfinished file; `old` is the file that it will replace, null for none.
     void makePart(struct stat const* old);
-    // Flushes the unfinished file and renames it over the target.
-    [[nodiscard]] bool takePlace();
     [[nodiscard]] bool fail();  // with errno
     [[nodiscard]] bool fail(int problem);
 

@@ -2,10 +2,12 @@
 
 #include <gtest/gtest.h>
 
+#include <csignal>
 #include <cstddef>
 #include <cstdlib>
 #include <filesystem>
 #include <string>
+#include <vector>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -15,6 +17,7 @@
 #include "host/files/file_kind.h"
 #include "host/files/install_paths.h"
 #include "host/files/safe_file.h"
+#include "host/files/safe_files.h"
 
 namespace {
 
@@ -148,6 +151,32 @@ TEST_F(FileBytes, JoinTheProgramsOwnOutput) {
     ::close(terminal);
     EXPECT_TRUE(isWritten && isGoingOn);
     EXPECT_EQ(tzhost::readFile(path("log")), "before new behind");
+}
+
+volatile std::sig_atomic_t ended = 0;
+
+// Together they take their places, each that can; a signal that ends the program waits for them.
+TEST_F(FileBytes, TakeTheirPlacesTogether) {
+    auto const before = std::signal(SIGTERM, [](int) { ended = 1; });
+    ASSERT_TRUE(tzhost::writeFileSafely(path("old"), "old"));
+    {
+        tzhost::SafeFiles files;
+        EXPECT_EQ(files.add(path("none") + "/x", "x"), "No such file or directory");
+        EXPECT_EQ(files.add(path("old"), "new"), "");
+        EXPECT_EQ(files.add(path("taken"), "x"), "");
+        EXPECT_EQ(files.add(path("made"), "made"), "");
+        fs::create_directories(path("taken") + "/below");
+        std::raise(SIGTERM);
+        EXPECT_EQ(tzhost::readFile(path("old")), "old");
+        EXPECT_EQ(ended, 0);
+        EXPECT_EQ(files.takePlaces(), (std::vector<std::string>{"", "Is a directory", ""}));
+        EXPECT_EQ(ended, 1);
+        EXPECT_EQ(files.add(path("made"), "given up"), "");
+    }
+    EXPECT_EQ(tzhost::readFile(path("old")), "new");
+    EXPECT_EQ(tzhost::readFile(path("made")), "made");
+    EXPECT_EQ(filesThere(), 3);
+    std::signal(SIGTERM, before);
 }
 
 TEST(InstallPaths, LeadToTheLibraries) {
