@@ -6,6 +6,8 @@
 #include <stdexcept>
 #include <utility>
 
+#include <sys/stat.h>
+
 #include "apps/tzconvert/conversion.h"
 #include "apps/tzconvert/inputs.h"
 #include "apps/tzconvert/machine.h"
@@ -13,6 +15,7 @@
 #include "apps/tzconvert/places.h"
 #include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/report.h"
+#include "apps/tzconvert/results.h"
 #include "apps/tzconvert/streams.h"
 #include "apps/tzconvert/warnings.h"
 #include "host/text/system_words.h"
@@ -40,12 +43,22 @@ public:
     void summarise() const;
 
 private:
+    // A result that waits to take its place.
+    struct Waiting {
+        std::string target;
+        FileReport report;
+    };
+
+    [[nodiscard]] int convertNext(Input const& input);
     [[nodiscard]] Failure convertFile(Input const& input, Warnings& warnings);
     [[nodiscard]] Failure convertUnguarded(Input const& input, Warnings& warnings);
+    [[nodiscard]] int settle();
     [[nodiscard]] Failure convertText(std::string const& file,
                                       std::string const& target,
                                       Converted& converted,
                                       Warnings& warnings);
+    [[nodiscard]] Failure
+    normalise(std::string const& file, std::string const& target, Warnings& warnings);
     [[nodiscard]] Failure makeFolderOf(std::string const& target) const;
     void tellWarnings(std::string const& file, Warnings const& warnings);
 
@@ -53,19 +66,51 @@ private:
     std::vector<Input> const& inputs_;
     Places places_;
     FontTables fonts_;
-    std::vector<FileReport> reports_;
-    int warned_ = 0;  // files
+    Results results_;
+    std::vector<Waiting> waiting_;
+    std::vector<FileReport> reports_;  // of results that have their places
+    int warned_ = 0;                   // files
 };
+
+// Whether a file is read and converted in less time than a person waits for Ctrl-C.
+bool isQuick(std::string const& file) {
+    constexpr off_t kMost = 1 << 20;
+    struct stat status {};
+    return stat(file.c_str(), &status) == 0 && S_ISREG(status.st_mode) && status.st_size <= kMost;
+}
 
 int Batch::convertAll() {
     int status = kDone;
-    for (Input const& input : inputs_) {
-        Warnings warnings;
-        status = std::max(status, told(convertFile(input, warnings)));
-        tellWarnings(input.file, warnings);
-    }
+    for (Input const& input : inputs_)
+        status = std::max(status, convertNext(input));
+    status = std::max(status, settle());
     bool const isError = warned_ > 0 && options_.warningsAreErrors;
     return std::max(status, isError ? kWarned : kDone);
+}
+
+// Results wait for others only as long as these come at once.
+int Batch::convertNext(Input const& input) {
+    int status = results_.areDue() || !isQuick(input.file) ? settle() : kDone;
+    Warnings warnings;
+    status = std::max(status, told(convertFile(input, warnings)));
+    tellWarnings(input.file, warnings);
+    return status;
+}
+
+int Batch::settle() {
+    int status = kDone;
+    std::vector<Waiting> waiting;
+    waiting.swap(waiting_);
+    std::size_t at = 0;
+    for (Failure const& failure : results_.settle()) {
+        Waiting& result = waiting[at++];
+        if (failure)
+            places_.dropTarget(result.target);
+        else
+            reports_.push_back(std::move(result.report));
+        status = std::max(status, told(failure));
+    }
+    return status;
 }
 
 void Batch::tellWarnings(std::string const& file, Warnings const& warnings) {
@@ -98,13 +143,20 @@ Failure Batch::convertUnguarded(Input const& input, Warnings& warnings) {
     std::string const target = targetOf(options_, input);
     if (Failure failure = places_.checkTarget(input.file, target)) return failure;
     if (Failure failure = makeFolderOf(target)) return failure;
+    Waiting result{target, {input.file, {}}};
+    waiting_.reserve(waiting_.size() + 1);  // nothing fails between the writing and the list
     Converted converted;
     Failure const failure = options_.direction == Direction::normalise
-                                ? normaliseFile(input.file, target, warnings)
+                                ? normalise(input.file, target, warnings)
                                 : convertText(input.file, target, converted, warnings);
     if (failure) return failure;
+    result.report.found = converted.found;
+    if (target.empty()) {
+        reports_.push_back(std::move(result.report));
+        return {};
+    }
+    waiting_.push_back(std::move(result));
     places_.keepTarget(target);
-    reports_.push_back({input.file, converted.found});
     return {};
 }
 
@@ -114,8 +166,7 @@ Failure Batch::makeFolderOf(std::string const& target) const {
     std::error_code problem;
     std::filesystem::create_directories(std::filesystem::path(target).parent_path(), problem);
     if (!problem) return {};
-    return target + ": " + localText("cannot be written") + ": " +
-           tzhost::systemWords(problem.value());
+    return notWritten(target, tzhost::systemWords(problem.value()));
 }
 
 Failure Batch::convertText(std::string const& file,
@@ -132,7 +183,13 @@ Failure Batch::convertText(std::string const& file,
     // What the normaliser writes is the converter's own, and so is what a round trip reads.
     if (options_.direction == Direction::toMtext && !options_.normalises)
         addLosses(warnings, converted.losses);
-    return writeText(target, converted.text);
+    return results_.write(target, std::wstring_view(converted.text));
+}
+
+Failure Batch::normalise(std::string const& file, std::string const& target, Warnings& warnings) {
+    std::string document;
+    if (Failure failure = readNormalised(file, document, warnings)) return failure;
+    return results_.write(target, std::string_view(document));
 }
 
 Failure Batch::writeReport() const {

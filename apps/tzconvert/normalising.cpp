@@ -24,7 +24,9 @@ void addWhatIsLeftOut(Warnings& warnings, tzhost::NormalisedRtf const& rtf) {
     if (!counts.empty()) warnings.push_back(localText("left out: ") + counts);
 }
 
-Failure normalise(std::string const& file, std::string& document, Warnings& warnings) {
+}  // namespace
+
+Failure readNormalised(std::string const& file, std::string& document, Warnings& warnings) {
     tzhost::NormalisedRtf rtf;
     {
         std::string bytes;
@@ -37,20 +39,12 @@ Failure normalise(std::string const& file, std::string& document, Warnings& warn
     return {};
 }
 
-}  // namespace
-
 Failure readNormalised(std::string const& file, std::wstring& text, Warnings& warnings) {
     std::string document;
-    if (Failure failure = normalise(file, document, warnings)) return failure;
+    if (Failure failure = readNormalised(file, document, warnings)) return failure;
     text.reserve(document.size());
     (void)decodeText(document, text);  // it is UTF-8 without zeros
     return {};
-}
-
-Failure normaliseFile(std::string const& file, std::string const& target, Warnings& warnings) {
-    std::string document;
-    if (Failure failure = normalise(file, document, warnings)) return failure;
-    return writeBytes(target, document);
 }
 
 }  // namespace tzconvert

@@ -7,11 +7,11 @@
 
 namespace tzconvert {
 
-// Takes a whole file of any RTF as the RTF that the converter reads, or writes that to `target`,
-// which is standard output when it is empty. What is left out is a warning.
+// Takes a whole file of any RTF as the RTF that the converter reads. What is left out is a warning.
 [[nodiscard]] Failure
 readNormalised(std::string const& file, std::wstring& text, Warnings& warnings);
+// The same in UTF-8.
 [[nodiscard]] Failure
-normaliseFile(std::string const& file, std::string const& target, Warnings& warnings);
+readNormalised(std::string const& file, std::string& document, Warnings& warnings);
 
 }  // namespace tzconvert

@@ -1,6 +1,7 @@
 #include "apps/tzconvert/places.h"
 
 #include <algorithm>
+#include <filesystem>
 
 #include "apps/tzconvert/program_texts.h"
 #include "host/files/safe_file.h"
@@ -21,12 +22,28 @@ Places::Places(Options const& options, std::vector<Input> const& inputs)
     if (!options.fontMap.empty()) inputs_.insert(placeOf(options.fontMap));
 }
 
+// Empty for a folder that is not there or cannot be looked at.
+std::string const& Places::realFolder(std::string const& folder) const {
+    if (auto const at = folders_.find(folder); at != folders_.end()) return at->second;
+    std::error_code unreadable;
+    fs::path const real = fs::canonical(folder.empty() ? "." : folder, unreadable);
+    static std::string const kNone;  // a batch may make the folder yet
+    return unreadable ? kNone : folders_.emplace(folder, real.string()).first->second;
+}
+
 // The file itself, links followed, from the root even when it is not there.
-Places::Place Places::placeOf(std::string const& file) {
+Places::Place Places::placeOf(std::string const& file) const {
     std::error_code unreadable;  // will be named when it is read
-    Place const named = fs::absolute(file, unreadable);
-    Place const real = fs::weakly_canonical(tzhost::followLinks(named), unreadable);
-    return unreadable ? named : real;
+    fs::path const path(file);
+    std::string const name = path.filename().string();
+    bool const isPlain = !name.empty() && name != "." && name != "..";
+    if (isPlain && !fs::is_symlink(path, unreadable)) {
+        std::string const& folder = realFolder(path.parent_path().string());
+        if (!folder.empty()) return (fs::path(folder) / name).string();
+    }
+    fs::path const named = fs::absolute(path, unreadable);
+    fs::path const real = fs::weakly_canonical(tzhost::followLinks(named), unreadable);
+    return unreadable ? named.string() : real.string();
 }
 
 Failure Places::checkReport() const {
@@ -54,6 +71,10 @@ Failure Places::checkTarget(std::string const& file, std::string const& target) 
 
 void Places::keepTarget(std::string const& target) {
     if (!target.empty()) targets_.insert(placeOf(target));
+}
+
+void Places::dropTarget(std::string const& target) {
+    targets_.erase(placeOf(target));
 }
 
 }  // namespace tzconvert

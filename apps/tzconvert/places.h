@@ -2,9 +2,9 @@
 
 // Where results go, and what they may not take the place of.
 
-#include <filesystem>
-#include <set>
 #include <string>
+#include <unordered_map>
+#include <unordered_set>
 
 #include "apps/tzconvert/inputs.h"
 #include "apps/tzconvert/options.h"
@@ -25,17 +25,20 @@ public:
 
     [[nodiscard]] Failure checkReport() const;
     [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) const;
-    // A result that was not made keeps no place.
+    // A result that is not made keeps no place.
     void keepTarget(std::string const& target);
+    void dropTarget(std::string const& target);
 
 private:
-    using Place = std::filesystem::path;
-    [[nodiscard]] static Place placeOf(std::string const& file);
+    using Place = std::string;  // the real path
+    [[nodiscard]] Place placeOf(std::string const& file) const;
+    [[nodiscard]] std::string const& realFolder(std::string const& folder) const;
 
     Options const& options_;
     std::vector<Input> const& files_;
-    std::set<Place> inputs_;
-    std::set<Place> targets_;  // the results that were written
+    std::unordered_set<Place> inputs_;
+    std::unordered_set<Place> targets_;                             // the results that were written
+    mutable std::unordered_map<std::string, std::string> folders_;  // real ones, looked up once
 };
 
 }  // namespace tzconvert

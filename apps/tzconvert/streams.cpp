@@ -87,13 +87,8 @@ Failure readBytes(std::string const& file, std::string& bytes) {
     return readFile(takeAll, file, bytes);
 }
 
-Failure writeText(std::string const& file, std::wstring_view text) {
+Failure writeText(std::wstring_view text) {
     std::string bytes;
-    if (!file.empty()) {
-        bytes.reserve(text.size());
-        encodeText(text, bytes);
-        return writeBytes(file, bytes);
-    }
     bytes.reserve(kPiece * 4);
     while (!text.empty()) {
         bytes.clear();
@@ -107,7 +102,11 @@ Failure writeText(std::string const& file, std::wstring_view text) {
 Failure writeBytes(std::string const& file, std::string_view bytes) {
     if (file.empty()) return writeStandardOutput(bytes);
     if (tzhost::writeFileSafely(file, bytes)) return {};
-    return file + ": " + localText("cannot be written") + ": " + tzhost::systemReason();
+    return notWritten(file, tzhost::systemReason());
+}
+
+Failure notWritten(std::string const& file, std::string const& reason) {
+    return file + ": " + localText("cannot be written") + ": " + reason;
 }
 
 }  // namespace tzconvert

@@ -25,10 +25,13 @@ void tell(std::string const& line);
 // The same with any bytes, which may have zeros among them.
 [[nodiscard]] Failure readBytes(std::string const& file, std::string& bytes);
 
-// Writes all of a text as UTF-8, to standard output for an empty name. A file is the old or the new
-// one, whatever happens.
-[[nodiscard]] Failure writeText(std::string const& file, std::wstring_view text);
-// The same with bytes.
+// Writes all of a text as UTF-8 to standard output.
+[[nodiscard]] Failure writeText(std::wstring_view text);
+// Writes bytes, to standard output for an empty name. A file is the old or the new one, whatever
+// happens.
 [[nodiscard]] Failure writeBytes(std::string const& file, std::string_view bytes);
+
+// That a file is as it was before, and why.
+[[nodiscard]] Failure notWritten(std::string const& file, std::string const& reason);
 
 }  // namespace tzconvert
