@@ -13,6 +13,7 @@ import shutil
 import statistics
 import sys
 import tempfile
+import time
 
 from ratios import line_of
 
@@ -92,6 +93,62 @@ def measure_depth(report, convert, file):
         report.line(f"bytes for a level of groups, {way}", (peaks[1] - peaks[0]) / MILLION, 128)
 
 
+SMALL_FILES = 2000
+NOTE = r"{\fArial|b0|i0|c0|p34;Note %d}\P{\H1.5x;\Lunderlined\l} and {\C1;red}\Pa second line of it"
+
+
+def write_renamed(contents, folder, is_flushed):
+    """Seconds to write each file beside its place and rename it; one that is flushed as well is the old
+    or the new one after a crash."""
+    handle = os.open(folder, os.O_RDONLY)
+    begin = time.monotonic()
+    for number, content in enumerate(contents):
+        part = os.path.join(folder, f".part{number}")
+        with open(part, "wb", buffering=0) as out:
+            out.write(content)
+            if is_flushed:
+                os.fsync(out.fileno())
+        os.rename(part, os.path.join(folder, str(number)))
+        if is_flushed:
+            os.fsync(handle)
+    seconds = time.monotonic() - begin
+    os.close(handle)
+    return seconds
+
+
+def emptied(folder):
+    shutil.rmtree(folder, ignore_errors=True)
+    os.mkdir(folder)
+    os.sync()  # no earlier work is waited for
+    return folder
+
+
+def measure_batch(report, convert, folder, rounds):
+    """Time on the clock of a batch of small files, beside writing its results and no more."""
+    notes, results = (emptied(os.path.join(folder, name)) for name in ("notes", "results"))
+    files = [os.path.join(notes, f"{number}.txt") for number in range(SMALL_FILES)]
+    for number, file in enumerate(files):
+        with open(file, "w", encoding="ascii") as out:
+            out.write(NOTE % number)
+    times = {"batch": [], "written": [], "flushed": []}
+    for _ in range(rounds):
+        emptied(results)
+        begin = time.monotonic()
+        run([convert, "to-rtf", "-q", "--output-dir", results] + files)
+        times["batch"].append(time.monotonic() - begin)
+        contents = []
+        for name in os.listdir(results):
+            with open(os.path.join(results, name), "rb") as made:
+                contents.append(made.read())
+        for name in ("written", "flushed"):
+            times[name].append(write_renamed(contents, emptied(results), name == "flushed"))
+    medians = {name: statistics.median(each) for name, each in times.items()}
+    print(f"         {SMALL_FILES} small files: {medians['batch']:.2f} s, written and renamed "
+          f"{medians['written']:.2f} s, each flushed as well {medians['flushed']:.2f} s")
+    report.line(f"{SMALL_FILES} small files over writing and renaming them",
+                medians["batch"] / medians["written"], 3)
+
+
 def measure_letters(report, convert, file):
     with open(file, "w", encoding="ascii") as out:
         for _ in range(100):
@@ -116,6 +173,7 @@ def main():
         with open(file, "w", encoding="ascii") as out:
             out.write(document(10 * MILLION))
         compare_speed(report, convert, os.path.join(build, "tests", "bare_pass"), file, rounds)
+        measure_batch(report, convert, folder, rounds)
         measure_depth(report, convert, file)
         measure_letters(report, convert, file)
     return 1 if report.over else 0
