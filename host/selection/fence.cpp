@@ -1,9 +1,10 @@
 #include "host/selection/fence.h"
 
-#include "host/base/job.h"
+#include <algorithm>
+
 #include "host/command_line/point_input.h"
 #include "host/database/user_system.h"
-#include "host/selection/outline.h"
+#include "host/selection/entities_where.h"
 #include "host/selection/rubber_line.h"
 #include "host/text/local_text.h"
 #include "tz/ed/jig.h"
@@ -61,16 +62,15 @@ int askPoint(FencePoints& fence) {
 }  // namespace
 
 EntityIds entitiesAcross(FencePoints const& fence) {
-    EntityIds found;
-    if (fence.size() < 2) return found;
-    Job const job(localText(L"Selecting"));
+    if (fence.size() < 2) return EntityIds();
     std::vector<TzGePoint2d> line;
-    for (TzGePoint3d const& point : fence)
+    FlatBox around{fence.front().convert2d(), fence.front().convert2d()};
+    for (TzGePoint3d const& point : fence) {
         line.push_back(point.convert2d());
-    for (TzDbObjectId const id : entitiesOfActiveSpace()) {
-        if (Outline::of(*entityOf(id)).meets(line)) found.append(id);
+        around.low = {std::min(around.low.x, point.x), std::min(around.low.y, point.y)};
+        around.high = {std::max(around.high.x, point.x), std::max(around.high.y, point.y)};
     }
-    return found;
+    return entitiesWhere(around, [&](Outline const& outline) { return outline.meets(line); });
 }
 
 std::optional<FencePoints> askFence() {

@@ -5,12 +5,10 @@
 #include <string>
 #include <vector>
 
-#include "host/base/job.h"
 #include "host/command_line/point_input.h"
-#include "host/database/drawing.h"
 #include "host/runtime/words.h"
-#include "host/selection/box_index.h"
 #include "host/selection/corners.h"
+#include "host/selection/entities_where.h"
 #include "host/selection/fence.h"
 #include "host/selection/pick.h"
 #include "host/text/local_text.h"
@@ -149,20 +147,9 @@ Answered readHandles(Words const& words) {
 }  // namespace
 
 EntityIds entitiesIn(FlatBox const& box, Touch touch) {
-    Job const job(localText(L"Selecting"));
-    EntityIds found;
-    Drawing const* const drawing = workingDrawing();
-    if (drawing == nullptr) return found;
-    TzDbObjectRecord const* const space = drawing->activeSpace().record();
-    for (TzDbObjectRecord* const record : itemsNear(space, TzGeMatrix3d::kIdentity, box)) {
-        TzDbObjectId const id(record);
-        if (entityOf(id) == nullptr) continue;
-        Outline const outline = Outline::of(*entityOf(id));
-        if (touch == Touch::within ? outline.isWithin(box) : outline.touches(box)) {
-            found.append(id);
-        }
-    }
-    return found;
+    return entitiesWhere(box, [&](Outline const& outline) {
+        return touch == Touch::within ? outline.isWithin(box) : outline.touches(box);
+    });
 }
 
 std::wstring selectionWords() {
