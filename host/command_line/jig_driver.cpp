@@ -124,8 +124,8 @@ Reply TzEdJigDriver::take(std::wstring_view answer) {
         return Reply::done(TzEdJig::kString);
     }
     if (!point)
-        return Reply::unreadable(
-            tzhost::localText(L"A point is needed, or ~ and a point to move the cursor."));
+        return Reply::unreadable(tzhost::localText(
+            L"A point is needed: x,y or x,y,z; @x,y or @length<angle go from the last one; ~x,y moves the cursor."));
     if (!has(TzEdJig::kAccept3dCoordinates)) point->z = 0;
     return isMove ? moveTo(*point) : pick(*point);
 }

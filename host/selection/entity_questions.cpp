@@ -8,6 +8,7 @@
 #include "host/text/local_text.h"
 #include "tz/ed/selection.h"
 #include "tz/rx/resbuf.h"
+#include "tz/text/string.h"
 
 namespace tzhost {
 
@@ -33,6 +34,14 @@ std::optional<PickedAt> readPick(std::wstring_view answer, Depth depth) {
     return PickedAt{pickAt(*point, depth), *point};
 }
 
+std::wstring refusalOf(std::wstring_view answer) {
+    if (!isHandles(answer))
+        return localText(L"A point x,y is needed, or the handle of an entity, such as #2A.");
+    return TzString::formatted(localText(L"There is no entity %ls here."),
+                               std::wstring(answer).c_str())
+        .str();
+}
+
 using Taker = std::function<int(PickedAt const& pick)>;
 
 // Enter gives 5000; a pick at nothing ends the question with -5001.
@@ -41,8 +50,7 @@ int askForEntity(wchar_t const* prompt, Depth depth, Taker const& take) {
     if (prompt == nullptr) question.setPrompt(localText(kUsualPrompt));
     return question.ask([&](std::wstring_view answer) {
         auto const pick = readPick(answer, depth);
-        if (!pick)
-            return Reply::unreadable(localText(L"A point is needed, or the handle of an entity."));
+        if (!pick) return Reply::unreadable(refusalOf(answer));
         return Reply::done(pick->picked ? take(*pick) : Tzad::ePromptError);
     });
 }

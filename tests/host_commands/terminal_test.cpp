@@ -140,6 +140,8 @@ KeysCase const kCases[] = {
     {"ArrowsRecall", {kIdle, "CIRCLE\r", kCenter, "\x03", kIdle, "\x1b[A\r"}, kCenter, 0, kNone},
     {"BlanksAroundACommand", {kIdle, " CIRCLE \r"}, kCenter, 0, kNone},
     {"AnswersAfterACommand", {kIdle, "circle 0,0\r"}, "Near it is CIRCLE.", 0, kNone},
+    {"PointsInADrag", {kIdle, "MTEXT\r", kFirst, "0;0\r"}, "@x,y or @length<angle", 0, kNone},
+    {"HandlesThatAreNone", {kIdle, "MTEDIT\r", "text: ", "#99\r"}, "no entity #99", 0, kNone},
     {"WordsAreOffered",
      {kIdle, "UCS\r", "<World>: ", "Q\r"},
      "One of the words in question will do, too.",
