@@ -182,7 +182,8 @@ void ProgramSession::setPlotting(tzhost::PageChoice const& page, tzhost::PlotSpa
 
 bool ProgramSession::plot(std::filesystem::path const& file,
                           std::string& error,
-                          std::vector<std::string>& remarks) const {
+                          std::vector<std::string>& remarks,
+                          tzhost::IfReadOnly ifReadOnly) {
     TzString ending = TzString::fromUtf8(file.extension().string());
     ending.makeLower();
     auto const at = std::find_if(kPlotEndings.begin(), kPlotEndings.end(),
@@ -191,18 +192,23 @@ bool ProgramSession::plot(std::filesystem::path const& file,
         error = file.string() + ": " + localText("a plot's name ends in .svg, .png or .pdf");
         return false;
     }
-    return plotAs(at->format, file, error, remarks);
+    return plotAs(at->format, file, error, remarks, ifReadOnly);
 }
 
 bool ProgramSession::plotAs(tzhost::PlotFormat format,
                             std::filesystem::path const& file,
                             std::string& error,
-                            std::vector<std::string>& remarks) const {
+                            std::vector<std::string>& remarks,
+                            tzhost::IfReadOnly ifReadOnly) {
     tzhost::PlotReport const report =
-        tzhost::plotDrawing(*drawing_, {format, file.string(), page_, space_});
+        tzhost::plotDrawing(*drawing_, {format, file.string(), page_, space_, ifReadOnly});
     remarks = report.remarks;
-    if (report.problem) error = *report.problem;
-    return !report.problem;
+    if (report.problem) {
+        error = *report.problem;
+        return false;
+    }
+    ownFiles_.insert(plainPath(file));
+    return true;
 }
 
 TzString ProgramSession::moduleName() const {

@@ -44,12 +44,14 @@ public:
     // `remarks` are lines about what the picture lacks.
     [[nodiscard]] bool plot(std::filesystem::path const& file,
                             std::string& error,
-                            std::vector<std::string>& remarks) const;
+                            std::vector<std::string>& remarks,
+                            tzhost::IfReadOnly ifReadOnly = tzhost::IfReadOnly::refuse);
     // The same with the kind of picture given.
     [[nodiscard]] bool plotAs(tzhost::PlotFormat format,
                               std::filesystem::path const& file,
                               std::string& error,
-                              std::vector<std::string>& remarks) const;
+                              std::vector<std::string>& remarks,
+                              tzhost::IfReadOnly ifReadOnly = tzhost::IfReadOnly::refuse);
     // The open drawing; there is always one once makeNew or open was called.
     [[nodiscard]] tzhost::Drawing& drawing() const { return *drawing_; }
 

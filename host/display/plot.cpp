@@ -189,7 +189,7 @@ bool Plot::writeOutput() {
 }
 
 bool Plot::writeFile() {
-    SafeFile target(order_.file);
+    SafeFile target(order_.file, order_.ifReadOnly);
     bool written = target.isOpen();
     bool const painted = written && paint([&](std::string_view bytes) {
                              written = written && target.write(bytes);

@@ -5,6 +5,7 @@
 #include <vector>
 
 #include "host/display/plot_sheet.h"
+#include "host/files/safe_file.h"
 #include "host/page/page.h"
 
 class TzDbDatabase;
@@ -23,6 +24,7 @@ struct PlotOrder {
     std::string file;  // "-" is standard output
     PageChoice page;   // stands above the drawing's own page
     PlotSpace space = PlotSpace::active;
+    IfReadOnly ifReadOnly = IfReadOnly::refuse;
 };
 
 // Lines without an end, each with the file in it.

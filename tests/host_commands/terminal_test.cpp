@@ -23,9 +23,10 @@ public:
     explicit Terminal(std::string const& editor, std::string const& arguments = "") {
         fs::remove_all(desk());
         fs::create_directories(desk());
-        for (char const* const name : {"there.json", "locked.json"})
+        for (char const* const name : {"there.json", "locked.json", "locked.svg", "plot.svg"})
             std::ofstream(desk() / name) << "{}";
-        fs::permissions(desk() / "locked.json", fs::perms::owner_read);
+        for (char const* const name : {"locked.json", "locked.svg"})
+            fs::permissions(desk() / name, fs::perms::owner_read);
         winsize const size{40, 200, 0, 0};
         child_ = forkpty(&screen_, nullptr, nullptr, &size);
         if (child_ != 0) return;
@@ -46,7 +47,8 @@ public:
         close(screen_);
     }
 
-    // The program's working folder, with "there.json" and a read-only "locked.json" in it.
+    // The program's working folder. "there.json" and "plot.svg" are there, and "locked.json" and
+    // "locked.svg", which are read-only.
     static fs::path desk() { return fs::path(testing::TempDir()) / "desk"; }
     static fs::path configuration() { return fs::path(testing::TempDir()) / "configuration"; }
 
@@ -246,6 +248,14 @@ constexpr CareCase kCare[] = {
      "Saved: /"},
     {"OpenSaysWhat", ": |SAVE\r|: |c.json\r|Saved: |OPEN\r|open: |c.json\r", "Opened: /"},
     {"PlotSaysWhat", ": |PLOT\r|: |a.svg\r", "/desk/a.svg."},
+    // PLOT used to replace the first without a word, and could not replace the second.
+    {"PlotAsksOnce",
+     ": |PLOT\r|to: |plot.svg\r|<No>: |y\r|Plotted: /|PLOT\r|to: |plot.svg\r|Plotted: /|PLOT\r|"
+     ": |there.json\r|<No>: |\r",
+     kIdle},
+    {"PlotAsksReadOnly",
+     ": |PLOT\r|to: |locked.svg\r|read-only: |y\r|Plotted: /|PLOT\r|to: |locked.svg\r|read-only: |",
+     "<No>: "},
     {"TabInAText", ": |TEXT\r|: |0,0\r|: |1\r|: |\r|: |a\tb\r|: |LIST\r|: |l\r|: |\r", "  a\tb"},
     {"FilesComplete", ": |SAVE\r|: |th\t\r", kReplace},
     {"ModulesComplete", ": |LOAD\r|: |sheetm\t", "arks.tzx"},

@@ -216,6 +216,10 @@ TEST(Files, AreWrittenWholeOrNotAtAll) {
     EXPECT_EQ(contentsOf("kept.rtf"), "old");
     EXPECT_EQ(run("to-mtext --output kept.rtf", "new").status, 0);
     EXPECT_EQ(contentsOf("kept.rtf"), "new");
+    fs::permissions("kept.rtf", fs::perms::owner_read);
+    EXPECT_EQ(run("to-mtext --output kept.rtf", "newer").status, 2);
+    EXPECT_EQ(contentsOf("kept.rtf"), "new");
+    fs::permissions("kept.rtf", fs::perms::owner_all);
 }
 
 TEST(Files, OfABatchAreConvertedThoughOneFails) {

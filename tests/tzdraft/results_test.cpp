@@ -68,6 +68,15 @@ TEST_P(Result, BeyondTheSizeLimitLeavesTheOldFile) {
     expectOnlyTheOldFile();
 }
 
+// Nobody is asked where options or a script name the file.
+TEST_P(Result, OntoAReadOnlyFileLeavesIt) {
+    ASSERT_EQ(chmod(scratch("results/result", kOld).c_str(), 0444), 0);
+    tztest::ProgramRun const run = tztest::startProgram(words(file()));
+    expectRefused(run, file());
+    EXPECT_NE(run.errors.find("it is read-only\n"), std::string::npos) << run.errors;
+    expectOnlyTheOldFile();
+}
+
 // The root user may write anywhere, so that another one runs the program then.
 TEST_P(Result, IntoALockedFolderLeavesTheOldFile) {
     scratch("results/result", kOld);

@@ -42,21 +42,25 @@ bool isOpened(File const& file) {
            });
 }
 
+// A person has just been asked (mayOverwrite); nobody asks a script.
+tzhost::IfReadOnly ifReadOnly() {
+    return tzhost::commandLine().isPerson() ? tzhost::IfReadOnly::replace
+                                            : tzhost::IfReadOnly::refuse;
+}
+
 bool isSaved(File const& file) {
     if (!mayOverwrite(file.value)) return true;
-    // A person has just been asked; nobody asks a script.
-    auto const ifReadOnly =
-        tzhost::commandLine().isPerson() ? tzhost::IfReadOnly::replace : tzhost::IfReadOnly::refuse;
-    return isDone(file, forLocalText(L"Saved: %ls."), [&](auto const& to, std::string& error) {
-        return ProgramSession::current().save(to, error, ifReadOnly);
+    return isDone(file, forLocalText(L"Saved: %ls."), [](auto const& to, std::string& error) {
+        return ProgramSession::current().save(to, error, ifReadOnly());
     });
 }
 
 bool isPlotted(File const& file) {
+    if (!mayOverwrite(file.value)) return true;
     std::vector<std::string> remarks;
     bool const isMade =
         isDone(file, forLocalText(L"Plotted: %ls."), [&](auto const& to, std::string& error) {
-            return ProgramSession::current().plot(to, error, remarks);
+            return ProgramSession::current().plot(to, error, remarks, ifReadOnly());
         });
     for (std::string const& each : remarks)
         tzhost::commandLine().say(tzhost::fromUtf8(each));
