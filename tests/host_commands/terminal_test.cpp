@@ -218,7 +218,7 @@ constexpr CareCase kCare[] = {
      "*|NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r", "<No>"},
     // A name or value that is none is asked for again: it used to end the command.
     {"LayersAgain",
-     ": |LAYER\r|: |M\r|rent: |a/b\r|layer.\r\nName of|W\r|: |C\r|<7>: |red\r|colour.\r\nColour|3\r"
+     ": |LAYER\r|: |M\r|rent: |a/b\r|ends.\r\nName of| W \r|: |C\r|<7>: |red\r|colour.\r\nColour|3\r"
      "|<W>: |x\r|\"x\".\r\nLayer to colour|W\r|: |OFf\r|<W>: |\r|does not show.|D\r|delete: |0\r",
      "stays.\r\nLayer to delete: "},
     {"VariablesAgain",
@@ -226,10 +226,10 @@ constexpr CareCase kCare[] = {
      "|: |LUNITS\r",
      "<4>: "},
     {"StylesAgain",
-     ": |STYLE\r|: |a/b\r|style.\r\nText|S\r|: |\r|height|-1\r|negative.\r\nText|3\r|: |0\r",
+     ": |STYLE\r|: |a/b\r|ends.\r\nText|S\r|: |\r|height|-1\r|negative.\r\nText|3\r|: |0\r",
      "zero.\r\nWidth"},
     {"BlocksAgain",
-     "*|ATTDEF\r|: |\r|tag: |T W\r|blanks.\r\nAttribute|\x03|: |BLOCK\r|: |a/b\r|block.\r\nName|B\r"
+     "*|ATTDEF\r|: |\r|tag: |T W\r|blanks.\r\nAttribute|\x03|: |BLOCK\r|: |a/b\r|ends.\r\nName|B\r"
      "|point: |1,2\r|: |all\r|: |\r|: |BLOCK\r|: |b\r|already.\r\nName|\x03|: |INSERT\r|: |c\r",
      "\"c\".\r\nBlock to insert"},
     {"AxesAgain", ": |UCS\r|: |3P\r|: |0,0\r|axis: |0,0\r|itself.\r\nPoint|1,0\r|Y axis: |2,0\r",

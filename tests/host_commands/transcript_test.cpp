@@ -35,7 +35,8 @@ TranscriptCase const kCases[] = {
      "Command: LIST\nSelect objects: ^C"},
     {"NothingToTakeBack", "U\n", "There is nothing to take back.\n"},
     {"NoModuleLeft", "UNLOAD\nUNLOAD\n", "Command: UNLOAD\nNo module is loaded.\n"},
-    {"NamesForRecords", "LAYER\nM\n lead\n\n", "\" lead\" cannot be the name of a layer.\n"},
+    {"NamesForRecords", "LAYER\nM\n lead\n\n",
+     "\" lead\" cannot be the name of a layer. A name has up to 255 letters, none of < >"},
     // The style of the file used to be current while the variable said "Standard".
     {"OpenedStyleIsShown",
      "STYLE\nBig\n\n\n\n\n\n\n\n\n"

@@ -6,6 +6,7 @@
 #include "apps/tzdraft/program_texts.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
+#include "host/runtime/words.h"
 #include "host/settings/variables.h"
 #include "host/text/utf8.h"
 #include "tz/ed/prompts.h"
@@ -112,11 +113,14 @@ Answer<TzString>
 askName(wchar_t const* question, tzhost::Offer offer, TzString const& defaultName) {
     TzString const prompt = defaultName.isEmpty() ? TzString::formatted(L"\n%ls: ", question)
                                                   : withDefault(question, defaultName);
+    bool const isName = offer.kind == tzhost::Offer::Kind::names;  // with no blanks at its ends
     Answer<TzString> answer;
     answer.asked = askUntilDecided(nullptr, [&] {
         tzhost::commandLine().offer(offer);
         return tzedGetString(1, prompt, answer.value);
     });
+    if (tzhost::commandLine().isPerson() && isName)
+        answer.value = TzString(std::wstring(tzhost::withoutBlanksAround(answer.value.str())));
     if (answer.asked == Asked::given && answer.value.isEmpty()) {
         answer.value = defaultName;
         if (defaultName.isEmpty()) answer.asked = Asked::empty;

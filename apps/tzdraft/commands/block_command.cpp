@@ -32,7 +32,7 @@ bool isFree(Answer<TzString> const& name) {
     if (isTaken) {
         tellProblem(localText(L"There is a block \"%ls\" already."), name.value.kwszPtr());
     } else if (!tzhost::isSymbolName(name.value.str())) {
-        tellProblem(localText(L"\"%ls\" cannot be the name of a new block."), name.value.kwszPtr());
+        tellNoName(localText(L"\"%ls\" cannot be the name of a new block."), name.value);
     } else {
         return true;
     }

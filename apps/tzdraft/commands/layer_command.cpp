@@ -41,8 +41,7 @@ TzDbObjectId layerToBe(TzString const& name) {
         return {};
     Opened<TzDbLayerTable> const opened(table);
     TzDbObjectId const id = findOrAdd<TzDbLayerTableRecord>(table, name);
-    if (id.isNull())
-        tellProblem(localText(L"\"%ls\" cannot be the name of a layer."), name.kwszPtr());
+    if (id.isNull()) tellNoName(localText(L"\"%ls\" cannot be the name of a layer."), name);
     return id;
 }
 

@@ -150,9 +150,7 @@ StyleAnswers startingValues(TzString const& name) {
 
 bool canBeStyle(Answer<TzString> const& name) {
     bool const isName = tzhost::isSymbolName(name.value.str());
-    if (!isName)
-        tellProblem(localText(L"\"%ls\" cannot be the name of a text style."),
-                    name.value.kwszPtr());
+    if (!isName) tellNoName(localText(L"\"%ls\" cannot be the name of a text style."), name.value);
     return isName;
 }
 
