@@ -22,7 +22,7 @@ bool isOne(Direction direction, fs::path const& file) {
 
 class Walk {
 public:
-    Walk(Direction direction, Inputs& inputs) : direction_(direction), inputs_(inputs) {}
+    Walk(Options const& options, Inputs& inputs) : options_(options), inputs_(inputs) {}
 
     void through(fs::path const& root) {
         folders_.push_back(root);
@@ -42,10 +42,10 @@ private:
         for (fs::directory_iterator at(folder, problem), end; !problem && at != end;
              at.increment(problem)) {
             if (at->path().filename().string().starts_with('.')) continue;
-            std::error_code unseen;  // such an entry is neither
+            std::error_code unseen;  // such an entry is no folder, and named when it is read
             if (at->is_directory(unseen)) {
-                if (!at->is_symlink(unseen)) below.push_back(at->path());
-            } else if (isOne(direction_, at->path())) {
+                if (isBelow(*at)) below.push_back(at->path());
+            } else if (isOne(options_.direction, at->path()) && !at->is_other(unseen)) {
                 files.push_back(at->path());
             }
         }
@@ -60,7 +60,14 @@ private:
         folders_.insert(folders_.end(), below.begin(), below.end());
     }
 
-    Direction direction_;
+    // Whether a folder in a folder is looked through.
+    [[nodiscard]] bool isBelow(fs::directory_entry const& folder) const {
+        std::error_code unseen;
+        return !folder.is_symlink(unseen) &&
+               !fs::equivalent(folder.path(), options_.outputDir, unseen);
+    }
+
+    Options const& options_;
     Inputs& inputs_;
     std::vector<fs::path> folders_;  // still to be looked at, the next one last
 };
@@ -69,7 +76,7 @@ private:
 
 Inputs inputsOf(Options const& options) {
     Inputs inputs;
-    Walk walk(options.direction, inputs);
+    Walk walk(options, inputs);
     for (std::string const& file : options.files) {
         std::error_code unseen;  // will be named when it is read
         if (options.isRecursive && fs::is_directory(file, unseen)) {

@@ -23,7 +23,8 @@ struct Inputs {
 
 // The files in the order that they were named in. A folder stands for the files in it and below it,
 // by their names: .rtf where RTF is read, else .mtext and .txt, in any case. Names that begin with
-// a dot and folders that are links are left out.
+// a dot, folders that are links, pipes and devices are left out, and so is the folder of the
+// results where it lies below.
 [[nodiscard]] Inputs inputsOf(Options const& options);
 
 }  // namespace tzconvert

@@ -285,7 +285,7 @@ std::optional<std::vector<char const*>> wordsOf(int count, char const* const* ar
     std::vector<char const*> words(arguments, arguments + count);
     if (words.size() < 2 || std::string_view(words[1]) != kHelp) return words;
     words.erase(words.begin() + 1);
-    if (words.size() > 1 && !isCommand(words[1])) {
+    if (words.size() > 1 && !isCommand(words[1]) && *words[1] != '-') {
         tell(explainCommand({words[1]}) + localText("; try --help"));
         return std::nullopt;
     }

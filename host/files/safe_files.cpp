@@ -73,7 +73,7 @@ void SafeFiles::holdSignals() {
     if (holdsSignals_) return;
     sigset_t ends;
     sigemptyset(&ends);
-    for (int const signal : {SIGINT, SIGTERM, SIGHUP})
+    for (int const signal : {SIGINT, SIGTERM, SIGHUP, SIGPIPE})
         sigaddset(&ends, signal);
     holdsSignals_ = sigprocmask(SIG_BLOCK, &ends, &before_) == 0;
 }

@@ -11,7 +11,8 @@
 //   complain(files.takePlaces());
 //
 // A crash leaves each file as it was or new. Signals that end the program (interrupt, hang-up,
-// termination) wait while files wait, so that none leaves unfinished files; hence areDue.
+// termination, a reader of its output that is gone) wait while files wait, so that none leaves
+// unfinished files; hence areDue.
 
 #include <chrono>
 #include <csignal>

@@ -7,6 +7,7 @@
 #include <sstream>
 #include <string>
 
+#include <sys/stat.h>
 #include <sys/wait.h>
 
 #include <gtest/gtest.h>
@@ -161,6 +162,7 @@ constexpr RunCase kRuns[] = {
     {"NearCommand", "to-rft", ""sv, 2, "", "not \"to-rft\"; did you mean to-rtf?"},
     {"NearOption", "to-rtf --szie=3", ""sv, 2, "", "--szie=3; did you mean --size?"},
     {"HelpOnACommand", "help to-rtf", ""sv, 0, "~Usage: tzconvert to-rtf", ""},
+    {"HelpOnHelp", "help --help", ""sv, 0, "~round-trip", ""},
     {"HelpOnNothing", "help toRTF", ""sv, 2, "", "not \"toRTF\"; did you mean to-rtf?"},
     {"ShortVersion", "-v", ""sv, 0, "~tzconvert 1", ""},
     {"UnknownLanguage", "to-rtf --locale x1", ""sv, 2, "",
@@ -243,31 +245,33 @@ TEST(Files, OfABatchAreConvertedThoughOneFails) {
     EXPECT_EQ(report.find("bad.txt"), std::string::npos) << report;
 }
 
-// What has no ending of an input, a hidden name and a folder behind a link stay out.
+// What has no ending of an input, a hidden name, a pipe, a folder behind a link and the results of
+// earlier stay out.
 TEST(Files, OfFoldersKeepTheirPlaces) {
     fs::remove_all("tree");
-    fs::remove_all("made");
     fs::create_directories("tree/below/.hidden");
-    fs::create_directories("made");
+    fs::create_directories("tree/made/below");
+    write("tree/made/below/earlier.rtf", "e");
+    ASSERT_EQ(mkfifo("tree/pipe.rtf", 0600), 0);
     fs::create_directory_symlink("..", "tree/loop");
     write("tree/a.rtf", "{\\rtf1 a}");
     write("tree/b.txt", "b");
     write("tree/below/A.RTF", "{\\rtf1\\new A}");
     write("tree/below/.hidden/c.rtf", "c");
     write("tree/below/bad.rtf", "\xFF");
-    Outcome const result = run("to-mtext --recursive --output-dir made tree", "");
+    Outcome const result = run("to-mtext --recursive --output-dir tree/made tree", "");
     EXPECT_EQ(result.status, 2);
     EXPECT_EQ(
         result.err,
         "tzconvert: tree/below/A.RTF: warning: unknown words, passed over: 1, the first \\new\n"
         "tzconvert: tree/below/bad.rtf: byte 0: not UTF-8\n"
         "tzconvert: 2 of 3 files converted, 1 failed, 1 with warnings\n");
-    EXPECT_EQ(contentsOf("made/a.mtext"), "a");
-    EXPECT_EQ(contentsOf("made/below/A.mtext"), "A");
-    std::size_t const files = static_cast<std::size_t>(
-        std::count_if(fs::recursive_directory_iterator("made"), fs::recursive_directory_iterator(),
-                      [](fs::directory_entry const& each) { return each.is_regular_file(); }));
-    EXPECT_EQ(files, 2U);
+    EXPECT_EQ(contentsOf("tree/made/a.mtext"), "a");
+    EXPECT_EQ(contentsOf("tree/made/below/A.mtext"), "A");
+    std::size_t const files = static_cast<std::size_t>(std::count_if(
+        fs::recursive_directory_iterator("tree/made"), fs::recursive_directory_iterator(),
+        [](fs::directory_entry const& each) { return each.is_regular_file(); }));
+    EXPECT_EQ(files, 3U) << "with the earlier one";
 }
 
 // They are read once more for each conversion: the second time it was empty.
