@@ -219,7 +219,7 @@ constexpr CareCase kCare[] = {
     // A name or value that is none is asked for again: it used to end the command.
     {"LayersAgain",
      ": |LAYER\r|: |M\r|rent: |a/b\r|ends.\r\nName of| W \r|: |C\r|<7>: |red\r|colour.\r\nColour|3\r"
-     "|<W>: |x\r|\"x\".\r\nLayer to colour|W\r|: |OFf\r|<W>: |\r|does not show.|D\r|delete: |0\r",
+     "|<W>: |x\r|\"x\".\r\nLayer to colour|W\r|: |OFf\r|<W>: |?\r|layer: \"W\".\r\nLayer to|\r|does not show.|D\r|delete: |0\r",
      "stays.\r\nLayer to delete: "},
     {"VariablesAgain",
      ": |SETVAR\r|: |LUNIT\r|them.\r\nVariable|LUNITS\r|<2>: |9\r|to 5.\r\nNew|4\r|: |SETVAR\r"

@@ -11,7 +11,37 @@
 namespace tzdraft {
 namespace {
 
+TzString currentLayerName() {
+    Opened<TzDbLayerTableRecord> const layer(ProgramSession::current().drawing().clayer(),
+                                             TzDb::kForRead);
+    return layer ? TzString(layer->getName()) : TzString();
+}
+
+bool list() {
+    TzDbLayerTable* table = nullptr;
+    TzDbSymbolTableIterator* found = nullptr;
+    if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk)
+        return true;
+    Opened<TzDbLayerTable> const opened(table);
+    if (table->newIterator(found) != Tzad::eOk) return true;
+    std::unique_ptr<TzDbSymbolTableIterator> const walk(found);
+    for (walk->start(); !walk->done(); walk->step()) {
+        Opened<TzDbLayerTableRecord> const layer(walk->getRecordId(), TzDb::kForRead);
+        if (!layer) continue;
+        tzutPrintf(localText(L"\n\"%ls\", colour %ls%ls%ls"), layer->getName(),
+                   writeColor(layer->color()).c_str(), layer->isOff() ? localText(L", off") : L"",
+                   layer->isLocked() ? localText(L", locked") : L"");
+    }
+    tzutPrintf(localText(L"\nCurrent layer: \"%ls\".\n"), currentLayerName().kwszPtr());
+    return true;
+}
+
+// "?" lists them, as at the other questions for names.
 TzDbObjectId layerNamed(TzString const& name) {
+    if (name == L"?") {
+        (void)list();  // which is done, and no cancel
+        return {};
+    }
     TzDbLayerTable* table = nullptr;
     TzDbObjectId id;
     if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk)
@@ -21,12 +51,6 @@ TzDbObjectId layerNamed(TzString const& name) {
         tellProblem(localText(L"There is no layer \"%ls\"."), name.kwszPtr());
     }
     return id;
-}
-
-TzString currentLayerName() {
-    Opened<TzDbLayerTableRecord> const layer(ProgramSession::current().drawing().clayer(),
-                                             TzDb::kForRead);
-    return layer ? TzString(layer->getName()) : TzString();
 }
 
 void makeCurrent(TzDbObjectId layer) {
@@ -136,25 +160,6 @@ TzDbObjectId removed(TzString const& name) {
 
 bool remove() {
     return !askLayer(localText(L"Layer to delete"), L"", removed).isCancelled();
-}
-
-bool list() {
-    TzDbLayerTable* table = nullptr;
-    TzDbSymbolTableIterator* found = nullptr;
-    if (ProgramSession::current().drawing().getLayerTable(table, TzDb::kForRead) != Tzad::eOk)
-        return true;
-    Opened<TzDbLayerTable> const opened(table);
-    if (table->newIterator(found) != Tzad::eOk) return true;
-    std::unique_ptr<TzDbSymbolTableIterator> const walk(found);
-    for (walk->start(); !walk->done(); walk->step()) {
-        Opened<TzDbLayerTableRecord> const layer(walk->getRecordId(), TzDb::kForRead);
-        if (!layer) continue;
-        tzutPrintf(localText(L"\n\"%ls\", colour %ls%ls%ls"), layer->getName(),
-                   writeColor(layer->color()).c_str(), layer->isOff() ? localText(L", off") : L"",
-                   layer->isLocked() ? localText(L", locked") : L"");
-    }
-    tzutPrintf(localText(L"\nCurrent layer: \"%ls\".\n"), currentLayerName().kwszPtr());
-    return true;
 }
 
 // One choice of the command; its action returns false when it was cancelled.
