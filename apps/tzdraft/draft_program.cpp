@@ -1,22 +1,18 @@
 #include "apps/tzdraft/draft_program.h"
 
-#include <exception>
 #include <new>
-#include <optional>
 #include <string>
 #include <unistd.h>
 #include <vector>
 
-#include "apps/tzdraft/commands/bodies.h"
-#include "apps/tzdraft/commands/choices.h"
+#include "apps/tzdraft/command_loop.h"
 #include "apps/tzdraft/commands/host_commands.h"
-#include "apps/tzdraft/commands/unsaved.h"
 #include "apps/tzdraft/end_signals.h"
 #include "apps/tzdraft/event_file.h"
-#include "apps/tzdraft/function_call.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/progress_line.h"
+#include "apps/tzdraft/results.h"
 #include "apps/tzdraft/start.h"
 #include "apps/tzdraft/terminal_source.h"
 #include "apps/tzdraft/version.h"
@@ -27,12 +23,8 @@
 #include "host/runtime/command_runner.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/module_linker.h"
-#include "host/runtime/words.h"
-#include "host/selection/entity_list.h"
-#include "host/selection/selection_sets.h"
 #include "host/settings/settings.h"
 #include "host/text/local_text.h"
-#include "host/text/system_words.h"
 #include "host/text/utf8.h"
 #include "host/text/visible_text.h"
 
@@ -44,7 +36,8 @@ namespace {
 class Run {
 public:
     Run(Options const& options, Screens screens)
-        : options_(options), screens_(std::move(screens)), source_(std::move(screens_.source)) {}
+        : options_(options), screens_(std::move(screens)), source_(std::move(screens_.source)),
+          loop_(session_, options.isStrict ? Strict::yes : Strict::no) {}
     Run(Run const&) = delete;
     Run& operator=(Run const&) = delete;
     ~Run();
@@ -61,23 +54,10 @@ private:
     bool loadModule();
     [[nodiscard]] bool mustEnd() const;
     void tellEarlyEnd() const;
-    void readCommands();
-    [[nodiscard]] std::optional<std::wstring> nextLine() const;
-    [[nodiscard]] static bool endsHere();
-    void runCall(std::wstring const& line);
     void greet() const;
-    static void tellUnknown(std::wstring const& line);
-    // Whether the line means something that can be run.
-    [[nodiscard]] static bool isKnown(std::wstring const& line);
-    void runTyped(std::wstring const& line);
-    void runGuarded(std::wstring const& line);
-    void beginCommand(tzhost::Command const& command);
-    void endCommand(tzhost::Command const& command);
     int finish();
     void writeResults();
     void saveSettings();
-    template <class Write>
-    void writeResult(std::filesystem::path const& file, Write write);
     bool complain(std::string const& error) const;
 
     Options const& options_;
@@ -88,8 +68,8 @@ private:
     ProgramSession session_;
     tzhost::FaultPlan faults_;
     SettingsState settings_ = SettingsState::unusable;
-    std::vector<std::string> problems_;  // with results, one line each
-    std::string written_;                // results, with commas between them
+    CommandLoop loop_;
+    Results results_;
 };
 
 bool Run::complain(std::string const& error) const {
@@ -187,8 +167,7 @@ bool Run::begin() {
     if (options_.isQuiet && !line.isPerson()) line.keepToProblems();
     if (!options_.events.empty() && !events_.begin(options_.events, error)) return complain(error);
     registerHostCommands();
-    tzhost::addCommandHooks({[this](tzhost::Command const& command) { beginCommand(command); },
-                             [this](tzhost::Command const& command) { endCommand(command); }});
+    loop_.hook();
     session_.setModule(modulePath(options_));
     session_.setPlotting(options_.page, options_.space);
     if (!options_.save.empty()) session_.saveAtEnd();
@@ -209,34 +188,6 @@ void Run::tellEarlyEnd() const {
     }
 }
 
-// A call is taken back as a command is.
-void Run::runCall(std::wstring const& line) {
-    session_.beginCommand(line);
-    try {
-        tzhost::runFunction([&] { callTyped(line); });
-    } catch (...) {
-        session_.endCommand();
-        throw;
-    }
-    session_.endCommand();
-}
-
-bool isCall(std::wstring const& line) {
-    return line.front() == L'(';
-}
-
-bool Run::isKnown(std::wstring const& line) {
-    return isCall(line) || tzhost::commandStack().find(TzString(line)) != nullptr;
-}
-
-// Answers do not follow a command on its line, though who tries it still is told which one it is.
-void Run::tellUnknown(std::wstring const& line) {
-    TzString said = TzString::formatted(localText(L"There is no command \"%ls\"."), line.c_str());
-    said += nearCommand(line.substr(0, line.find(L' '))).c_str();
-    said += TzString::formatted(localText(L" %ls lists all."), localText(L"HELP"));
-    tzhost::commandLine().sayProblem(said.str());
-}
-
 // To a person who may be here for the first time.
 void Run::greet() const {
     if (!tzhost::commandLine().isPerson()) return;
@@ -249,117 +200,18 @@ void Run::greet() const {
                                   .str());
 }
 
-void Run::runTyped(std::wstring const& line) {
-    if (isCall(line)) return runCall(line);
-    tzhost::Command const* const command = tzhost::commandStack().find(TzString(line));
-    if (!command) return tellUnknown(line);
-    auto const answers =
-        tzhost::commandLine().isPerson() ? tzhost::AnswersFrom::user : tzhost::AnswersFrom::script;
-    tzhost::runCommand(*command, answers);
-}
-
-// A script that ends at problems ends here, too.
-void tellLeftOver(std::wstring const& line) {
-    if (tzhost::commandLine().isPerson()) return;
-    tzhost::commandLine().sayProblem(
-        TzString::formatted(localText(L"%ls left something open."), line.c_str()).str());
-}
-
-void Run::runGuarded(std::wstring const& line) {
-    try {
-        runTyped(line);
-        session_.doPostponed();
-    } catch (std::exception const& problem) {
-        tzhost::commandLine().sayProblem(line + localText(L" ended early: ") +
-                                         tzhost::fromUtf8(tzhost::systemWords(problem)));
-    }
-    tzhost::freeAllSets();  // the audit has counted them
-    if (options_.isStrict && !tzhost::worstAudit().clean()) tellLeftOver(line);
-}
-
-// Whether the end of the input is that of the session. A person who ended it by Ctrl-D may stay.
-bool Run::endsHere() {
-    tzhost::CommandLine& line = tzhost::commandLine();
-    line.setVoice(tzhost::CommandLine::Voice::host);
-    bool const isOver = line.hasEnded() || mayLeave();
-    line.setVoice(tzhost::CommandLine::Voice::module);
-    if (!isOver) line.goOn();
-    return isOver;
-}
-
-// Nothing when the session ends.
-std::optional<std::wstring> Run::nextLine() const {
-    tzhost::CommandLine& line = tzhost::commandLine();
-    while (!session_.wantsToEnd()) {
-        auto text =
-            line.readCommand(line.isPerson() ? commandNames() : std::vector<std::wstring>());
-        if (text || endsHere()) return text;
-    }
-    return std::nullopt;
-}
-
-// Enter alone repeats the command before it where a person types, but no mistyped one; in a script
-// it does nothing.
-void Run::readCommands() {
-    std::wstring last;
-    while (auto const typed = nextLine()) {
-        std::wstring const line(tzhost::withoutBlanksAround(*typed));
-        if (line.empty()) {
-            if (!last.empty() && tzhost::commandLine().isPerson()) runGuarded(last);
-            continue;
-        }
-        last = isKnown(line) ? line : std::wstring();
-        runGuarded(line);
-    }
-}
-
-// What a command of the program prints is no event, and one that does not look at the selection
-// made before it begins without one.
-void Run::beginCommand(tzhost::Command const& command) {
-    bool const isOwn = command.group == TzString(kHostCommandGroup);
-    tzhost::commandLine().setVoice(isOwn ? tzhost::CommandLine::Voice::host
-                                         : tzhost::CommandLine::Voice::module);
-    if ((command.flags & tzhost::Command::kUsesImpliedSelection) == 0) {
-        tzhost::dropImpliedSelection();
-    }
-    session_.beginCommand(command.localName.str());
-}
-
-void Run::endCommand(tzhost::Command const& command) {
-    session_.endCommand();
-    if (command.callback != selectCommand) tzhost::dropImpliedSelection();
-    tzhost::commandLine().setVoice(tzhost::CommandLine::Voice::module);
-}
-
-// Notes that a result was written, or why it was not. `write` fails by an error, or by an exception
-// when memory runs short.
-template <class Write>
-void Run::writeResult(std::filesystem::path const& file, Write write) {
-    if (file.empty()) return;
-    std::string error;
-    try {
-        (void)write(error);  // the error says it
-    } catch (std::bad_alloc const&) {
-        error = file.string() + ": " + localText("there is not enough memory to write it");
-    }
-    if (!error.empty()) return problems_.push_back(error);
-    if (!written_.empty()) written_ += ", ";
-    written_ += file.string();
-}
-
-// One that cannot be written keeps none of the others back.
 void Run::writeResults() {
     struct Plot {
         std::filesystem::path const& file;
         tzhost::PlotFormat format;
     };
-    writeResult(options_.save,
-                [&](std::string& error) { return session_.save(options_.save, error); });
+    results_.write(options_.save,
+                   [&](std::string& error) { return session_.save(options_.save, error); });
     for (Plot const& plot :
          {Plot{options_.svg, tzhost::PlotFormat::svg}, Plot{options_.png, tzhost::PlotFormat::png},
           Plot{options_.pdf, tzhost::PlotFormat::pdf}}) {
         std::vector<std::string> remarks;
-        writeResult(plot.file, [&](std::string& error) {
+        results_.write(plot.file, [&](std::string& error) {
             return session_.plotAs(plot.format, plot.file, error, remarks);
         });
         for (std::string const& each : remarks)
@@ -370,7 +222,7 @@ void Run::writeResults() {
 void Run::saveSettings() {
     if (settings_ == SettingsState::unusable) return;
     if (auto const problem = tzhost::saveUserVariables(settingsFile(options_))) {
-        problems_.push_back(*problem);
+        results_.noteProblem(*problem);
     }
 }
 
@@ -383,13 +235,11 @@ int Run::finish() {
     saveSettings();
     bool const leftOver = !tzhost::worstAudit().clean();
     tzhost::dynamicLinker().unloadAll();
-    writeResult(options_.events, [&](std::string& error) { return events_.finish(error); });
-    if (!problems_.empty()) {
-        if (!written_.empty()) problems_.back() += "; " + tzhost::localText("written: ") + written_;
-        for (std::string const& problem : problems_)
-            complain(problem);
-        return kUnusable;
-    }
+    results_.write(options_.events, [&](std::string& error) { return events_.finish(error); });
+    std::vector<std::string> const problems = results_.problems();
+    for (std::string const& problem : problems)
+        complain(problem);
+    if (!problems.empty()) return kUnusable;
     if (leftOver) return kLeftOver;
     return tzhost::commandLine().hasFailed() ? kFailed : kDone;
 }
@@ -398,7 +248,7 @@ int Run::toItsEnd() {
     if (!begin()) return kUnusable;
     EndSignals const endInOrder;
     greet();
-    readCommands();
+    loop_.run();
     return finish();
 }
 
