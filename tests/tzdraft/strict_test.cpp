@@ -28,6 +28,7 @@ constexpr ScriptRow kRows[] = {
     {"CallOfNoFunction", "(nosuch)\n", 1, ":1: (nosuch): no module defines this function"},
     {"HostCommand", "LAYER\nSet\nNOSUCH\n\n", 1, ":3: There is no layer \"NOSUCH\"."},
     {"VariableOutsideItsLimits", "SETVAR\nLUNITS\n9\n", 1, ":3: LUNITS takes"},
+    {"RefusedPaper", "PAGE\nB5\n", 1, ":2: That is not what is asked for, expected A0 to A4"},
     {"FileCommand", "OPEN\n/nosuch/a.json\n", 1, ":2: /nosuch/a.json: cannot be read: No such"},
     {"LeftOver", "-MTEXT\n0,0\n5,5\nabc\n\nSELECT\nall\n\nMTEDIT\n", 3,
      ":9: MTEDIT left something open."},

@@ -1,32 +1,33 @@
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/program_session.h"
 #include "apps/tzdraft/program_texts.h"
 #include "host/page/page_plan.h"
 #include "host/page/page_text.h"
-#include "tz/ed/print.h"
 
 namespace tzdraft {
 namespace {
 
-// Asks for a text until `read` makes a value of it. False when it was cancelled.
+// Asks for a text that `read` makes a value of. False when none was given.
 template <class Value, class Read>
 bool askRead(wchar_t const* question,
              std::string const& present,
              char const* expected,
              Value& value,
              Read read) {
-    for (;;) {
-        Answer<TzString> const answer = askText(question, TzString::fromUtf8(present));
-        if (answer.isCancelled()) return false;
+    auto const accepts = [&](Answer<TzString> const& answer) {
         auto const found = read(answer.value.toUtf8());
         if (found) {
             value = *found;
-            return true;
+        } else {
+            tellProblem(localText(L"That is not what is asked for, expected %ls."),
+                        TzString::fromUtf8(localText(expected)).kwszPtr());
         }
-        tzutPrintf(localText(L"\nThat is not what is asked for, expected %ls.\n"),
-                   TzString::fromUtf8(localText(expected)).kwszPtr());
-    }
+        return found.has_value();
+    };
+    auto const ask = [&] { return askText(question, TzString::fromUtf8(present)); };
+    return askUntil(ask, accepts).asked == Asked::given;
 }
 
 bool liesOnItsSide(tzhost::Page const& page) {
@@ -79,8 +80,8 @@ void pageCommand() {
                 tzhost::kWindowsOrAll, page.window, tzhost::readWindowOrAll);
     if (!isAnswered) return;
     if (auto const problem = tzhost::problemOf(page)) {
-        tzutPrintf(localText(L"\nThe page stays as it was: %ls.\n"),
-                   TzString::fromUtf8(*problem).kwszPtr());
+        tellProblem(localText(L"The page stays as it was: %ls."),
+                    TzString::fromUtf8(*problem).kwszPtr());
         return;
     }
     settings.page = page;
