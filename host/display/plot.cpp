@@ -40,7 +40,6 @@ SpaceToPlot contentsOf(Drawing const& drawing, Space space) {
     return result;
 }
 
-// A drawing without anything still gives a page.
 std::vector<SpaceToPlot> spacesOf(Drawing const& drawing, PlotSpace wanted) {
     switch (wanted) {
     case PlotSpace::active: return {contentsOf(drawing, activeSpace())};
@@ -48,11 +47,16 @@ std::vector<SpaceToPlot> spacesOf(Drawing const& drawing, PlotSpace wanted) {
     case PlotSpace::paper: return {contentsOf(drawing, Space::paper)};
     case PlotSpace::all: break;
     }
-    std::vector<SpaceToPlot> spaces{contentsOf(drawing, Space::model),
-                                    contentsOf(drawing, Space::paper)};
-    std::erase_if(spaces, [](SpaceToPlot const& each) { return each.entities.isEmpty(); });
-    if (spaces.empty()) spaces.push_back(contentsOf(drawing, Space::model));
-    return spaces;
+    return {contentsOf(drawing, Space::model), contentsOf(drawing, Space::paper)};
+}
+
+// Of pages with nothing on them no more than one stays, and only when all are such.
+void dropEmpty(std::vector<PlotSheet>& sheets) {
+    auto const isEmpty = [](PlotSheet const& sheet) { return !extentsOf(sheet.scene); };
+    if (std::all_of(sheets.begin(), sheets.end(), isEmpty))
+        sheets.resize(1);
+    else
+        std::erase_if(sheets, isEmpty);
 }
 
 // The window lies on the world's XY plane; the box around it is what the view shows of it.
@@ -155,8 +159,10 @@ bool Plot::make() {
     if (faultAt("plotDrawing")) return fail(localText("cannot be plotted"));
     if (!checkPage()) return false;
     std::vector<SpaceToPlot> const spaces = spacesOf(drawing_, order_.space);
-    return std::all_of(spaces.begin(), spaces.end(),
-                       [&](SpaceToPlot const& each) { return addSheet(each); });
+    bool const isMade = std::all_of(spaces.begin(), spaces.end(),
+                                    [&](SpaceToPlot const& each) { return addSheet(each); });
+    if (isMade && spaces.size() > 1) dropEmpty(sheets_);
+    return isMade;
 }
 
 // Each face that had to be left out of the document, with what became of its letters.

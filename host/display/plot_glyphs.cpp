@@ -3,7 +3,8 @@
 #include <pango/pango.h>
 
 #include <algorithm>
-#include <array>
+#include <map>
+#include <string_view>
 #include <utility>
 
 namespace tzhost {
@@ -53,11 +54,14 @@ bool isShown(PlotGlyph const& glyph, PlotSheet const& sheet) {
 
 }  // namespace
 
-// Characters that are read to the left come the other way round.
-std::string wordsOf(AlikeGlyphs const& glyphs) {
+std::string wordsOf(PlotShape const& letters, PlotSheet const& sheet) {
+    std::map<std::size_t, std::string_view> parts;
+    for (PlotGlyph const& each : letters.glyphs) {
+        if (!each.text.empty() && isShown(each, sheet)) parts.emplace(each.at, each.text);
+    }
     std::string words;
-    for (PlotGlyph const& each : glyphs)
-        words.insert(each.rightToLeft ? 0 : words.size(), each.text);
+    for (auto const& [at, part] : parts)
+        words += part;
     return words;
 }
 

@@ -9,9 +9,11 @@
 // The glyphs of letters as both kinds of documents write them.
 namespace tzhost {
 
-// Glyphs of one font, size and direction of reading, and the characters that they stand for.
+// Glyphs of one font, size and direction of reading.
 using AlikeGlyphs = std::vector<PlotGlyph>;
-[[nodiscard]] std::string wordsOf(AlikeGlyphs const& glyphs);
+
+// What the glyphs stand for that the page shows, in the order of reading.
+[[nodiscard]] std::string wordsOf(PlotShape const& letters, PlotSheet const& sheet);
 
 // Hands over the glyphs that the page shows, those alike that follow each other together.
 // `separates` is asked for each and parts those that differ in the answer.

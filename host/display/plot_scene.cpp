@@ -95,7 +95,12 @@ public:
         shape_.color = inkOf(pen, PlotKind::stroke);
     }
 
-    void startRun(GlyphRun const& run) { shape_.letterHeight = run.height; }
+    void startRun(GlyphRun const& run) {
+        shape_.letterHeight = run.height;
+        constexpr std::size_t kMostBytes = 4;  // of a character
+        first_ = next_;
+        next_ += kMostBytes * run.text.size();
+    }
     void add(OutlinedLetter const& letter);
     void flush();
 
@@ -107,6 +112,8 @@ private:
     ShapeTaker const& take_;
     PlotShape shape_;
     int letters_ = 0;
+    std::size_t first_ = 0;  // the place of the run among all characters
+    std::size_t next_ = 0;
 };
 
 void LetterShapes::add(OutlinedLetter const& letter) {
@@ -121,7 +128,7 @@ void LetterShapes::add(OutlinedLetter const& letter) {
     }
     shape_.glyphs.push_back({letter.font, letter.glyph, frame_.place(letter.origin),
                              frame_.turn(letter.along), frame_.turn(letter.down), letter.text,
-                             letter.rightToLeft, letter.spread});
+                             first_ + letter.at, letter.rightToLeft, letter.spread});
     ++letters_;
 }
 

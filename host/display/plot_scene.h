@@ -33,6 +33,7 @@ struct PlotGlyph {
     LayoutPoint along;
     LayoutPoint down;
     std::string text;
+    std::size_t at = 0;  // the place of `text` among the characters of the letters
     bool rightToLeft = false;
     bool spread = false;
 };

@@ -3,6 +3,7 @@
 #include <pango/pangocairo.h>
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <memory>
 #include <string_view>
@@ -47,6 +48,11 @@ ScaledFont fontOn(cairo_matrix_t const& toPage, PangoFont* font) {
     return isGood ? std::move(made) : nullptr;
 }
 
+// A document tells how wide a glyph is in whole thousandths of the font's size, so that a line of
+// fifty letters would end a tenth of a millimetre off. Cairo tells a new place when the font's size
+// changes, so each word has a size that differs from that of the one before by no more than this.
+constexpr double kTwin = 1.0 + 0x1p-50;
+
 // Where letters stand side by side along the page's edge, as their font says, a reader joins them
 // to words by their places. Of others it would make words of one letter.
 bool areJoinedByPlace(PlotGlyph const& glyph) {
@@ -63,7 +69,7 @@ bool isBlank(std::string_view text) {
 
 // Which characters the glyphs stand for: each glyph for its own, or those of a word for all of it.
 std::vector<cairo_text_cluster_t> clustersOf(AlikeGlyphs const& glyphs) {
-    bool const keepsWords = !areJoinedByPlace(glyphs.front());
+    bool const keepsWords = !glyphs.front().rightToLeft && !areJoinedByPlace(glyphs.front());
     bool isInWord = false;
     std::vector<cairo_text_cluster_t> clusters;
     for (PlotGlyph const& each : glyphs) {
@@ -74,8 +80,22 @@ std::vector<cairo_text_cluster_t> clustersOf(AlikeGlyphs const& glyphs) {
         if (each.glyph != PANGO_GLYPH_EMPTY) ++clusters.back().num_glyphs;
         isInWord = isOfWord;
     }
-    if (glyphs.front().rightToLeft) std::reverse(clusters.begin(), clusters.end());
     return clusters;
+}
+
+// The glyphs of each word, with the blanks to the right of it, in the order of reading. Those of a
+// word stand from left to right: readers turn the letters of Hebrew and Arabic round themselves.
+std::vector<AlikeGlyphs> wordsIn(AlikeGlyphs const& glyphs) {
+    std::vector<AlikeGlyphs> words;
+    bool isAfterBlank = true;
+    for (PlotGlyph const& each : glyphs) {
+        if (isAfterBlank && !isBlank(each.text)) words.emplace_back();
+        if (words.empty()) words.emplace_back();
+        words.back().push_back(each);
+        if (!each.text.empty()) isAfterBlank = isBlank(each.text);
+    }
+    if (glyphs.front().rightToLeft) std::reverse(words.begin(), words.end());
+    return words;
 }
 
 }  // namespace
@@ -117,24 +137,37 @@ bool TextPainter::canBeText(PlotGlyph const& glyph) {
 
 bool TextPainter::showAsText(AlikeGlyphs const& glyphs) {
     if (!canBeText(glyphs.front())) return false;
-    ScaledFont const font = fontOn(matrixOf(glyphs.front()), glyphs.front().font.get());
-    if (!font) return false;
-    std::string const text = wordsOf(glyphs);
+    cairo_matrix_t const matrix = matrixOf(glyphs.front());
+    cairo_matrix_t twin = matrix;
+    cairo_matrix_scale(&twin, kTwin, kTwin);
+    PangoFont* const font = glyphs.front().font.get();
+    std::array const fonts{fontOn(matrix, font), fontOn(twin, font)};
+    bool const areFinite = std::all_of(glyphs.begin(), glyphs.end(), [&](PlotGlyph const& each) {
+        LayoutPoint const at = sheet_.place(each.origin);
+        return std::isfinite(at.x) && std::isfinite(at.y);
+    });
+    if (!fonts[0] || !fonts[1] || !areFinite) return false;
+    for (AlikeGlyphs const& word : wordsIn(glyphs)) {
+        cairo_set_scaled_font(cairo_, fonts[words_++ % fonts.size()].get());
+        showWord(word);
+    }
+    return true;
+}
+
+void TextPainter::showWord(AlikeGlyphs const& word) {
+    std::string text;
     std::vector<cairo_glyph_t> placed;
-    for (PlotGlyph const& each : glyphs) {
+    for (PlotGlyph const& each : word) {
+        text += each.text;
         if (each.glyph == PANGO_GLYPH_EMPTY) continue;
         LayoutPoint const at = sheet_.place(each.origin);
-        if (!std::isfinite(at.x) || !std::isfinite(at.y)) return false;
         placed.push_back({each.glyph, at.x, at.y});
     }
-    std::vector<cairo_text_cluster_t> const clusters = clustersOf(glyphs);
-    cairo_set_scaled_font(cairo_, font.get());
+    std::vector<cairo_text_cluster_t> const clusters = clustersOf(word);
     cairo_show_text_glyphs(cairo_, text.data(), static_cast<int>(text.size()), placed.data(),
                            static_cast<int>(placed.size()), clusters.data(),
                            static_cast<int>(clusters.size()),
-                           glyphs.front().rightToLeft ? CAIRO_TEXT_CLUSTER_FLAG_BACKWARD
-                                                      : static_cast<cairo_text_cluster_flags_t>(0));
-    return true;
+                           static_cast<cairo_text_cluster_flags_t>(0));
 }
 
 void TextPainter::fillOutlines(AlikeGlyphs const& glyphs) {

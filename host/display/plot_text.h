@@ -2,6 +2,7 @@
 
 #include <cairo.h>
 
+#include <cstddef>
 #include <map>
 #include <set>
 #include <string>
@@ -30,6 +31,7 @@ public:
 
 private:
     [[nodiscard]] bool showAsText(AlikeGlyphs const& glyphs);
+    void showWord(AlikeGlyphs const& word);
     void fillOutlines(AlikeGlyphs const& glyphs);
     [[nodiscard]] bool canBeText(PlotGlyph const& glyph);
     // From Pango units to the page, without the glyph's place.
@@ -39,6 +41,7 @@ private:
     PlotSheet const& sheet_;
     std::set<std::string>& lockedFaces_;
     std::map<GlyphFont, bool> usable_;
+    std::size_t words_ = 0;  // shown so far
 };
 
 }  // namespace tzhost

@@ -89,13 +89,26 @@ std::string paint(char const* what, PlotColor const& color) {
     return result;
 }
 
+// The last two characters of Unicode's first plane, which XML has no room for.
+bool isBeyondXml(std::string_view bytes) {
+    return bytes.starts_with("\xEF\xBF\xBE") || bytes.starts_with("\xEF\xBF\xBF");
+}
+
 std::string escaped(std::string const& words) {
+    constexpr std::size_t kBytesBeyond = 3;
     std::string result;
-    for (char const c : words) {
-        switch (c) {
+    for (std::size_t i = 0; i < words.size(); ++i) {
+        switch (char const c = words[i]) {
         case '&': result += "&amp;"; break;
         case '<': result += "&lt;"; break;
         case '"': result += "&quot;"; break;
+        case '\xEF':
+            if (isBeyondXml(std::string_view(words).substr(i))) {
+                result += ' ';
+                i += kBytesBeyond - 1;
+                break;
+            }
+            [[fallthrough]];
         default: result += static_cast<unsigned char>(c) < ' ' ? ' ' : c;
         }
     }
@@ -211,7 +224,6 @@ void SvgWriter::closeLine() {
 
 void SvgWriter::addAlike(PlotShape const& letters, AlikeGlyphs const& glyphs) {
     PlotGlyph const& first = glyphs.front();
-    words_ += wordsOf(glyphs);
     LayoutPoint const start = sheet_.place(first.origin);
     double const area = first.along.x * first.down.y - first.along.y * first.down.x;
     if (!first.font || area == 0.0 || !std::isfinite(start.x) || !std::isfinite(start.y)) return;
@@ -239,6 +251,7 @@ void SvgWriter::addLetters(PlotShape const& letters) {
     double const gap = std::hypot(letters.from.x - last_.to.x, letters.from.y - last_.to.y);
     constexpr double kBlank = 0.2;  // text heights
     if (!words_.empty() && gap > kBlank * letters.letterHeight) words_ += ' ';
+    words_ += wordsOf(letters, sheet_);
     eachAlike(
         letters, sheet_, [](PlotGlyph const&) { return false; },
         [&](AlikeGlyphs const& glyphs) { addAlike(letters, glyphs); });

@@ -102,6 +102,7 @@ void Outliner::addItem(PangoItem const& item, Utf8Text const& utf8, PangoGlyphSt
             .substr(static_cast<std::size_t>(item.offset), static_cast<std::size_t>(item.length));
     for (int i = 0; i < glyphs.num_glyphs; ++i) {
         letter_.text = clusterAt(text, glyphs, i);
+        letter_.at = static_cast<std::size_t>(item.offset + glyphs.log_clusters[i]);
         addGlyph(glyphs.glyphs[i]);
     }
 }

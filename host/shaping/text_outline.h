@@ -42,6 +42,7 @@ struct OutlinedLetter {
     // The characters that this glyph and those after it stand for, in UTF-8; empty for a glyph that
     // belongs to the one before it.
     std::string text;
+    std::size_t at = 0;        // where in the run's UTF-8 they stand
     bool rightToLeft = false;  // the letters are read from the last to the first
     bool spread = false;       // they stand further apart or closer together than the font says
 };

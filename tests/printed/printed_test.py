@@ -4,6 +4,7 @@ on a raster of pdftoppm, and the words of each example."""
 import json
 import os
 import re
+import shutil
 import subprocess
 import unittest
 import xml.etree.ElementTree as xml
@@ -22,7 +23,9 @@ def run(*command):
 
 
 def tzdraft(*arguments):
-    run(TZDRAFT, "--module", MODULE, *arguments)
+    """What it said on standard error."""
+    return subprocess.run((TZDRAFT, "--module", MODULE, *arguments), check=True, text=True,
+                          capture_output=True, stdin=subprocess.DEVNULL, timeout=120).stderr
 
 
 def played(example):
@@ -166,6 +169,84 @@ class Examples(unittest.TestCase):
                                        if each["space"] == "model"]
                 spoken = "\n".join(filter(None, labels))
                 self.assertEqual(list(self.lost(drawing, spoken)), [], "in the SVG")
+
+
+class Letters(unittest.TestCase):
+    """Texts that a plot could lose, each on a line of its own."""
+    # Style, text, what a reader finds in the PDF, and the label in the SVG.
+    ROWS = (
+        ("Hebrew", "\u05e9\u05dc\u05d5\u05dd \u05e2\u05d5", "\u05e9\u05dc\u05d5\u05dd", None),
+        ("Latin", "of \u05d0\u05d1 7 fi", "fi", "of \u05d0\u05d1 7 fi"),
+        ("Latin", "office e\u0301tude", "office e\u0301tude", None),
+        ("Latin", "a\u0001b\uffff<&\">", None, 'a b <&">'),
+        ("Backward", "Mirrored words", "Mirrored", None),
+        ("Locked", "No embedding", None, None),
+        ("Off", "Hidden", None, None),
+    )
+    REMARK = "Lockedface Sans: may not be embedded, its letters are outlines"
+
+    @classmethod
+    def setUpClass(cls):
+        cls.lock_a_face()
+        styles = [{"name": style, "typeface": face, "backward": style == "Backward"}
+                  for style, face in (("Latin", "DejaVu Sans"), ("Hebrew", "Noto Sans Hebrew"),
+                                      ("Locked", "Lockedface Sans"), ("Backward", "DejaVu Sans"))]
+        texts = [{"type": "TEXT", "style": "Latin" if style == "Off" else style, "text": text,
+                  "layer": "Off" if style == "Off" else "0", "position": [0, -4 * line, 0]}
+                 for line, (style, text, _, _) in enumerate(cls.ROWS)]
+        long_line = {"type": "TEXT", "style": "Latin", "position": [0, 9, 0], "textHeight": 2.5,
+                     "text": "a line of letters " * 9 + "ends", "space": "paper"}
+        hidden = {"type": "TEXT", "text": "Alone", "space": "paper", "visible": False}
+        drawing = {"format": "tz-drawing", "version": 1, "textStyles": styles,
+                   "layers": [{"name": "Off", "off": True}], "entities": [*texts, hidden]}
+        (SCRATCH / "texts.json").write_text(json.dumps(drawing))
+        drawing["entities"] = [long_line]
+        (SCRATCH / "long.json").write_text(json.dumps(drawing))
+
+    @classmethod
+    def lock_a_face(cls):
+        """A copy of a face whose makers do not let it be embedded, among the fonts of the test."""
+        shown = os.environ["FONTCONFIG_FILE"]
+        face = Path(shown).parent / "files/LiberationSans-Regular.ttf"
+        font = bytearray(face.read_bytes())
+        for code in ("ascii", "utf-16-be"):
+            font = font.replace("Liberation Sans".encode(code), "Lockedface Sans".encode(code))
+        tables = (font[at:at + 16] for at in range(12, 12 + 16 * font[5], 16))
+        start = next(int.from_bytes(table[8:12]) for table in tables if table[:4] == b"OS/2")
+        font[start + 8:start + 10] = (2).to_bytes(2)
+        shutil.rmtree(SCRATCH / "fonts", ignore_errors=True)
+        (SCRATCH / "fonts").mkdir()
+        (SCRATCH / "fonts/locked.ttf").write_bytes(font)
+        conf = Path(shown).read_text().replace("<dir>", f"<dir>{SCRATCH / 'fonts'}</dir><dir>", 1)
+        (SCRATCH / "fonts.conf").write_text(conf)
+        os.environ["FONTCONFIG_FILE"] = str(SCRATCH / "fonts.conf")
+        cls.addClassCleanup(os.environ.update, FONTCONFIG_FILE=shown)
+
+    def test_are_found(self):
+        pdf, svg = SCRATCH / "texts.pdf", SCRATCH / "texts.svg"
+        said = tzdraft(SCRATCH / "texts.json", "--pdf", pdf, "--space", "all")
+        tzdraft(SCRATCH / "texts.json", "--svg", svg)
+        self.assertEqual(said, f"tzdraft: {pdf}: {self.REMARK}\n")
+        page = re.sub("[\u202a-\u202e]", "", run("pdftotext", "-raw", pdf, "-"))
+        self.assertEqual(page.count("\f"), 1, "no page for what is hidden")
+        labels = [group.get("aria-label") for group in xml.parse(svg).iter()]
+        for style, text, found, label in self.ROWS:
+            if found:
+                self.assertIn(found, page)
+            if style == "Off":
+                self.assertNotIn(text, page)
+            self.assertEqual((label or text) in labels, style != "Off", labels)
+
+    def test_end_a_long_line_in_their_place(self):
+        saved, pdf = SCRATCH / "measured.json", SCRATCH / "long.pdf"
+        tzdraft(SCRATCH / "long.json", "--space", "paper", "--paper", "A3", "--scale", "1:1",
+                "--script", "/dev/null", "--save", saved, "--pdf", pdf)
+        measured = json.loads(saved.read_text())["entities"][0]["measured"]
+        words = run("pdftotext", "-bbox", pdf, "-")
+        left, = re.findall('xMin="(.*)" yMin.*>a<', words)[:1]
+        right, = re.findall('xMax="(.*)" yMax.*>ends<', words)
+        width = measured["upperRight"][0] - measured["lowerLeft"][0]
+        self.assertLess(abs((float(right) - float(left)) * POINT - width), WITHIN / 4)
 
 
 if __name__ == "__main__":
