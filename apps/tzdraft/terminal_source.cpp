@@ -10,6 +10,7 @@
 #include <utility>
 
 #include "apps/tzdraft/completion.h"
+#include "apps/tzdraft/terminal_keys.h"
 #include "host/files/install_paths.h"
 #include "host/text/utf8.h"
 #include "host/text/visible_text.h"
@@ -113,6 +114,7 @@ void TerminalSource::Editor::bindKeys() {
     el_wset(line_, EL_BIND, L"^D", L"tz-leave", nullptr);
     el_wset(line_, EL_BIND, L"\t", L"tz-complete", nullptr);
     el_wset(line_, EL_BIND, L"^R", L"em-inc-search-prev", nullptr);
+    bindTerminalKeys(line_);
 }
 
 TerminalSource::Editor::~Editor() {

@@ -140,6 +140,8 @@ KeysCase const kCases[] = {
     // The next answer used to lose its first character.
     {"EscapeCancels", {kIdle, "CIRCLE\r", kCenter, "1,2\x1b"}, "^C\r\nCommand: ", 0, kNone},
     {"ArrowsRecall", {kIdle, "CIRCLE\r", kCenter, "\x03", kIdle, "\x1b[A\r"}, kCenter, 0, kNone},
+    // They used to leave "~", "5~" and "5D" in the line.
+    {"KeysOfNoUse", {kIdle, "CLE\x1b[5~\x1b[15;5~\x1b[1;5DCIR\r"}, kCenter, 0, kNone},
     {"BlanksAroundACommand", {kIdle, " CIRCLE \r"}, kCenter, 0, kNone},
     {"AnswersAfterACommand", {kIdle, "circle 0,0\r"}, "Near it is CIRCLE.", 0, kNone},
     {"PointsInADrag", {kIdle, "MTEXT\r", kFirst, "0;0\r"}, "@x,y or @length<angle", 0, kNone},
