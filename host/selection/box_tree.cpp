@@ -4,6 +4,7 @@
 #include <cmath>
 #include <iterator>
 
+#include "host/database/object_list.h"
 #include "host/display/record_access.h"
 #include "host/selection/entity_list.h"
 #include "tz/db/block_table.h"
@@ -37,9 +38,22 @@ std::optional<BoxTree::Leaf> BoxTree::leafOf(Entry const& entry, TzDbObjectRecor
                 {&item, entry.place});
 }
 
+// Blocks that are no longer shown stay noted, which costs a tree at most.
+void BoxTree::noteBlocks(TzDbObjectRecord const& item) {
+    std::vector<TzDbObjectRecord const*> open{&item};
+    while (!open.empty()) {
+        auto const* const reference = dynamic_cast<TzDbBlockReference const*>(open.back()->object);
+        open.pop_back();
+        TzDbObjectRecord const* const block =
+            reference ? reference->blockTableRecord().record() : nullptr;
+        ObjectList const* const list = block ? listOf(*block) : nullptr;
+        if (list == nullptr || !blocks_.insert(block).second) continue;
+        open.insert(open.end(), list->items.begin(), list->items.end());
+    }
+}
+
 void BoxTree::list(TzDbObjectRecord& item) {
     entries_[&item] = {++lastPlace_, std::nullopt};
-    hasReferences_ = hasReferences_ || isA(item, TzDbBlockReference::desc());
 }
 
 void BoxTree::takeOut(Entry const& entry, TzDbObjectRecord& item) {
@@ -60,6 +74,7 @@ void BoxTree::renew(TzDbObjectRecord& item) {
     Entry& entry = at->second;
     takeOut(entry, item);
     entry.box = boxOf(item);
+    noteBlocks(item);
     if (auto const leaf = leafOf(entry, item)) {
         tree_.insert(*leaf);
     } else if (entry.box) {
@@ -73,6 +88,7 @@ void BoxTree::build(std::vector<TzDbObjectRecord*> const& items) {
         list(*item);
         Entry& entry = entries_[item];
         entry.box = boxOf(*item);
+        noteBlocks(*item);
         if (auto const leaf = leafOf(entry, *item)) {
             leaves.push_back(*leaf);
         } else if (entry.box) {
@@ -90,7 +106,7 @@ BoxTree::Reach BoxTree::reachOf(TzDbObjectRecord* changed, TzDbObjectRecord*& it
         if (item->owner == &owner_) return Reach::item;
         if (item->object == nullptr) return Reach::all;  // deleted: nobody knows what it was
         if (isA(*item, TzDbBlockTableRecord::desc()))
-            return hasReferences_ ? Reach::all : Reach::none;
+            return blocks_.contains(item) ? Reach::all : Reach::none;
         if (isA(*item, TzDbSymbolTableRecord::desc())) return Reach::all;
     }
     return Reach::none;

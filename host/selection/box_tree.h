@@ -20,9 +20,10 @@ namespace tzhost {
 //
 // It always names what a walk over the list would find. A box follows from the values of its item
 // and of what that owns, which the journal names when they change; from layers, styles and the
-// content of blocks, whose changes make the tree begin anew; and from the user system and the place
-// of the list, which belong to the tree. System variables have no part in it. All points of an
-// outline are finite and lie in its box, so what an outline touches or lies within meets that box.
+// content of the blocks that references show, whose changes make the tree begin anew; and from the
+// user system and the place of the list, which belong to the tree. System variables have no part in
+// it. All points of an outline are finite and lie in its box, so what an outline touches or lies
+// within meets that box.
 class BoxTree {
 public:
     BoxTree(TzDbObjectRecord const& owner, TzGeMatrix3d const& placed)
@@ -37,7 +38,7 @@ public:
     [[nodiscard]] std::optional<std::vector<TzDbObjectRecord*>> itemsIn(FlatBox const& box) const;
     // Whether the box of an item of the tree holds a point, as Outline::boxHolds says.
     [[nodiscard]] bool boxHolds(TzDbObjectRecord* item, TzGePoint2d const& point) const;
-    // How many items it keeps, about 150 bytes each.
+    // How many items it keeps, about 200 bytes each.
     [[nodiscard]] std::size_t size() const { return entries_.size(); }
 
 private:
@@ -60,6 +61,7 @@ private:
     // The item that a changed object belongs to; null with what it means for all of them.
     enum class Reach { item, none, all };
     [[nodiscard]] Reach reachOf(TzDbObjectRecord* changed, TzDbObjectRecord*& item) const;
+    void noteBlocks(TzDbObjectRecord const& item);
     void list(TzDbObjectRecord& item);
     void unlist(TzDbObjectRecord& item);
     // An item as the tree keeps it, in a slightly larger box; nothing when it lies nowhere or is
@@ -75,7 +77,7 @@ private:
     std::unordered_set<TzDbObjectRecord*> boundless_;  // met by every box
     Tree tree_;
     std::uint64_t lastPlace_ = 0;
-    bool hasReferences_ = false;
+    std::unordered_set<TzDbObjectRecord const*> blocks_;  // that references show, in others too
 };
 
 }  // namespace tzhost

@@ -109,8 +109,11 @@ protected:
         TzGeVector3d const by(coordinate() - 10, 1, 0);
         // Most changes leave the index standing.
         switch (below(4) > 0 ? below(9) : 9 + below(10)) {
-        case 0: return add(newLine());
-        case 1: return add(newReference(inner_));
+        case 0: return add(newLine(), below(2) == 0 ? kModelSpaceName : newest_.c_str());
+        case 1:
+            if (below(2) == 0) return add(newReference(inner_));
+            newest_ = L"N" + std::to_wstring(entities_.size());
+            return add(newReference(drawing_.addBlock(newest_.c_str())));
         case 2:
             return change<TzDbEntity>(id, [](auto& each) { (void)each.erase(!each.isErased()); });
         case 3:
@@ -198,13 +201,14 @@ protected:
                  huge_ = drawing_.addBlock(L"D"), layer_, style_;
     TzDbObjectId plain_ = drawing_.drawing().clayer(), standard_ = drawing_.drawing().textstyle();
     std::string hugeReference_;
+    std::wstring newest_ = L"C";  // block
     std::vector<std::string> entities_;
     std::mt19937 random_{11};
 };
 
 TEST_F(BoxIndexes, FindWhatAWalkFinds) {
     auto& log = drawing_.drawing().undoLog();
-    for (int turn = 0; turn < 600; ++turn) {
+    for (int turn = 0; turn < 250; ++turn) {
         TzGePoint3d const at = place();
         (void)found(at);  // the index is there now
         (void)foundInside(at);
