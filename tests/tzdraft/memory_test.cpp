@@ -113,6 +113,20 @@ TEST_P(ShortMemory, IsSaid) {
     EXPECT_LE(std::count(run.errors.begin(), run.errors.end(), '\n'), 1) << run.errors;
 }
 
+TEST(ShortMemory, NamesSettingsThatDoNotFit) {
+#ifdef __SANITIZE_ADDRESS__
+    GTEST_SKIP() << "the sanitizer needs the memory that is left out here";
+#endif
+    std::string const long30 = "{\"textEditor\": \"" + std::string(30'000'000, 'a') + "\"}";
+    std::filesystem::path const file = scratch("short.settings", long30);
+    tztest::ProgramRun const run = tztest::startProgram(
+        "--script /dev/null --settings " + file.string(), "ulimit -v 150000; ");
+    std::filesystem::remove(file);
+    EXPECT_EQ(run.status, 2);
+    EXPECT_EQ(run.errors,
+              "tzdraft: --settings " + file.string() + ": cannot be read: memory ran short\n");
+}
+
 INSTANTIATE_TEST_SUITE_P(Rows, ShortMemory, testing::ValuesIn(kShortRows), [](auto const& row) {
     return row.param.name;
 });
