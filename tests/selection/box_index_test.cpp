@@ -90,11 +90,12 @@ protected:
         return definition;
     }
     void addAttribute(TzDbBlockReference& reference) {
-        auto* const attribute = new TzDbAttribute;
+        auto attribute = std::make_unique<TzDbAttribute>();
         (void)attribute->setPosition(place());
         (void)attribute->setTextString(L"WW");
         TzDbObjectId id;
-        if (reference.appendAttribute(id, attribute) == Tzad::eOk) (void)attribute->close();
+        if (reference.appendAttribute(id, attribute.get()) == Tzad::eOk)
+            (void)attribute.release()->close();
         entities_.push_back(OpenDrawing::handle(id));
     }
     template <class Object, class Change>

@@ -31,15 +31,16 @@ public:
         setWorkingDrawing(nullptr);
     }
 
-    // Adds an entity to a block; its handle.
+    // Adds an entity to a block; its handle, "0" when the block is not there.
     std::string add(TzDbEntity* entity, wchar_t const* block = kModelSpaceName) {
+        std::unique_ptr<TzDbEntity> owned(entity);
         TzDbBlockTable* table = nullptr;
         TzDbBlockTableRecord* record = nullptr;
         TzDbObjectId id;
         if (drawing_->getBlockTable(table, TzDb::kForRead) != Tzad::eOk) return "no table";
         if (table->getAt(block, record, TzDb::kForWrite) == Tzad::eOk) {
             if (record->appendTzDbEntity(id, entity) == Tzad::eOk) {
-                EXPECT_EQ(entity->close(), Tzad::eOk);
+                EXPECT_EQ(owned.release()->close(), Tzad::eOk);
             }
             EXPECT_EQ(record->close(), Tzad::eOk);
         }
