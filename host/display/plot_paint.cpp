@@ -127,7 +127,7 @@ void Painter::paint(PlotShape const& shape) {
     PlotColor const& color = shape.color;
     cairo_set_source_rgba(cairo_, color.red, color.green, color.blue, color.alpha);
     bool const isBaseline = isTooSmall(sheet_, shape);
-    if (text_ && !shape.glyphs.empty() && !isBaseline) return text_->show(shape);
+    if (text_ && isText(sheet_, shape)) return text_->show(shape);
     auto const path = placedPath(sheet_, isBaseline ? baselineOf(shape) : shape.path);
     if (!path) return;
     if (shape.kind == PlotKind::stroke || isBaseline) return stroke(shape, *path);

@@ -62,6 +62,12 @@ bool isTooSmall(PlotSheet const& sheet, PlotShape const& shape) {
     return shape.letterHeight > 0.0 && shape.letterHeight * sheet.scale < kLeastLetter;
 }
 
+// Viewers count in numbers of limited size too, and show nothing of fonts of some metres.
+bool isText(PlotSheet const& sheet, PlotShape const& shape) {
+    bool const isOnPage = shape.letterHeight * sheet.scale <= std::max(sheet.width, sheet.height);
+    return !shape.glyphs.empty() && isOnPage && !isTooSmall(sheet, shape);
+}
+
 std::vector<OutlineStep> baselineOf(PlotShape const& letters) {
     return {{OutlineKind::move, {letters.from}}, {OutlineKind::line, {letters.to}}};
 }

@@ -39,7 +39,9 @@ struct PlotSheet {
 [[nodiscard]] std::optional<std::vector<OutlineStep>>
 placedPath(PlotSheet const& sheet, std::vector<OutlineStep> const& path);
 
-// Whether letters would vanish in the grid of a page, and the line that they show as then.
+// Whether a shape is letters that can stand on the page as text. Letters that would vanish in its
+// grid show as a line; of those larger than the page no more than a part of their outline shows.
+[[nodiscard]] bool isText(PlotSheet const& sheet, PlotShape const& shape);
 [[nodiscard]] bool isTooSmall(PlotSheet const& sheet, PlotShape const& shape);
 [[nodiscard]] std::vector<OutlineStep> baselineOf(PlotShape const& letters);
 

@@ -261,8 +261,7 @@ void SvgWriter::addLetters(PlotShape const& letters) {
 }
 
 void SvgWriter::add(PlotShape const& shape) {
-    bool const areLetters = !shape.glyphs.empty() && !isTooSmall(sheet_, shape);
-    if (areLetters) {
+    if (isText(sheet_, shape)) {
         addLetters(shape);
         return flush(kPart);
     }

@@ -237,6 +237,17 @@ class Letters(unittest.TestCase):
                 self.assertNotIn(text, page)
             self.assertEqual((label or text) in labels, style != "Off", labels)
 
+    def test_larger_than_the_page_show_their_part(self):
+        drawing = json.dumps({"format": "tz-drawing", "version": 1, "entities": [
+            {"type": "TEXT", "text": "H", "style": "Latin", "textHeight": 2}],
+            "textStyles": [{"name": "Latin", "typeface": "DejaVu Sans"}]})
+        (SCRATCH / "large.json").write_text(drawing)
+        pdf = SCRATCH / "large.pdf"
+        tzdraft(SCRATCH / "large.json", "--paper", "100x80", "--margin", "0",
+                "--window", "0.35,0.9,0.41,0.95", "--pdf", pdf)
+        run("pdftoppm", "-r", "40", "-gray", "-singlefile", pdf, SCRATCH / "large")
+        self.assertEqual((SCRATCH / "large.pgm").read_bytes()[-50 * 158 + 79], 0)
+
     def test_end_a_long_line_in_their_place(self):
         saved, pdf = SCRATCH / "measured.json", SCRATCH / "long.pdf"
         tzdraft(SCRATCH / "long.json", "--space", "paper", "--paper", "A3", "--scale", "1:1",
