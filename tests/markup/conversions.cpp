@@ -1,6 +1,7 @@
 #include "tests/markup/conversions.h"
 
 #include <cstdlib>
+#include <utility>
 
 #include "host/fonts/font_map_path.h"
 
@@ -19,7 +20,9 @@ OwnFontMap::~OwnFontMap() {
 
 CStdStrW Conversions::roundTrip(std::wstring const& markup) {
     WrittenRtf const document = session_.toRtf(markup);
-    return session_.toMarkup(document.rtf, document.found.wholeText).markup;
+    WrittenMarkup trip = session_.toMarkup(document.rtf, document.found.wholeText);
+    losses_ = std::move(trip.losses);
+    return std::move(trip.markup);
 }
 
 TextStart startOfTests() {

@@ -42,8 +42,11 @@ public:
     }
     // To rich text and back, with the whole-text values carried over as an editor does.
     [[nodiscard]] CStdStrW roundTrip(std::wstring const& markup);
+    // What the last round trip passed over.
+    [[nodiscard]] RtfLosses const& losses() const { return losses_; }
 
 private:
+    RtfLosses losses_;
     ConversionSession session_{startOfTests()};
 };
 

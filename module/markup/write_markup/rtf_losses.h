@@ -13,10 +13,14 @@ struct RtfLosses {
             if (count++ == 0) first = word;
         }
     };
-    Kind unknownWords;
+    Kind unknownWords;              // that say something about the text
     Kind texts;                     // of groups that an unknown word opens
     bool hasTextBehindEnd = false;  // behind a "}" that closes more than was opened
 };
+
+// Whether a document says something about its text by a word that the reader does not know. It does
+// not by the words of every document's head, nor by those of paragraphs.
+[[nodiscard]] bool isWordLost(std::wstring_view word, int value);
 
 // Whether the rest of a group that an unknown word opens holds text of the document. A few groups
 // hold names and numbers alone. `begin` and `end` lie in the group.

@@ -85,7 +85,7 @@ void CRichTextToMTextContext::onWord(wchar_t const*& cursor,
     wchar_t const* const rest = cursor;
     if (skipsDestination || isOpening) IgnoreToMatchingBrace(cursor);
     if (skipsDestination) return;  // the document says that this may be dropped
-    losses_.unknownWords.note(step.name);
+    if (isWordLost(step.name, step.value)) losses_.unknownWords.note(step.name);
     if (isOpening && isTextLost(step.name, rest, cursor)) losses_.texts.note(step.name);
 }
 
