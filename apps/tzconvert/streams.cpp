@@ -7,6 +7,7 @@
 #include "apps/tzconvert/text_codec.h"
 #include "host/files/file_bytes.h"
 #include "host/files/file_reader.h"
+#include "host/files/standard_streams.h"
 #include "host/text/visible_text.h"
 
 namespace tzconvert {
@@ -61,10 +62,7 @@ Failure readFile(Take take, std::string const& file, Content& content) {
 }
 
 Failure writeStandardOutput(std::string_view bytes) {
-    if (std::fwrite(bytes.data(), 1, bytes.size(), stdout) == bytes.size() &&
-        std::fflush(stdout) == 0) {
-        return {};
-    }
+    if (tzhost::writeStandardOutput(bytes)) return {};
     return localText("standard output") + ": " + tzhost::systemReason();
 }
 

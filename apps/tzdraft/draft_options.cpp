@@ -12,6 +12,7 @@
 #include "apps/tzdraft/page_options.h"
 #include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/version.h"
+#include "host/files/standard_streams.h"
 #include "host/page/page_text.h"
 #include "host/text/system_words.h"
 #include "host/text/visible_text.h"
@@ -89,9 +90,7 @@ void declare(CLI::App& app, Options& options) {
 
 // The exit status.
 int printAnswer(std::string const& text) {
-    bool const isWritten =
-        std::fwrite(text.data(), 1, text.size(), stdout) == text.size() && std::fflush(stdout) == 0;
-    if (isWritten) return kDone;
+    if (tzhost::writeStandardOutput(text)) return kDone;
     std::fprintf(stderr, "tzdraft: %s: %s\n", localText("standard output").c_str(),
                  tzhost::systemWords(errno).c_str());
     return kUnusable;

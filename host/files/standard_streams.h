@@ -12,7 +12,8 @@ void openStandardStreams();
 // What is printed to standard output from now on, by other programs too, goes to standard error:
 // standard output is for a result alone.
 void keepStandardOutput();
-// Writes to the standard output that the program was started with. False with errno.
+// Writes to the standard output that the program was started with, and at once. False with errno,
+// EBADF when the program was started without one.
 [[nodiscard]] bool writeStandardOutput(std::string_view bytes);
 
 }  // namespace tzhost

@@ -142,6 +142,7 @@ constexpr RunCase kRuns[] = {
     {"BoldNeedsFace", "to-rtf --bold", "a"sv, 2, "", "--font"},
     {"NoOutputDir", "to-rtf --output-dir nosuch/x in in", "a"sv, 2, "", "exist: nosuch/x"},
     {"TwoFiles", "to-rtf in in", "a"sv, 2, "", "--output-dir"},
+    {"OutputClosed", "to-rtf >&-", "a"sv, 2, "", "standard output: Bad file descriptor"},
     {"HeadWithoutText", "to-mtext --werror",
      "{\\rtf1\\ansi\\deflang1033\\viewkind4\\uc1\\deftab0\\pard\\fi8 a}"sv, 0, "~a", ""},
     {"MarkupThatIsLost", "to-rtf", "\\T2;\\T3;\\xa\\Sb;\\y{\\fNo|b0;c}"sv, 0, "~c}\\par }",

@@ -126,14 +126,17 @@ TEST(Results, AreWrittenWhenTheTranscriptCannotBe) {
     EXPECT_EQ(tztest::startProgram(words + " >/dev/full 2>&1 #").status, 1);
 }
 
-// The transcript used to go into the file that took the number of standard output.
+// The transcript used to go into the file that took the number of standard output, and a plot for
+// standard output nowhere. A device is no file that two results share.
 TEST(Results, StayApartFromStreamsThatAreClosed) {
-    auto const script = scratch("quit.scr", "QUIT\n");
+    std::string const words = "--script " + scratch("quit.scr", "QUIT\n").string();
     auto const events = scratch("closed.jsonl");
-    tztest::ProgramRun const run = tztest::startProgram(
-        "--script " + script.string() + " --events " + events.string() + " <&- >&- 2>&- #");
+    tztest::ProgramRun const run =
+        tztest::startProgram(words + " --events " +
+                             events.string() + " <&- >&- 2>&- #");
     EXPECT_EQ(run.status, 0);
     EXPECT_FALSE(tztest::eventsOf(events).empty());
+    EXPECT_EQ(tztest::startProgram(words + " --svg - >&- 2>&1 #").status, 2);
 }
 
 TEST(Results, ThatCanBeWrittenAreAndTheLineNamesThem) {
