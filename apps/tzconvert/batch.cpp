@@ -35,7 +35,7 @@ public:
     Batch(Options const& options, std::vector<Input> const& inputs)
         : options_(options), inputs_(inputs), places_(options, inputs) {}
 
-    [[nodiscard]] Failure checkReport() const { return places_.checkReport(); }
+    [[nodiscard]] Failure checkReport() { return places_.checkReport(); }
     // Converts all files, one after the other; the status.
     [[nodiscard]] int convertAll();
     [[nodiscard]] Failure writeReport() const;

@@ -3,12 +3,12 @@
 // Where results go, and what they may not take the place of.
 
 #include <string>
-#include <unordered_map>
 #include <unordered_set>
 
 #include "apps/tzconvert/inputs.h"
 #include "apps/tzconvert/options.h"
 #include "apps/tzconvert/streams.h"
+#include "host/files/real_paths.h"
 
 namespace tzconvert {
 
@@ -23,22 +23,18 @@ class Places {
 public:
     Places(Options const& options, std::vector<Input> const& inputs);
 
-    [[nodiscard]] Failure checkReport() const;
-    [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target) const;
+    [[nodiscard]] Failure checkReport();
+    [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target);
     // A result that is not made keeps no place.
     void keepTarget(std::string const& target);
     void dropTarget(std::string const& target);
 
 private:
-    using Place = std::string;  // the real path
-    [[nodiscard]] Place placeOf(std::string const& file) const;
-    [[nodiscard]] std::string const& realFolder(std::string const& folder) const;
-
     Options const& options_;
     std::vector<Input> const& files_;
-    std::unordered_set<Place> inputs_;
-    std::unordered_set<Place> targets_;                             // the results that were written
-    mutable std::unordered_map<std::string, std::string> folders_;  // real ones, looked up once
+    tzhost::RealPaths paths_;
+    std::unordered_set<std::string> inputs_;
+    std::unordered_set<std::string> targets_;  // the results that were written
 };
 
 }  // namespace tzconvert

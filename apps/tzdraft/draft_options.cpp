@@ -9,6 +9,7 @@
 #include "apps/options/local_help.h"
 #include "apps/options/option_list.h"
 #include "apps/options/usage.h"
+#include "apps/tzdraft/file_options.h"
 #include "apps/tzdraft/page_options.h"
 #include "apps/tzdraft/program_texts.h"
 #include "apps/tzdraft/version.h"
@@ -116,6 +117,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
     try {
         app.parse(count, arguments);
         checkPage(parsed.options);
+        checkFiles(parsed.options);
     } catch (CLI::Success const& asked) {  // --help, --version
         std::ostringstream text;
         app.exit(asked, text);

@@ -41,6 +41,15 @@ constexpr BadRow kUsage[] = {
     {"DotsBelowOne", "--dpi 0", 2, "--dpi: \"0\" is none"},
     {"OrientationTwice", "--portrait --landscape", 2, "--portrait excludes --landscape"},
     {"OutputOfTwo", "--svg - --pdf -", 2, "-: standard output takes one plot alone"},
+    {"ResultOverResult", "--save p.json --svg ./p.json", 2,
+     "--svg: ./p.json is the file of --save"},
+    {"ResultOverEvents", "--events p --png p", 2, "--events: p is the file of --png too"},
+    {"ResultOverDrawing", "p --save p --pdf p", 2, "--pdf: p is the file of DRAWING too"},
+    {"ResultOverScript", "--script p --save p", 2, "--save: p is the file of --script too"},
+    {"ResultOverFontMap", "--font-map p --save p", 2, "--save: p is the file of --font-map too"},
+    {"ResultOverSettings", "--settings p --pdf p", 2, "--pdf: p is the file of --settings too"},
+    {"DrawingToOutput", "--save -", 2, "--save: it does not go to standard output"},
+    {"EventsToOutput", "--events -", 2, "--events: it does not go to standard output"},
     {"PictureOfAllSpaces", "--space all --png a.png", 2, "--space: only a PDF has a page"},
 };
 

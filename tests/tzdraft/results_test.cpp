@@ -132,7 +132,7 @@ TEST(Results, StayApartFromStreamsThatAreClosed) {
     std::string const words = "--script " + scratch("quit.scr", "QUIT\n").string();
     auto const events = scratch("closed.jsonl");
     tztest::ProgramRun const run =
-        tztest::startProgram(words + " --events " +
+        tztest::startProgram(words + " --save /dev/null --png /dev/null --events " +
                              events.string() + " <&- >&- 2>&- #");
     EXPECT_EQ(run.status, 0);
     EXPECT_FALSE(tztest::eventsOf(events).empty());
