@@ -67,6 +67,16 @@ bool isPlotted(File const& file) {
     return isMade;
 }
 
+// Asks for a file until `isTaken`. A person leaves the question by an empty answer; a script that
+// has no name to give has failed.
+template <class Ask, class IsTaken>
+void askUntilTaken(Ask ask, IsTaken isTaken) {
+    Asked const asked = askUntil(ask, isTaken).asked;
+    tzhost::CommandLine& line = tzhost::commandLine();
+    if (asked == Asked::empty && !line.isPerson())
+        line.sayFailure(localText(L"the file name is empty"));
+}
+
 }  // namespace
 
 void newCommand() {
@@ -74,17 +84,17 @@ void newCommand() {
 }
 
 void openCommand() {
-    (void)askUntil([] { return askFile(localText(L"Drawing to open")); }, isOpened);
+    askUntilTaken([] { return askFile(localText(L"Drawing to open")); }, isOpened);
 }
 
 void saveCommand() {
     TzString const present =
         TzString::fromUtf8(ProgramSession::current().drawing().file().string());
-    (void)askUntil([&] { return askFile(localText(L"Save drawing as"), present); }, isSaved);
+    askUntilTaken([&] { return askFile(localText(L"Save drawing as"), present); }, isSaved);
 }
 
 void plotCommand() {
-    (void)askUntil([] { return askFile(localText(L"File to plot to")); }, isPlotted);
+    askUntilTaken([] { return askFile(localText(L"File to plot to")); }, isPlotted);
 }
 
 void quitCommand() {
