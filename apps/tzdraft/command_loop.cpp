@@ -67,13 +67,19 @@ void CommandLoop::hook() {
 // A call is taken back as a command is.
 void CommandLoop::runCall(std::wstring const& line) {
     session_.beginCommand(line);
+    tzhost::commandLine().setVoice(tzhost::CommandLine::Voice::function);
     try {
         tzhost::runFunction([&] { callTyped(line); });
     } catch (...) {
-        session_.endCommand();
+        endCall();
         throw;
     }
+    endCall();
+}
+
+void CommandLoop::endCall() {
     session_.endCommand();
+    tzhost::commandLine().setVoice(tzhost::CommandLine::Voice::module);
 }
 
 void CommandLoop::runTyped(std::wstring const& line) {

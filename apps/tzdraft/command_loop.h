@@ -34,6 +34,7 @@ private:
     void runGuarded(std::wstring const& line);
     void runTyped(std::wstring const& line);
     void runCall(std::wstring const& line);
+    void endCall();
     void beginCommand(tzhost::Command const& command);
     void endCommand(tzhost::Command const& command);
 

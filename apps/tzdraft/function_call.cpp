@@ -34,21 +34,23 @@ Arguments textArgument(std::wstring_view text) {
     return argument;
 }
 
-Arguments entityArgument(std::wstring_view digits) {
-    auto const handle = tzhost::readHandle(tzhost::toUtf8(digits));
-    Arguments argument(handle ? tzutNewRb(Tzad::eResultEntityName) : nullptr);
-    if (!argument) return nullptr;
-    TzDbObjectId const id = ProgramSession::current().drawing().objectAt(*handle);
-    if (tzdbGetTzsName(argument->resval.rlname, id) != Tzad::eOk) return nullptr;
+Arguments entityArgument(TzDbObjectId id) {
+    Arguments argument(tzutNewRb(Tzad::eResultEntityName));
+    if (argument && tzdbGetTzsName(argument->resval.rlname, id) != Tzad::eOk) return nullptr;
     return argument;
 }
 
-// The one argument as the function gets it; null when it is neither an entity nor a text, and when
+// The one argument as the function gets it. Without one `problem` says why; that is so as well when
 // the host gives no record for it.
-Arguments readArgument(std::wstring_view text) {
+Arguments readArgument(std::wstring_view text, wchar_t const*& problem) {
+    problem = forLocalText(L"the argument is neither an entity (#2A) nor a text (\"...\")");
     bool const isText = text.size() >= 2 && text.front() == L'"' && text.back() == L'"';
     if (isText) return textArgument(text.substr(1, text.size() - 2));
-    return text.starts_with(L'#') ? entityArgument(text.substr(1)) : nullptr;
+    if (!text.starts_with(L'#')) return nullptr;
+    auto const handle = tzhost::readHandle(tzhost::toUtf8(text.substr(1)));
+    if (!handle) return nullptr;
+    problem = forLocalText(L"there is no such entity");
+    return entityArgument(ProgramSession::current().drawing().objectAt(*handle));
 }
 
 void complain(std::wstring_view call, wchar_t const* what) {
@@ -66,10 +68,9 @@ void callTyped(std::wstring_view line) {
     std::wstring const name(inside.substr(0, blank));
     Arguments arguments;
     if (blank != std::wstring_view::npos) {
-        arguments = readArgument(trimmed(inside.substr(blank)));
-        if (!arguments)
-            return complain(
-                whole, localText(L"the argument is neither an entity (#2A) nor a text (\"...\")"));
+        wchar_t const* problem = nullptr;
+        arguments = readArgument(trimmed(inside.substr(blank)), problem);
+        if (!arguments) return complain(whole, localText(problem));
     }
     int const status = tzhost::callFunction(TzString(name), arguments.get());
     if (status == -1) return complain(whole, localText(L"no module defines this function"));

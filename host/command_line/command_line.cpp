@@ -1,5 +1,6 @@
 #include "host/command_line/command_line.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "host/base/event_sink.h"
@@ -17,6 +18,11 @@ namespace {
 constexpr int kMostFailures = 100;
 constexpr wchar_t const* kIdlePrompt = forLocalText(L"Command: ");
 constexpr std::wstring_view kCancelEcho = L"^C";
+
+std::wstring_view withoutLineEnds(std::wstring_view text) {
+    text.remove_prefix(std::min(text.size(), text.find_first_not_of(L'\n')));
+    return text.substr(0, text.find_last_not_of(L'\n') + 1);
+}
 
 }  // namespace
 
@@ -60,10 +66,13 @@ void CommandLine::reset() {
 
 void CommandLine::print(std::wstring_view text) {
     if (text.empty()) return;
-    if (voice_ == Voice::module) {
+    if (voice_ != Voice::host) {
         reportEvent([&] { return Event{{"event", "print"}, {"text", toUtf8(text)}}; });
     }
-    transcript_.message(text);
+    std::wstring_view const words = withoutLineEnds(text);
+    if (voice_ != Voice::function || words.empty()) return transcript_.message(text);
+    transcript_.message(text, Shown::problem);
+    countProblem(words);
 }
 
 // It has lines of its own; a line end that its text begins with adds no empty one.
@@ -79,9 +88,13 @@ void CommandLine::complain(std::wstring const& text) {
 }
 
 // One thing went wrong; what follows from it is no news.
+void CommandLine::countProblem(std::wstring_view what) {
+    if (endsAtProblems_ && !isPerson() && !isStopped_) complain(place() + std::wstring(what));
+}
+
 void CommandLine::sayProblem(std::wstring_view what) {
     transcript_.problem(what);
-    if (endsAtProblems_ && !isPerson() && !isStopped_) complain(place() + std::wstring(what));
+    countProblem(what);
 }
 
 std::wstring CommandLine::place() const {

@@ -83,7 +83,8 @@ public:
     // with its place, and a failure of the session.
     void sayFailure(std::wstring const& what);
     // Who prints: what modules print are events, too, what the host's own commands print are not.
-    enum class Voice { module, host };
+    // A module's function that works prints nothing, so what it prints is what went wrong.
+    enum class Voice { module, function, host };
     void setVoice(Voice voice) { voice_ = voice; }
     void print(std::wstring_view text) override;
     // A message that waits for the user is a line of the host's own, and nobody waits.
@@ -117,6 +118,7 @@ private:
     void showAnswer(Answer const& answer);
     [[nodiscard]] bool mustEnd();
     void complain(std::wstring const& text);
+    void countProblem(std::wstring_view what);
     [[nodiscard]] std::wstring place() const;
     void endedInCommand(std::wstring const& where);
 

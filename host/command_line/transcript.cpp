@@ -25,8 +25,10 @@ void Transcript::show(Shown kind, std::wstring_view text) {
     if (screen_) screen_(kind, visible(text));
 }
 
+// A line that stands open where problems alone are shown is one of them.
 void Transcript::freshLine(Shown next) {
-    if (cursor_ == Cursor::inLine || cursor_ == Cursor::afterAnswer) show(next, L"\n");
+    Shown const kind = isQuiet_ ? Shown::problem : next;
+    if (cursor_ == Cursor::inLine || cursor_ == Cursor::afterAnswer) show(kind, L"\n");
     cursor_ = Cursor::lineStart;
 }
 
@@ -42,17 +44,16 @@ void Transcript::answer(std::wstring_view text) {
     cursor_ = isLineEmpty ? Cursor::belowAnswer : Cursor::afterAnswer;
 }
 
-void Transcript::message(std::wstring_view text) {
+void Transcript::message(std::wstring_view text, Shown kind) {
     if (text.empty()) return;
     if (cursor_ == Cursor::belowAnswer) {
         cursor_ = Cursor::lineStart;
-        show(Shown::message, withoutLineFeed(text));
+        show(kind, withoutLineFeed(text));
         return;
     }
-    if (cursor_ == Cursor::afterAnswer && text.front() != L'\n') freshLine(Shown::message);
+    if (cursor_ == Cursor::afterAnswer && text.front() != L'\n') freshLine(kind);
     bool const isBlankLine = text.find_first_not_of(L'\n') == std::wstring_view::npos;
-    show(Shown::message,
-         cursor_ == Cursor::lineStart && !isBlankLine ? withoutLineFeed(text) : text);
+    show(kind, cursor_ == Cursor::lineStart && !isBlankLine ? withoutLineFeed(text) : text);
 }
 
 void Transcript::wholeLine(Shown kind, std::wstring_view text) {

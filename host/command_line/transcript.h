@@ -38,8 +38,8 @@ public:
 
     void prompt(std::wstring_view text);
     void answer(std::wstring_view text);
-    // A text of a module, which may be a part of a line.
-    void message(std::wstring_view text);
+    // A text of a module, which may be a part of a line; as a problem when it says what went wrong.
+    void message(std::wstring_view text, Shown kind = Shown::message);
     // A whole line of the host's own.
     void line(std::wstring_view text);
     // A whole line of the host's own about what went wrong.

@@ -9,6 +9,7 @@
 #include "apps/tzdraft/commands/copying.h"
 #include "apps/tzdraft/commands/placing.h"
 #include "apps/tzdraft/commands/placing_drag.h"
+#include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/program_session.h"
@@ -17,7 +18,6 @@
 #include "host/command_line/command_line.h"
 #include "host/command_line/point_input.h"
 #include "host/database/user_system.h"
-#include "tz/ed/print.h"
 
 namespace tzdraft {
 namespace {
@@ -43,7 +43,7 @@ std::optional<Chosen> choose() {
 // An entity cannot be where its coordinates would not be finite.
 void tellStaying(std::ptrdiff_t count) {
     if (count > 0)
-        tzutPrintf(localText(L"\nObjects that cannot be there: %d.\n"), static_cast<int>(count));
+        tellProblem(localText(L"Objects that cannot be there: %d."), static_cast<int>(count));
 }
 
 void moveAll(Entities const& entities, TzGeMatrix3d const& placed) {
