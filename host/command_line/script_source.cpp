@@ -24,7 +24,6 @@ constexpr std::wstring_view kBlockEscape = L">>>>";
 
 constexpr std::size_t kMostBytes = 4 * (kLongestAnswer + 1);
 constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
-constexpr wchar_t const* kNotUtf8 = forLocalText(L"this line is not UTF-8");
 
 using Traits = std::istream::traits_type;
 
@@ -41,6 +40,20 @@ bool readBytes(std::streambuf& from, std::size_t most, std::string& bytes, bool&
     }
     if (!isCut && bytes.ends_with('\r')) bytes.pop_back();
     return true;
+}
+
+struct Fault {
+    std::size_t at;
+    wchar_t const* what;
+};
+
+// The first thing that no script holds. Names would end at a zero character.
+std::optional<Fault> faultIn(std::string_view bytes) {
+    std::size_t const bad = firstBadByte(bytes);
+    std::size_t const zero = bytes.substr(0, bad).find('\0');
+    if (zero != bytes.npos) return Fault{zero, forLocalText(L"this line holds a zero character")};
+    if (bad == kAllUtf8) return std::nullopt;
+    return Fault{bad, forLocalText(L"this line is not UTF-8")};
 }
 
 std::wstring_view withoutBlanksBehind(std::wstring_view text) {
@@ -69,11 +82,10 @@ std::unique_ptr<ScriptSource> ScriptSource::open(std::string const& file, std::s
         return nullptr;
     }
     std::string const text = whole.str();
-    std::size_t const bad = firstBadByte(text);
-    if (bad != kAllUtf8) {
-        auto const at = text.begin() + static_cast<std::ptrdiff_t>(bad);
+    if (auto const fault = faultIn(text)) {
+        auto const at = text.begin() + static_cast<std::ptrdiff_t>(fault->at);
         error = file + ":" + std::to_string(1 + std::count(text.begin(), at, '\n')) + ": " +
-                toUtf8(localText(kNotUtf8));
+                toUtf8(localText(fault->what));
         return nullptr;
     }
     return std::make_unique<ScriptSource>(text, file);
@@ -100,8 +112,8 @@ std::optional<ScriptSource::Line> ScriptSource::read(Length length) {
     if (line.number == 1 && bytes.starts_with(kByteOrderMark))
         bytes.erase(0, kByteOrderMark.size());
     if (line.isTooLong) return line;
-    if (firstBadByte(bytes) != kAllUtf8) {
-        fail(line.number, kNotUtf8);
+    if (auto const fault = faultIn(bytes)) {
+        fail(line.number, fault->what);
         return std::nullopt;
     }
     line.text = fromUtf8(bytes);

@@ -81,6 +81,11 @@ constexpr ScriptRow kScripts[] = {
      "left{} fault(script:2: this line is not UTF-8) end"},
     {"NotUtf8AtEditor", "\xFF\n<<<\na\n>>>\n", kPoint, "B",
      "left{} fault(script:1: this line is not UTF-8) end"},
+    {"ZeroCharacter",
+     {"a\nLI\0NE\nb\n", 10},
+     kPoint,
+     "",
+     "[a] fault(script:2: this line holds a zero character) end"},
     {"NotUtf8", "a\n\xFF\nb\n", kPoint, "", "[a] fault(script:2: this line is not UTF-8) end"},
 };
 
@@ -110,6 +115,9 @@ TEST(Scripts, AreCheckedWholeWhenOpened) {
     std::string error;
     EXPECT_EQ(ScriptSource::open("bad.txt", error), nullptr);
     EXPECT_EQ(error, "bad.txt:3: this line is not UTF-8");
+    std::ofstream("bad.txt") << "a\n" << '\0' << "\n\xFF\n";
+    EXPECT_EQ(ScriptSource::open("bad.txt", error), nullptr);
+    EXPECT_EQ(error, "bad.txt:2: this line holds a zero character");
     EXPECT_EQ(ScriptSource::open("missing.txt", error), nullptr);
     EXPECT_EQ(error, "missing.txt: the script cannot be read: No such file or directory");
     auto const source = ScriptSource::open("good.txt", error);
