@@ -118,6 +118,14 @@ void readVariable(ReadContext& context,
     values.emplace_back(row.name, *value);
 }
 
+void warnLeftOut(ReadContext& context,
+                 std::string_view name,
+                 JsonValue const& member,
+                 std::string const& why) {
+    context.warnings.push_back(std::to_string(member.line) + ": " + localText("member \"") +
+                               "variables." + std::string(name) + why);
+}
+
 }  // namespace
 
 void readLayers(ReadContext& context, JsonValue const& list) {
@@ -136,16 +144,21 @@ void readTextStyles(ReadContext& context, JsonValue const& list) {
 }
 
 void readVariables(ReadContext& context, JsonValue const& object, Variables::Values& values) {
+    std::set<VariableDefinition const*> seen;
     for (auto const& [name, member] : object.members) {
         VariableDefinition const* const row = findVariable(fromUtf8(name));
-        if (!row) {
+        if (row && !seen.insert(row).second) {
+            context.complain(member.line, "variables." + std::string(name),
+                             localText("stands twice, expected each member once"));
+        } else if (!row) {
             std::string json;
             writeValue(json, member);
             context.drawing.unknown.push_back({"variables", std::string(name), std::move(json)});
         } else if (row->kept != KeptIn::drawing) {
-            context.warnings.push_back(std::to_string(member.line) + ": " + localText("member \"") +
-                                       "variables." + std::string(name) +
-                                       localText("\": a drawing does not decide it, left out"));
+            warnLeftOut(context, name, member,
+                        localText("\": a drawing does not decide it, left out"));
+        } else if (row->name == L"TEXTSTYLE") {
+            warnLeftOut(context, name, member, localText("\": currentTextStyle has it, left out"));
         } else {
             readVariable(context, *row, name, member, values);
         }

@@ -133,6 +133,9 @@ void Reader::variables(JsonValue const& value, std::string const& path) {
         if (auto const complaint = row->complaintAbout(read)) {
             return fail(held, here, toUtf8(*complaint));
         }
+        auto const isSame = [&](auto const& each) { return each.first == row->name; };
+        if (std::ranges::any_of(result_.settings.variables, isSame))
+            return fail(held, here, localText("stands twice, expected each member once"));
         result_.settings.variables.emplace_back(row->name, read);
     }
 }

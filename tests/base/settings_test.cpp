@@ -39,6 +39,8 @@ constexpr FaultRow kFaults[] = {
      "3: variables.NOSUCH: there is no such system variable"},
     {"DrawingVariable", "{\"variables\": {\"LUNITS\": 1}}",
      "1: variables.LUNITS: is not kept in the settings"},
+    {"VariableTwice", "{\"variables\": {\"DIALOGS\": 1, \"dialogs\": 0}}",
+     "1: variables.dialogs: stands twice, expected each member once"},
     {"VariableOutOfRange", "{\"variables\": {\"DIALOGS\": 2}}",
      "1: variables.DIALOGS: takes a whole number from 0 to 1"},
     {"VariableOfAnotherType", "{\"variables\": {\"DIALOGS\": \"1\"}}",

@@ -141,6 +141,8 @@ BadCase const kBad[] = {
      ":2: member \"variables.LUPREC\": is a text, expected a whole number"},
     {"VariableRange", ",\"variables\":{\"LUNITS\":9}}",
      ":1: member \"variables.LUNITS\": is outside its limits, expected a whole number from 1 to 5"},
+    {"VariableTwice", ",\"variables\":{\"TEXTSIZE\":3,\n\"textsize\":4}}",
+     ":2: member \"variables.textsize\": stands twice, expected each member once"},
     {"SlantedSystem", ",\"ucs\":{\"x\":[1,0,0],\"y\":[1,1,0]}}",
      ":1: member \"ucs.y\": stands at no right angle to x, expected one that does"},
     {"WorkingAngle", ",\"workingAngle\":\"0\"}",
@@ -198,12 +200,14 @@ TEST(DrawingFiles, VariablesOfTheUserAreLeftOut) {
     auto const file = scratch("user.json");
     writeBytes(file,
                "{\"format\":\"tz-drawing\",\"version\":1,\"variables\":{\n\"MTEXTED\":\"evil\",\n"
-               "\"TEXTSIZE\":3}}");
+               "\"TEXTSIZE\":3,\n\"TEXTSTYLE\":\"A\"}}");
     tzhost::DrawingRead const read = tzhost::readDrawing(file);
     ASSERT_TRUE(read.drawing) << read.error;
-    ASSERT_EQ(read.warnings.size(), 1U);
+    ASSERT_EQ(read.warnings.size(), 2U);
     EXPECT_EQ(read.warnings[0], file.string() + ":2: member \"variables.MTEXTED\": a drawing does "
                                                 "not decide it, left out");
+    EXPECT_EQ(read.warnings[1], file.string() + ":4: member \"variables.TEXTSTYLE\": "
+                                                "currentTextStyle has it, left out");
     ASSERT_EQ(read.variables.size(), 1U);
     EXPECT_EQ(read.variables[0].first, L"TEXTSIZE");
 }
