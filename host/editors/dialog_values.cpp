@@ -79,6 +79,14 @@ std::wstring writeColor(TzCmColor const& color) {
                              : std::to_wstring(color.colorIndex());
 }
 
+// What a drawing file has in quotes may stand so here, too.
+std::wstring withoutQuotes(std::wstring_view text) {
+    if (!text.starts_with(L'"')) return std::wstring(text);
+    JsonDocument const document = readJson(toUtf8(text));
+    bool const isText = !document.failed && document.root.kind == JsonKind::text;
+    return isText ? fromUtf8(document.root.text) : std::wstring(text);
+}
+
 DialogChange readHeight(State const&, std::wstring_view text) {
     auto const height = readReal(text);
     if (!height || *height <= 0) return {};
@@ -116,7 +124,7 @@ bool isStyle(std::wstring const& name) {
 }
 
 DialogChange readStyle(State const&, std::wstring_view text) {
-    std::wstring name(text);
+    std::wstring const name = withoutQuotes(text);
     if (!isStyle(name)) return {};
     return [name](State& state) { state.SetStyle(name); };
 }
@@ -137,7 +145,7 @@ DialogChange readSpacingFactor(State const&, std::wstring_view text) {
 
 // The state has the colours of the layer and the block as they look.
 DialogChange readTextColor(State const& state, std::wstring_view text) {
-    auto const color = readColor(text);
+    auto const color = readColor(withoutQuotes(text));
     if (!color) return {};
     unsigned int const rgb = color->isByLayer()   ? state.GetByLayerColor()
                              : color->isByBlock() ? state.GetByBlockColor()
