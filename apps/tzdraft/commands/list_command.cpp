@@ -8,6 +8,7 @@
 #include "apps/tzdraft/program_texts.h"
 #include "host/settings/variables.h"
 #include "tz/db/block_table.h"
+#include "tz/db/extensions.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"
@@ -84,8 +85,18 @@ void listBackground(TzDbMText const& text) {
     std::wstring const color = text.useBackgroundColorOn() ? std::wstring(localText(L"as the page"))
                                                            : writeColor(text.backgroundFillColor());
     row(localText(L"background"),
-        TzString::formatted(localText(L"colour %ls, scale %ls"), color.c_str(),
-                            number(text.backgroundScaleFactor()).kwszPtr()));
+        TzString::formatted(localText(L"colour %ls, scale %ls, transparency %d"), color.c_str(),
+                            number(text.backgroundScaleFactor()).kwszPtr(),
+                            static_cast<int>(text.backgroundTransparency().percent())));
+}
+
+// Each is told where it is so.
+void listMarks(TzDbEntity const& text) {
+    auto* const scaled = tzrxQuery<TzDbAnnotativeObjectPE>(&text);
+    if (scaled && scaled->annotative(&text)) row(localText(L"annotative"), localText(L"yes"));
+    auto* const turned = tzrxQuery<TzDbPaperOrientationPE>(&text);
+    if (turned && turned->paperOrientation(&text))
+        row(localText(L"upright"), localText(L"on the sheet"));
 }
 
 void listMText(TzDbMText const& text) {
@@ -110,6 +121,7 @@ void listMText(TzDbMText const& text) {
     }
     listColumns(text);
     listBackground(text);
+    listMarks(text);
     row(localText(L"contents"), text.contents());
 }
 
@@ -124,6 +136,7 @@ void listText(TzDbText const& text) {
     row(localText(L"rotation"), angle(text.rotation()));
     row(localText(L"width factor"), number(text.widthFactor()));
     row(localText(L"oblique"), angle(text.oblique()));
+    listMarks(text);
     row(localText(L"text"), text.textString());
 }
 
