@@ -1,5 +1,7 @@
 #include "apps/options/usage.h"
 
+#include <algorithm>
+
 #include "host/text/filled.h"
 #include "host/text/local_text.h"
 
@@ -34,6 +36,18 @@ constexpr MessageRow kMessages[] = {
      forLocalText("%s: Directory is actually a file: %s")},
 };
 
+constexpr char const* kArguments[] = {forLocalText("FILE"), forLocalText("DRAWING")};
+
+// Arguments are called what the usage line calls them.
+std::string withLocalName(std::string const& problem) {
+    std::size_t const colon = std::min(problem.find(':'), problem.size());
+    for (char const* const name : kArguments) {
+        if (problem.substr(0, colon) == name)
+            return tzhost::localText(name) + problem.substr(colon);
+    }
+    return problem;
+}
+
 }  // namespace
 
 std::string problemWith(CLI::ParseError const& wrong) {
@@ -42,7 +56,7 @@ std::string problemWith(CLI::ParseError const& wrong) {
         if (auto const parts = tzhost::partsOf(wrong.what(), row.message))
             return tzhost::filled(tzhost::localText(row.said), *parts);
     }
-    return wrong.what();
+    return withLocalName(wrong.what());
 }
 
 }  // namespace tzapps

@@ -65,6 +65,7 @@ constexpr Row kRows[] = {
     {"Summary", "tzconvert to-rtf --output-dir . a1 - -", "\\\\x"},
 
     {"UnknownOption", "tzdraft --zzz1", ""},
+    {"EmptyDrawingName", "tzdraft ''", ""},
     {"EmptyFile", "tzdraft --save ''", ""},
     {"NoPaper", "tzdraft --paper x1", ""},
     {"NoScale", "tzdraft --scale x1", ""},
@@ -126,9 +127,9 @@ bool isLetter(char c) {
 // Names of commands, options, files and sizes are the same in both.
 std::set<std::string> wordsOf(std::string text) {
     static std::set<std::string> const kNames = {
-        "tzconvert", "tzdraft", "normalise", "FILE",   "RRGGBB", "RTF",     "JSON",  "PDF",
-        "LF",        "model",   "paper",     "letter", "legal",  "tabloid", "fit",   "mm",
-        "cm",        "in",      "ft",        "all",    "or",     "true",    "false", "null"};
+        "tzconvert", "tzdraft", "normalise", "RRGGBB", "RTF",     "JSON",  "PDF", "LF",
+        "model",     "paper",   "letter",    "legal",  "tabloid", "fit",   "mm",  "cm",
+        "in",        "ft",      "all",       "or",     "true",    "false", "null"};
     std::replace_if(
         text.begin(), text.end(), [](char c) { return std::strchr(",;:()\"?", c) != nullptr; },
         ' ');
