@@ -1,5 +1,7 @@
 #include "host/command_line/keyword_list.h"
 
+#include <algorithm>
+
 #include "host/runtime/words.h"
 #include "tz/text/string.h"
 
@@ -8,6 +10,8 @@ namespace tzhost {
 namespace {
 
 constexpr std::wstring_view kGlobalMark = L" _";
+// What words of prompts may hold and words of lists may not.
+constexpr std::wstring_view kShownOnly = L" =()";
 
 std::vector<std::wstring> wordsOf(std::wstring_view list) {
     Words const words = splitWords(list);
@@ -39,6 +43,13 @@ std::optional<int> findMeant(std::wstring_view answer, std::vector<std::wstring>
     return std::nullopt;
 }
 
+std::optional<int> findSame(std::wstring_view answer, std::vector<std::wstring> const& words) {
+    auto const found = std::ranges::find_if(
+        words, [answer](std::wstring const& word) { return isSameWord(answer, word); });
+    if (found == words.end()) return std::nullopt;
+    return static_cast<int>(found - words.begin());
+}
+
 }  // namespace
 
 std::optional<KeywordList> KeywordList::parse(std::wstring_view list) {
@@ -57,6 +68,14 @@ std::optional<int> KeywordList::match(std::wstring_view answer) const {
     if (answer.front() == L'_') return findMeant(answer.substr(1), globals_);
     auto const local = findMeant(answer, locals_);
     return local ? local : findMeant(answer, globals_);
+}
+
+std::optional<int> KeywordList::matchShown(std::wstring_view answer) const {
+    std::wstring word(answer);
+    std::erase_if(word, [](wchar_t c) { return kShownOnly.find(c) != kShownOnly.npos; });
+    if (word.size() == answer.size()) return std::nullopt;
+    auto const local = findSame(word, locals_);
+    return local ? local : findSame(word, globals_);
 }
 
 }  // namespace tzhost

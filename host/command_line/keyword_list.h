@@ -26,6 +26,9 @@ public:
     // that holds all of them, without regard to case. The first word wins, local words before
     // global.
     [[nodiscard]] std::optional<int> match(std::wstring_view answer) const;
+    // The index of the word that an answer is as a prompt shows it: with the blanks, equals signs
+    // and parentheses that a word in a list cannot hold ("Line spacing" for Linespacing).
+    [[nodiscard]] std::optional<int> matchShown(std::wstring_view answer) const;
 
     [[nodiscard]] bool isEmpty() const { return globals_.empty(); }
     [[nodiscard]] int count() const { return static_cast<int>(globals_.size()); }

@@ -88,7 +88,10 @@ Reply Question::replyTo(std::wstring_view answer, Reader const& read) {
             return Reply::refused(localText(L"An answer is needed."));
         return Reply::done(emptyStatus_);
     }
-    if (auto const index = armed_.words.match(answer)) {
+    // Where any text is an answer, a word with a blank in it is such a text.
+    auto index = armed_.words.match(answer);
+    if (!index && !armed_.has(Armed::kFreeText)) index = armed_.words.matchShown(answer);
+    if (index) {
         if (wordReader_) return wordReader_(*index);
         line_.leaveInput(armed_.words.global(*index));
         return Reply::done(Tzad::ePromptKeyword);

@@ -51,6 +51,15 @@ INSTANTIATE_TEST_SUITE_P(Answers, Keyword, testing::ValuesIn(kMatches), [](auto 
     return row.param.name;
 });
 
+// Only the whole word: a piece with blanks was hardly meant.
+TEST(KeywordLists, TakeWordsAsPromptsShowThem) {
+    auto const words = KeywordList::parse(L"Zeilenabstand Exakt _Linespacing Exactly");
+    for (wchar_t const* const answer : {L"line spacing", L"Line (spacing)", L"Zeilen abstand"})
+        EXPECT_EQ(words->matchShown(answer), 0) << answer;
+    for (wchar_t const* const answer : {L"Line sp", L"Linespacing", L"", L" "})
+        EXPECT_EQ(words->matchShown(answer), std::nullopt) << answer;
+}
+
 TEST(KeywordLists, MustBeEquallyLong) {
     EXPECT_FALSE(KeywordList::parse(L"One Two _One"));
     EXPECT_FALSE(KeywordList::parse(L"One _"));

@@ -91,9 +91,10 @@ class Sheets : public testing::TestWithParam<fs::path> {};
 
 TEST_P(Sheets, GiveTheirDrawing) {
     fs::path const saved = scratch("sheet.json");
-    tztest::ProgramRun const run = tztest::runProgram(played(
-        GetParam(), {"--save", saved.string(), "--svg", scratch("sheet.svg").string(), "--png",
-                     scratch("sheet.png").string(), "--events", scratch("sheet.jsonl").string()}));
+    tztest::ProgramRun const run = tztest::runProgram(
+        played(GetParam(), {"--strict", "--save", saved.string(), "--svg",
+                            scratch("sheet.svg").string(), "--png", scratch("sheet.png").string(),
+                            "--events", scratch("sheet.jsonl").string()}));
     ASSERT_EQ(run.status, 0) << run.output;
     EXPECT_EQ(run.errors, "");
 
