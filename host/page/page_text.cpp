@@ -60,7 +60,6 @@ char const* const kPapers =
 char const* const kScales = forLocalText("fit, or N:M with numbers above 0");
 char const* const kUnits = forLocalText("mm, cm, m, in or ft");
 char const* const kWindows = forLocalText("X1,Y1,X2,Y2, two opposite corners");
-char const* const kWindowsOrAll = forLocalText("X1,Y1,X2,Y2, two opposite corners, or all");
 
 std::optional<double> readPlainNumber(std::string_view text) {
     double value = 0.0;

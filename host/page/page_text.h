@@ -45,6 +45,5 @@ extern char const* const kPapers;
 extern char const* const kScales;
 extern char const* const kUnits;
 extern char const* const kWindows;
-extern char const* const kWindowsOrAll;
 
 }  // namespace tzhost

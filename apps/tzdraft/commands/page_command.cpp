@@ -1,3 +1,6 @@
+#include <optional>
+#include <string>
+
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/problem.h"
@@ -8,6 +11,22 @@
 
 namespace tzdraft {
 namespace {
+
+// A word that stands for no value: that of drawings and scripts, and that of the program's
+// language.
+struct NoValue {
+    char const* word;
+    wchar_t const* shown;
+};
+constexpr NoValue kFit{"fit", forLocalText(L"fit")};
+constexpr NoValue kAll{"all", forLocalText(L"all")};
+
+// Whether an answer is the second of the words, or the first with the mark of global words.
+bool isShownOrGlobal(NoValue const& nothing, std::string const& answer) {
+    TzString const text = TzString::fromUtf8(answer);
+    TzString const global = TzString::fromUtf8(std::string("_") + nothing.word);
+    return text.compareNoCase(localText(nothing.shown)) == 0 || text.compareNoCase(global) == 0;
+}
 
 // Asks for a text that `read` makes a value of. False when none was given.
 template <class Value, class Read>
@@ -30,6 +49,20 @@ bool askRead(wchar_t const* question,
     return askUntil(ask, accepts).asked == Asked::given;
 }
 
+// The same for a value that there may not be; `read` takes the first word of `nothing` for none.
+template <class Value, class Read>
+bool askReadOr(NoValue const& nothing,
+               wchar_t const* question,
+               char const* expected,
+               std::optional<Value>& value,
+               Read read) {
+    std::string const shown = TzString(localText(nothing.shown)).toUtf8();
+    return askRead(question, value ? nameOf(*value) : shown, expected, value,
+                   [&](std::string const& answer) {
+                       return read(isShownOrGlobal(nothing, answer) ? nothing.word : answer);
+                   });
+}
+
 bool liesOnItsSide(tzhost::Page const& page) {
     if (page.paper.name != tzhost::PaperName::custom) return page.landscape;
     return page.paper.width >= page.paper.height;
@@ -46,8 +79,9 @@ bool askOrientation(tzhost::Page& page) {
 }
 
 bool askScale(tzhost::Page& page) {
-    return askRead(localText(L"Scale, N:M or fit"), page.scale ? nameOf(*page.scale) : "fit",
-                   tzhost::kScales, page.scale, tzhost::readScaleOrFit);
+    return askReadOr(kFit, localText(L"Scale, N:M or fit"),
+                     forLocalText("N:M with numbers above 0, or fit"), page.scale,
+                     tzhost::readScaleOrFit);
 }
 
 bool askMargin(tzhost::Page& page) {
@@ -69,15 +103,15 @@ void pageCommand() {
     tzhost::Drawing& drawing = ProgramSession::current().drawing();
     tzhost::DrawingSettings settings = drawing.settings();
     tzhost::Page page = settings.page.value_or(tzhost::Page());
-    bool const isAnswered =
-        askRead(localText(L"Paper, such as A3 or 420x297"), nameOf(page.paper), tzhost::kPapers,
-                page.paper, tzhost::readPaper) &&
-        askOrientation(page) && askScale(page) &&
-        askRead(localText(L"What a drawing unit is"), nameOf(page.unit), tzhost::kUnits, page.unit,
-                tzhost::readUnit) &&
-        askMargin(page) &&
-        askRead(localText(L"Window X1,Y1,X2,Y2 or all"), page.window ? nameOf(*page.window) : "all",
-                tzhost::kWindowsOrAll, page.window, tzhost::readWindowOrAll);
+    bool const isAnswered = askRead(localText(L"Paper, such as A3 or 420x297"), nameOf(page.paper),
+                                    tzhost::kPapers, page.paper, tzhost::readPaper) &&
+                            askOrientation(page) && askScale(page) &&
+                            askRead(localText(L"What a drawing unit is"), nameOf(page.unit),
+                                    tzhost::kUnits, page.unit, tzhost::readUnit) &&
+                            askMargin(page) &&
+                            askReadOr(kAll, localText(L"Window X1,Y1,X2,Y2 or all"),
+                                      forLocalText("two opposite corners X1,Y1,X2,Y2, or all"),
+                                      page.window, tzhost::readWindowOrAll);
     if (!isAnswered) return;
     if (auto const problem = tzhost::problemOf(page)) {
         tellProblem(localText(L"The page stays as it was: %ls."),
