@@ -10,13 +10,14 @@ namespace {
 
 // The status of the question.
 int askValue(DialogValue const& row, CMTextEditorInterface const& state, DialogChanges& changes) {
-    std::wstring const prompt = std::wstring(row.name) + L" <" + row.shown(state) + L">: ";
+    wchar_t const* const name = localText(row.name);
+    std::wstring const prompt = std::wstring(name) + L" <" + row.shown(state) + L">: ";
     Question question(QuestionKind::string, prompt.c_str(), {});
     return question.ask([&](std::wstring_view answer) {
         DialogChange change = row.read(state, answer);
         if (!change) {
             return Reply::refused(
-                TzString::formatted(localText(L"That is no value for %ls, expected %ls."), row.name,
+                TzString::formatted(localText(L"That is no value for %ls, expected %ls."), name,
                                     localText(row.expected))
                     .str());
         }

@@ -236,24 +236,24 @@ std::wstring showBackground(State const& state) {
 }
 
 constexpr DialogValue kValues[] = {
-    {L"textHeight", forLocalText(L"a number above 0"),
+    {forLocalText(L"textHeight"), forLocalText(L"a number above 0"),
      [](State const& state) { return writeReal(state.GetNominalTextSize()); }, readHeight},
-    {L"attachment", forLocalText(L"1 to 9, from top left to bottom right"),
+    {forLocalText(L"attachment"), forLocalText(L"1 to 9, from top left to bottom right"),
      [](State const& state) { return std::to_wstring(state.GetAlignment()); }, readAttachment},
-    {L"width", forLocalText(L"a number, 0 or more"),
+    {forLocalText(L"width"), forLocalText(L"a number, 0 or more"),
      [](State const& state) { return writeReal(state.GetWidth()); }, readWidth},
-    {L"rotation", forLocalText(L"a number, in radians"),
+    {forLocalText(L"rotation"), forLocalText(L"a number, in radians"),
      [](State const& state) { return writeReal(state.GetRotation()); }, readRotation},
-    {L"style", forLocalText(L"the name of a text style"),
+    {forLocalText(L"style"), forLocalText(L"the name of a text style"),
      [](State const& state) -> std::wstring { return state.GetStyle(); }, readStyle},
-    {L"lineSpacingStyle", forLocalText(L"1 for at least or 2 for exactly"),
+    {forLocalText(L"lineSpacingStyle"), forLocalText(L"1 for at least or 2 for exactly"),
      [](State const& state) { return std::to_wstring(state.GetLineSpacingStyle()); },
      readSpacingStyle},
-    {L"lineSpacingFactor", forLocalText(L"a number from 0.25 to 4"),
+    {forLocalText(L"lineSpacingFactor"), forLocalText(L"a number from 0.25 to 4"),
      [](State const& state) { return writeReal(state.GetLineSpacingFactor()); }, readSpacingFactor},
-    {L"color", forLocalText(L"0 to 256 or #RRGGBB"), showTextColor, readTextColor},
-    {L"background", forLocalText(L"{\"fill\": true} or other members in braces"), showBackground,
-     readBackground},
+    {forLocalText(L"color"), forLocalText(L"0 to 256 or #RRGGBB"), showTextColor, readTextColor},
+    {forLocalText(L"background"), forLocalText(L"{\"fill\": true} or other members in braces"),
+     showBackground, readBackground},
 };
 
 }  // namespace

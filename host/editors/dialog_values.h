@@ -20,7 +20,7 @@ namespace tzhost {
 using DialogChange = std::function<void(CMTextEditorInterface&)>;
 
 struct DialogValue {
-    wchar_t const* name;
+    wchar_t const* name;      // as files have it; questions show its local text
     wchar_t const* expected;  // what a value is, to be looked up among the local texts
     std::wstring (*shown)(CMTextEditorInterface const& state);
     // What stores the value that the text says; empty when the text says none.

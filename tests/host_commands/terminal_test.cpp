@@ -268,6 +268,10 @@ constexpr CareCase kCare[] = {
      "rotation <0>: |\r|style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
      "textHeight <3>: |\r",
      "attachment <5>: "},
+    {"PropertiesInGerman",
+     "$--locale de --var MTEXTED=OLDEDITOR|: |_-MTEXT\r|: |0,0\r|: |9,-9\r|: |one\r|: |\r|"
+     ": |_MTPROP\r|: |#1\r|Texthöhe <0.2>: |0\r|Wert für Texthöhe, |\r|",
+     "Ausrichtung <1>: "},
     {"SelectionsAreCounted",
      "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
      "1 removed, 0 total|what\r",
