@@ -1,6 +1,7 @@
 #include "host/database/undo_log.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <utility>
 
 #include "host/base/memory_faults.h"
@@ -23,6 +24,15 @@ bool isLastPoint(std::size_t slot) {
         if (slot-- == 0) return row.name == L"LASTPOINT";
     }
     return false;
+}
+
+// Asks the processor for the first lines of its cache that values take, where most values lie.
+void fetchValues(TzDbObjectImp const* values) {
+    constexpr std::uintptr_t kLine = 64;
+    constexpr std::uintptr_t kLines = 3;
+    auto const start = reinterpret_cast<std::uintptr_t>(values);
+    for (std::uintptr_t line = 0; line < kLines; ++line)
+        __builtin_prefetch(reinterpret_cast<void const*>(start + line * kLine));
 }
 
 }  // namespace
@@ -61,11 +71,36 @@ void UndoLog::collectVariables() {
 // Values that were set to what they were, or there and back, and objects that came and went, are no
 // change that a drafter would take back.
 void UndoLog::dropUnchanged() {
-    std::erase_if(open_.entries, [](Entry const& entry) {
-        TzDbObjectRecord const& record = *entry.record;
-        if (record.erased != entry.erased) return false;
-        return !entry.values || TzDbObjectAccess::imp(*record.object)->isSameAs(*entry.values);
-    });
+    std::vector<Entry>& entries = open_.entries;
+    std::size_t kept = 0;
+    for (std::size_t at = 0; at < entries.size(); ++at) {
+        fetchAhead(entries, at);
+        if (entries[at].isUnchanged()) continue;
+        if (kept != at) entries[kept] = std::move(entries[at]);
+        ++kept;
+    }
+    entries.erase(entries.begin() + static_cast<std::ptrdiff_t>(kept), entries.end());
+}
+
+bool UndoLog::Entry::isUnchanged() const {
+    if (record->erased != erased) return false;
+    return !values || TzDbObjectAccess::imp(*record->object)->isSameAs(*values);
+}
+
+// The objects of a long step lie all over the memory, and the processor would wait for the record,
+// the object and both its values, one after the other. Each is asked for some entries before.
+void UndoLog::fetchAhead(std::vector<Entry> const& entries, std::size_t at) {
+    constexpr std::size_t kRecord = 16;
+    constexpr std::size_t kObject = 8;
+    constexpr std::size_t kValues = 4;
+    if (at + kRecord < entries.size()) __builtin_prefetch(entries[at + kRecord].record);
+    if (at + kObject < entries.size()) {
+        __builtin_prefetch(entries[at + kObject].record->object);
+        fetchValues(entries[at + kObject].values.get());
+    }
+    if (at + kValues >= entries.size()) return;
+    TzDbObject const* const object = entries[at + kValues].record->object;
+    if (object) fetchValues(TzDbObjectAccess::imp(*object));
 }
 
 // A command that only picked a point, such as LIST, is none that a drafter would take back.
@@ -139,8 +174,10 @@ void UndoLog::exchangeVariables(Step& step) {
 // the settings, which show their style in one of them.
 void UndoLog::exchange(Step& step) {
     std::reverse(step.entries.begin(), step.entries.end());
-    for (Entry& entry : step.entries)
-        exchange(entry);
+    for (std::size_t at = 0; at < step.entries.size(); ++at) {
+        fetchAhead(step.entries, at);
+        exchange(step.entries[at]);
+    }
     exchangeVariables(step);
     if (step.settings) {
         DrawingSettings const present = drawing_.settings();

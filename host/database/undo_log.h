@@ -61,6 +61,9 @@ private:
         TzDbObjectRecord* record;
         std::unique_ptr<TzDbObjectImp> values;  // null for an object that the step added
         bool erased;
+
+        // Whether the object is as it was.
+        [[nodiscard]] bool isUnchanged() const;
     };
     struct VariableChange {
         std::size_t slot;
@@ -84,6 +87,7 @@ private:
     void rememberBase();
     void collectVariables();
     void dropUnchanged();
+    static void fetchAhead(std::vector<Entry> const& entries, std::size_t at);
     bool pass(std::vector<Step>& from, std::vector<Step>& to);
     void exchange(Step& step);
     static void exchange(Entry& entry);

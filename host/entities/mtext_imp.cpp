@@ -21,13 +21,14 @@ std::unique_ptr<TzDbObjectImp> MTextImp::copy() const {
     return std::make_unique<MTextImp>(*this);
 }
 
+// The contents come last: they lie elsewhere in memory, and commands on many texts leave them.
 bool MTextImp::isSameAs(TzDbObjectImp const& other) const {
     return TextStyledImp::isSameAs(other) &&
-           agree(*this, static_cast<MTextImp const&>(other), &MTextImp::contents,
-                 &MTextImp::location, &MTextImp::normal, &MTextImp::direction,
-                 &MTextImp::textHeight, &MTextImp::width, &MTextImp::height,
+           agree(*this, static_cast<MTextImp const&>(other), &MTextImp::textHeight,
+                 &MTextImp::direction, &MTextImp::width, &MTextImp::height,
                  &MTextImp::lineSpacingFactor, &MTextImp::lineSpacingStyle, &MTextImp::attachment,
-                 &MTextImp::columns, &MTextImp::background);
+                 &MTextImp::location, &MTextImp::normal, &MTextImp::columns, &MTextImp::background,
+                 &MTextImp::contents);
 }
 
 void MTextImp::forgetComputed() {
