@@ -32,6 +32,17 @@ void appendEntities(EntityIds& ids, TzDbObjectId space) {
     }
 }
 
+// Null while no drawing is open.
+ObjectList const* listOfActiveSpace() {
+    Drawing const* const drawing = workingDrawing();
+    return drawing != nullptr ? listOf(*drawing->activeSpace().record()) : nullptr;
+}
+
+bool isSelectable(TzDbObjectRecord* record) {
+    TzDbEntity const* const entity = entityOf(TzDbObjectId(record));
+    return entity != nullptr && !isOnLayerOff(*entity);
+}
+
 }  // namespace
 
 KeptEntities::KeptEntities(EntityIds ids) : ids_(std::move(ids)) {
@@ -50,28 +61,20 @@ EntityIds KeptEntities::read() const {
 }
 
 EntityIds entitiesOfActiveSpace() {
-    EntityIds all;
-    if (Drawing const* const drawing = workingDrawing()) {
-        appendEntities(all, drawing->activeSpace());
-    }
     EntityIds ids;
-    for (TzDbObjectId const id : all) {
-        TzDbEntity const* const entity = entityOf(id);
-        if (entity != nullptr && !isOnLayerOff(*entity)) ids.append(id);
+    if (ObjectList const* const list = listOfActiveSpace()) {
+        for (TzDbObjectRecord* const record : list->items) {
+            if (isSelectable(record)) ids.append(TzDbObjectId(record));
+        }
     }
     return ids;
 }
 
 EntityIds newestEntity() {
     EntityIds newest;
-    Drawing const* const drawing = workingDrawing();
-    ObjectList const* const list = drawing ? listOf(*drawing->activeSpace().record()) : nullptr;
+    ObjectList const* const list = listOfActiveSpace();
     if (list == nullptr) return newest;
-    auto const at =
-        std::find_if(list->items.rbegin(), list->items.rend(), [](TzDbObjectRecord* record) {
-            TzDbEntity const* const entity = entityOf(TzDbObjectId(record));
-            return entity != nullptr && !isOnLayerOff(*entity);
-        });
+    auto const at = std::find_if(list->items.rbegin(), list->items.rend(), isSelectable);
     if (at != list->items.rend()) newest.append(TzDbObjectId(*at));
     return newest;
 }
