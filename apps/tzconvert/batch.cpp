@@ -45,7 +45,7 @@ public:
 private:
     // A result that waits to take its place.
     struct Waiting {
-        std::string target;
+        std::string place;
         FileReport report;
     };
 
@@ -105,7 +105,7 @@ int Batch::settle() {
     for (Failure const& failure : results_.settle()) {
         Waiting& result = waiting[at++];
         if (failure)
-            places_.dropTarget(result.target);
+            places_.drop(result.place);
         else
             reports_.push_back(std::move(result.report));
         status = std::max(status, told(failure));
@@ -141,9 +141,10 @@ Failure Batch::convertFile(Input const& input, Warnings& warnings) {
 
 Failure Batch::convertUnguarded(Input const& input, Warnings& warnings) {
     std::string const target = targetOf(options_, input);
-    if (Failure failure = places_.checkTarget(input.file, target)) return failure;
+    std::string const place = places_.placeOf(target);
+    if (Failure failure = places_.checkTarget(input.file, target, place)) return failure;
     if (Failure failure = makeFolderOf(target)) return failure;
-    Waiting result{target, {input.file, {}}};
+    Waiting result{place, {input.file, {}}};
     waiting_.reserve(waiting_.size() + 1);  // nothing fails between the writing and the list
     Converted converted;
     Failure const failure = options_.direction == Direction::normalise
@@ -156,7 +157,7 @@ Failure Batch::convertUnguarded(Input const& input, Warnings& warnings) {
         return {};
     }
     waiting_.push_back(std::move(result));
-    places_.keepTarget(target);
+    places_.keep(place);
     return {};
 }
 

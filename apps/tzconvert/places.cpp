@@ -33,10 +33,14 @@ Failure Places::checkReport() {
     return {};
 }
 
-Failure Places::checkTarget(std::string const& file, std::string const& target) {
-    if (target.empty()) return {};
+std::string Places::placeOf(std::string const& target) {
+    return target.empty() ? std::string() : paths_.of(target);
+}
+
+Failure
+Places::checkTarget(std::string const& file, std::string const& target, std::string const& place) {
+    if (place.empty()) return {};
     std::string const name = shownName(file);
-    std::string const place = paths_.of(target);
     if (inputs_.count(place) != 0)
         return filled(localText("%s: its result would take the place of %s"), {name, target});
     if (targets_.count(place) != 0)
@@ -44,12 +48,12 @@ Failure Places::checkTarget(std::string const& file, std::string const& target) 
     return {};
 }
 
-void Places::keepTarget(std::string const& target) {
-    if (!target.empty()) targets_.insert(paths_.of(target));
+void Places::keep(std::string const& place) {
+    if (!place.empty()) targets_.insert(place);
 }
 
-void Places::dropTarget(std::string const& target) {
-    targets_.erase(paths_.of(target));
+void Places::drop(std::string const& place) {
+    targets_.erase(place);
 }
 
 }  // namespace tzconvert

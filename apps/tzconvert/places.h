@@ -24,10 +24,14 @@ public:
     Places(Options const& options, std::vector<Input> const& inputs);
 
     [[nodiscard]] Failure checkReport();
-    [[nodiscard]] Failure checkTarget(std::string const& file, std::string const& target);
+    // What tells a target from all others; empty for standard output.
+    [[nodiscard]] std::string placeOf(std::string const& target);
+    // Whether the result of a file may go there.
+    [[nodiscard]] Failure
+    checkTarget(std::string const& file, std::string const& target, std::string const& place);
     // A result that is not made keeps no place.
-    void keepTarget(std::string const& target);
-    void dropTarget(std::string const& target);
+    void keep(std::string const& place);
+    void drop(std::string const& place);
 
 private:
     Options const& options_;

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <memory>
 
 #include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/text_codec.h"
@@ -15,23 +16,28 @@ namespace {
 
 constexpr std::size_t kPiece = 1 << 16;
 
+// Memory for a piece, as it comes: a batch of small files would notice its filling.
+auto makePiece() {
+    return std::make_unique_for_overwrite<char[]>(kPiece);
+}
+
 std::string faultAt(std::size_t offset, char const* reason) {
     return filled(localText("byte %s: "), {std::to_string(offset)}) + localText(reason);
 }
 
 // What is wrong with what the reader gives, if anything. The bytes are never there as a whole.
 Failure decodeAll(tzhost::FileReader& reader, std::wstring& text) {
-    std::string piece(kPiece, '\0');
+    auto const piece = makePiece();
     text.reserve(reader.expectedSize());
     std::size_t kept = 0;  // bytes of a character that the last piece cut in two
     std::size_t offset = 0;
-    while (std::size_t const count = reader.read(piece.data() + kept, kPiece - kept)) {
-        std::string_view const bytes(piece.data(), kept + count);
+    while (std::size_t const count = reader.read(piece.get() + kept, kPiece - kept)) {
+        std::string_view const bytes(piece.get(), kept + count);
         Decoded const decoded = decodeText(bytes, text);
         offset += decoded.size;
         if (decoded.fault) return faultAt(offset, decoded.fault);
         kept = bytes.size() - decoded.size;
-        std::copy(bytes.end() - static_cast<std::ptrdiff_t>(kept), bytes.end(), piece.begin());
+        std::copy(bytes.end() - static_cast<std::ptrdiff_t>(kept), bytes.end(), piece.get());
     }
     if (reader.hasFailed()) return localText("cannot be read") + ": " + tzhost::systemReason();
     return kept > 0 ? Failure(faultAt(offset, kNotUtf8)) : Failure();
@@ -39,9 +45,9 @@ Failure decodeAll(tzhost::FileReader& reader, std::wstring& text) {
 
 Failure takeAll(tzhost::FileReader& reader, std::string& bytes) {
     bytes.reserve(reader.expectedSize());
-    std::string piece(kPiece, '\0');
-    while (std::size_t const count = reader.read(piece.data(), kPiece))
-        bytes.append(piece, 0, count);
+    auto const piece = makePiece();
+    while (std::size_t const count = reader.read(piece.get(), kPiece))
+        bytes.append(piece.get(), count);
     return reader.hasFailed() ? localText("cannot be read") + ": " + tzhost::systemReason()
                               : Failure();
 }

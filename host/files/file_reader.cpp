@@ -30,10 +30,10 @@ std::size_t FileReader::expectedSize() const {
 
 std::size_t FileReader::read(char* to, std::size_t size) {
     std::size_t count = 0;
-    while (!hasFailed_ && count < size) {
+    while (!hasFailed_ && !isAtEnd_ && count < size) {
         ssize_t const got = ::read(file_, to + count, size - count);
         if (got < 0 && errno == EINTR) continue;
-        if (got == 0) break;
+        isAtEnd_ = got == 0;  // asked again, a terminal would wait for more
         hasFailed_ = got < 0;
         if (!hasFailed_) count += static_cast<std::size_t>(got);
     }

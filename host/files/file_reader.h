@@ -37,6 +37,7 @@ private:
     int file_ = 0;
     std::size_t total_ = 0;
     bool hasFailed_ = false;
+    bool isAtEnd_ = false;
 };
 
 }  // namespace tzhost

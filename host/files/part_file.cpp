@@ -56,26 +56,44 @@ int makeBesideAll(std::string const& prefix, std::string& name) {
     }
 }
 
-// At the first free place. The descriptor, or -1 and errno: EEXIST when all are taken.
-int makeAtAPlace(std::string const& prefix, std::string& name) {
-    for (char const place : kPlaces) {
-        name = prefix + place;
-        int const file =
-            open(name.c_str(), O_RDWR | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, 0600);
-        if (file < 0 && errno != EEXIST) return file;
-        if (file >= 0 && isOwn(file)) return file;
-        if (file >= 0) (void)close(file);
+// The descriptor of a new file, or -1 and errno.
+int makeNew(std::string const& file) {
+    return open(file.c_str(), O_RDWR | O_CREAT | O_EXCL | O_NOFOLLOW | O_CLOEXEC, 0600);
+}
+
+// In the place of one that was left. The descriptor, or -1 and errno: EEXIST when a save has it.
+int makeAt(std::string const& place) {
+    int file = makeNew(place);
+    if (file < 0 && errno == EEXIST) {
+        removeIfLeft(place);
+        file = makeNew(place);
     }
+    if (file < 0 || isOwn(file)) return file;
+    (void)close(file);
     errno = EEXIST;
     return -1;
+}
+
+// At the first free place; nothing stays behind at the others. The descriptor, or -1 and errno:
+// EEXIST when all are taken.
+int makeAtAPlace(std::string const& prefix, std::string& name) {
+    int file = -1;
+    for (char const place : kPlaces) {
+        if (file >= 0) {
+            removeIfLeft(prefix + place);
+            continue;
+        }
+        name = prefix + place;
+        file = makeAt(name);
+        if (file < 0 && errno != EEXIST) return file;
+    }
+    return file;
 }
 
 }  // namespace
 
 int makePartFile(fs::path const& target, std::string& name) {
     std::string const prefix = (target.parent_path() / prefixOf(target)).string();
-    for (char const place : kPlaces)
-        removeIfLeft(prefix + place);
     int file = makeAtAPlace(prefix, name);
     if (file < 0 && errno == EEXIST) file = makeBesideAll(prefix, name);
     if (file < 0) name.clear();

@@ -41,9 +41,8 @@ mode_t newPermissions() {
 
 // A descriptor for the file when the program's own output goes there ("/dev/stdout"), else -1. Such
 // a file must not be replaced, since others write to it too.
-int ownOutput(std::filesystem::path const& target) {
-    struct stat file {};
-    if (stat(target.c_str(), &file) != 0 || !S_ISREG(file.st_mode)) return -1;
+int ownOutput(struct stat const& file) {
+    if (!S_ISREG(file.st_mode)) return -1;
     for (int const output : {STDOUT_FILENO, STDERR_FILENO}) {
         struct stat own {};
         if (fstat(output, &own) == 0 && own.st_dev == file.st_dev && own.st_ino == file.st_ino)
@@ -79,13 +78,18 @@ void flushFolder(std::filesystem::path const& folder) {
     (void)close(handle);
 }
 
-SafeFile::SafeFile(std::filesystem::path const& target, IfReadOnly ifReadOnly)
-    : target_(followLinks(target)), file_(ownOutput(target_)) {
-    if (isOpen()) return;
+SafeFile::SafeFile(std::filesystem::path const& target, IfReadOnly ifReadOnly) : target_(target) {
     struct stat old {};
-    bool const isThere = stat(target_.c_str(), &old) == 0;
-    if (!isThere && errno != ENOENT) {
-        (void)fail();  // a ring of links, a name that is too long, a folder that is none
+    bool isThere = lstat(target_.c_str(), &old) == 0;
+    if (isThere && S_ISLNK(old.st_mode)) {
+        target_ = followLinks(target);
+        isThere = stat(target_.c_str(), &old) == 0;
+    }
+    int const problem = errno;
+    if (isThere) file_ = ownOutput(old);
+    if (isOpen()) return;
+    if (!isThere && problem != ENOENT) {
+        (void)fail(problem);  // a ring of links, a name that is too long, a folder that is none
     } else if (isThere && S_ISDIR(old.st_mode)) {
         (void)fail(EISDIR);
     } else if (isThere && !S_ISREG(old.st_mode)) {

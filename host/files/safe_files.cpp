@@ -17,7 +17,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr std::size_t kMostFiles = 64;
+constexpr std::size_t kMostFiles = 256;
 constexpr std::size_t kPartOfDescriptors = 4;
 constexpr auto kLongest = 200ms;
 
