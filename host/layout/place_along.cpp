@@ -40,11 +40,9 @@ double columnsWidth(LayoutColumns const& columns, std::size_t used, double width
 }  // namespace
 
 MTextLayout placeAlong(MTextLayoutInput const& input, BrokenText const& broken) {
-    std::vector<LineMetrics> metrics;
-    metrics.reserve(broken.lines.size());
-    for (LaidLine const& laid : broken.lines) {
-        metrics.push_back(metricsOf(broken, laid));
-    }
+    std::vector<LineMetrics> metrics(broken.lines.size());
+    std::ranges::transform(broken.lines, metrics.begin(),
+                           [&](LaidLine const& laid) { return metricsOf(broken, laid); });
     SpacingRule const spacing = spacingRuleOf(input);
     PlacedLines const placed = placeLines(metrics, spacing, columnRuleOf(input, metrics, spacing));
 

@@ -60,11 +60,9 @@ void drawDown(BrokenText const& broken,
 }  // namespace
 
 MTextLayout placeDown(MTextLayoutInput const& input, BrokenText const& broken) {
-    std::vector<LineMetrics> metrics;
-    metrics.reserve(broken.lines.size());
-    for (LaidLine const& laid : broken.lines) {
-        metrics.push_back(metricsOf(broken, laid));
-    }
+    std::vector<LineMetrics> metrics(broken.lines.size());
+    std::ranges::transform(broken.lines, metrics.begin(),
+                           [&](LaidLine const& laid) { return metricsOf(broken, laid); });
     PlacedLines const placed = placeLines(metrics, spacingRuleOf(input), {{}, 0.0, 1});
 
     AttachmentShares const shares = attachmentShares(input.attachment, input.style);
