@@ -220,7 +220,7 @@ constexpr CareCase kCare[] = {
      "*|NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r", "<No>"},
     // A name or value that is none is asked for again: it used to end the command.
     {"LayersAgain",
-     ": |LAYER\r|: |M\r|rent: |a/b\r|ends.\r\nName of| W \r|: |C\r|<7>: |red\r|colour.\r\nColour|3\r"
+     ": |LAYER\r|: |M\r|rent: |a/b\r|ends.\r\nName of| W \r|: |C\r|<7>: |red\r|colour.\r\nColour|0\r|colour.\r\nColour|3\r"
      "|<W>: |x\r|\"x\".\r\nLayer to colour|W\r|: |OFf\r|<W>: |?\r|layer: \"W\".\r\nLayer to|\r|does not show.|D\r|delete: |0\r",
      "stays.\r\nLayer to delete: "},
     {"VariablesAgain",

@@ -23,7 +23,8 @@ std::optional<TzCmColor> readColor(std::wstring_view text) {
     if (auto const trueColor = tzhost::readTrueColor(bytes)) return trueColor;
     TzCmColor color;
     std::optional<int> const index = readInteger(bytes);
-    if (!index || color.setColorIndex(*index) != Tzad::eOk) return std::nullopt;
+    if (!index || *index < 1 || *index > 255) return std::nullopt;
+    if (color.setColorIndex(*index) != Tzad::eOk) return std::nullopt;
     return color;
 }
 
