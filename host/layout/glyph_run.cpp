@@ -1,11 +1,18 @@
 #include "host/layout/glyph_run.h"
 
+#include <algorithm>
 #include <cmath>
+#include <numbers>
 
 namespace tzhost {
 
 double usableFactor(double factor) {
     return factor > 0.0 && std::isfinite(factor) ? factor : 1.0;
+}
+
+double usableSlant(double radians) {
+    constexpr double kMost = 85.0 * std::numbers::pi / 180.0;
+    return std::clamp(std::remainder(radians, 2.0 * std::numbers::pi), -kMost, kMost);
 }
 
 namespace {

@@ -13,6 +13,9 @@ inline constexpr double kVerticalStep = 3.0 / 2.0;
 
 // A factor that letters can be drawn with: the given one, or 1 when it is not above 0 and finite.
 [[nodiscard]] double usableFactor(double factor);
+// A slant that letters can be drawn with: 350 degrees are -10, and beyond 85 either way they would
+// be endless.
+[[nodiscard]] double usableSlant(double radians);
 
 // Whether the letters of a text may join.
 [[nodiscard]] Ligatures ligaturesOf(WholeText const& whole);

@@ -15,7 +15,7 @@ WholeText wholeTextOf(LineLayoutInput const& input) {
     WholeText whole;
     whole.widthFactor = usableFactor(input.style.widthFactor);
     whole.tracking = usableFactor(input.tracking);
-    whole.oblique = input.style.oblique;
+    whole.oblique = usableSlant(input.style.oblique);
     whole.flow = isVerticalStyle(input.style) ? TextFlow::down : TextFlow::along;
     return whole;
 }

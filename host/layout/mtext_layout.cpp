@@ -13,16 +13,14 @@
 namespace tzhost {
 namespace {
 
-constexpr double kTabHeights = 4.0;    // text heights between tab stops of a paragraph without any
-constexpr double kMostOblique = 85.0;  // degrees; beyond it letters would be endless
+constexpr double kTabHeights = 4.0;  // text heights between tab stops of a paragraph without any
 constexpr double kDegree = std::numbers::pi / 180.0;
 
 WholeText wholeTextOf(MTextLayoutInput const& input, MarkupText const& markup) {
     WholeText whole;
     whole.widthFactor = usableFactor(markup.widthFactor) * usableFactor(input.style.widthFactor);
     whole.tracking = usableFactor(markup.tracking);
-    double const most = kMostOblique * kDegree;
-    whole.oblique = std::clamp(input.style.oblique + markup.oblique * kDegree, -most, most);
+    whole.oblique = usableSlant(input.style.oblique + markup.oblique * kDegree);
     whole.stackScale = usableFactor(input.stackScalePercent / 100.0);
     whole.tabDistance = kTabHeights * input.textHeight;
     whole.flow = isVerticalStyle(input.style) ? TextFlow::down : TextFlow::along;

@@ -230,6 +230,8 @@ constexpr CareCase kCare[] = {
     {"StylesAgain",
      ": |STYLE\r|: |a/b\r|ends.\r\nText|S\r|: |\r|height|-1\r|negative.\r\nText|3\r|: |0\r",
      "zero.\r\nWidth"},
+    {"SlantsAgain",
+     ": |STYLE\r|: |\r|: |\r|: |\r|: |\r|angle <0.0000>: |90\r|degrees.\r\nObl|350\r", "Backward"},
     {"BlocksAgain",
      "*|ATTDEF\r|: |\r|tag: |T W\r|blanks.\r\nAttribute|\x03|: |BLOCK\r|: |a/b\r|ends.\r\nName|B\r"
      "|point: |1,2\r|: |all\r|: |\r|: |BLOCK\r|: |b\r|already.\r\nName|\x03|: |INSERT\r|: |c\r",

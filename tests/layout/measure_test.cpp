@@ -2,7 +2,9 @@
 
 #include <cmath>
 #include <new>
+#include <numbers>
 #include <string>
+#include <utility>
 
 #include "host/base/memory_faults.h"
 #include "host/faults/fault_plan.h"
@@ -51,6 +53,20 @@ TEST(Measure, AdvancesComeFromTheFaceAtEveryHeight) {
             line.style.typeface = face.typeface;
             EXPECT_NEAR(layOutLine(line).box.right / expected, 1.0, 1e-9) << height;
         }
+    }
+}
+
+// 90 degrees used to draw endless letters on single lines, and 350 leant multi-line texts by 85.
+TEST(Measure, SlantsStayThoseOfLetters) {
+    constexpr double kDegree = std::numbers::pi / 180.0;
+    for (auto const& [given, drawn] : {std::pair{90.0, 85.0}, {350.0, -10.0}, {-10.0, -10.0}}) {
+        MTextLayoutInput input = inputOf(kFaces[0], 1.0);
+        LineLayoutInput line;
+        line.text = kFaces[0].text;
+        line.textHeight = 1.0;
+        line.style.oblique = input.style.oblique = given * kDegree;
+        EXPECT_NEAR(layOutLine(line).runs.front().oblique, drawn * kDegree, 1e-12) << given;
+        EXPECT_NEAR(layOutMText(input).runs.front().oblique, drawn * kDegree, 1e-12);
     }
 }
 

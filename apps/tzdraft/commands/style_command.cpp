@@ -1,3 +1,6 @@
+#include <cmath>
+#include <numbers>
+
 #include "apps/tzdraft/commands/ask.h"
 #include "apps/tzdraft/commands/bodies.h"
 #include "apps/tzdraft/commands/choices.h"
@@ -30,6 +33,7 @@ struct StyleAnswers {
     bool annotative = false;
 };
 
+constexpr double kMostOblique = 85.0 * std::numbers::pi / 180.0;
 constexpr int kBackward = 2;
 constexpr int kUpsideDown = 4;
 
@@ -91,13 +95,28 @@ bool askFont(StyleAnswers& values) {
            take(askYesNo(localText(L"Italic?"), values.italic), values.italic);
 }
 
+// An angle within half a turn; beyond the most letters would be endless.
+bool askSlant(double& radians) {
+    auto const ask = [&] {
+        Answer<double> angle = askAngle(localText(L"Obliquing angle"), radians);
+        angle.value = std::remainder(angle.value, 2.0 * std::numbers::pi);
+        return angle;
+    };
+    auto const canBe = [](Answer<double> const& angle) {
+        bool const isUsable = std::abs(angle.value) <= kMostOblique;
+        if (!isUsable) tellProblem(localText(L"Letters slant by -85 to 85 degrees."));
+        return isUsable;
+    };
+    return take(askUntil(ask, canBe), radians);
+}
+
 bool askAll(StyleAnswers& values) {
     return askFont(values) &&
            take(askSize(localText(L"Text height, 0 for any"), values.height, Zero::taken),
                 values.height) &&
            take(askSize(localText(L"Width factor"), values.widthFactor, Zero::refused),
                 values.widthFactor) &&
-           take(askAngle(localText(L"Obliquing angle"), values.oblique), values.oblique) &&
+           askSlant(values.oblique) &&
            take(askYesNo(localText(L"Backward?"), values.backward), values.backward) &&
            take(askYesNo(localText(L"Upside-down?"), values.upsideDown), values.upsideDown) &&
            take(askYesNo(localText(L"Vertical?"), values.vertical), values.vertical) &&
