@@ -35,9 +35,12 @@ std::wstring reportOf(Removed const& removed) {
     return report;
 }
 
-std::wstring refusedSelection() {
+std::wstring refusedSelection(std::wstring_view answer) {
     std::wstring report = localText(L"That selects nothing here.");
     if (!commandLine().isPerson()) return report;
+    if (std::wstring const handle = missingHandle(answer); !handle.empty())
+        return TzString::formatted(localText(L"There is no entity %ls here."), handle.c_str())
+            .str();
     wchar_t const* const what = localText(L" Type a point, #HANDLE, %ls; Enter ends.");
     return report + TzString::formatted(what, selectionWords().c_str()).str();
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 
 // What the user is told about an answer at a selection.
 //
@@ -28,7 +29,7 @@ struct Removed {
 // "1 removed", to a person "1 removed, 4 total".
 [[nodiscard]] std::wstring reportOf(Removed const& removed);
 
-// That a line selects nothing; to a person also what does.
-[[nodiscard]] std::wstring refusedSelection();
+// That an answer selects nothing; to a person also which handle is wrong, or else what does.
+[[nodiscard]] std::wstring refusedSelection(std::wstring_view answer);
 
 }  // namespace tzhost

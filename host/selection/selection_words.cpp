@@ -152,6 +152,13 @@ EntityIds entitiesIn(FlatBox const& box, Touch touch) {
     });
 }
 
+std::wstring missingHandle(std::wstring_view text) {
+    for (std::wstring_view const word : splitWords(text)) {
+        if (isHandles(word) && !pickByHandles(word)) return std::wstring(word);
+    }
+    return {};
+}
+
 std::wstring selectionWords() {
     std::wstring text;
     for (WordRow const& row : kWords) {

@@ -33,6 +33,9 @@ struct SelectionAnswer {
 // and for handles of what is not in the active space.
 [[nodiscard]] std::optional<SelectionAnswer> readSelection(std::wstring_view text);
 
+// The first handle of a line of handles that names nothing in the active space; empty for none.
+[[nodiscard]] std::wstring missingHandle(std::wstring_view text);
+
 // The words in the language of the session, as a user is told them: "window, crossing, ...".
 [[nodiscard]] std::wstring selectionWords();
 

@@ -79,7 +79,7 @@ private:
 
     Reply take(std::wstring_view text) {
         auto const answer = readSelection(text);
-        if (!answer) return Reply::refused(refusedSelection());
+        if (!answer) return Reply::refused(refusedSelection(text));
         switch (answer->kind) {
         case SelectionAnswer::Kind::entities:
             commandLine().say(isRemoving_ ? reportOf(selecting_.remove(answer->ids))

@@ -276,7 +276,7 @@ constexpr CareCase kCare[] = {
      "Ausrichtung <1>: "},
     {"SelectionsAreCounted",
      "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
-     "1 removed, 0 total|what\r",
+     "1 removed, 0 total|#1 #99\r|There is no entity #99 here.\r\n|what\r",
      "nothing here. Type a point, #HANDLE, window, crossing, fence, all, last, "},
     {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |\r", "Loaded: /"},
     // The questions used to show nowhere.
