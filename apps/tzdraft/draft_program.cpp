@@ -170,7 +170,7 @@ bool Run::begin() {
     loop_.hook();
     session_.setModule(modulePath(options_));
     session_.setPlotting(options_.page, options_.space);
-    if (!options_.save.empty()) session_.saveAtEnd();
+    session_.saveAtEnd(options_.save);
     if (!openDrawing()) return false;
     if (!options_.faults.empty()) faults_.install();
     return loadModule();

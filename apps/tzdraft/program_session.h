@@ -55,9 +55,9 @@ public:
     // The open drawing; there is always one once makeNew or open was called.
     [[nodiscard]] tzhost::Drawing& drawing() const { return *drawing_; }
 
-    // The drawing is written at the end of the session anyway.
-    void saveAtEnd() { savesAtEnd_ = true; }
-    [[nodiscard]] bool savesAtEnd() const { return savesAtEnd_; }
+    // The file that the drawing is written to at the end of the session anyway; empty for none.
+    void saveAtEnd(std::filesystem::path file) { fileAtEnd_ = std::move(file); }
+    [[nodiscard]] std::filesystem::path const& fileAtEnd() const { return fileAtEnd_; }
     // The names of the drawings with changes that no file holds: the open one, and those that undo
     // can bring back.
     [[nodiscard]] std::vector<std::wstring> unsaved() const;
@@ -118,12 +118,12 @@ private:
     std::vector<std::function<void()>> postponed_;
     std::set<std::filesystem::path> ownFiles_;
     std::filesystem::path module_;
+    std::filesystem::path fileAtEnd_;
     std::wstring command_;  // the one that runs
     tzhost::PageChoice page_;
     tzhost::PlotSpace space_ = tzhost::PlotSpace::active;
     bool isInCommand_ = false;
     bool wantsToEnd_ = false;
-    bool savesAtEnd_ = false;
 };
 
 }  // namespace tzdraft

@@ -330,6 +330,21 @@ TEST(Signals, EndTheSessionInOrder) {
     }
 }
 
+// The session used to end, and the drawing was lost.
+TEST(SaveAtTheEnd, AsksWhenItFails) {
+    Terminal terminal(kNone, "--save none/kept.json");
+    for (char const* const keys : {"CIRCLE\r", "1,2\r", "3\r", "QUIT\r"}) {
+        ASSERT_TRUE(terminal.shows(": ")) << terminal.rest();
+        terminal.type(keys);
+    }
+    ASSERT_TRUE(terminal.shows("none/kept.json: cannot be written: ")) << terminal.rest();
+    ASSERT_TRUE(terminal.shows(kQuit)) << terminal.rest();
+    fs::create_directory(Terminal::desk() / "none");
+    terminal.type("\rQUIT\r");
+    EXPECT_EQ(terminal.exitStatus(), 0);
+    EXPECT_TRUE(fs::exists(Terminal::desk() / "none/kept.json"));
+}
+
 TEST(History, IsThereInTheNextSession) {
     fs::remove_all(Terminal::configuration());
     {

@@ -23,11 +23,21 @@ std::wstring listed(std::vector<std::wstring> const& names) {
     return list;
 }
 
+// Written before the session ends: when that fails, another file can still be named.
+bool isSavedAtEnd() {
+    ProgramSession& session = ProgramSession::current();
+    if (session.fileAtEnd().empty()) return false;
+    std::string error;
+    bool const isSaved = session.save(session.fileAtEnd(), error);
+    if (!isSaved) tzhost::commandLine().sayFailure(tzhost::fromUtf8(error));
+    return isSaved;
+}
+
 }  // namespace
 
 bool mayLeave() {
+    if (!tzhost::commandLine().isPerson() || isSavedAtEnd()) return true;
     ProgramSession const& session = ProgramSession::current();
-    if (!tzhost::commandLine().isPerson() || session.savesAtEnd()) return true;
     std::vector<std::wstring> const names = session.unsaved();
     return names.empty() || isMeant(forLocalText(L"Changes are not saved: %ls."), listed(names),
                                     forLocalText(L"Quit without saving them?"));
@@ -35,7 +45,7 @@ bool mayLeave() {
 
 bool mayReplace() {
     ProgramSession const& session = ProgramSession::current();
-    if (!tzhost::commandLine().isPerson() || session.savesAtEnd()) return true;
+    if (!tzhost::commandLine().isPerson() || !session.fileAtEnd().empty()) return true;
     std::wstring const oldest = session.unsavedToDrop();
     return oldest.empty() ||
            isMeant(forLocalText(L"U keeps no more drawings; changes not saved would be lost: %ls."),

@@ -6,7 +6,8 @@
 // to go on; Enter and Ctrl-C stay. A script means what it says, so that nothing asks there.
 namespace tzdraft {
 
-// Whether the session may end: with --save it may.
+// Whether the session may end. The file of --save is written for that; only when this fails is
+// there anything to ask.
 [[nodiscard]] bool mayLeave();
 // Whether another drawing may take the place of the open one. Only the oldest one that U could
 // bring back is lost by that, if there are as many as are kept.
