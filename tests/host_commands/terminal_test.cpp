@@ -240,6 +240,8 @@ constexpr CareCase kCare[] = {
      "line.\r\nPoint"},
     {"HelpFitsTheScreen", "$$(stty cols 60)|Command: |HELP\r|list: |\r",
      "Copies what is selected from a base point\r\n                 to others; Enter ends.\r\n"},
+    {"TopicsFitTheScreen", "$$(stty cols 60)|Command: |HELP\r|list: |PLOT\r",
+     "has one;\r\nthe file"},
     {"HelpAgain", ": |HELP\r|: |LINI\r|LINE.\r\nCommand, or|?\r", "UNLOAD  "},
     {"FilesAgain",
      ": |SAVE\r|: |/none/a\r|directory\r\nSave|d.json\r|: |OPEN\r|: |none\r|ory\r\nDrawing|\r|: |PLOT\r"

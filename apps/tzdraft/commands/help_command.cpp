@@ -1,6 +1,6 @@
 #include <algorithm>
 #include <map>
-#include <sys/ioctl.h>
+#include <sstream>
 #include <unistd.h>
 
 #include "apps/tzdraft/commands/ask.h"
@@ -9,6 +9,7 @@
 #include "apps/tzdraft/commands/problem.h"
 #include "apps/tzdraft/help_topics.h"
 #include "apps/tzdraft/program_texts.h"
+#include "apps/tzdraft/screen_columns.h"
 #include "host/command_line/command_line.h"
 #include "host/runtime/command_stack.h"
 #include "host/runtime/documents.h"
@@ -18,19 +19,11 @@ namespace tzdraft {
 namespace {
 
 constexpr std::size_t kNameWidth = 16;
-constexpr std::size_t kLeastRoom = 20;  // beside the names; where there is less, lines stay whole
+constexpr std::size_t kLeastRoom = 20;  // for a line; where there is less, it stays whole
 
-// Of a person's screen; 0 where nobody looks at one.
-std::size_t screenColumns() {
-    winsize size{};
-    bool const isSeen =
-        tzhost::commandLine().isPerson() && ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) == 0;
-    return isSeen ? size.ws_col : 0;
-}
-
-// Broken at blanks, so that it fits on the screen after `indent` columns.
+// A line broken at blanks, so that it fits on a person's screen after `indent` columns.
 std::wstring fitted(std::wstring_view text, std::size_t indent) {
-    std::size_t const columns = screenColumns();
+    std::size_t const columns = tzhost::commandLine().isPerson() ? screenColumns(STDOUT_FILENO) : 0;
     std::wstring shown;
     if (columns >= indent + kLeastRoom) {
         while (text.size() > columns - indent) {
@@ -78,7 +71,10 @@ bool isTold(Answer<TzString> const& name) {
     TzString const registered = registeredName(name.value);
     std::wstring const text = registered.isEmpty() ? std::wstring() : helpFor(registered);
     if (!text.empty()) {
-        tzutPrintf(L"\n%ls\n", text.c_str());
+        std::wistringstream lines(text);
+        for (std::wstring line; std::getline(lines, line);)
+            tzutPrintf(L"\n%ls", fitted(line, 0).c_str());
+        tzutPrintf(L"\n");
         return true;
     }
     tellProblem(
