@@ -10,6 +10,7 @@
 #include <utility>
 
 #include "apps/tzdraft/completion.h"
+#include "apps/tzdraft/screen_columns.h"
 #include "apps/tzdraft/terminal_keys.h"
 #include "host/files/install_paths.h"
 #include "host/text/utf8.h"
@@ -41,6 +42,17 @@ void useTerminalCharacters() {
 bool moreFollowsAtOnce() {
     pollfd keys{STDIN_FILENO, POLLIN, 0};
     return poll(&keys, 1, kKeyMilliseconds) > 0;
+}
+
+// What is written after the key would stand in the middle of the line. So the cursor goes to its
+// end first, and the key comes again. Gives how far the cursor went.
+int goToEnd(EditLine* line, wchar_t const* key) {
+    LineInfoW const* const info = el_wline(line);
+    int const way = static_cast<int>(info->lastchar - info->cursor);
+    if (way == 0) return 0;
+    (void)el_cursor(line, way);
+    el_wpush(line, key);
+    return way;
 }
 
 }  // namespace
@@ -77,6 +89,8 @@ private:
     struct sigaction interruptBefore_ {};
     tzhost::AnswerRequest const* request_ = nullptr;  // while one is read
     std::wstring prompt_;
+    std::vector<std::wstring> choices_;  // of Tab, until the cursor is at the end of the line
+    int wayBack_ = 0;                    // from there to where the cursor was
     bool isCancelled_ = false;
     bool isLeft_ = false;    // by Ctrl-D; up to the idle prompt each answer is an end
     bool hasEnded_ = false;  // the terminal is gone
@@ -146,6 +160,7 @@ int TerminalSource::Editor::readKey(EditLine* line, wchar_t* key) {
 }
 
 unsigned char TerminalSource::Editor::cancel(EditLine* line, wint_t /*key*/) {
+    if (goToEnd(line, L"\x03") != 0) return CC_CURSOR;
     of(line).isCancelled_ = true;
     return CC_EOF;
 }
@@ -181,16 +196,22 @@ Completion TerminalSource::Editor::completionOf(std::wstring_view typed) const {
 }
 
 unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {
-    Editor const& editor = of(line);
-    LineInfoW const* const info = el_wline(line);
-    Completion const completion =
-        editor.completionOf({info->buffer, static_cast<std::size_t>(info->cursor - info->buffer)});
-    if (!completion.insert.empty()) {
-        el_winsertstr(line, completion.insert.c_str());
-        return CC_REFRESH;
+    Editor& editor = of(line);
+    if (editor.choices_.empty()) {
+        LineInfoW const* const info = el_wline(line);
+        Completion completion = editor.completionOf(
+            {info->buffer, static_cast<std::size_t>(info->cursor - info->buffer)});
+        if (!completion.insert.empty()) {
+            el_winsertstr(line, completion.insert.c_str());
+            return CC_REFRESH;
+        }
+        if (completion.choices.empty()) return CC_REFRESH_BEEP;
+        editor.choices_ = std::move(completion.choices);
+        editor.wayBack_ = goToEnd(line, L"\t");
+        if (editor.wayBack_ != 0) return CC_CURSOR;
     }
-    if (completion.choices.empty()) return CC_REFRESH_BEEP;
-    editor.show(completion.choices);
+    editor.show(std::exchange(editor.choices_, {}));
+    (void)el_cursor(line, -std::exchange(editor.wayBack_, 0));
     // Shown from here on; to redisplay clears the lines above, of a long prompt's choices too.
     el_wset(line, EL_REFRESH);
     return CC_NORM;
@@ -198,10 +219,16 @@ unsigned char TerminalSource::Editor::complete(EditLine* line, wint_t /*key*/) {
 
 // Below the line that is edited, which then is shown anew.
 void TerminalSource::Editor::show(std::vector<std::wstring> const& choices) const {
+    std::size_t const columns = screenColumns(fileno(screen_));
+    std::wstring line;
     std::string text = "\n";
-    for (std::wstring const& each : choices)
-        text += tzhost::toUtf8(tzhost::visible(each, tzhost::LineFeeds::shown)) + "  ";
-    text += "\n";
+    for (std::wstring const& each : choices) {
+        std::wstring const word = tzhost::visible(each, tzhost::LineFeeds::shown) + L"  ";
+        bool const fits = columns == 0 || line.size() + word.size() <= columns;
+        if (!fits && !line.empty()) text += tzhost::toUtf8(std::exchange(line, {})) + "\n";
+        line += word;
+    }
+    text += tzhost::toUtf8(line) + "\n";
     std::fwrite(text.data(), 1, text.size(), screen_);
     std::fflush(screen_);
 }

@@ -152,6 +152,8 @@ KeysCase const kCases[] = {
      0,
      kNone},
     {"ControlCAtTheIdlePrompt", {kIdle, "abc\x03"}, "^C\r\nCommand: ", 0, kNone},
+    // The mark used to stand on the letters after the cursor.
+    {"ControlCWithinALine", {kIdle, "abc\x01\x03"}, "abc^C\r\nCommand: ", 0, kNone},
     {"ControlDInsideACommand", {kIdle, "CIRCLE\r", kCenter, "\x04"}, "\r\n", 1, kNone},
     {"TabCompletesACommand", {kIdle, "circ\t\r"}, kCenter, 0, kNone},
     {"TabShowsChoices", {kIdle, "LI\t"}, "LINE  LIST", 0, kNone},
@@ -242,6 +244,7 @@ constexpr CareCase kCare[] = {
      "Copies what is selected from a base point\r\n                 to others; Enter ends.\r\n"},
     {"TopicsFitTheScreen", "$$(stty cols 60)|Command: |HELP\r|list: |PLOT\r",
      "has one;\r\nthe file"},
+    {"ChoicesFitTheScreen", "$$(stty cols 60)|Command: |\t", "EXIT  \r\nHELP"},
     {"HelpAgain", ": |HELP\r|: |LINI\r|LINE.\r\nCommand, or|?\r", "UNLOAD  "},
     {"FilesAgain",
      ": |SAVE\r|: |/none/a\r|directory\r\nSave|d.json\r|: |OPEN\r|: |none\r|ory\r\nDrawing|\r|: |PLOT\r"
