@@ -11,14 +11,16 @@ namespace {
 // The status of the question.
 int askValue(DialogValue const& row, CMTextEditorInterface const& state, DialogChanges& changes) {
     wchar_t const* const name = localText(row.name);
-    std::wstring const prompt = std::wstring(name) + L" <" + row.shown(state) + L">: ";
-    Question question(QuestionKind::string, prompt.c_str(), {});
+    wchar_t const* const expected = localText(row.expected);
+    TzString const prompt =
+        TzString::formatted(L"%ls, %ls <%ls>: ", name, expected, row.shown(state).c_str());
+    Question question(QuestionKind::string, prompt, {});
     return question.ask([&](std::wstring_view answer) {
         DialogChange change = row.read(state, answer);
         if (!change) {
             return Reply::refused(
                 TzString::formatted(localText(L"That is no value for %ls, expected %ls."), name,
-                                    localText(row.expected))
+                                    expected)
                     .str());
         }
         changes.add(std::move(change));

@@ -271,14 +271,14 @@ constexpr CareCase kCare[] = {
     // Enter keeps a value; what is no value is asked for again.
     {"PropertiesAreAskedFor",
      "$--var MTEXTED=OLDEDITOR|: |-MTEXT\r|: |0,0\r|: |9,-9\r|: |one\r|: |\r|: |MTPROP\r|: |#1\r|"
-     "textHeight <0.2>: |0\r|no value for textHeight, expected a number above 0.|3\r|attachment <1>: |5\r|width <9>: |\r|"
-     "rotation <0>: |\r|style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
-     "textHeight <3>: |\r",
-     "attachment <5>: "},
+     "textHeight, a number above 0 <0.2>: |0\r|no value for textHeight, expected a number above 0.|3\r|bottom right <1>: |5\r|or more <9>: |\r|"
+     "in radians <0>: |\r|text style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
+     "above 0 <3>: |\r",
+     "bottom right <5>: "},
     {"PropertiesInGerman",
      "$--locale de --var MTEXTED=OLDEDITOR|: |_-MTEXT\r|: |0,0\r|: |9,-9\r|: |one\r|: |\r|"
-     ": |_MTPROP\r|: |#1\r|Texthöhe <0.2>: |0\r|Wert für Texthöhe, |\r|",
-     "Ausrichtung <1>: "},
+     ": |_MTPROP\r|: |#1\r|<0.2>: |0\r|Wert für Texthöhe, |\r|",
+     "unten rechts <1>: "},
     {"SelectionsAreCounted",
      "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
      "1 removed, 0 total|#1 #99\r|There is no entity #99 here.\r\n|what\r",
