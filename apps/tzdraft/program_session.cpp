@@ -36,13 +36,6 @@ std::wstring nameOf(tzhost::Drawing const& drawing) {
     return tzhost::fromUtf8(drawing.file().string());
 }
 
-// The same for each way to name a file, as far as the system tells.
-std::filesystem::path plainPath(std::filesystem::path const& file) {
-    std::error_code unknown;
-    std::filesystem::path plain = std::filesystem::weakly_canonical(file, unknown);
-    return unknown ? file : plain;
-}
-
 // A person typed a name that leads elsewhere than it may seem; a script is not told.
 void tellPerson(wchar_t const* what, std::filesystem::path const& file) {
     tzhost::CommandLine& line = tzhost::commandLine();
@@ -117,7 +110,7 @@ bool ProgramSession::open(std::filesystem::path const& file, std::string& error)
     for (std::string const& warning : read.warnings) {
         tzhost::commandLine().say(tzhost::fromUtf8(warning));
     }
-    ownFiles_.insert(plainPath(file));
+    ownFiles_.note(file);
     replaceForUndo(std::move(read.drawing), [&] { tzhost::setKeptVariables(read.variables); });
     return true;
 }
@@ -135,10 +128,6 @@ std::wstring ProgramSession::unsavedToDrop() const {
     if (replaced_.size() < kMostReplaced) return {};
     tzhost::Drawing& oldest = *replaced_.front().drawing;
     return oldest.undoLog().isSaved() ? std::wstring() : nameOf(oldest);
-}
-
-bool ProgramSession::isOwn(std::filesystem::path const& file) const {
-    return ownFiles_.count(plainPath(file)) > 0;
 }
 
 std::optional<std::wstring> ProgramSession::pass(ReplacedDrawings& from, ReplacedDrawings& to) {
@@ -171,7 +160,7 @@ bool ProgramSession::save(std::filesystem::path const& file,
     if (!error.empty()) return false;
     drawing_->setFile(file);
     drawing_->undoLog().noteSaved();
-    ownFiles_.insert(plainPath(file));
+    ownFiles_.note(file);
     return true;
 }
 
@@ -207,7 +196,7 @@ bool ProgramSession::plotAs(tzhost::PlotFormat format,
         error = *report.problem;
         return false;
     }
-    ownFiles_.insert(plainPath(file));
+    ownFiles_.note(file);
     return true;
 }
 

@@ -5,10 +5,10 @@
 #include <functional>
 #include <memory>
 #include <optional>
-#include <set>
 #include <string>
 #include <vector>
 
+#include "apps/tzdraft/own_files.h"
 #include "host/database/drawing.h"
 #include "host/display/plot.h"
 #include "host/files/safe_file.h"
@@ -64,8 +64,7 @@ public:
     // The name of the drawing with such changes that the next new one would push out of undo's
     // reach; empty for none.
     [[nodiscard]] std::wstring unsavedToDrop() const;
-    // Whether this session opened or wrote that file.
-    [[nodiscard]] bool isOwn(std::filesystem::path const& file) const;
+    [[nodiscard]] OwnFiles const& ownFiles() const { return ownFiles_; }
 
     // A command wants the session to end.
     void quit() { wantsToEnd_ = true; }
@@ -116,7 +115,7 @@ private:
     // Drawings that a command has done away with live until that command has ended.
     std::vector<std::unique_ptr<tzhost::Drawing>> retired_;
     std::vector<std::function<void()>> postponed_;
-    std::set<std::filesystem::path> ownFiles_;
+    OwnFiles ownFiles_;
     std::filesystem::path module_;
     std::filesystem::path fileAtEnd_;
     std::wstring command_;  // the one that runs

@@ -1,5 +1,6 @@
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
@@ -333,6 +334,23 @@ TEST(Signals, EndTheSessionInOrder) {
         EXPECT_EQ(terminal.exitStatus(), 1);
         EXPECT_TRUE(fs::exists(Terminal::desk() / "kept.json"));
     }
+}
+
+// SAVE used to write over what somebody else had made of the file, without a word.
+TEST(SaveAgain, AsksAfterSomebodyElseWrote) {
+    Terminal terminal(kNone);
+    for (char const* const keys : {"SAVE\r", "a.json\r", "SAVE\r"}) {
+        ASSERT_TRUE(terminal.shows(": ")) << terminal.rest();
+        terminal.type(keys);
+    }
+    ASSERT_TRUE(terminal.shows("<a.json>: ")) << terminal.rest();
+    fs::path const file = Terminal::desk() / "a.json";
+    fs::last_write_time(file, fs::last_write_time(file) + std::chrono::hours(1));
+    terminal.type("\r");
+    ASSERT_TRUE(terminal.shows("written to this file since: a.json.")) << terminal.rest();
+    ASSERT_TRUE(terminal.shows(kReplace)) << terminal.rest();
+    terminal.type("\rQUIT\r");
+    EXPECT_EQ(terminal.exitStatus(), 0);
 }
 
 // The session used to end, and the drawing was lost.

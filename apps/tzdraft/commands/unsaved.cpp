@@ -54,11 +54,15 @@ bool mayReplace() {
 
 bool mayOverwrite(std::filesystem::path const& file) {
     if (!tzhost::commandLine().isPerson() || !tzhost::isFile(file.string())) return true;
-    bool const isReadOnly = tzhost::isReadOnly(file.string());
-    if (!isReadOnly && ProgramSession::current().isOwn(file)) return true;
-    return isMeant(isReadOnly ? forLocalText(L"The file is read-only: %ls.")
-                              : forLocalText(L"There is a file of that name: %ls."),
-                   tzhost::fromUtf8(file.string()), forLocalText(L"Replace it?"));
+    OwnFiles::Standing const standing = ProgramSession::current().ownFiles().standingOf(file);
+    wchar_t const* what = forLocalText(L"There is a file of that name: %ls.");
+    if (tzhost::isReadOnly(file.string()))
+        what = forLocalText(L"The file is read-only: %ls.");
+    else if (standing == OwnFiles::Standing::own)
+        return true;
+    else if (standing == OwnFiles::Standing::changed)
+        what = forLocalText(L"Somebody else has written to this file since: %ls.");
+    return isMeant(what, tzhost::fromUtf8(file.string()), forLocalText(L"Replace it?"));
 }
 
 }  // namespace tzdraft

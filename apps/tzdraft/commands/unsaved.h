@@ -12,8 +12,8 @@ namespace tzdraft {
 // Whether another drawing may take the place of the open one. Only the oldest one that U could
 // bring back is lost by that, if there are as many as are kept.
 [[nodiscard]] bool mayReplace();
-// Whether a file may be written over: it is not there yet, this session opened or wrote it and it
-// is not read-only, or the person says so.
+// Whether a file may be written over: it is not there yet, this session was the last to write to it
+// or has opened it since and it is not read-only, or the person says so.
 [[nodiscard]] bool mayOverwrite(std::filesystem::path const& file);
 
 }  // namespace tzdraft
