@@ -5,12 +5,17 @@
 
 #include "host/command_line/unit_text.h"
 #include "host/settings/variables.h"
+#include "tz/ed/units.h"
 
 namespace tzhost {
 
 namespace {
 
 constexpr std::wstring_view kLastPoint = L"LASTPOINT";
+
+int setting(wchar_t const* name) {
+    return static_cast<int>(Variables::instance().number(name));
+}
 
 // A part of a unit vector; one that should be zero is.
 double exact(double part) {
@@ -50,8 +55,19 @@ std::optional<double> readDistance(std::wstring_view text) {
 
 std::optional<double> readAngle(std::wstring_view text) {
     double radians = 0;
-    int const unit = static_cast<int>(Variables::instance().number(L"AUNITS"));
-    return readAngle(text, unit, radians) ? std::optional(radians) : std::nullopt;
+    return readAngle(text, setting(L"AUNITS"), radians) ? std::optional(radians) : std::nullopt;
+}
+
+TzString shownDistance(double value) {
+    TzString text;
+    (void)tzdbRToS(value, setting(L"LUNITS"), setting(L"LUPREC"), text);  // finite, so it has one
+    return text;
+}
+
+TzString shownAngle(double radians) {
+    TzString text;
+    (void)tzdbAngToS(radians, setting(L"AUNITS"), setting(L"AUPREC"), text);
+    return text;
 }
 
 std::optional<TzGePoint3d> readPoint(std::wstring_view text, TzGePoint3d const& last) {

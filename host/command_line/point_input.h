@@ -6,6 +6,7 @@
 #include <string_view>
 
 #include "tz/ge/point3d.h"
+#include "tz/text/string.h"
 
 namespace tzhost {
 
@@ -17,6 +18,9 @@ namespace tzhost {
 [[nodiscard]] std::optional<double> readDistance(std::wstring_view text);
 // An angle in radians; a bare number is in the drawing's unit.
 [[nodiscard]] std::optional<double> readAngle(std::wstring_view text);
+// Both as the drawing's units write them; neither is infinite.
+[[nodiscard]] TzString shownDistance(double value);
+[[nodiscard]] TzString shownAngle(double radians);
 
 // The last point that was given, which "@" stands for: the variable LASTPOINT. Setting it is no
 // event.

@@ -7,11 +7,9 @@
 #include "host/command_line/point_input.h"
 #include "host/command_line/question.h"
 #include "host/command_line/unit_reader.h"
-#include "host/settings/variables.h"
 #include "host/text/local_text.h"
 #include "host/text/utf8.h"
 #include "tz/ed/prompts.h"
-#include "tz/ed/units.h"
 
 using tzhost::Armed;
 using tzhost::Question;
@@ -49,22 +47,6 @@ struct Measure {
     wchar_t const* complaint;
 };
 
-int setting(wchar_t const* name) {
-    return static_cast<int>(tzhost::Variables::instance().number(name));
-}
-
-TzString shownDistance(double value) {
-    TzString text;
-    (void)tzdbRToS(value, setting(L"LUNITS"), setting(L"LUPREC"), text);  // finite, so it has one
-    return text;
-}
-
-TzString shownAngle(double radians) {
-    TzString text;
-    (void)tzdbAngToS(radians, setting(L"AUNITS"), setting(L"AUPREC"), text);
-    return text;
-}
-
 double distanceBetween(TzGePoint3d const& from, TzGePoint3d const& to) {
     return from.distanceTo(to);
 }
@@ -76,12 +58,12 @@ double angleBetween(TzGePoint3d const& from, TzGePoint3d const& to) {
 }
 
 constexpr Measure kDistance{QuestionKind::distance, tzhost::readDistance, distanceBetween,
-                            shownDistance,
+                            tzhost::shownDistance,
                             tzhost::forLocalText(L"A length is needed, or a point.")};
-constexpr Measure kAngle{QuestionKind::angle, tzhost::readAngle, angleBetween, shownAngle,
+constexpr Measure kAngle{QuestionKind::angle, tzhost::readAngle, angleBetween, tzhost::shownAngle,
                          tzhost::forLocalText(L"An angle is needed, or a point.")};
 constexpr Measure kOrientation{QuestionKind::orientation, tzhost::readAngle, angleBetween,
-                               shownAngle,
+                               tzhost::shownAngle,
                                tzhost::forLocalText(L"An angle is needed, or a point.")};
 
 Reply giveNumber(double value, Armed const& armed, double* result) {

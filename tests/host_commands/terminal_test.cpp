@@ -284,6 +284,8 @@ constexpr CareCase kCare[] = {
      "*|SELECT\r|objects: |l\r|1 found\r\n|all\r|1 found (1 duplicate), 1 total|r\r|objects: |l\r|"
      "1 removed, 0 total|#1 #99\r|There is no entity #99 here.\r\n|what\r",
      "nothing here. Type a point, #HANDLE, window, crossing, fence, all, last, "},
+    {"PointsTellTheirAngle", "*|ROTATE\r|objects: |l\r|: |\r|point: |1,2\r|angle|1,0\r",
+     "1,0\r\n270\r\n"},
     {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |\r", "Loaded: /"},
     // The questions used to show nowhere.
     {"TranscriptInAFile", "$>seen.txt|Command: |CIRCLE\r", "Center point: "},

@@ -6,14 +6,16 @@
 #include "apps/tzdraft/commands/record.h"
 #include "apps/tzdraft/commands/selected.h"
 #include "apps/tzdraft/program_texts.h"
-#include "host/settings/variables.h"
+#include "host/command_line/point_input.h"
 #include "tz/db/block_table.h"
 #include "tz/db/extensions.h"
 #include "tz/db/shapes.h"
 #include "tz/db/text.h"
 #include "tz/ed/print.h"
-#include "tz/ed/units.h"
 #include "tz/rx/class.h"
+
+using tzhost::shownAngle;
+using tzhost::shownDistance;
 
 namespace tzdraft {
 namespace {
@@ -33,25 +35,8 @@ constexpr wchar_t const* kJustifications[TzDbText::kJustifications] = {
     forLocalText(L"bottom left"), forLocalText(L"bottom center"), forLocalText(L"bottom right"),
 };
 
-int setting(wchar_t const* name) {
-    return static_cast<int>(tzhost::Variables::instance().number(name));
-}
-
-// In the drawing's units.
-TzString length(double value) {
-    TzString text;
-    (void)tzdbRToS(value, setting(L"LUNITS"), setting(L"LUPREC"), text);  // finite, so it has one
-    return text;
-}
-
 TzString point(TzGePoint3d const& place) {
-    return length(place.x) + L", " + length(place.y) + L", " + length(place.z);
-}
-
-TzString angle(double radians) {
-    TzString text;
-    (void)tzdbAngToS(radians, setting(L"AUNITS"), setting(L"AUPREC"), text);
-    return text;
+    return shownDistance(place.x) + L", " + shownDistance(place.y) + L", " + shownDistance(place.z);
 }
 
 TzString number(double value) {
@@ -76,8 +61,8 @@ void listColumns(TzDbMText const& text) {
         TzString::formatted(
             localText(L"%ls, %d, width %ls, gutter %ls"),
             localText(isStatic ? forLocalText(L"static") : forLocalText(L"dynamic")),
-            columns.columnCount, length(columns.columnWidth).kwszPtr(),
-            length(columns.columnGutter).kwszPtr()));
+            columns.columnCount, shownDistance(columns.columnWidth).kwszPtr(),
+            shownDistance(columns.columnGutter).kwszPtr()));
 }
 
 void listBackground(TzDbMText const& text) {
@@ -105,14 +90,15 @@ void listMText(TzDbMText const& text) {
     row(localText(L"attachment"),
         localText(kJustifications[TzDbText::kRight + static_cast<int>(text.attachment())]));
     row(localText(L"style"), nameOf(text.textStyle()));
-    row(localText(L"text height"), length(text.textHeight()));
-    row(localText(L"rotation"), angle(text.rotation()));
+    row(localText(L"text height"), shownDistance(text.textHeight()));
+    row(localText(L"rotation"), shownAngle(text.rotation()));
     row(localText(L"line spacing"),
         TzString::formatted(isExact ? localText(L"exactly %ls") : localText(L"at least %ls"),
                             number(text.lineSpacingFactor()).kwszPtr()));
     row(localText(L"width"),
-        text.width() > 0 ? length(text.width()) : TzString(localText(L"no wrapping")));
-    row(localText(L"measured"), length(text.actualWidth()) + L" x " + length(text.actualHeight()));
+        text.width() > 0 ? shownDistance(text.width()) : TzString(localText(L"no wrapping")));
+    row(localText(L"measured"),
+        shownDistance(text.actualWidth()) + L" x " + shownDistance(text.actualHeight()));
     TzArray<TzGePoint3d> corners;
     text.getBoundingPoints(corners);
     if (corners.length() == 4) {
@@ -132,10 +118,10 @@ void listText(TzDbText const& text) {
         row(localText(L"alignment point"), point(text.alignmentPoint()));
     }
     row(localText(L"style"), nameOf(text.textStyle()));
-    row(localText(L"text height"), length(text.height()));
-    row(localText(L"rotation"), angle(text.rotation()));
+    row(localText(L"text height"), shownDistance(text.height()));
+    row(localText(L"rotation"), shownAngle(text.rotation()));
     row(localText(L"width factor"), number(text.widthFactor()));
-    row(localText(L"oblique"), angle(text.oblique()));
+    row(localText(L"oblique"), shownAngle(text.oblique()));
     listMarks(text);
     row(localText(L"text"), text.textString());
 }
@@ -160,19 +146,19 @@ void listAttribute(TzDbAttribute const& attribute) {
 void listLine(TzDbLine const& line) {
     row(localText(L"from"), point(line.startPoint()));
     row(localText(L"to"), point(line.endPoint()));
-    row(localText(L"length"), length(line.startPoint().distanceTo(line.endPoint())));
+    row(localText(L"length"), shownDistance(line.startPoint().distanceTo(line.endPoint())));
 }
 
 void listCircle(TzDbCircle const& circle) {
     row(localText(L"center"), point(circle.center()));
-    row(localText(L"radius"), length(circle.radius()));
+    row(localText(L"radius"), shownDistance(circle.radius()));
 }
 
 void listReference(TzDbBlockReference const& reference) {
     row(localText(L"block"), nameOf(reference.blockTableRecord()));
     row(localText(L"position"), point(reference.position()));
     row(localText(L"scale"), number(reference.scale()));
-    row(localText(L"rotation"), angle(reference.rotation()));
+    row(localText(L"rotation"), shownAngle(reference.rotation()));
     TzArray<TzDbObjectId> ids;
     reference.attributes(ids);
     for (TzDbObjectId const id : ids) {

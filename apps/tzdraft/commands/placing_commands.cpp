@@ -80,13 +80,15 @@ TzGeMatrix3d turned(TzGePoint3d const& base, double radians) {
     return TzGeMatrix3d::rotation(radians, userPlane().normal, base);
 }
 
-// By the angle that the cursor has, seen from the base point; there itself by nothing.
+// Of the point seen from the base point; 0 for the base point itself.
+double angleOf(TzGePoint3d const& to, TzGePoint3d const& base) {
+    tzhost::UserSystem const system = tzhost::currentUserSystem();
+    TzGeVector3d const arm = to - base;
+    return std::atan2(arm.dotProduct(system.yAxis), arm.dotProduct(system.xAxis));
+}
+
 PlacingDrag::Placing turnedAbout(TzGePoint3d const& base) {
-    return [=](TzGePoint3d const& to) {
-        tzhost::UserSystem const system = tzhost::currentUserSystem();
-        TzGeVector3d const arm = to - base;
-        return turned(base, std::atan2(arm.dotProduct(system.yAxis), arm.dotProduct(system.xAxis)));
-    };
+    return [=](TzGePoint3d const& to) { return turned(base, angleOf(to, base)); };
 }
 
 // The angle that was typed instead of a point; asks again for what is none.
@@ -94,7 +96,12 @@ std::optional<TzGeMatrix3d> askTurn(PlacingDrag& drag, TzGePoint3d const& base) 
     for (;;) {
         int const status =
             drag.ask(localText(L"Rotation angle, or a point"), PlacingDrag::Takes::otherAnswers);
-        if (status == TzEdJig::kNormal) return drag.placed();
+        if (status == TzEdJig::kNormal) {
+            // What the point came to, which a person has not typed. A script is not told.
+            if (tzhost::commandLine().isPerson())
+                tzhost::commandLine().say(tzhost::shownAngle(angleOf(drag.cursor(), base)).str());
+            return drag.placed();
+        }
         if (status != TzEdJig::kString) return std::nullopt;
         std::wstring const typed = tzhost::commandLine().takeInput().value_or(L"");
         if (auto const radians = tzhost::readAngle(typed)) return turned(base, *radians);

@@ -42,7 +42,9 @@ public:
     // another kind, when `takesOthers`; anything else is a cancel.
     enum class Takes { points, otherAnswers };
     [[nodiscard]] DragStatus ask(wchar_t const* question, Takes takes = Takes::points);
-    // Where the point puts the entities.
+    // The point that was answered last, in world coordinates.
+    [[nodiscard]] TzGePoint3d const& cursor() const { return cursor_; }
+    // Where it puts the entities.
     [[nodiscard]] TzGeMatrix3d const& placed() const { return view_.moving; }
     // Shows them there in the drags to come.
     void keep() { view_.kept.push_back(view_.moving); }
