@@ -76,8 +76,10 @@ constexpr std::array kCommands{
                 forLocalText(L"Writes the drawing to a file.")},
     HostCommand{forLocalText(L"SELECT"), selectCommand, kAlone,
                 forLocalText(L"Selects entities for the next command.")},
-    HostCommand{forLocalText(L"SETVAR"), setvarCommand, kAlone,
-                forLocalText(L"Shows and sets a system variable; ? lists them.")},
+    HostCommand{
+        forLocalText(L"SETVAR"), setvarCommand, kAlone,
+        forLocalText(
+            L"Shows and sets a system variable; ? lists them, and . stands for the empty text.")},
     HostCommand{forLocalText(L"STYLE"), styleCommand, kAlone,
                 forLocalText(L"Makes or changes a text style and makes it current.")},
     HostCommand{
