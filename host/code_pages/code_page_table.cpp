@@ -54,8 +54,10 @@ constexpr int kLastIsoPage = 28606;
 }  // namespace
 
 int systemCodePage() {
-    // This runs at every change of a font, so the text of the variable is not copied.
-    auto const& name = std::get<std::wstring>(*Variables::instance().get(L"SYSCODEPAGE"));
+    // This runs at every change of a font, so the variable is looked up once, and its text is not
+    // copied.
+    static VariableDefinition const& row = *findVariable(L"SYSCODEPAGE");
+    auto const& name = std::get<std::wstring>(Variables::instance().get(row));
     std::size_t const underscore = name.rfind(L'_');
     int page = 0;
     for (std::size_t i = underscore == name.npos ? 0 : underscore + 1; i < name.size(); ++i) {

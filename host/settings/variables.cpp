@@ -58,9 +58,12 @@ Variables::Slot const& Variables::slotOf(VariableDefinition const& row) const {
 
 VariableValue const* Variables::get(std::wstring_view name) const {
     VariableDefinition const* const row = findVariable(name);
-    if (row == nullptr) return nullptr;
-    Slot const& slot = slotOf(*row);
-    return slot.override_ ? &*slot.override_ : &slot.value;
+    return row == nullptr ? nullptr : &get(*row);
+}
+
+VariableValue const& Variables::get(VariableDefinition const& row) const {
+    Slot const& slot = slotOf(row);
+    return slot.override_ ? *slot.override_ : slot.value;
 }
 
 double Variables::number(std::wstring_view name) const {

@@ -50,6 +50,8 @@ public:
 
     // The value in force, valid until the variable's next write; null for an unknown name.
     [[nodiscard]] VariableValue const* get(std::wstring_view name) const;
+    // The same for a row of the table, without a search.
+    [[nodiscard]] VariableValue const& get(VariableDefinition const& row) const;
     // The value in force as a number or a text; 0 or empty for an unknown name or another type.
     [[nodiscard]] double number(std::wstring_view name) const;
     [[nodiscard]] std::wstring text(std::wstring_view name) const;
