@@ -17,7 +17,7 @@ bool CFontAttributes::IsSameTypeface(CFontAttributes const& other) const {
 }
 
 bool CFontAttributes::operator==(CFontAttributes const& other) const {
-    return IsSameTypeface(other) && m_bUnderline == other.m_bUnderline &&
-           m_bStrikethrough == other.m_bStrikethrough && m_nColorIndex == other.m_nColorIndex &&
-           m_dSize == other.m_dSize;
+    return m_bUnderline == other.m_bUnderline && m_bStrikethrough == other.m_bStrikethrough &&
+           m_nColorIndex == other.m_nColorIndex && m_dSize == other.m_dSize &&
+           IsSameTypeface(other);
 }
