@@ -75,8 +75,8 @@ void checkFiles(Options const& options) {
             bool const isSavedBack = place.option == kSave && other.option == kDrawing;
             if (other.path != place.path || isSavedBack) continue;
             throw CLI::ValidationError(
-                place.option,
-                tzhost::filled(localText("%s is the file of %s too"), {file.name, other.option}));
+                place.option, tzhost::filled(localText("%s is the file of %s too"),
+                                             {file.name, localText(other.option.c_str())}));
         }
         places.push_back(place);
     }

@@ -45,6 +45,7 @@ constexpr BadRow kUsage[] = {
      "--svg: ./p.json is the file of --save"},
     {"ResultOverEvents", "--events p --png p", 2, "--events: p is the file of --png too"},
     {"ResultOverDrawing", "p --save p --pdf p", 2, "--pdf: p is the file of DRAWING too"},
+    {"ResultInGerman", "--locale de p --pdf p", 2, "--pdf: p ist auch die Datei von ZEICHNUNG;"},
     {"ResultOverScript", "--script p --save p", 2, "--save: p is the file of --script too"},
     {"ResultOverFontMap", "--font-map p --save p", 2, "--save: p is the file of --font-map too"},
     {"ResultOverSettings", "--settings p --pdf p", 2, "--pdf: p is the file of --settings too"},
