@@ -204,11 +204,14 @@ TzString ProgramSession::moduleName() const {
     return TzString::fromUtf8(module_.filename().string());
 }
 
-void ProgramSession::loadLater(std::filesystem::path file) {
+std::filesystem::path ProgramSession::moduleCalled(std::filesystem::path const& name) const {
     std::error_code gone;  // of a working folder: the loader then says that nothing is there
-    file = file.has_parent_path() ? std::filesystem::absolute(file, gone)
-                                  : module_.parent_path() / file;
-    postponed_.emplace_back([file = std::move(file)] {
+    return name.has_parent_path() ? std::filesystem::absolute(name, gone)
+                                  : module_.parent_path() / name;
+}
+
+void ProgramSession::loadLater(std::filesystem::path const& name) {
+    postponed_.emplace_back([file = moduleCalled(name)] {
         std::string error;
         if (!tzhost::dynamicLinker().load(file, error))
             tzhost::commandLine().sayFailure(tzhost::fromUtf8(error));

@@ -80,10 +80,11 @@ public:
     void setModule(std::filesystem::path module) { module_ = std::move(module); }
     [[nodiscard]] TzString moduleName() const;
     [[nodiscard]] std::filesystem::path moduleFolder() const { return module_.parent_path(); }
-    // Modules come and go between commands, since the one that asks for it may be a module's. A
-    // name without a slash is looked for beside the proposed module alone: the working folder may
+    // A name without a slash is looked for beside the proposed module alone: the working folder may
     // hold a stranger's files.
-    void loadLater(std::filesystem::path file);
+    [[nodiscard]] std::filesystem::path moduleCalled(std::filesystem::path const& name) const;
+    // Modules come and go between commands, since the one that asks for it may be a module's.
+    void loadLater(std::filesystem::path const& name);
     void unloadLater();
 
     // Begin and end of a command, or of a call of a function; undo names it so.

@@ -286,7 +286,9 @@ constexpr CareCase kCare[] = {
      "nothing here. Type a point, #HANDLE, window, crossing, fence, all, last, "},
     {"PointsTellTheirAngle", "*|ROTATE\r|objects: |l\r|: |\r|point: |1,2\r|angle|1,0\r",
      "1,0\r\n270\r\n"},
-    {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |\r", "Loaded: /"},
+    // A module that is not there used to end the command.
+    {"ModulesAreTold", ": |UNLOAD\r|Unloaded: /|LOAD\r|tzmted.tzx>: |none\r|directory\r\nModule|\r",
+     "Loaded: /"},
     // The questions used to show nowhere.
     {"TranscriptInAFile", "$>seen.txt|Command: |CIRCLE\r", "Center point: "},
     // Below a question of two lines the choices used to be cleared again.
