@@ -4,6 +4,8 @@
 
 #include "host/text/filled.h"
 #include "host/text/local_text.h"
+#include "host/text/near_words.h"
+#include "host/text/utf8.h"
 
 namespace tzapps {
 namespace {
@@ -48,15 +50,38 @@ std::string withLocalName(std::string const& problem) {
     return problem;
 }
 
-}  // namespace
+// The options of a command, with their dashes.
+std::vector<std::wstring> optionNames(CLI::App const& command) {
+    std::vector<std::wstring> names;
+    for (CLI::Option const* const option : command.get_options()) {
+        for (std::string const& name : option->get_lnames())
+            names.push_back(tzhost::fromUtf8("--" + name));
+    }
+    return names;
+}
 
-std::string problemWith(CLI::ParseError const& wrong) {
+std::string localProblem(CLI::ParseError const& wrong) {
     for (MessageRow const& row : kMessages) {
         if (wrong.get_exit_code() != static_cast<int>(row.kind)) continue;
         if (auto const parts = tzhost::partsOf(wrong.what(), row.message))
             return tzhost::filled(tzhost::localText(row.said), *parts);
     }
     return withLocalName(wrong.what());
+}
+
+}  // namespace
+
+std::string problemWith(CLI::App const& command, CLI::ParseError const& wrong) {
+    std::vector<std::string> const unknown = command.remaining();
+    if (unknown.empty()) return localProblem(wrong);
+    std::string const option = unknown.front().substr(0, unknown.front().find('='));
+    return localProblem(wrong) + nearMiss(option, optionNames(command));
+}
+
+std::string nearMiss(std::string const& typed, std::vector<std::wstring> const& words) {
+    std::wstring const near = tzhost::nearestWord(tzhost::fromUtf8(typed), words);
+    if (near.empty()) return {};
+    return tzhost::filled(tzhost::localText("; did you mean %s?"), {tzhost::toUtf8(near)});
 }
 
 }  // namespace tzapps

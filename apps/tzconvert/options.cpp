@@ -12,7 +12,6 @@
 #include "apps/options/usage.h"
 #include "apps/tzconvert/program_texts.h"
 #include "apps/tzconvert/streams.h"
-#include "host/text/near_words.h"
 #include "host/text/utf8.h"
 
 namespace tzconvert {
@@ -227,22 +226,6 @@ std::vector<std::wstring> commandNames() {
     return names;
 }
 
-// The options of a command, with their dashes.
-std::vector<std::wstring> optionNames(CLI::App const& command) {
-    std::vector<std::wstring> names;
-    for (CLI::Option const* const option : command.get_options()) {
-        for (std::string const& name : option->get_lnames())
-            names.push_back(tzhost::fromUtf8("--" + name));
-    }
-    return names;
-}
-
-// "; did you mean ...?", or nothing when no word is near.
-std::string nearMiss(std::string const& typed, std::vector<std::wstring> const& words) {
-    std::wstring const near = tzhost::nearestWord(tzhost::fromUtf8(typed), words);
-    return near.empty() ? "" : filled(localText("; did you mean %s?"), {tzhost::toUtf8(near)});
-}
-
 // What is wrong with the first word, which should be a command.
 std::string explainCommand(std::vector<std::string> const& rest) {
     std::string names;
@@ -250,7 +233,7 @@ std::string explainCommand(std::vector<std::string> const& rest) {
         names += std::string(&row == kDirections ? "" : ", ") + row.name;
     if (rest.empty()) return filled(localText("expected %s"), {names});
     return filled(localText("expected %s, not \"%s\""), {names, rest.front()}) +
-           nearMiss(rest.front(), commandNames());
+           tzapps::nearMiss(rest.front(), commandNames());
 }
 
 // What is wrong, in a line.
@@ -260,11 +243,7 @@ std::string explain(CLI::App const& app, CLI::ParseError const& wrong) {
     if (!rest.empty()) {
         return filled(localText("options stand after the command, not \"%s\""), {rest.front()});
     }
-    CLI::App const& command = *app.get_subcommands().front();
-    std::vector<std::string> const unknown = command.remaining();
-    if (unknown.empty()) return tzapps::problemWith(wrong);
-    std::string const option = unknown.front().substr(0, unknown.front().find('='));
-    return tzapps::problemWith(wrong) + nearMiss(option, optionNames(command));
+    return tzapps::problemWith(*app.get_subcommands().front(), wrong);
 }
 
 // What was asked of the program itself, and the exit status after it.

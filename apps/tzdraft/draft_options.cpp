@@ -123,7 +123,7 @@ ParsedOptions parseOptions(int count, char const* const* arguments) {
         app.exit(asked, text);
         parsed.exit = printAnswer(text.str());
     } catch (CLI::ParseError const& wrong) {
-        std::string const problem = tzapps::problemWith(wrong) + localText("; try --help");
+        std::string const problem = tzapps::problemWith(app, wrong) + localText("; try --help");
         std::fprintf(stderr, "tzdraft: %s\n",
                      tzhost::visible(problem, tzhost::LineFeeds::shown).c_str());
         parsed.exit = kUnusable;

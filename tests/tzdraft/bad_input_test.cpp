@@ -23,6 +23,8 @@ struct BadRow {
 // Arguments that are no arguments, in a process of their own.
 constexpr BadRow kUsage[] = {
     {"UnknownOption", "--nonsense", 2, "The following argument was not expected: --nonsense"},
+    {"NearOption", "--svae=p", 2,
+     "The following argument was not expected: --svae=p; did you mean --save?"},
     {"ValueMissing", "--script", 2, "--script needs a value"},
     {"TwoDrawings", "a.json b.json", 2, "The following argument was not expected: b.json"},
     {"VariableMissing", "--script /dev/null --var", 2, "--var needs a value"},
