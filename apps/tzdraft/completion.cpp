@@ -4,6 +4,7 @@
 #include <filesystem>
 #include <iterator>
 
+#include "apps/tzdraft/typed_file.h"
 #include "host/text/case_table.h"
 #include "host/text/utf8.h"
 
@@ -69,9 +70,9 @@ Completion completeFile(std::wstring_view typed, std::wstring_view home) {
     std::wstring_view const start =
         slash == std::wstring_view::npos ? typed : typed.substr(slash + 1);
     std::filesystem::path const folder =
-        tzhost::toUtf8(slash != std::wstring_view::npos ? typed.substr(0, slash + 1)
-                       : home.empty()                   ? L"."
-                                                        : home);
+        fileTyped(slash != std::wstring_view::npos ? typed.substr(0, slash + 1)
+                  : home.empty()                   ? L"."
+                                                   : home);
     std::vector<std::wstring> names;
     std::error_code unreadable;  // such a folder holds nothing to offer
     for (std::filesystem::directory_iterator each(folder, unreadable), end; each != end;

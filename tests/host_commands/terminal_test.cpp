@@ -34,6 +34,7 @@ public:
         setenv("TERM", "xterm", 1);
         setenv("LC_ALL", "C.UTF-8", 1);
         setenv("XDG_CONFIG_HOME", configuration().c_str(), 1);
+        setenv("HOME", desk().c_str(), 1);
         unsetenv("VISUAL");
         setenv("EDITOR", editor.c_str(), 1);
         fs::current_path(desk());
@@ -268,6 +269,8 @@ constexpr CareCase kCare[] = {
      "<No>: "},
     {"TabInAText", ": |TEXT\r|: |0,0\r|: |1\r|: |\r|: |a\tb\r|: |LIST\r|: |l\r|: |\r", "  a\tb"},
     {"FilesComplete", ": |SAVE\r|: |th\t\r", kReplace},
+    // "~" used to be a folder of that name.
+    {"FilesAtHome", ": |SAVE\r|: |~/h.json\r|/desk/h.json.|OPEN\r|: |~/th\t", "ere.json"},
     {"ModulesComplete", ": |LOAD\r|: |sheetm\t", "arks.tzx"},
     // Enter keeps a value; what is no value is asked for again.
     {"PropertiesAreAskedFor",

@@ -4,6 +4,7 @@
 
 #include "apps/tzdraft/commands/name_list.h"
 #include "apps/tzdraft/program_texts.h"
+#include "apps/tzdraft/typed_file.h"
 #include "host/command_line/command_line.h"
 #include "host/command_line/keyword_list.h"
 #include "host/runtime/words.h"
@@ -143,6 +144,7 @@ Answer<std::filesystem::path>
 askFile(wchar_t const* question, TzString const& defaultFile, std::filesystem::path const& home) {
     tzhost::Offer const offer{tzhost::Offer::Kind::files, {}, tzhost::fromUtf8(home.string())};
     Answer<TzString> const file = askName(question, offer, defaultFile);
+    if (tzhost::commandLine().isPerson()) return {file.asked, fileTyped(file.value.str())};
     return {file.asked, std::filesystem::path(file.value.toUtf8())};
 }
 
