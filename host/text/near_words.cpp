@@ -31,6 +31,21 @@ std::size_t slipsBetween(std::wstring_view a, std::wstring_view b) {
     return row[b.size()];
 }
 
+bool beginsWith(std::wstring const& word, std::wstring_view start) {
+    return word.size() > start.size() &&
+           std::equal(start.begin(), start.end(), word.begin(),
+                      [](wchar_t a, wchar_t b) { return tzToLower(a) == tzToLower(b); });
+}
+
+std::wstring shortestWith(std::wstring_view start, std::vector<std::wstring> const& words) {
+    std::wstring shortest;
+    for (std::wstring const& each : words) {
+        bool const isShorter = shortest.empty() || each.size() < shortest.size();
+        if (isShorter && beginsWith(each, start)) shortest = each;
+    }
+    return shortest;
+}
+
 }  // namespace
 
 std::wstring nearestWord(std::wstring_view typed, std::vector<std::wstring> const& words) {
@@ -45,7 +60,7 @@ std::wstring nearestWord(std::wstring_view typed, std::vector<std::wstring> cons
         least = slips;
         nearest = each;
     }
-    return nearest;
+    return nearest.empty() ? shortestWith(typed, words) : nearest;
 }
 
 }  // namespace tzhost

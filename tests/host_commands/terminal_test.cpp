@@ -145,6 +145,7 @@ KeysCase const kCases[] = {
     // They used to leave "~", "5~" and "5D" in the line.
     {"KeysOfNoUse", {kIdle, "CLE\x1b[5~\x1b[15;5~\x1b[1;5DCIR\r"}, kCenter, 0, kNone},
     {"BlanksAroundACommand", {kIdle, " CIRCLE \r"}, kCenter, 0, kNone},
+    {"BeginningsOfCommands", {kIdle, "mt\r"}, "Near it is MTEXT.", 0, kNone},
     {"AnswersAfterACommand", {kIdle, "circle 0,0\r"}, "Near it is CIRCLE.", 0, kNone},
     {"PointsInADrag", {kIdle, "MTEXT\r", kFirst, "0;0\r"}, "@x,y or @length<angle", 0, kNone},
     {"HandlesThatAreNone", {kIdle, "MTEDIT\r", "text: ", "#99\r"}, "no entity #99", 0, kNone},
