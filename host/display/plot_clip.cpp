@@ -10,9 +10,6 @@ namespace {
 
 using Contour = std::vector<LayoutPoint>;
 
-// How many points of each kind of step count, in the order of OutlineKind.
-constexpr std::size_t kPointsOf[] = {1, 1, 3, 0};
-
 bool isWithin(LayoutPoint const& point, LayoutBox const& box) {
     return point.x >= box.left && point.x <= box.right && point.y >= box.bottom &&
            point.y <= box.top;
@@ -101,7 +98,7 @@ partWithin(LayoutPoint const& from, LayoutPoint const& to, LayoutBox const& box)
 bool reachesBeyond(std::vector<OutlineStep> const& path, LayoutBox const& box) {
     return std::any_of(path.begin(), path.end(), [&](OutlineStep const& step) {
         auto const* const first = step.points.data();
-        return std::any_of(first, first + kPointsOf[static_cast<std::size_t>(step.kind)],
+        return std::any_of(first, first + step.pointCount(),
                            [&](LayoutPoint const& point) { return !isWithin(point, box); });
     });
 }

@@ -14,13 +14,6 @@
 namespace tzhost {
 namespace {
 
-// How many points of each kind of step count, in the order of OutlineKind.
-constexpr std::size_t kPointsOf[] = {1, 1, 3, 0};
-
-std::size_t pointsOf(OutlineStep const& step) {
-    return kPointsOf[static_cast<std::size_t>(step.kind)];
-}
-
 LayoutPoint flat(TzGePoint2d const& point) {
     return {point.x, point.y};
 }
@@ -122,7 +115,7 @@ void LetterShapes::add(OutlinedLetter const& letter) {
     if (letters_ == 0) shape_.from = frame_.place(letter.start);
     shape_.to = frame_.place(letter.end);
     for (OutlineStep step : letter.steps) {
-        for (std::size_t i = 0; i < pointsOf(step); ++i)
+        for (std::size_t i = 0; i < step.pointCount(); ++i)
             step.points[i] = frame_.place(step.points[i]);
         shape_.path.push_back(step);
     }
@@ -180,7 +173,7 @@ void addTo(BoxBuilder& builder, PlotShape const& shape) {
             continue;
         }
         if (start) builder.add(*std::exchange(start, std::nullopt));
-        for (std::size_t i = 0; i < pointsOf(step); ++i)
+        for (std::size_t i = 0; i < step.pointCount(); ++i)
             builder.add(step.points[i]);
     }
     if (start && shape.path.size() == 1) builder.add(*start);

@@ -134,6 +134,16 @@ LayoutPoint Outliner::place(LayoutPoint const& point) const {
 
 }  // namespace
 
+std::size_t OutlineStep::pointCount() const {
+    switch (kind) {
+    case OutlineKind::move:
+    case OutlineKind::line: return 1;
+    case OutlineKind::curve: return 3;
+    case OutlineKind::close: break;
+    }
+    return 0;
+}
+
 std::vector<OutlineStep> const& outlineOf(GlyphFont const& font, unsigned int glyph) {
     PangoGlyphInfo info{};
     info.glyph = glyph;

@@ -24,6 +24,9 @@ enum class OutlineKind { move, line, curve, close };
 struct OutlineStep {
     OutlineKind kind = OutlineKind::move;
     std::array<LayoutPoint, 3> points;
+
+    // How many of the points count.
+    [[nodiscard]] std::size_t pointCount() const;
 };
 
 // The font that a glyph is from; Pango's.
