@@ -11,8 +11,6 @@ constexpr double kLineDistance = 5.0 / 3.0;
 constexpr double kSlack = 1e-9;
 
 constexpr int kExactly = 2;
-constexpr int kStaticColumns = 1;
-constexpr int kDynamicColumns = 2;
 
 double limitOf(ColumnRule const& rule, std::size_t column) {
     bool const last = rule.most != 0 && column + 1 >= rule.most;
@@ -79,12 +77,12 @@ ColumnRule columnRuleOf(MTextLayoutInput const& input,
     LayoutColumns const& columns = input.columns;
     ColumnRule rule;
     rule.height = input.height;
-    if (columns.type == kStaticColumns) {
+    if (columns.type == LayoutColumns::kStatic) {
         rule.most = static_cast<std::size_t>(std::max(columns.count, 1));
         if (input.height <= 0.0) {
             rule.height = evenHeight(lines, spacing, rule.most);
         }
-    } else if (columns.type == kDynamicColumns) {
+    } else if (columns.type == LayoutColumns::kDynamic) {
         rule.most = 0;
         if (!columns.autoHeight && !columns.heights.empty()) {
             rule.heights = columns.heights;

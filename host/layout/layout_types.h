@@ -29,10 +29,15 @@ struct LayoutStyle {
     bool upsideDown = false;
 };
 
-// Columns as the entity holds them: type 0 none, 1 static, 2 dynamic. `heights` counts for dynamic
+// Columns as the entity holds them. `heights` counts for dynamic
 // columns without automatic height, a height of 0 or below standing for no limit.
 struct LayoutColumns {
-    int type = 0;
+    // The types.
+    static constexpr int kNone = 0;
+    static constexpr int kStatic = 1;
+    static constexpr int kDynamic = 2;
+
+    int type = kNone;
     bool autoHeight = false;
     int count = 0;
     double width = 0.0;

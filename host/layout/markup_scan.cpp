@@ -7,9 +7,7 @@
 namespace tzhost::markup {
 namespace {
 
-// What follows the letters of a character code: "+XXXX" and "+nXXXX".
-constexpr int kUnicodeArguments = 5;
-constexpr int kMultibyteArguments = 6;
+constexpr int kMultibyteArguments = 6;  // what follows the "M": "+nXXXX"
 
 bool isDigit(wchar_t c) {
     return c >= L'0' && c <= L'9';
@@ -87,7 +85,7 @@ std::wstring scanEscapedText(wchar_t const*& cursor) {
 wchar_t scanUnicode(wchar_t const*& cursor) {
     int code = 0;
     (void)getCIF(cursor - 2, code);  // without a code it gives 0
-    for (int i = 0; i < kUnicodeArguments && *cursor != 0; ++i) {
+    for (unsigned int i = 0; i < kUnicodeArguments && *cursor != 0; ++i) {
         ++cursor;
     }
     return static_cast<wchar_t>(code);

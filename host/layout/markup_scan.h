@@ -28,6 +28,9 @@ void skipSemicolon(wchar_t const*& cursor);
 // nothing.
 [[nodiscard]] std::wstring scanEscapedText(wchar_t const*& cursor);
 
+// How many characters follow the letter of a Unicode code: a plus sign and four digits.
+inline constexpr unsigned int kUnicodeArguments = 5;
+
 // With the cursor after "\U": the character of "+XXXX" (four hex digits), or 0 when something else
 // stands there. Five characters are taken either way, as far as the text goes.
 [[nodiscard]] wchar_t scanUnicode(wchar_t const*& cursor);

@@ -13,8 +13,6 @@ namespace {
 // characters belong to the format all the same: a text with a "T" in it is a stack of one part.
 constexpr std::wstring_view kStackMarks = L"/#^TzmtedRes.dll";
 
-constexpr unsigned int kUnicodeArguments = 5;  // a plus sign and four digits
-
 struct SignRow {
     wchar_t sign;
     StackKind kind;

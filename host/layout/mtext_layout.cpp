@@ -1,7 +1,6 @@
 #include "host/layout/mtext_layout.h"
 
 #include <algorithm>
-#include <cmath>
 #include <numbers>
 
 #include "host/layout/glyph_run.h"
@@ -31,7 +30,7 @@ BrokenText breakText(MTextLayoutInput const& input) {
     MarkupText const markup = readMarkup(input.contents, {0, input.textHeight, input.color});
     BrokenText broken;
     broken.whole = wholeTextOf(input, markup);
-    bool const columns = input.columns.type != 0 && input.columns.width > 0.0 &&
+    bool const columns = input.columns.type != LayoutColumns::kNone && input.columns.width > 0.0 &&
                          broken.whole.flow == TextFlow::along;
     broken.wrapWidth = columns ? input.columns.width : input.width;
     broken.formats = lineFormatsOf(markup, input.style);

@@ -8,8 +8,6 @@
 namespace tzhost {
 namespace {
 
-constexpr int kStaticColumns = 1;
-
 LineMetrics metricsOf(BrokenText const& broken, LaidLine const& laid) {
     Segment const& segment = broken.segmentOf(laid);
     LineMetrics metrics;
@@ -31,7 +29,7 @@ LineMetrics metricsOf(BrokenText const& broken, LaidLine const& laid) {
 
 // The width of all columns with the gutters between them. Static columns count used or not.
 double columnsWidth(LayoutColumns const& columns, std::size_t used, double width) {
-    auto const count = columns.type == kStaticColumns
+    auto const count = columns.type == LayoutColumns::kStatic
                            ? static_cast<double>(std::max(columns.count, 1))
                            : static_cast<double>(used);
     return count * width + (count - 1.0) * columns.gutter;
@@ -48,7 +46,7 @@ MTextLayout placeAlong(MTextLayoutInput const& input, BrokenText const& broken) 
 
     AttachmentShares const shares = attachmentShares(input.attachment, input.style);
     LineFrame const frame = frameOf(broken, shares.along);
-    bool const hasColumns = input.columns.type != 0;
+    bool const hasColumns = input.columns.type != LayoutColumns::kNone;
     MTextLayout layout;
     layout.width = hasColumns ? columnsWidth(input.columns, placed.columns, frame.width)
                               : frame.measure(broken.lines);
