@@ -1,12 +1,7 @@
 #include "module/align/text_filter.h"
 
 #include "module/align/manipulator.h"
-
-namespace {
-
-constexpr int kEveryHook = 15;
-
-}  // namespace
+#include "module/host_calls/selection_sets.h"
 
 TzEdTextSSFilter::TzEdTextSSFilter(TzApDocument* document,
                                    TzMTextAlignManipulator const& manipulator)

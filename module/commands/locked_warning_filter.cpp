@@ -1,12 +1,12 @@
 #include "module/commands/locked_warning_filter.h"
 
+#include "module/host_calls/selection_sets.h"
 #include "tz/db/entity.h"
 #include "tz/ed/warning.h"
 #include "tz/mte/easy_object.h"
 
 namespace {
 
-constexpr int kEveryHook = 15;
 constexpr int kGrowth = 8;
 
 // Whether the host refuses to open the entity for write because its layer is locked. An entity that

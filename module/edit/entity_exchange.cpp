@@ -15,8 +15,6 @@ namespace {
 
 constexpr int kLowestIndex = 1;
 constexpr int kHighestIndex = 255;
-constexpr int kByLayerIndex = 256;
-constexpr int kByBlockIndex = 0;
 constexpr int kFieldCodeFlags = 0x100;
 
 unsigned int colorForEditor(CMTextEditorInterface const& editor, TzDbMText const& text) {

@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "module/markup/session/conversion_session.h"
+#include "module/markup/shared/rtf_units.h"
 #include "tz/mte/editor_state.h"
 #include "tz/mte/globals.h"
 
@@ -24,8 +25,6 @@ constexpr FailureTexts kToMarkupFailures = {
     L"FindStyle(GetStyle(), iStyleIndex) == FALSE",
     L"GetStyleInfo(iStyleIndex,Entry) == FALSE",
 };
-
-constexpr int kTwipsPerHalfPoint = 10;
 
 // The entry of the session's style; else the text about the step that failed.
 wchar_t const*
