@@ -10,7 +10,6 @@ namespace tzhost {
 namespace {
 
 constexpr wchar_t const* kTextFieldKey = L"TEXT";
-constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 
 // Replaces the text's evaluated contents by those with the codes of its field, where it has one.
 // False when there is a field that cannot be opened.
@@ -47,7 +46,7 @@ std::string EditedMarkup::bytes() const {
 
 // Compares what both files say: line ends of another system and a byte-order mark change nothing.
 TakenText EditedMarkup::take(std::string_view left) {
-    if (left.starts_with(kByteOrderMark)) left.remove_prefix(kByteOrderMark.size());
+    left = withoutByteOrderMark(left);
     if (std::string problem = problemOf(left); !problem.empty())
         return {Taken::refused, std::move(problem)};
     std::wstring const markup = markupOf(left);

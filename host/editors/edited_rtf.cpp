@@ -14,7 +14,6 @@
 namespace tzhost {
 namespace {
 
-constexpr std::string_view kByteOrderMark = "\xEF\xBB\xBF";
 constexpr std::string_view kDocumentStart = "{\\rtf";
 constexpr std::string_view kBlanks = " \t\r\n";
 
@@ -104,7 +103,7 @@ EditedRtf::EditedRtf(CMTextEditorInterface& state) : state_(state), isEmpty_(!ho
 }
 
 TakenText EditedRtf::take(std::string_view left) {
-    if (left.starts_with(kByteOrderMark)) left.remove_prefix(kByteOrderMark.size());
+    left = withoutByteOrderMark(left);
     DialogChanges changes = changes_;
     if (std::string problem = readChanges(left, changes); !problem.empty())
         return {Taken::refused, std::move(problem)};
@@ -115,7 +114,7 @@ TakenText EditedRtf::take(std::string_view left) {
     return {isChanged || !changes.areNone() ? Taken::changed : Taken::unchanged, ""};
 }
 
-// Takes the lines ahead of the document off; the problem with one of them, or nothing.
+// Takes the lines before the document off; the problem with one of them, or nothing.
 std::string EditedRtf::readChanges(std::string_view& left, DialogChanges& changes) const {
     while (!left.empty() && !left.starts_with(kDocumentStart)) {
         std::string_view const line = takeLine(left);

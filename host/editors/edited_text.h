@@ -20,6 +20,11 @@ struct TakenText {
     std::string problem;  // one clause with the editor as its subject, such as "left an empty file"
 };
 
+// What an editor left without the byte-order mark that some of them write first.
+[[nodiscard]] inline std::string_view withoutByteOrderMark(std::string_view left) {
+    return left.substr(left.starts_with("\xEF\xBB\xBF") ? 3 : 0);
+}
+
 class EditedText {
 public:
     EditedText() = default;
