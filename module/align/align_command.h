@@ -23,7 +23,8 @@ public:
     // The whole dialogue. The settings are remembered when it is finished; after a cancel, changes
     // made by its keywords are lost.
     void run();
-    // The first part of it on its own: the selection, and the entities that are dragged.
+    // The first part of it on its own: the selection, and the entities that are dragged. Nothing
+    // calls it.
     bool acquireTextObjsAndAlignSettings();
 
     // Questions of the run, for the keywords of others too. A status of the host; choosing the

@@ -18,7 +18,7 @@ public:
 
     // Takes the option over. Of options with one name the newest is found.
     void registerAlignOption(TzMTextAlignOption* option);
-    // Deletes the option of that name; nothing when there is none.
+    // Deletes the option of that name, if there is one. Only a test calls it.
     void unregisterAlignOption(TzString const& name);
     // 0 when there is none.
     [[nodiscard]] std::size_t findOptionIndexWith(TzString const& name) const;
