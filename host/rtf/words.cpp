@@ -17,7 +17,7 @@ constexpr std::size_t kLetters = 'z' - 'a' + 1;
 }  // namespace
 
 // A row for each word, in alphabetical order.
-RtfWords::Row const* RtfWords::find(std::string_view word) {
+struct RtfWords::Table {
     using Document = RtfDocument;
     static constexpr Row kRows[] = {
         {"ab", &Document::setWide, of(RtfField::wideBold)},
@@ -148,9 +148,13 @@ RtfWords::Row const* RtfWords::find(std::string_view word) {
         {"zwj", &Document::putNamed, 0x200D},
         {"zwnj", &Document::putNamed, 0x200C},
     };
+};
+
+RtfWords::Row const* RtfWords::find(std::string_view word) {
+    static constexpr auto const& kRows = Table::kRows;
     static_assert(std::is_sorted(std::begin(kRows), std::end(kRows),
                                  [](Row const& a, Row const& b) { return a.word < b.word; }));
-    // The first row of each letter or behind it, and one place more for the end of all.
+    // The first row of each letter or after it, and one place more for the end of all.
     static constexpr auto kFirsts = [] {
         std::array<Row const*, kLetters + 1> firsts{};
         for (std::size_t letter = 0; letter <= kLetters; ++letter) {

@@ -24,6 +24,9 @@ struct RtfWords {
     [[nodiscard]] static bool isCharacter(std::string_view word);
     // Whether it numbers a style of the style sheet.
     [[nodiscard]] static bool beginsStyle(RtfToken const& token);
+
+private:
+    struct Table;
 };
 
 }  // namespace tzhost
