@@ -75,7 +75,7 @@ void addLosses(Warnings& warnings, RtfLosses const& losses) {
     add(warnings,
         localText("texts lost with the unknown word before them, which --normalise keeps"),
         losses.texts);
-    if (losses.hasTextBehindEnd)
+    if (losses.hasTextAfterEnd)
         warnings.push_back(localText("what stands behind the last \"}\" is lost"));
 }
 

@@ -176,7 +176,7 @@ bool readMagnitude(UnitReader& reader, double bare, double& radians) {
     return true;
 }
 
-// Behind "N" or "S": a bearing of at most a right angle and the letter that it leans to.
+// After "N" or "S": a bearing of at most a right angle and the letter that it leans to.
 bool readBearing(UnitReader& reader, char first, double& radians) {
     constexpr double kMost = std::numbers::pi / 2 + 1e-12;
     double bearing = 0;

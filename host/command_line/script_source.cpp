@@ -131,7 +131,7 @@ ScriptSource::Line const* ScriptSource::peek() {
     return &*peeked_;
 }
 
-// Stands at the line that opens the block.
+// The line that was peeked at last opens the block.
 std::optional<EditorBlock> ScriptSource::readBlock() {
     int const start = peeked_->number;
     peeked_.reset();

@@ -16,7 +16,6 @@
 #include <istream>
 #include <memory>
 #include <string>
-#include <vector>
 
 #include "host/command_line/answer_source.h"
 

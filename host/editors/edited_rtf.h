@@ -7,8 +7,8 @@
 #include "tz/mte/editor_interface.h"
 
 // The text of a dialog's session as a rich-text document for a word processor, and what such a
-// program leaves as a document that the module reads. Lines `NAME=VALUE` ahead of the document
-// change the values of dialog_values.h; without a document behind them the words stay.
+// program leaves as a document that the module reads. Lines `NAME=VALUE` before the document
+// change the values of dialog_values.h; without a document after them the words stay.
 //
 //   EditedRtf rtf(state);  // the state of the session
 //   if (!rtf.failure().empty()) return;
@@ -25,7 +25,7 @@ public:
     // What the module gave instead of a document, which is the text of its failure; empty when
     // there is a document.
     [[nodiscard]] std::wstring const& failure() const { return failure_; }
-    // Changes of values that were made ahead of the session; they count when the text is taken.
+    // Changes of values that were made before the session; they count when the text is taken.
     void setChanges(DialogChanges changes) { changes_ = std::move(changes); }
 
     [[nodiscard]] char const* fileName() const override { return "mtext.rtf"; }

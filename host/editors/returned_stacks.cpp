@@ -108,7 +108,7 @@ private:
 };
 
 // Text in bare characters, since words would be dropped between the stack's sign and its text. A
-// line end keeps a letter behind a backslash from reading as a word of paragraphs; a brace brings
+// line end keeps a letter after a backslash from reading as a word of paragraphs; a brace brings
 // its backslash along.
 std::string stackText(std::wstring_view text) {
     std::wstring written;
@@ -142,13 +142,13 @@ public:
 private:
     void copy(Unit const& unit);
     void takeBackslashes();
-    bool takeStack(std::string_view behindSign);
+    bool takeStack(std::string_view afterSign);
     void putStack(std::wstring_view text, Look const& after);
 
     std::string_view rest_;
     std::string document_;
     Look look_;
-    char const* noEndBefore_ = nullptr;  // no stack ends ahead of here
+    char const* noEndBefore_ = nullptr;  // no stack ends before this place
 };
 
 // The tables end in the document's first line end.
@@ -172,22 +172,22 @@ void Returning::copy(Unit const& unit) {
     rest_.remove_prefix(unit.text.size());
 }
 
-// Takes a run of backslashes, through changes of look. Ahead of an "S" each pair of them is one of
+// Takes a run of backslashes, through changes of look. Before an "S" each pair of them is one of
 // the text, and one more makes the sign of a stack.
 void Returning::takeBackslashes() {
     std::size_t count = 0;
-    std::string_view behind = rest_;
-    Unit next = unitAt(behind);
+    std::string_view after = rest_;
+    Unit next = unitAt(after);
     while (next.kind == Unit::Kind::open || next.kind == Unit::Kind::close ||
            next.kind == Unit::Kind::blank ||
            (next.kind == Unit::Kind::character && next.c == L'\\')) {
         if (next.kind == Unit::Kind::character) ++count;
-        behind.remove_prefix(next.text.size());
-        next = unitAt(behind);
+        after.remove_prefix(next.text.size());
+        next = unitAt(after);
     }
     bool const isSign = next.kind == Unit::Kind::character && next.c == L'S';
     std::size_t kept = isSign ? count / 2 : count;
-    while (rest_.size() > behind.size()) {
+    while (rest_.size() > after.size()) {
         Unit const unit = unitAt(rest_);
         bool const isBackslash = unit.kind == Unit::Kind::character;
         if (!isBackslash || kept > 0)
@@ -197,17 +197,17 @@ void Returning::takeBackslashes() {
         if (isBackslash && kept > 0) --kept;
     }
     if (!isSign || count % 2 == 0) return;
-    if (takeStack(behind.substr(next.text.size()))) return;
+    if (takeStack(after.substr(next.text.size()))) return;
     document_ += "\\\\\n";  // of the text, after all; the line end keeps the "S" apart from it
 }
 
 // Makes a stack of the text up to the ";" that ends it; false when the paragraph has none.
-bool Returning::takeStack(std::string_view behindSign) {
-    if (behindSign.data() < noEndBefore_) return false;
+bool Returning::takeStack(std::string_view afterSign) {
+    if (afterSign.data() < noEndBefore_) return false;
     std::wstring text;
     Look look = look_;
     bool isEscaped = false;
-    std::string_view rest = behindSign;
+    std::string_view rest = afterSign;
     for (Unit unit = unitAt(rest);; unit = unitAt(rest)) {
         if (unit.kind == Unit::Kind::part || unit.kind == Unit::Kind::end) {
             noEndBefore_ = rest.data();

@@ -2,7 +2,7 @@
 
 // Stacks in what a word processor left, once it was normalised: each text `\S1/2;`, whatever looks
 // the program gave to parts of it, becomes the stack that a module reads, in the look of its start;
-// backslashes that stand doubled ahead of an "S" become one.
+// backslashes that stand doubled before an "S" become one.
 //
 //   std::string const document = withStacks(normaliseRtf(bytes).document);
 

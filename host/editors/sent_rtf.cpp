@@ -90,7 +90,7 @@ private:
     std::string sent_;
     std::vector<int> sizes_{0};  // half-points, of the groups that are open; 0 before the first
     bool hasStyle_ = false;
-    std::size_t backslashes_ = 0;  // of the text, directly ahead
+    std::size_t backslashes_ = 0;  // of the text, directly before `rest_`
 };
 
 std::string Sending::run() {
@@ -254,7 +254,7 @@ void Sending::takeColorTable() {
 // Names of fonts are bytes of the page of each font.
 class SentFonts {
 public:
-    // False behind the table.
+    // False once the table has ended.
     bool take(RtfToken const& token);
     [[nodiscard]] std::vector<DialectFont> fonts() const;
 

@@ -57,7 +57,7 @@ bool isUncasedLetter(wchar_t c) {
     return false;
 }
 
-constexpr wchar_t kBehindLatin = 0x250;
+constexpr wchar_t kAfterLatin = 0x250;
 
 enum class Latin { without, with };
 
@@ -65,7 +65,7 @@ void addBytes(FcCharSet& letters, int codePage, std::string_view bytes, Latin la
     auto const text = decode(codePage, bytes);
     if (!text || text->size() != 1) return;
     wchar_t const c = text->front();
-    bool const isLatin = c < kBehindLatin;
+    bool const isLatin = c < kAfterLatin;
     bool const isLetter = lowerOf(c) != upperOf(c) || isUncasedLetter(c) || bytes.size() > 1;
     if (isLetter && (!isLatin || latin == Latin::with)) {
         FcCharSetAddChar(&letters, static_cast<FcChar32>(c));

@@ -10,8 +10,8 @@
 namespace tzhost {
 namespace {
 
-// Stands for a stack while lines are broken: a digit, so that a stack stays with the number ahead
-// of it.
+// Stands for a stack while lines are broken: a digit, so that a stack stays with the number before
+// it.
 constexpr wchar_t kStackPlace = L'0';
 
 bool isDropped(wchar_t c) {

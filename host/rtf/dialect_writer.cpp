@@ -101,16 +101,16 @@ void DialectWriter::closeLook() {
     look_ = {};
 }
 
-// The reader looks for words of paragraphs behind every backslash, also behind the second of an
+// The reader looks for words of paragraphs after every backslash, also after the second of an
 // escaped pair; a line end in between, which it skips, keeps it from finding one there.
 void DialectWriter::ascii(std::string_view text) {
     if (text.empty()) return;
     writeMark();
     hasContent_ = true;
-    bool const isBehindBackslash = !body_.empty() && body_.back() == '\\';
-    if (isBehindBackslash && std::string_view("flpt").find(text[0]) != std::string_view::npos)
+    bool const isAfterBackslash = !body_.empty() && body_.back() == '\\';
+    if (isAfterBackslash && std::string_view("flpt").find(text[0]) != std::string_view::npos)
         body_ += '\n';
-    bool const isStackSign = isBehindBackslash && text == "S" && !look_.isStackMark;
+    bool const isStackSign = isAfterBackslash && text == "S" && !look_.isStackMark;
     stackSignAt_ = isStackSign ? body_.size() : kNowhere;
     body_ += text;
 }
@@ -160,7 +160,7 @@ void DialectWriter::endStack() {
     body_ += "{\\dn6}";
 }
 
-// Behind an escaped backslash and an "S" the reader swallows words up to the next text. The "S"
+// After an escaped backslash and an "S" the reader swallows words up to the next text. The "S"
 // as a number of its own is no such sign.
 void DialectWriter::protectStackSign() {
     if (stackSignAt_ == kNowhere) return;

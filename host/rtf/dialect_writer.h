@@ -1,7 +1,7 @@
 #pragma once
 
 // Writes rich text in the words that the module's reader knows: a font and a colour table of what
-// is used, each paragraph behind a `\pard` with its indents and tabs, and each run of a look of its
+// is used, each paragraph after a `\pard` with its indents and tabs, and each run of a look of its
 // own in a group that opens with the words of that look.
 //
 //   DialectWriter writer;
@@ -25,7 +25,7 @@ namespace tzhost {
 struct DialectFont {
     std::wstring name;
     int charset = 1;
-    int family = 0;  // in tens of hexadecimal, as in a pitch and family
+    int family = 0;  // a multiple of 16, as in a pitch and family
     int pitch = 0;
 };
 
@@ -68,7 +68,7 @@ public:
     void character(wchar_t c);
     void tab();
     void line();
-    // Ends what a stack's mark began, for a reader to whom all text behind such a mark belongs to
+    // Ends what a stack's mark began, for a reader to which all text after such a mark belongs to
     // it.
     void endStack();
 

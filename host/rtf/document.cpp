@@ -25,7 +25,7 @@ void RtfDocument::take(RtfToken const& token) {
     }
 }
 
-// Whether the token as a whole stands for the `\u` ahead of it. Of a run of text, the characters
+// Whether the token as a whole stands for the `\u` before it. Of a run of text, the characters
 // that do are stepped over when it is read; a brace or a word that is no character ends them all.
 bool RtfDocument::skips(RtfToken const& token) {
     bool const isCharacter =
@@ -48,7 +48,7 @@ void RtfDocument::onOpen() {
     }
 }
 
-// A brace too many is stepped over, so that what stands behind it is read.
+// A closing brace too many is stepped over, so that what follows it is read.
 void RtfDocument::onClose() {
     isStarred_ = false;
     if (entryDepth_ != 0 && state_.depth() == entryDepth_) endEntry();
@@ -77,7 +77,7 @@ bool RtfDocument::isInFonts() const {
     return destination() == kFontTable || destination() == kFont;
 }
 
-// The character behind a backslash.
+// The character after a backslash.
 void RtfDocument::onSymbol(char symbol) {
     switch (symbol) {
     case '*': isStarred_ = true; break;

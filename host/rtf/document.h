@@ -155,7 +155,7 @@ private:
     int usualSize_;
     int codePage_ = 0;  // of the document; 0: the system's
     int defaultFont_ = kRtfUnset;
-    bool isStarred_ = false;        // a `\*` stands ahead
+    bool isStarred_ = false;        // a `\*` was just read
     int substitutes_ = 0;           // characters to come that stand for the last `\u`
     wchar_t highSurrogate_ = 0;     // waits for its other half
     std::uint32_t entryDepth_ = 0;  // of the group of a font or style; 0: none is open
@@ -163,8 +163,8 @@ private:
     int styleBase_ = kRtfUnset;
     RtfStyleKind styleKind_ = RtfStyleKind::paragraph;
 
-    bool isBehindCell_ = false;      // what follows is in another cell
-    bool isBehindInnerEnd_ = false;  // what follows is in another paragraph of the cell
+    bool isAfterCell_ = false;      // what follows is in another cell
+    bool isAfterInnerEnd_ = false;  // what follows is in another paragraph of the cell
     int rowTabs_ = RtfTabLists::kEmpty;
     Settings last_;  // of the last text
 

@@ -122,14 +122,15 @@ DialectParagraph RtfDocument::paragraphOf(Settings const& settings) const {
     return {settings.firstIndent, settings.leftIndent, tabs_.stopsOf(settings.tabs)};
 }
 
-// What stands between the text ahead and that which follows.
+// Parts what was written from the text that follows: cells by a tab, paragraphs of a cell by a
+// blank.
 void RtfDocument::beginContent() {
     last_ = run().settings;
-    if (isBehindCell_)
+    if (isAfterCell_)
         putCellTab();
-    else if (isBehindInnerEnd_ && writer_.hasContent())
+    else if (isAfterInnerEnd_ && writer_.hasContent())
         writer_.ascii(" ");
-    isBehindCell_ = isBehindInnerEnd_ = false;
+    isAfterCell_ = isAfterInnerEnd_ = false;
 }
 
 // No line goes from cell to cell.

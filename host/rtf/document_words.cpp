@@ -94,9 +94,9 @@ void RtfDocument::putLine(RtfToken const&, int) {
 
 // In a table the row is the paragraph.
 void RtfDocument::endParagraph(RtfToken const&, int) {
-    isBehindInnerEnd_ = state_.get(RtfField::inTable) != 0;
-    if (isBehindInnerEnd_) return;
-    isBehindCell_ = false;
+    isAfterInnerEnd_ = state_.get(RtfField::inTable) != 0;
+    if (isAfterInnerEnd_) return;
+    isAfterCell_ = false;
     writer_.endParagraph(paragraphOf(run().settings), run().plainLook);
 }
 
@@ -106,19 +106,19 @@ void RtfDocument::breakParagraph(RtfToken const& token, int argument) {
 }
 
 void RtfDocument::endCell(RtfToken const&, int) {
-    isBehindInnerEnd_ = false;
-    if (isBehindCell_) putCellTab();
-    isBehindCell_ = true;
+    isAfterInnerEnd_ = false;
+    if (isAfterCell_) putCellTab();
+    isAfterCell_ = true;
 }
 
 // Of a table in a cell, whose cells and rows are like paragraphs of the cell.
 void RtfDocument::endInnerCell(RtfToken const&, int) {
-    isBehindInnerEnd_ = true;
+    isAfterInnerEnd_ = true;
 }
 
 // The columns are tab stops where the cells but the first begin.
 void RtfDocument::endRow(RtfToken const&, int) {
-    isBehindCell_ = isBehindInnerEnd_ = false;
+    isAfterCell_ = isAfterInnerEnd_ = false;
     DialectParagraph row = paragraphOf({0, 0, rowTabs_});
     if (!row.tabs.empty()) row.tabs.pop_back();
     writer_.endParagraph(row, run().plainLook);

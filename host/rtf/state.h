@@ -38,7 +38,7 @@ enum class RtfField : std::uint8_t {
     inTable,
     inListText,   // the number or bullet of a list
     stackMark,    // the characters are a mark of a stack
-    substitutes,  // characters that stand behind a `\u` for who does not know it
+    substitutes,  // characters after a `\u` for readers that do not know it
     destination,
     // What characters of East Asia have instead, where a writer keeps that apart.
     isWide,  // what follows is such text
@@ -70,7 +70,7 @@ public:
     [[nodiscard]] std::uint64_t changes() const { return changes_; }
 
 private:
-    // A number before a group changed it. Those of a group stand behind those of the groups around.
+    // A number before a group changed it. Those of a group stand after those of the groups around.
     struct Saved {
         std::uint32_t depth;       // of the group that changed it
         std::uint32_t olderDepth;  // of the one that had changed it last

@@ -111,7 +111,7 @@ RtfToken RtfTokens::word() {
     return token;
 }
 
-// A hyphen without a digit behind it is text.
+// A hyphen without a digit after it is text.
 void RtfTokens::takeNumber(RtfToken& token) {
     std::size_t const sign = !rest_.empty() && rest_.front() == '-' ? 1 : 0;
     if (rest_.size() <= sign || !isDigit(rest_[sign])) return;

@@ -18,7 +18,7 @@ struct RtfToken {
         open,
         close,
         word,    // `text` is its letters, of which the first is a small one
-        symbol,  // `text` is the character behind the backslash
+        symbol,  // `text` is the character after the backslash
         text,    // `text` is a run of plain ASCII
         byte,  // `value` is a byte of a code page, escaped or as it stands, or a control character
     };

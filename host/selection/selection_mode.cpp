@@ -16,7 +16,7 @@ constexpr WayRow kWays[] = {
     {L'P', SelectionWay::previous}, {L'W', SelectionWay::window}, {L'C', SelectionWay::crossing},
 };
 
-// Behind a colon.
+// The letter after a colon; false for an unknown one. `c` and `p` change nothing.
 bool takeOption(wchar_t letter, SelectionMode& mode) {
     switch (letter) {
     case L'$': mode.hasPrompts = true; return true;

@@ -16,8 +16,8 @@ constexpr int kPointsAtFirst = 16;
 constexpr int kFixedWidth = 300;
 // The window's frame stands this far outside the text.
 constexpr int kFrame = 6;
-// A text nearer to the desktop's edge than this leaves no room for the frame and the caption; the
-// window then moves to the place behind it.
+// A text nearer to the desktop's edge than the first of each pair leaves no room for the frame and
+// the caption; the window then moves to the second.
 constexpr int kLeastTop = 106;
 constexpr int kTopInstead = 100;
 constexpr int kLeastLeft = 6;

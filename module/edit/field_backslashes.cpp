@@ -13,7 +13,7 @@ void convertBackslashesInFields(CStdStrW& text, signed char flag) {
     int end = 0;
     // The text is put together from its pieces: exchanging each span in place would move all that
     // follows once for each field. The host is given the rest alone, since it may look at all that
-    // stands ahead of a start.
+    // stands before a start.
     while (tzdbFindField(text.c_str() + copied, 0, first, end)) {
         CStdStrW field = text.Mid(copied + first, end - first);
         field.Replace(flag ? one : two, flag ? two : one);

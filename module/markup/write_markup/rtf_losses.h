@@ -13,9 +13,9 @@ struct RtfLosses {
             if (count++ == 0) first = word;
         }
     };
-    Kind unknownWords;              // that say something about the text
-    Kind texts;                     // of groups that an unknown word opens
-    bool hasTextBehindEnd = false;  // behind a "}" that closes more than was opened
+    Kind unknownWords;             // that say something about the text
+    Kind texts;                    // of groups that an unknown word opens
+    bool hasTextAfterEnd = false;  // after a "}" that closes more than was opened
 };
 
 // Whether a document says something about its text by a word that the reader does not know. It does

@@ -69,6 +69,7 @@ public:
     [[nodiscard]] RtfLosses const& losses() const { return losses_; }
 
     // The control word after a backslash and its number, kNoValue without one; a view of the text.
+    // Nothing calls it: the pass takes its words from nextStep.
     [[nodiscard]] static std::wstring_view GetToken(wchar_t const*& cursor, int& value);
     // Does what a word says, with the cursor after it. False for an unknown word.
     bool HandleToken(wchar_t const*& cursor, std::wstring_view word, int value);
@@ -79,7 +80,7 @@ private:
     struct Level {
         CFontAttributes look;
         bool skipsDestination;
-        bool isBehindFirst;
+        bool isAfterFirst;
     };
     struct Replacement;
 
@@ -89,10 +90,10 @@ private:
 
     // Groups.
     void Convert(wchar_t const* cursor);
-    void onGroup(bool& skipsDestination, bool& isBehindFirst);
-    [[nodiscard]] bool onGroupEnd(bool& skipsDestination, bool& isBehindFirst);
+    void onGroup(bool& skipsDestination, bool& isAfterFirst);
+    [[nodiscard]] bool onGroupEnd(bool& skipsDestination, bool& isAfterFirst);
     void
-    onWord(wchar_t const*& cursor, RtfStep const& step, bool skipsDestination, bool isBehindFirst);
+    onWord(wchar_t const*& cursor, RtfStep const& step, bool skipsDestination, bool isAfterFirst);
     void onSymbol(wchar_t const*& cursor);
     void onEscapedBackslash(wchar_t const*& cursor);
     void onText(std::wstring_view text);

@@ -20,21 +20,21 @@ std::wstring_view CRichTextToMTextContext::GetToken(wchar_t const*& cursor, int&
 // group may be dropped when its next word is unknown.
 void CRichTextToMTextContext::Convert(wchar_t const* cursor) {
     bool skipsDestination = false;
-    bool isBehindFirst = false;
+    bool isAfterFirst = false;
     bool isOpen = true;
     m_bCharEmitted = false;
     while (isOpen) {
         RtfStep const step = nextStep(cursor);
         switch (step.kind) {
         case RtfStep::end: isOpen = false; break;
-        case RtfStep::open: onGroup(skipsDestination, isBehindFirst); break;
+        case RtfStep::open: onGroup(skipsDestination, isAfterFirst); break;
         case RtfStep::close:
-            isOpen = onGroupEnd(skipsDestination, isBehindFirst);
-            if (!isOpen) losses_.hasTextBehindEnd = isMoreThanBlank(cursor);
+            isOpen = onGroupEnd(skipsDestination, isAfterFirst);
+            if (!isOpen) losses_.hasTextAfterEnd = isMoreThanBlank(cursor);
             break;
         case RtfStep::word:
-            onWord(cursor, step, skipsDestination, isBehindFirst);
-            isBehindFirst = true;
+            onWord(cursor, step, skipsDestination, isAfterFirst);
+            isAfterFirst = true;
             break;
         case RtfStep::symbol:
             if (*cursor == L'*') {
@@ -43,7 +43,7 @@ void CRichTextToMTextContext::Convert(wchar_t const* cursor) {
             } else {
                 onSymbol(cursor);
             }
-            isBehindFirst = true;
+            isAfterFirst = true;
             break;
         case RtfStep::character:
             if (*step.start == L'\n' || *step.start == L'\r') break;
@@ -57,20 +57,20 @@ void CRichTextToMTextContext::Convert(wchar_t const* cursor) {
     levels_.clear();
 }
 
-void CRichTextToMTextContext::onGroup(bool& skipsDestination, bool& isBehindFirst) {
-    levels_.push_back({current(), skipsDestination, isBehindFirst});
+void CRichTextToMTextContext::onGroup(bool& skipsDestination, bool& isAfterFirst) {
+    levels_.push_back({current(), skipsDestination, isAfterFirst});
     skipsDestination = false;
-    isBehindFirst = false;
+    isAfterFirst = false;
     m_bCharEmitted = false;
 }
 
 // False when no group was open.
-bool CRichTextToMTextContext::onGroupEnd(bool& skipsDestination, bool& isBehindFirst) {
+bool CRichTextToMTextContext::onGroupEnd(bool& skipsDestination, bool& isAfterFirst) {
     if (levels_.empty()) return false;
     Level const& level = levels_.back();
     restore(level.look);
     skipsDestination = level.skipsDestination;
-    isBehindFirst = level.isBehindFirst;
+    isAfterFirst = level.isAfterFirst;
     levels_.pop_back();
     return true;
 }
@@ -79,9 +79,9 @@ bool CRichTextToMTextContext::onGroupEnd(bool& skipsDestination, bool& isBehindF
 void CRichTextToMTextContext::onWord(wchar_t const*& cursor,
                                      RtfStep const& step,
                                      bool skipsDestination,
-                                     bool isBehindFirst) {
+                                     bool isAfterFirst) {
     if (HandleToken(cursor, step.name, step.value)) return;
-    bool const isOpening = !isBehindFirst && !m_bCharEmitted;
+    bool const isOpening = !isAfterFirst && !m_bCharEmitted;
     wchar_t const* const rest = cursor;
     if (skipsDestination || isOpening) IgnoreToMatchingBrace(cursor);
     if (skipsDestination) return;  // the document says that this may be dropped
