@@ -38,7 +38,7 @@ std::optional<BoxTree::Leaf> BoxTree::leafOf(Entry const& entry, TzDbObjectRecor
                 {&item, entry.place});
 }
 
-// Blocks that are no longer shown stay noted, which costs a tree at most.
+// A block that is no longer shown stays noted: when it changes, the tree is built anew in vain.
 void BoxTree::noteBlocks(TzDbObjectRecord const& item) {
     std::vector<TzDbObjectRecord const*> open{&item};
     while (!open.empty()) {
@@ -99,8 +99,9 @@ void BoxTree::build(std::vector<TzDbObjectRecord*> const& items) {
 }
 
 BoxTree::Reach BoxTree::reachOf(TzDbObjectRecord* changed, TzDbObjectRecord*& item) const {
-    // Its own values say how references place a block; the tree of what it lists begins there. The
-    // attributes of a reference have coordinates of their own.
+    // The owner's own values move none of its items: those of a block say where references place
+    // it, and the place belongs to the tree; the attributes of a reference stand by coordinates of
+    // their own.
     if (changed == &owner_) return Reach::none;
     for (item = changed; item != nullptr; item = item->owner) {
         if (item->owner == &owner_) return Reach::item;
