@@ -6,6 +6,7 @@
 #include "module/align/spacing/setting_variables.h"
 #include "module/align/spacing/text_axes.h"
 #include "module/align/spacing/text_planes.h"
+#include "module/align/spacing/text_spacing.h"
 #include "module/host_calls/selection_sets.h"
 #include "tz/db/mtext.h"
 #include "tz/db/text.h"

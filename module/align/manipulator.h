@@ -4,7 +4,6 @@
 
 #include "module/align/spacing/aligned_entity.h"
 #include "module/align/spacing/options_factory.h"
-#include "module/align/spacing/text_spacing.h"
 #include "tz/ge/line_seg3d.h"
 #include "tz/ge/plane.h"
 #include "tz/text/array.h"
@@ -50,7 +49,7 @@ public:
     void setSecondPoint(TzGePoint3d const& point);
     void setAlignDirection(tagTextDirection direction) { m_direction = direction; }
     [[nodiscard]] tagTextDirection alignDirection() const { return m_direction; }
-    // Kept and not used: the gap in force is the option's.
+    // Kept and not used: the gap in force is the option's. Nothing calls it.
     void setAlignSpacingValue(double value) { m_spacingValue = value; }
 
     // Makes the option of that name the one in force and lets it ask what it needs, and returns the
@@ -83,6 +82,7 @@ public:
 
     // Texts, multi-line texts and attribute definitions; derived classes are not.
     [[nodiscard]] bool isTextSupported(TzDbObjectId id) const;
+    // Adds a class to these. Nothing calls it.
     void addSupportedEntityType(TzRxClass* kind);
 
 protected:
