@@ -4,9 +4,10 @@
 #   tz_row(FOLDER [USES folders...] [LIBRARIES third-party libraries...])
 #
 # Rows stand bottom to top, so a folder may only use folders of rows above its own line here: no
-# cycles. Each row is one line, since the lint reads this file too. Folders with no LIBRARIES
-# column under sdk/, module/ and examples/ use the standard library alone
-# (and the smallest host the loader).
+# cycles. A row also names what its folder reaches only through others: those headers must be found,
+# and a suite that links a layer links the layers of its row. Each row is one line, since the lint
+# reads this file too. Folders with no LIBRARIES column under sdk/, module/ and examples/ use the
+# standard library alone (and the smallest host the loader).
 #
 # Names of libraries: json (nlohmann-json), fastjson (RapidJSON), ini (SimpleIni), fontconfig,
 # pango (with GLib), cairo, boxes (Boost.Geometry), cli (CLI11), editline (libedit).
@@ -20,7 +21,7 @@ tz_row(module/host_calls   USES sdk)
 tz_row(module/texts        USES sdk module/host_calls)
 tz_row(module/geometry     USES sdk module/host_calls)
 tz_row(module/styles       USES sdk module/host_calls module/texts)
-tz_row(module/uncalled     USES sdk module/holders module/host_calls module/texts)
+tz_row(module/uncalled     USES sdk module/host_calls module/texts)
 tz_row(module/fonts        USES sdk module/globals module/host_calls module/texts)
 tz_row(module/prompt       USES sdk module/globals module/host_calls module/texts)
 tz_row(module/markup/shared       USES sdk module/host_calls module/fonts)
@@ -35,7 +36,7 @@ tz_row(module/edit         USES sdk module/globals module/holders module/host_ca
 tz_row(module/mtext        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/prompt module/edit)
 tz_row(module/commands     USES sdk module/globals module/holders module/host_calls module/texts module/styles module/prompt module/edit)
 tz_row(module/align/spacing USES sdk module/globals module/holders module/host_calls module/texts module/geometry)
-tz_row(module/align        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/prompt module/align/spacing)
+tz_row(module/align        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/align/spacing)
 tz_row(module/shell        USES sdk module/globals module/holders module/host_calls module/texts module/geometry module/styles module/fonts module/prompt module/markup/shared module/markup/read_markup module/markup/write_rtf module/markup/read_rtf module/markup/write_markup module/markup/session module/editor_state module/edit module/mtext module/commands module/align/spacing module/align)
 
 tz_row(host/base           USES sdk LIBRARIES json)
