@@ -22,6 +22,9 @@ constexpr int kByLayer = 256;
 constexpr int kByBlock = 0;
 constexpr double kLeastSpacing = 0.25;
 constexpr double kMostSpacing = 4.0;
+// For a scale beyond these the entity would refuse the whole background.
+constexpr double kLeastFillScale = 1.0;
+constexpr double kMostFillScale = 5.0;
 // In the names of styles that an external reference brought along.
 constexpr wchar_t kReferenceSign = L'|';
 
@@ -174,7 +177,8 @@ DialogChange readFillColor(JsonValue const& value) {
 }
 
 DialogChange readFillScale(JsonValue const& value) {
-    if (value.kind != JsonKind::number || value.number <= 0) return {};
+    bool const isInRange = value.number >= kLeastFillScale && value.number <= kMostFillScale;
+    if (value.kind != JsonKind::number || !isInRange) return {};
     return [scale = value.number](State& state) { state.SetBackgroundFillScale(scale); };
 }
 
