@@ -28,8 +28,8 @@ void RtfDocument::take(RtfToken const& token) {
 // Whether the token as a whole stands for the `\u` before it. Of a run of text, the characters
 // that do are stepped over when it is read; a brace or a word that is no character ends them all.
 bool RtfDocument::skips(RtfToken const& token) {
-    bool const isCharacter =
-        token.kind == Kind::byte || token.kind == Kind::symbol || RtfWords::isCharacter(token.text);
+    bool const isName = token.kind == Kind::word && RtfWords::isCharacter(token.text);
+    bool const isCharacter = token.kind == Kind::byte || token.kind == Kind::symbol || isName;
     if (isCharacter)
         --substitutes_;
     else if (token.kind != Kind::text)

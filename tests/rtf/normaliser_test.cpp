@@ -42,6 +42,8 @@ constexpr Case kTexts[] = {
     {"OneSubstitute", "\\u233?\\u-3913 ?b"sv, "\\pard \\u233?\\u61623?b"},
     {"NoSubstitute", "{\\uc0\\u233 a}\\u233 bc"sv, "\\pard \\u233?a\\u233?c"},
     {"LongSubstitutes", "\\uc3\\u233\\'41B\\endash c"sv, "\\pard \\u233?c"},
+    // The text "bullet" went as a whole, as if it were the word of that name.
+    {"SubstituteInAName", "\\u233 bullet\\endash c"sv, "\\pard \\u233?ullet\\u8211?c"},
     {"SubstitutesMissing", "\\uc2\\u233\\par\\u233 {a}\\u233\\u234 abc"sv,
      "\\pard \\u233?\\par\n\\pard \\u233?a\\u233?\\u234?c"},
     {"Surrogates", "\\u-10179?\\u-8704?{\\uc0 \\u55357\\uc1 \\u56832\\'3f}\\u128512?"sv,
