@@ -20,9 +20,10 @@
 
 namespace {
 
-// Flags of the questions.
+// Bits of tzedInitGet. The one for negative values says nothing of a keyword; it is handed over all
+// the same, and an empty answer is taken.
 constexpr int kNoEmptyAnswer = 1;
-constexpr int kEmptyAnswerTaken = 4;
+constexpr int kNoNegative = 4;
 
 constexpr int kLongestKeyword = 255;  // letters
 
@@ -54,7 +55,7 @@ void showEach(TzArray<TzDbObjectId> const& ids, Show const& show) {
 
 // A keyword has one letter at least and 255 at most, as in a buffer with its closing zero.
 int askKeyword(TzString const& prompt, unsigned int keywords, TzString& answer) {
-    tzedInitGet(kEmptyAnswerTaken, gStringTable[keywords]);
+    tzedInitGet(kNoNegative, gStringTable[keywords]);
     int const status = tzedGetKword(prompt, answer);
     if (status != Tzad::ePromptNormal) return status;
     if (answer.isEmpty()) return Tzad::ePromptError;
