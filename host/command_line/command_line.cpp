@@ -87,7 +87,7 @@ void CommandLine::complain(std::wstring const& text) {
     transcript_.error(text);
 }
 
-// One thing went wrong; what follows from it is no news.
+// The first thing that goes wrong ends the script; what follows from it is not told as an error.
 void CommandLine::countProblem(std::wstring_view what) {
     if (endsAtProblems_ && !isPerson() && !isStopped_) complain(place() + std::wstring(what));
 }

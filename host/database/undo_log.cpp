@@ -103,7 +103,8 @@ void UndoLog::fetchAhead(std::vector<Entry> const& entries, std::size_t at) {
     if (object) fetchValues(TzDbObjectAccess::imp(*object));
 }
 
-// A command that only picked a point, such as LIST, is none that a drafter would take back.
+// A step that only moved LASTPOINT, as a pick of LIST does, is not kept: a drafter would not want
+// it taken back.
 bool UndoLog::Step::isKept() const {
     return !entries.empty() || settings ||
            !std::all_of(variables.begin(), variables.end(),

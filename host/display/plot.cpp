@@ -211,7 +211,7 @@ bool Plot::writeFile() {
 PlotReport plotDrawing(TzDbDatabase& database, PlotOrder const& order) try {
     Job const job(localText(L"Plotting"));
     Plot plot(*drawingOf(&database), order);
-    // What is lacking in a plot that is not there is no news.
+    // Remarks tell what a plot leaves out, so a plot that failed has none.
     if (!plot.make() || !plot.write()) return {plot.takeReport().problem, {}};
     return plot.takeReport();
 } catch (std::bad_alloc const&) {

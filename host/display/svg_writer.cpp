@@ -19,6 +19,7 @@ constexpr int kPageDigits = 3;
 // The file is handed over in parts of about so many bytes.
 constexpr std::size_t kPart = std::size_t{1} << 16;
 
+// A number without zeros at its end, and without the sign of a zero.
 std::string shown(double value, std::chars_format format, int digits) {
     std::array<char, 400> text{};
     auto const [end, problem] =
@@ -89,7 +90,7 @@ std::string paint(char const* what, PlotColor const& color) {
     return result;
 }
 
-// The last two characters of Unicode's first plane, which XML has no room for.
+// U+FFFE and U+FFFF, which XML does not allow.
 bool isBeyondXml(std::string_view bytes) {
     return bytes.starts_with("\xEF\xBF\xBE") || bytes.starts_with("\xEF\xBF\xBF");
 }

@@ -9,7 +9,6 @@
 #include "host/database/drawing.h"
 #include "host/database/object_list.h"
 #include "host/database/open_state.h"
-#include "host/database/user_system.h"
 #include "host/display/record_access.h"
 #include "host/selection/box_index.h"
 #include "host/selection/outline.h"
@@ -22,7 +21,7 @@ namespace {
 
 constexpr wchar_t kHandleMark = L'#';
 constexpr wchar_t kInside = L'/';
-constexpr int kDeepest = 64;
+constexpr int kDeepest = 64;  // references within references; those further in are not looked into
 constexpr std::ptrdiff_t kMostLooks = 1'000'000;
 
 // What stands inside a block reference: its attributes, which have the reference's own coordinates,
