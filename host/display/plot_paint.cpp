@@ -9,7 +9,6 @@
 #include <ctime>
 #include <memory>
 #include <new>
-#include <optional>
 #include <string_view>
 
 #include "host/base/result_time.h"

@@ -1,8 +1,5 @@
 #pragma once
 
-#include <memory>
-#include <vector>
-
 #include "host/database/symbol_imp.h"
 #include "host/drawing_file/member_reader.h"
 #include "host/drawing_file/member_writer.h"

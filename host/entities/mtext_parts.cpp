@@ -1,4 +1,3 @@
-#include <cmath>
 
 #include "host/database/geometry.h"
 #include "host/entities/mtext_imp.h"

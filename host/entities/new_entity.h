@@ -1,7 +1,5 @@
 #pragma once
 
-#include <cstdint>
-
 #include "tz/db/entity.h"
 
 // Taking entities over into a drawing.

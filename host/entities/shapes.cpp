@@ -1,7 +1,5 @@
 #include "tz/db/shapes.h"
 
-#include <cmath>
-
 #include "host/base/entity_drawing.h"
 #include "host/database/geometry.h"
 #include "host/entities/shape_imp.h"

@@ -3,7 +3,6 @@
 #include <cerrno>
 
 #include <fcntl.h>
-#include <initializer_list>
 #include <unistd.h>
 
 namespace tzhost {

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <utility>
 
 #include "host/page/page_text.h"
 #include "host/text/local_text.h"

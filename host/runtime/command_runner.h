@@ -1,10 +1,8 @@
 #pragma once
 
 #include <functional>
-#include <vector>
 
 #include "host/base/audit.h"
-#include "tz/text/string.h"
 
 namespace tzhost {
 

@@ -1,8 +1,6 @@
 #pragma once
 
 #include <deque>
-#include <map>
-#include <string>
 
 #include "tz/ed/command_stack.h"
 #include "tz/text/string.h"

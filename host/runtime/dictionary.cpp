@@ -1,7 +1,6 @@
 #include "host/runtime/dictionary.h"
 
 #include <string_view>
-#include <utility>
 
 #include "host/base/event_sink.h"
 #include "host/runtime/class_registry.h"

@@ -6,7 +6,6 @@
 #include <exception>
 #include <utility>
 
-#include "host/base/fault_point.h"
 #include "host/base/memory_faults.h"
 #include "host/runtime/class_registry.h"
 #include "host/runtime/documents.h"

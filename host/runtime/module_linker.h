@@ -7,7 +7,6 @@
 
 #include "tz/rx/app.h"
 #include "tz/rx/registry.h"
-#include "tz/text/string.h"
 
 namespace tzhost {
 

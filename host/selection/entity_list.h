@@ -1,7 +1,5 @@
 #pragma once
 
-#include <vector>
-
 #include "tz/db/object_id.h"
 #include "tz/text/array.h"
 

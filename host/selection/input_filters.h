@@ -1,7 +1,5 @@
 #pragma once
 
-#include <vector>
-
 #include "host/selection/entity_list.h"
 #include "tz/ed/selection_filter.h"
 

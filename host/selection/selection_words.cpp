@@ -3,7 +3,6 @@
 #include <algorithm>
 #include <set>
 #include <string>
-#include <vector>
 
 #include "host/command_line/point_input.h"
 #include "host/runtime/words.h"

@@ -2,7 +2,6 @@
 
 #include <pango/pangocairo.h>
 
-#include <cstddef>
 #include <map>
 #include <string>
 #include <vector>

@@ -5,7 +5,6 @@
 #include <array>
 #include <charconv>
 #include <cstddef>
-#include <cstdint>
 #include <cstdio>
 #include <cwchar>
 #include <string>

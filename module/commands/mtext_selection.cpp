@@ -2,7 +2,6 @@
 
 #include "tz/ed/selection.h"
 #include "tz/rx/resbuf.h"
-#include "tz/rx/status.h"
 
 int selectMText(long long* set, wchar_t const* mode, KindCode code) {
     wchar_t kind[] = L"MTEXT";

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <memory>
-#include <new>
 #include <optional>
 
 #include "tz/db/object_id.h"

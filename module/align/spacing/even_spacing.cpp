@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <limits>
 
 #include "module/align/spacing/setting_variables.h"
 #include "module/texts/string_table.h"

@@ -1,7 +1,5 @@
 #pragma once
 
-#include <string>
-
 #include "tz/text/code_page.h"
 #include "tz/text/std_str.h"
 

@@ -6,7 +6,6 @@
 #include "module/markup/read_markup/stack_look_ahead.h"
 #include "module/markup/shared/ascii_set.h"
 #include "module/markup/shared/number_text.h"
-#include "module/markup/shared/rtf_escapes.h"
 #include "module/markup/write_rtf/mtext_to_rtf.h"
 #include "tz/mte/font_map_database.h"
 #include "tz/mte/globals.h"
