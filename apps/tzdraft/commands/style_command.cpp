@@ -10,6 +10,7 @@
 #include "apps/tzdraft/program_texts.h"
 #include "host/database/symbol_name.h"
 #include "host/fonts/machine_fonts.h"
+#include "host/layout/glyph_run.h"
 #include "tz/db/extensions.h"
 #include "tz/ed/print.h"
 
@@ -33,7 +34,6 @@ struct StyleAnswers {
     bool annotative = false;
 };
 
-constexpr double kMostOblique = 85.0 * std::numbers::pi / 180.0;
 constexpr int kBackward = 2;
 constexpr int kUpsideDown = 4;
 
@@ -103,7 +103,7 @@ bool askSlant(double& radians) {
         return angle;
     };
     auto const canBe = [](Answer<double> const& angle) {
-        bool const isUsable = std::abs(angle.value) <= kMostOblique;
+        bool const isUsable = tzhost::usableSlant(angle.value) == angle.value;
         if (!isUsable) tellProblem(localText(L"Letters slant by -85 to 85 degrees."));
         return isUsable;
     };
