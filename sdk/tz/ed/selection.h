@@ -56,7 +56,7 @@ TZ_API int tzedSSSetFirst(long long const* grips, long long const* selected);
 
 // The process-wide callback that takes the keywords of a selection with ":K": it gets the global
 // word and may ask questions of its own; a list that it returns is ignored. The callback may be
-// null.
+// null. [any] Both give 5100; reading it into a null pointer gives -5001.
 using TzedSSKeywordCallback = resbuf* (*)(wchar_t const* keyword);
 TZ_API int tzedSSGetKwordCallbackPtr(TzedSSKeywordCallback* callback);
 TZ_API int tzedSSSetKwordCallbackPtr(TzedSSKeywordCallback callback);

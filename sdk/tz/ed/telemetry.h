@@ -9,6 +9,7 @@ struct TzEdJigInputData;
 // what the command adds. Nothing leaves the machine; the host's event file shows them.
 class TZ_API TzTelemetryCmdHelper {
 public:
+    // The part of the host and the command that each report names.
     TzTelemetryCmdHelper(int component, wchar_t const* name);
 
     // [command] `data` may be null.

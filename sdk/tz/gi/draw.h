@@ -71,9 +71,11 @@ public:
     virtual void popModelTransform() = 0;
 };
 
+// What a drawing is made in.
 class TZ_API TzGiContext {
 public:
     virtual ~TzGiContext() = default;
+    // The drawing that what is drawn belongs to; may be null.
     [[nodiscard]] virtual class TzDbDatabase* database() const = 0;
 };
 

@@ -45,6 +45,8 @@ public:
         MapTypeMisc = 4,
     };
 
+    // Reads the face that is lent to pairs from the font map file. The flag passes to LoadContents,
+    // which ignores it.
     explicit CMTextFontMapDatabase(signed char flag);
     ~CMTextFontMapDatabase() override;
     using CTzadFontMapDatabase::MapFileToFont;
