@@ -3,7 +3,7 @@
 #include "tz/text/code_page.h"
 #include "tz/text/std_str.h"
 
-// Characters as rich text escapes, a byte each.
+// Characters written as escapes of rich text, one for each byte.
 //
 //   Handle8Bits(L'A')      // A
 //   Handle8Bits(0xE9)      // \'e9

@@ -121,6 +121,7 @@ public:
     void SetEffectiveSize(double size) { top().effectiveSize = size; }
     // How many states there are.
     [[nodiscard]] int States() const { return m_nState + 1; }
+    // Makes the size 1.0, whatever the style's is. Only a test calls it.
     void ResetState() { SetEffectiveSize(1.0); }
 
 private:
@@ -129,7 +130,7 @@ private:
 
     struct State {
         ParagraphSettings paragraph;
-        double effectiveSize = 1.0;
+        double effectiveSize = 1.0;  // of the text, drawing units
         FontName font;
         int pitchAndFamily = 0;
         Charset charset = kAnsiCharset;
