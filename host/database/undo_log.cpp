@@ -75,11 +75,30 @@ void UndoLog::dropUnchanged() {
     std::size_t kept = 0;
     for (std::size_t at = 0; at < entries.size(); ++at) {
         fetchAhead(entries, at);
+        entries[at].putBackEqualFields();
         if (entries[at].isUnchanged()) continue;
         if (kept != at) entries[kept] = std::move(entries[at]);
         ++kept;
     }
     entries.erase(entries.begin() + static_cast<std::ptrdiff_t>(kept), entries.end());
+}
+
+void UndoLog::Entry::putBackEqualFields() const {
+    if (!values || !values->fields) return;
+    auto const& now = TzDbObjectAccess::imp(*record->object)->fields;
+    if (!now || now->size() != values->fields->size()) return;
+    for (std::size_t at = 0; at < now->size(); ++at) {
+        auto const& [key, old] = (*values->fields)[at];
+        auto& [newKey, added] = (*now)[at];
+        TzDbObjectRecord& before = *old.record();
+        TzDbObjectRecord& after = *added.record();
+        if (key != newKey || !before.erased || after.erased) continue;
+        TzDbObjectImp const& said = *TzDbObjectAccess::imp(*before.object);
+        if (!said.isSameAs(*TzDbObjectAccess::imp(*after.object))) continue;
+        added = old;
+        before.erased = false;
+        after.erased = true;
+    }
 }
 
 bool UndoLog::Entry::isUnchanged() const {

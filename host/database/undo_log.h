@@ -62,6 +62,9 @@ private:
         std::unique_ptr<TzDbObjectImp> values;  // null for an object that the step added
         bool erased;
 
+        // An editor sets the fields of a text anew, though they say what they said. Then the
+        // object has its old ones again.
+        void putBackEqualFields() const;
         // Whether the object is as it was.
         [[nodiscard]] bool isUnchanged() const;
     };

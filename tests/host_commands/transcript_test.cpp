@@ -59,6 +59,11 @@ TranscriptCase const kCases[] = {
     {"NothingNear", "WALTZ\n", "There is no command \"WALTZ\". HELP lists all.\n"},
     {"UndoSaysWhat", "CIRCLE\n0,0\n1\nundo\nREDO\nexit\n",
      "CIRCLE is taken back.\nCommand: REDO\nCIRCLE is done again.\nCommand: exit\n"},
+    // It used to be a step of its own, since the field was another.
+    {"FieldSetAnewIsNoChange",
+     "-MTEXT\n0,0\n9,9\n%<\\Var LUNITS>%\n\nSETVAR\nMTEXTED\nOLDEDITOR\nMTEDIT\n#1\n<<<\n"
+     "textHeight=0.2\n>>>\nU\n",
+     "-MTEXT is taken back.\n"},
     {"NothingToDoAgain", "REDO\n", "There is nothing to do again.\n"},
     {"BlocksAndStylesAreListed", "INSERT\n?\n\nSTYLE\n?\nNew\nNo Such Face\n^C\n",
      "none yet.\nBlock to insert or [?]: \nCommand: STYLE\nText style name or [?] <Standard>: ?\n"
