@@ -52,6 +52,9 @@ TranscriptCase const kCases[] = {
      "  location         0.0000, 0.0000, 0.0000\n  attachment       top left\n"
      "  style            Standard\n  text height      1.0000\n  rotation         0\n"
      "  line spacing     at least 1\n"},
+    // They used to be 0 columns.
+    {"ListTellsDynamicColumns", "-MTEXT\n0,0\nColumns\nDynamic\n20\n1\n10\nOne\n\nLIST\nall\n\n",
+     "  columns          dynamic, width 20.0000, gutter 1.0000\n"},
     {"ListTellsWhatATextIsMarkedWith",
      "STYLE\nNote\n\n\n\n\n\n\n\nYes\n-MTEXT\n0,0\n9,9\nOne\n\nSETVAR\nMTEXTED\nOLDEDITOR\nMTEDIT\n"
      "#1\n<<<\nbackground={\"fill\": true, \"color\": 2, \"transparency\": 50}\n>>>\nLIST\nall\n\n",

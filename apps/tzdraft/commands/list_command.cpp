@@ -57,11 +57,14 @@ void listColumns(TzDbMText const& text) {
     if (text.columnType() == TzDbMText::kNoColumns) return;
     TextEditorColumns const columns = text.columns();
     bool const isStatic = columns.columnType == TzDbMText::kStaticColumns;
+    // Of dynamic ones the text decides how many there are, and a drawing need not say it.
+    TzString const count =
+        columns.columnCount > 0 ? TzString::formatted(L", %d", columns.columnCount) : TzString();
     row(localText(L"columns"),
         TzString::formatted(
-            localText(L"%ls, %d, width %ls, gutter %ls"),
+            localText(L"%ls%ls, width %ls, gutter %ls"),
             localText(isStatic ? forLocalText(L"static") : forLocalText(L"dynamic")),
-            columns.columnCount, shownDistance(columns.columnWidth).kwszPtr(),
+            count.kwszPtr(), shownDistance(columns.columnWidth).kwszPtr(),
             shownDistance(columns.columnGutter).kwszPtr()));
 }
 
