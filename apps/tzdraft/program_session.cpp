@@ -196,6 +196,9 @@ bool ProgramSession::plotAs(tzhost::PlotFormat format,
         error = *report.problem;
         return false;
     }
+    // A person may look at the wrong space, or at one whose layers are off.
+    if (report.isEmpty && tzhost::commandLine().isPerson())
+        remarks.push_back(file.string() + ": " + localText("nothing is drawn there"));
     ownFiles_.note(file);
     return true;
 }

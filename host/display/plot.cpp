@@ -149,7 +149,9 @@ bool Plot::addSheet(SpaceToPlot const& space) {
     if (pass.hasTooManyLetters()) return fail(localText("it has more letters than a plot takes"));
     if (!pass.isWhole()) return fail(localText("its blocks stand for too much to plot"));
     ViewAxes const axes = viewAxes(space.space);
-    PlotScene scene = makeScene(pass.takeList(), axes);
+    DrawList list = pass.takeList();
+    report_.isEmpty = report_.isEmpty && list.empty();
+    PlotScene scene = makeScene(std::move(list), axes);
     if (page_) return addPaper(std::move(scene), axes);
     sheets_.push_back(fittedSheet(std::move(scene), order_.format));
     return true;
@@ -212,12 +214,13 @@ PlotReport plotDrawing(TzDbDatabase& database, PlotOrder const& order) try {
     Job const job(localText(L"Plotting"));
     Plot plot(*drawingOf(&database), order);
     // Remarks tell what a plot leaves out, so a plot that failed has none.
-    if (!plot.make() || !plot.write()) return {plot.takeReport().problem, {}};
+    if (!plot.make() || !plot.write()) return {plot.takeReport().problem, {}, true};
     return plot.takeReport();
 } catch (std::bad_alloc const&) {
     return {order.file + ": " + localText("cannot be written") + ": " +
                 localText("memory ran short"),
-            {}};
+            {},
+            true};
 }
 
 }  // namespace tzhost

@@ -31,6 +31,7 @@ struct PlotOrder {
 struct PlotReport {
     std::optional<std::string> problem;  // what went wrong; nothing was written then
     std::vector<std::string> remarks;    // what the plot lacks
+    bool isEmpty = true;                 // nothing is drawn in the spaces that were plotted
 };
 
 // Plots a space as it is looked at and writes it whole: a file that is there stays as it was until

@@ -259,7 +259,7 @@ constexpr CareCase kCare[] = {
      ": |SAVE\r|: |locked.json\r|read-only: |y\r|Saved: /|SAVE\r|n>: |\r|read-only: |y\r",
      "Saved: /"},
     {"OpenSaysWhat", ": |SAVE\r|: |c.json\r|Saved: |OPEN\r|open: |c.json\r", "Opened: /"},
-    {"PlotSaysWhat", ": |PLOT\r|: |a.svg\r", "/desk/a.svg."},
+    {"PlotSaysWhat", ": |PLOT\r|: |a.svg\r", "/desk/a.svg.\r\na.svg: nothing is drawn there\r\n"},
     // PLOT used to replace the first without a word, and could not replace the second.
     {"PlotAsksOnce",
      ": |PLOT\r|to: |plot.svg\r|<No>: |y\r|Plotted: /|PLOT\r|to: |plot.svg\r|Plotted: /|PLOT\r|"
