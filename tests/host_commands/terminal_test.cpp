@@ -247,6 +247,8 @@ constexpr CareCase kCare[] = {
      "Copies what is selected from a base point\r\n                 to others; Enter ends.\r\n"},
     {"TopicsFitTheScreen", "$$(stty cols 60)|Command: |HELP\r|list: |PLOT\r",
      "has one;\r\nthe file"},
+    {"TopicsAreBrokenAnew", "$$(stty cols 90)|Command: |HELP\r|list: |TEXTALIGN\r",
+     "at the\r\nsecond point, sets"},
     {"ChoicesFitTheScreen", "$$(stty cols 60)|Command: |\t", "EXIT  \r\nHELP"},
     {"HelpAgain", ": |HELP\r|: |LINI\r|LINE.\r\nCommand, or|?\r", "UNLOAD  "},
     {"FilesAgain",

@@ -36,6 +36,15 @@ std::wstring fitted(std::wstring_view text, std::size_t indent) {
     return shown.append(text);
 }
 
+// Help files break long sentences into lines of their own width; a person's screen has another.
+std::wstring unbroken(std::wstring text) {
+    if (!tzhost::commandLine().isPerson()) return text;
+    for (std::size_t at = text.find(L'\n', 1); at != text.npos; at = text.find(L'\n', at + 1)) {
+        if (text[at - 1] != L'.') text[at] = L' ';
+    }
+    return text;
+}
+
 // By the name as it is shown: the local one, and the global one where that is another.
 void listCommands() {
     std::map<std::wstring, std::wstring> helpByName;
@@ -71,7 +80,7 @@ bool isTold(Answer<TzString> const& name) {
     TzString const registered = registeredName(name.value);
     std::wstring const text = registered.isEmpty() ? std::wstring() : helpFor(registered);
     if (!text.empty()) {
-        std::wistringstream lines(text);
+        std::wistringstream lines(unbroken(text));
         for (std::wstring line; std::getline(lines, line);)
             tzutPrintf(L"\n%ls", fitted(line, 0).c_str());
         tzutPrintf(L"\n");
