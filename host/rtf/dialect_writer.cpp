@@ -97,7 +97,11 @@ void DialectWriter::closeLook() {
     if (look_ == DialectLook()) return;
     bool const isAhead = body_.size() == paragraphStart_;
     body_ += '}';
-    if (isAhead) paragraphStart_ = body_.size();
+    if (isAhead) {
+        paragraphStart_ = body_.size();
+        startLook_ = {};
+    }
+    hasLeftStart_ = true;
     look_ = {};
 }
 
@@ -183,9 +187,13 @@ void DialectWriter::writeMark() {
     protectStackSign();
     body_ += "\\par\n";
     paragraphStart_ = body_.size();
+    startLook_ = look_;
+    hasLeftStart_ = false;
 }
 
-// Settings hold for the whole paragraph and are known at its end.
+// Settings hold for the whole paragraph and are known at its end. A group that is open from the
+// paragraph before and ends within this one would take them along, so it ends before them and
+// begins anew. A stack's mark stays: twice it would be two stacks.
 void DialectWriter::insertSettings(DialectParagraph const& paragraph) {
     std::string words;
     appendWord(words, "pard");
@@ -194,6 +202,12 @@ void DialectWriter::insertSettings(DialectParagraph const& paragraph) {
     for (int const stop : paragraph.tabs)
         appendWord(words, "tx", stop);
     words += ' ';
+    if (hasLeftStart_ && startLook_ != DialectLook() && !startLook_.isStackMark) {
+        words.insert(0, 1, '}');
+        words += '{';
+        appendLook(words, startLook_);
+        words += ' ';
+    }
     body_.insert(paragraphStart_, words);
     if (stackSignAt_ != kNowhere) stackSignAt_ += words.size();
 }

@@ -101,8 +101,10 @@ private:
     std::size_t paragraphStart_ = 0;
     std::size_t stackSignAt_ = kNowhere;  // of an "S" that may be taken for a stack's sign
     DialectLook look_;                    // the one in force; a group is open when it has words
-    DialectLook mark_;                    // of a paragraph that has ended
-    bool hasMark_ = false;                // its end is not yet written
+    DialectLook startLook_;      // that of the group that is open where the paragraph starts
+    bool hasLeftStart_ = false;  // that group ends within the paragraph
+    DialectLook mark_;           // of a paragraph that has ended
+    bool hasMark_ = false;       // its end is not yet written
     bool hasContent_ = false;
     bool isInStack_ = false;
 };

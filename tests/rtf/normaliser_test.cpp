@@ -96,6 +96,9 @@ INSTANTIATE_TEST_SUITE_P(Looks, Bodies, testing::ValuesIn(kLooks), kName);
 constexpr Case kParagraphs[] = {
     {"Settings", "\\li720\\fi-360\\tx720 a\\par\\pard b"sv,
      "\\pard\\fi-360\\li720\\tx720 a\\par\n\\pard b"},
+    // The group went on over the end, so that a second pass lost the indent where it closes.
+    {"LookOverAParagraph", "\\li100{\\b a\\par b}c"sv,
+     "\\pard\\li100 {\\b a\\par\n}\\pard\\li100 {\\b b}c"},
     {"SettingsAtTheEnd", "{\\pard\\li100 a}\\li200\\par{\\pard\\li300 b}"sv,
      "\\pard\\li200 a\\par\n\\pard\\li300 b"},
     {"Breaks", "a\\page b\\sect\\sectd c\\column\\page d"sv,
