@@ -225,8 +225,10 @@ constexpr CareCase kCare[] = {
      "*|NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r|: |NEW\r", "<No>"},
     // A name or value that is none is asked for again: it used to end the command.
     {"LayersAgain",
-     ": |LAYER\r|: |M\r|rent: |a/b\r|ends.\r\nName of| W \r|: |C\r|<7>: |red\r|colour.\r\nColour|0\r|colour.\r\nColour|3\r"
-     "|<W>: |x\r|\"x\".\r\nLayer to colour|W\r|: |OFf\r|<W>: |?\r|layer: \"W\".\r\nLayer to|\r|does not show.|D\r|delete: |0\r",
+     ": |LAYER\r|: |M\r|rent: |a/b\r|ends.\r\nName of| W \r|: |C\r|<7>: |red\r|colour.\r\nColour|"
+     "0\r|colour.\r\nColour|3\r"
+     "|<W>: |x\r|\"x\".\r\nLayer to colour|W\r|: |OFf\r|<W>: |?\r|layer: \"W\".\r\nLayer to|\r|"
+     "does not show.|D\r|delete: |0\r",
      "stays.\r\nLayer to delete: "},
     {"VariablesAgain",
      ": |SETVAR\r|: |LUNIT\r|them.\r\nVariable|LUNITS\r|<2>: |9\r|to 5.\r\nNew|4\r|: |SETVAR\r"
@@ -252,7 +254,8 @@ constexpr CareCase kCare[] = {
     {"ChoicesFitTheScreen", "$$(stty cols 60)|Command: |\t", "EXIT  \r\nHELP"},
     {"HelpAgain", ": |HELP\r|: |LINI\r|LINE.\r\nCommand, or|?\r", "UNLOAD  "},
     {"FilesAgain",
-     ": |SAVE\r|: |/none/a\r|directory\r\nSave|d.json\r|: |OPEN\r|: |none\r|ory\r\nDrawing|\r|: |PLOT\r"
+     ": |SAVE\r|: |/none/a\r|directory\r\nSave|d.json\r|: |OPEN\r|: |none\r|ory\r\nDrawing|\r|: |"
+     "PLOT\r"
      "|: |a.gif\r",
      ".pdf\r\nFile"},
     {"SaveAsksFirst", ": |SAVE\r|: |there.json\r|<No>: |\r", kIdle},
@@ -278,7 +281,9 @@ constexpr CareCase kCare[] = {
     // Enter keeps a value; what is no value is asked for again.
     {"PropertiesAreAskedFor",
      "$--var MTEXTED=OLDEDITOR|: |-MTEXT\r|: |0,0\r|: |9,-9\r|: |one\r|: |\r|: |MTPROP\r|: |#1\r|"
-     "textHeight, a number above 0 <0.2>: |0\r|no value for textHeight, expected a number above 0.|3\r|bottom right <1>: |5\r|or more <9>: |\r|"
+     "textHeight, a number above 0 <0.2>: |0\r|"
+     "no value for textHeight, expected a number above 0.|3\r|bottom right <1>: |5\r|"
+     "or more <9>: |\r|"
      "in radians <0>: |\r|text style <Standard>: |\r|: |\r|: |\r|: |\r|: |\r|: |MTPROP\r|: |#1\r|"
      "above 0 <3>: |\r",
      "bottom right <5>: "},

@@ -58,7 +58,8 @@ TranscriptCase const kCases[] = {
     {"ListTellsWhatATextIsMarkedWith",
      "STYLE\nNote\n\n\n\n\n\n\n\nYes\n-MTEXT\n0,0\n9,9\nOne\n\nSETVAR\nMTEXTED\nOLDEDITOR\nMTEDIT\n"
      "#1\n<<<\nbackground={\"fill\": true, \"color\": 2, \"transparency\": 50}\n>>>\nLIST\nall\n\n",
-     "  background       colour 2, scale 1.5, transparency 50\n  annotative       yes\n  contents         One\n"},
+     "  background       colour 2, scale 1.5, transparency 50\n  annotative       yes\n"
+     "  contents         One\n"},
     {"NothingNear", "WALTZ\n", "There is no command \"WALTZ\". HELP lists all.\n"},
     {"UndoSaysWhat", "CIRCLE\n0,0\n1\nundo\nREDO\nexit\n",
      "CIRCLE is taken back.\nCommand: REDO\nCIRCLE is done again.\nCommand: exit\n"},
