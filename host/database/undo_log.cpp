@@ -107,7 +107,8 @@ bool UndoLog::Entry::isUnchanged() const {
 }
 
 // The objects of a long step lie all over the memory, and the processor would wait for the record,
-// the object and both its values, one after the other. Each is asked for some entries before.
+// the object and both its values, one after the other. Each is asked for some entries before. That
+// changes nothing but the time: records stay where they are as long as their drawing.
 void UndoLog::fetchAhead(std::vector<Entry> const& entries, std::size_t at) {
     constexpr std::size_t kRecord = 16;
     constexpr std::size_t kObject = 8;
